@@ -1,0 +1,15 @@
+/* What the platform tells of its display. */
+#pragma once
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+#pragma GCC visibility push(default)
+
+/* Stores the display's density in dots per inch, or 0 where it is unknown. */
+void getDpi(float* xdpi, float* ydpi);
+
+#pragma GCC visibility pop
+#ifdef __cplusplus
+}
+#endif

@@ -1,0 +1,40 @@
+/* What a host that stands in for a phone offers besides the phone's own services: opening its
+ * screen, saying how large it is, taking a picture of it, and telling that its window was closed.
+ *
+ * An application that is to run on a PC includes this header; one for the phone alone does not
+ * need it. Calls are made from the application's thread.
+ */
+#pragma once
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+#pragma GCC visibility push(default)
+
+/* Opens the screen as the environment asks: BRIMOL_DISPLAY=window|headless (a window when there is
+ * a display, headless otherwise) and BRIMOL_SCREEN=WIDTHxHEIGHT in pixels (1440x2560). EventInit
+ * does it for an application that did not; EventQuit closes it. Opening an open screen is a
+ * success. Returns 1, or 0 when it cannot be opened; brimol_host_error() says why. */
+int brimol_host_open(void);
+
+/* One line without a line end about the call that failed last; empty when none did. The text stays
+ * valid until the next call that fails. */
+const char* brimol_host_error(void);
+
+/* Stores the size of the open screen in pixels; what it would be where none is open. */
+void brimol_host_screen_size(int* width, int* height);
+
+/* The keys and mouse actions that the host understands, a line each, for an application's help. */
+const char* brimol_host_help(void);
+
+/* Non-zero once the user has asked to close the window. */
+int brimol_host_close_requested(void);
+
+/* Waits until the newest ended frame is painted and writes it as a PNG file in full size. Returns
+ * 1, or 0 when there is no open screen or the file cannot be written; brimol_host_error() says why. */
+int brimol_host_screenshot(const char* path);
+
+#pragma GCC visibility pop
+#ifdef __cplusplus
+}
+#endif

@@ -1,0 +1,83 @@
+/* The input service of the platform: input records, the millisecond clock and its pauses. */
+#pragma once
+
+#include <stdint.h>
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+#pragma GCC visibility push(default)
+
+/* What an input record tells; any other value is one that the toolkit does not know. */
+enum BrimolEventType {
+  BRIMOL_KEY_DOWN = 2,
+  BRIMOL_KEY_UP = 3,
+  BRIMOL_POINTER_MOTION = 4,
+  BRIMOL_POINTER_DOWN = 5,
+  BRIMOL_POINTER_UP = 6,
+  BRIMOL_LONG_PRESS = 18,
+  BRIMOL_USER_EVENT = 24
+};
+
+/* Types 4, 5, 6 and 18. Positions are in screen pixels. */
+typedef struct BrimolPointerEvent {
+  uint8_t type;
+  uint8_t reserved;
+  uint8_t finger; /* 0 for the first finger */
+  uint8_t state;
+  uint16_t x;
+  uint16_t y;
+  int16_t xrel; /* motion since the finger's previous record; type 4 only */
+  int16_t yrel;
+} BrimolPointerEvent;
+
+/* Types 2 and 3. */
+typedef struct BrimolKeyEvent {
+  uint8_t type;
+  uint8_t reserved;
+  uint8_t state;
+  uint8_t reserved2;
+  uint32_t reserved3;
+  uint32_t code;
+} BrimolKeyEvent;
+
+/* Type 24: two words whose meaning the sender and the receiver agree on. */
+typedef struct BrimolUserEvent {
+  uint8_t type;
+  uint8_t reserved[3];
+  uint32_t word1;
+  uint32_t word2;
+} BrimolUserEvent;
+
+enum { BRIMOL_EVENT_BYTES = 64 };
+
+/* One input record. The toolkit reads its first 12 bytes; a platform may use the room behind. */
+typedef union Event {
+  uint8_t type; /* enum BrimolEventType, the first byte of every form */
+  BrimolPointerEvent pointer;
+  BrimolKeyEvent key;
+  BrimolUserEvent user;
+  uint8_t bytes[BRIMOL_EVENT_BYTES];
+} Event;
+
+/* Starts the service; `flags` select what it reports. Non-zero on success. */
+int EventInit(unsigned int flags);
+
+/* Stops it. Records that nobody took are dropped. */
+void EventQuit(void);
+
+/* Fills `event` with the next record and returns non-zero, or returns 0 when none waits. Never
+ * blocks. One thread polls. */
+int PollEvent(Event* event);
+
+/* Milliseconds since some fixed moment; wraps after 49.7 days. Any thread. */
+unsigned int GetTicks(void);
+
+/* Pauses the calling thread for about `ms` milliseconds. On the polling thread the pause may end
+ * early when input arrives. Any thread. */
+void Delay(unsigned int ms);
+
+#pragma GCC visibility pop
+#ifdef __cplusplus
+}
+#endif

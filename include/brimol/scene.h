@@ -1,0 +1,100 @@
+/* The drawing service of the platform: the records that it draws and the calls that add them.
+ *
+ * The toolkit draws nothing itself. Each call adds one display item to the frame that is being
+ * recorded and returns its handle, a number that is at least 0, or a negative number when the item
+ * was not taken. Records are passed by value, so nothing needs to outlive the call. Usable from C11
+ * and C++.
+ */
+#pragma once
+
+#include <stdint.h>
+
+#ifdef __cplusplus
+#define BRIMOL_STATIC_ASSERT static_assert
+extern "C" {
+#else
+#define BRIMOL_STATIC_ASSERT _Static_assert
+#endif
+#pragma GCC visibility push(default)
+
+/* A rectangle in pixels. A point is inside when x <= px < x + w and y <= py < y + h. */
+typedef struct SKIA_Rect {
+  int32_t x;
+  int32_t y;
+  int32_t w;
+  int32_t h;
+  uint32_t color; /* 0xAARRGGBB, the fill where the rectangle is drawn as a box */
+} SKIA_Rect;
+
+/* A line between two points, in pixels. */
+typedef struct SKIA_Point {
+  int32_t x1;
+  int32_t y1;
+  int32_t x2;
+  int32_t y2;
+  uint32_t color; /* 0xAARRGGBB */
+  int32_t width;  /* thickness in pixels */
+} SKIA_Point;
+
+enum { SKIA_TEXT_BYTES = 128 };
+
+/* A text of at most 127 bytes of UTF-8 and a NUL. */
+typedef struct SKIA_Text {
+  char text[SKIA_TEXT_BYTES];
+  int32_t string_len; /* bytes of `text` that are drawn */
+  uint32_t color;     /* 0xAARRGGBB */
+  int32_t align;      /* 1 left, 2 right, 5 centred, any other left */
+  int32_t size;       /* font size in pixels */
+} SKIA_Text;
+
+/* What an item record shows; each kind names the drawing call that adds the same picture. */
+enum SKIA_ItemKind {
+  SKIA_LABEL = 0,
+  SKIA_TEXTBOX = 1,
+  SKIA_BUTTONBOX = 2,
+  SKIA_BOX = 3,
+  SKIA_ROUNDBOX = 4,
+  SKIA_STATICBOX = 5,
+  SKIA_LINE = 6,
+  SKIA_IMAGE = 7, /* the text names a picture file */
+  SKIA_ROUNDTEXTBOX = 8,
+  SKIA_ROUNDBUTTONBOX = 9,
+  SKIA_ARROW = 10
+};
+
+/* A whole display item: its kind and the records that this kind reads. */
+typedef struct SKIA_Item {
+  int32_t kind; /* enum SKIA_ItemKind */
+  SKIA_Rect rect;
+  SKIA_Point point;
+  SKIA_Text text;
+} SKIA_Item;
+
+BRIMOL_STATIC_ASSERT(sizeof(SKIA_Rect) == 20, "five words");
+BRIMOL_STATIC_ASSERT(sizeof(SKIA_Point) == 24, "six words");
+BRIMOL_STATIC_ASSERT(sizeof(SKIA_Text) == 144, "128 bytes and four words");
+BRIMOL_STATIC_ASSERT(sizeof(SKIA_Item) == 192, "kind, rect, point and text");
+
+int skia_add_box_c(SKIA_Rect rect);
+int skia_add_roundbox_c(SKIA_Rect rect);
+int skia_add_line_c(SKIA_Point line);
+int skia_add_label_c(SKIA_Rect rect, SKIA_Text text);
+int skia_add_textbox_c(SKIA_Rect rect, SKIA_Text text);
+int skia_add_roundtextbox_c(SKIA_Rect rect, SKIA_Text text);
+int skia_add_buttonbox_c(SKIA_Rect rect, SKIA_Text text);
+int skia_add_roundbuttonbox_c(SKIA_Rect rect, SKIA_Text text);
+int skia_add_staticbox_c(SKIA_Rect rect, SKIA_Text text);
+/* An arrow within the rectangle, in the point record's colour. The record's `width` is the
+ * direction word: 0 points right, any other left. */
+int skia_add_arrow_c(SKIA_Rect rect, SKIA_Point direction);
+/* The item is copied. A null pointer or an unknown kind adds nothing and returns a negative number. */
+int skia_add_widget_c(const SKIA_Item* item);
+
+/* Non-zero while the display takes part in input: what is false for a dark display. */
+int skia_live_widget_c(void);
+
+#pragma GCC visibility pop
+#ifdef __cplusplus
+}
+#endif
+#undef BRIMOL_STATIC_ASSERT
