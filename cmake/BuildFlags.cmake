@@ -1,0 +1,16 @@
+# mw_flags: what every target of the project is built with.
+
+add_library(mw_flags INTERFACE)
+target_compile_options(
+  mw_flags INTERFACE -Wall -Wextra -Wpedantic -Wconversion -Wshadow
+                     $<$<BOOL:${BRIMOL_WERROR}>:-Werror>)
+
+if(BRIMOL_SANITIZE STREQUAL "address")
+  set(sanitizers -fsanitize=address,undefined -fno-sanitize-recover=undefined)
+elseif(BRIMOL_SANITIZE STREQUAL "thread")
+  set(sanitizers -fsanitize=thread)
+elseif(NOT BRIMOL_SANITIZE STREQUAL "")
+  message(FATAL_ERROR "BRIMOL_SANITIZE is empty, address or thread")
+endif()
+target_compile_options(mw_flags INTERFACE ${sanitizers} $<$<BOOL:${sanitizers}>:-fno-omit-frame-pointer>)
+target_link_options(mw_flags INTERFACE ${sanitizers})
