@@ -1,0 +1,4 @@
+/// Marks what libbrimol3_widget.so exports.
+#pragma once
+
+#define MW_API __attribute__((visibility("default")))

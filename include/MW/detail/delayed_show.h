@@ -1,0 +1,29 @@
+/// A widget that appears some time after it was told to.
+#pragma once
+
+#include <cstdint>
+
+namespace MW {
+
+/// Until the first drawing pass at or after the due time the widget is neither drawn nor offered
+/// events. Times are GetTicks() milliseconds. The holder's lock guards it.
+class DelayedShow {
+ public:
+  constexpr void start(uint32_t now, uint32_t delayMs) {
+    due = now + delayMs;
+    pending = true;
+  }
+  constexpr bool isPending() const { return pending; }
+  constexpr bool isDue(uint32_t now) const { return pending && now >= due; }
+  /// A drawing pass: whether the widget is drawn in it.
+  constexpr bool draws(uint32_t now) {
+    if (isDue(now)) pending = false;
+    return !pending;
+  }
+
+ private:
+  uint32_t due = 0;
+  bool pending = false;
+};
+
+}  // namespace MW

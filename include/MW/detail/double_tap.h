@@ -1,0 +1,36 @@
+/// Two taps in quick succession.
+#pragma once
+
+#include <cstdint>
+
+namespace MW {
+
+/// Counts taps of which each ends within 500 ms of the one before. Times are GetTicks()
+/// milliseconds; 0 stands for none. One thread, the one that handles events.
+class DoubleTap {
+ public:
+  static constexpr uint32_t kWindowMs = 500;
+
+  /// A press: forgets a tap that lies too far back, and starts the time when none runs.
+  constexpr void press(uint32_t now) {
+    if (time != 0 && time < now - kWindowMs) reset();
+    if (time == 0) time = now;
+  }
+  constexpr bool isRunning() const { return time != 0; }
+  /// A completed tap: how many there were in a row, or 0 when it came too late, which starts over.
+  constexpr int tap(uint32_t now) {
+    if (now >= time + kWindowMs) {
+      reset();
+      return 0;
+    }
+    time = now;
+    return ++count;
+  }
+  constexpr void reset() { *this = DoubleTap(); }
+
+ private:
+  uint32_t time = 0;
+  int count = 0;
+};
+
+}  // namespace MW

@@ -1,0 +1,97 @@
+/// Passive display elements of one drawing record each.
+///
+/// They are in no layer and get no events: the application calls their show(), or copies them to
+/// the display-item table with add_MWWList(). Drawing and changing may happen on different threads.
+/// Constructors copy their records; a null rectangle or line is all zero, a null text empty. A
+/// text that fills its record without a NUL is cut.
+#pragma once
+
+#include <MW/widget.h>
+
+namespace MW {
+
+/// A text without a background.
+class MW_API Label : public Widget {
+ public:
+  /// The text's length is taken from its NUL, not from `string_len`.
+  Label(const SKIA_Rect* area, const SKIA_Text* caption);
+  /// The handle that the platform gave to the item.
+  int show() override;
+  int show(unsigned int ticks) override;
+  char* getText() override;
+  unsigned int getTextColor() override;
+  int getFontSize() override;
+  SKIA_Rect* getPositionAndSize() override;
+  void setFontSize(int pixels) override;
+  /// Replaces the text's first bytes and its length and writes no NUL behind them: the platform
+  /// goes by the length.
+  void setText(const char* newText) override;
+  void setTextAlign(int align) override;
+  /// Kept, though a label has no background; getBgColor() stays 0.
+  void setBgColor(unsigned int color) override;
+  int add_MWWList() override;
+};
+
+/// A text on a filled rectangle.
+class MW_API Textbox : public Widget {
+ public:
+  /// The text's length is taken from its NUL, not from `string_len`.
+  Textbox(const SKIA_Rect* area, const SKIA_Text* caption);
+  /// The handle that the platform gave to the item.
+  int show() override;
+  int show(unsigned int ticks) override;
+  char* getText() override;
+  unsigned int getTextColor() override;
+  int getFontSize() override;
+  SKIA_Rect* getPositionAndSize() override;
+  void setFontSize(int pixels) override;
+  void setText(const char* newText) override;
+  void setTextAlign(int align) override;
+  /// The fill. getBgColor() stays 0.
+  void setBgColor(unsigned int color) override;
+  int add_MWWList() override;
+};
+
+/// A picture, named by a text that the platform understands (a file's path).
+class MW_API Image : public Widget {
+ public:
+  /// Takes `string_len` bytes of the text, cut to 0 to 127, and none of its other fields.
+  Image(const SKIA_Rect* area, const SKIA_Text* name);
+  /// The handle that the platform gave to the item, a label.
+  int show() override;
+  int show(unsigned int ticks) override;
+  char* getText() override;
+  SKIA_Rect* getPositionAndSize() override;
+  /// As Label::setText.
+  void setText(const char* newText) override;
+  int add_MWWList() override;
+};
+
+/// A filled rectangle.
+class MW_API Box : public Widget {
+ public:
+  explicit Box(const SKIA_Rect* area);
+  /// The handle that the platform gave to the item.
+  int show() override;
+  int show(unsigned int ticks) override;
+  SKIA_Rect* getPositionAndSize() override;
+  /// The fill. getBgColor() stays 0.
+  void setBgColor(unsigned int color) override;
+  int add_MWWList() override;
+};
+
+/// A straight line.
+class MW_API Line : public Widget {
+ public:
+  explicit Line(const SKIA_Point* line);
+  /// The handle that the platform gave to the item.
+  int show() override;
+  int show(unsigned int ticks) override;
+  /// A rectangle that starts at the line's larger x and y and reaches back: its width and height
+  /// are zero or negative. Its colour is the line's.
+  SKIA_Rect* getPositionAndSize() override;
+  void setLnColor(unsigned int color) override;
+  int add_MWWList() override;
+};
+
+}  // namespace MW

@@ -1,0 +1,75 @@
+/// The records that events carry, their codes, and the toolkit's common colours. C11 and C++.
+#pragma once
+
+#include <brimol/scene.h>
+#include <stdint.h>
+
+#ifdef __cplusplus
+namespace MW {
+#endif
+
+/// What happened; event_data's `type`. Codes 0 to 3 are pointer events.
+enum EventCode {
+  kEventMotion = 0,
+  kEventPress = 1,
+  kEventRelease = 2,
+  kEventLongPress = 3,
+  kEventKeyPress = 4,
+  kEventKeyRelease = 5,
+  kEventApplication = 6,  ///< raised by EventService::AppEvent
+  kEventUser = 7,         ///< raised by the platform
+  kEventUnknown = 8       ///< input that the toolkit does not know; no widget acts on it
+};
+
+/// Key codes that widgets act on.
+enum KeyCode {
+  kKeyUp = 273,
+  kKeyDown = 274,
+  kKeyRight = 275,
+  kKeyLeft = 276,
+  kKeyHook = 323,
+  kKeySelect = 327
+};
+
+/// A touch, in screen pixels.
+struct mouse_event {
+  uint32_t state;   ///< the platform's pointer state
+  uint32_t finger;  ///< 0 for the first finger
+  int32_t x;
+  int32_t y;
+  int32_t xrel;  ///< motion since the finger's previous report; 0 except for kEventMotion
+  int32_t yrel;
+};
+
+/// A key, or the two words of a user event.
+struct kbd_event {
+  uint32_t state;
+  uint32_t code;  ///< a KeyCode or any other code of the platform
+};
+
+/// One event as widgets receive it.
+struct event_data {
+  int32_t type;  ///< EventCode
+  union {
+    struct mouse_event mouse;  ///< codes 0 to 3
+    struct kbd_event key;      ///< codes 4, 5 and 7
+    int32_t value;             ///< code 6: what AppEvent was given
+  };
+};
+
+#ifdef __cplusplus
+
+static_assert(sizeof(mouse_event) == 24, "six words");
+static_assert(sizeof(kbd_event) == 8, "two words");
+static_assert(sizeof(event_data) == 28, "the code and six words");
+
+// Colours are 0xAARRGGBB.
+inline constexpr uint32_t kColorBlack = 0xFF000000;
+inline constexpr uint32_t kColorWhite = 0xFFFFFFFF;
+inline constexpr uint32_t kColorBlue = 0xFF0000FF;
+inline constexpr uint32_t kColorGreen = 0xFF00FF00;
+inline constexpr uint32_t kColorShadow = 0x7F000000;     ///< half-transparent black
+inline constexpr uint32_t kColorHighlight = 0xFF87CEFA;  ///< what a pressed element turns
+
+}  // namespace MW
+#endif
