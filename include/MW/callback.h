@@ -23,21 +23,21 @@ class Callback {
   constexpr Callback(std::nullptr_t) {}  // NOLINT(google-explicit-constructor): assigned from null
 
   template <typename Function>
-    requires(std::convertible_to<Function, void (*)(int)>)
-  Callback(Function function)  // NOLINT(bugprone-forwarding-reference-overload)
+  requires(std::convertible_to<Function, void (*)(int)>)
+      Callback(Function function)  // NOLINT(bugprone-forwarding-reference-overload)
       : word(erase(static_cast<void (*)(int)>(function))) {}
 
   template <typename Function>
-    requires(std::convertible_to<Function, void (*)(mouse_event*)>)
-  Callback(Function function) : word(erase(static_cast<void (*)(mouse_event*)>(function))) {}
+  requires(std::convertible_to<Function, void (*)(mouse_event*)>) Callback(Function function)
+      : word(erase(static_cast<void (*)(mouse_event*)>(function))) {}
 
   template <typename Function>
-    requires(std::convertible_to<Function, void (*)(kbd_event*)>)
-  Callback(Function function) : word(erase(static_cast<void (*)(kbd_event*)>(function))) {}
+  requires(std::convertible_to<Function, void (*)(kbd_event*)>) Callback(Function function)
+      : word(erase(static_cast<void (*)(kbd_event*)>(function))) {}
 
   template <typename Function>
-    requires(std::convertible_to<Function, void (*)(int*)>)
-  Callback(Function function) : word(erase(static_cast<void (*)(int*)>(function))) {}
+  requires(std::convertible_to<Function, void (*)(int*)>) Callback(Function function)
+      : word(erase(static_cast<void (*)(int*)>(function))) {}
 
   explicit operator bool() const { return word != nullptr; }
 

@@ -6,7 +6,7 @@
 #include <brimol/input.h>
 
 #include <atomic>
-#include <deque>
+#include <list>
 
 namespace MW {
 
@@ -31,7 +31,8 @@ class MW_API EventService {
   void sendEvent(const Event* event);
   /// Fills `data` from the platform's record. A type that is not known gives kEventUnknown.
   void parseEvent(const Event* event, event_data* data);
-  /// Queues a block from malloc, which the queue owns from here on. Null is ignored. Any thread.
+  /// Queues a block from malloc, which the queue owns from here on; without memory it is freed and
+  /// a line logged. Null is ignored. Any thread.
   void saveQueue(event_data* data);
   /// Queues an application event (code 6) that carries `value`. As for sendEvent. Any thread.
   void AppEvent(int value);
@@ -45,7 +46,7 @@ class MW_API EventService {
   static bool isMouseEventAroundMe(const SKIA_Rect* area, const event_data* event);
 
  private:
-  std::deque<event_data*> queue;  // guarded by the queue lock
+  std::list<event_data*> queue;  // guarded by the queue lock
   std::atomic<int> active = 1;
 };
 

@@ -8,6 +8,7 @@
 
 #include <atomic>
 #include <mutex>
+#include <type_traits>
 
 namespace MW {
 
@@ -113,18 +114,18 @@ class MW_API Widget {
 
   // The application's callbacks. Null: not wanted.
 
-  Callback pressCallback;        ///< touch press: buttons, screens, dialogs
-  Callback hoverCallback;        ///< touch motion: screens, dialogs
-  Callback clickCallback;        ///< touch release inside: buttons, screens, dialogs
-  Callback longPressCallback;    ///< long press: buttons, screens, key widget
-  Callback doubleClickCallback;  ///< double tap within 500 ms: buttons, screens, slides
-  Callback callbackWord5;        ///< never called
-  Callback keyPressCallback;     ///< key pressed: dialogs, key widget
-  Callback keyReleaseCallback;   ///< key released: dialogs, key widget
-  Callback plugCallback;         ///< plug key event: dialogs, key widget
-  Callback doubleKeyCallback;    ///< one key released twice within 1000 ms
-  Callback tripleKeyCallback;    ///< one key released three times within 1000 ms
-  Callback touchPressCallback;   ///< raw touch press: key widget
+  Callback pressCallback;         ///< touch press: buttons, screens, dialogs
+  Callback hoverCallback;         ///< touch motion: screens, dialogs
+  Callback clickCallback;         ///< touch release inside: buttons, screens, dialogs
+  Callback longPressCallback;     ///< long press: buttons, screens, key widget
+  Callback doubleClickCallback;   ///< double tap within 500 ms: buttons, screens, slides
+  Callback callbackWord5;         ///< never called
+  Callback keyPressCallback;      ///< key pressed: dialogs, key widget
+  Callback keyReleaseCallback;    ///< key released: dialogs, key widget
+  Callback plugCallback;          ///< plug key event: dialogs, key widget
+  Callback doubleKeyCallback;     ///< one key released twice within 1000 ms
+  Callback tripleKeyCallback;     ///< one key released three times within 1000 ms
+  Callback touchPressCallback;    ///< raw touch press: key widget
   Callback touchReleaseCallback;  ///< raw touch release: key widget
   Callback button1Callback;       ///< dialog button 1 released
   Callback button2Callback;       ///< dialog button 2 released
@@ -140,6 +141,18 @@ class MW_API Widget {
   /// Takes the widget out of its layer, by its own address and whatever its id, and waits for a
   /// handler of it that runs on another thread. Its counters and the log are not touched.
   void leaveLayers();
+
+  /// A field that handlers and drawing share, read and written under the lock.
+  template <typename Field>
+  Field read(const Field& field) const {
+    const std::lock_guard guard(stateLock);
+    return field;
+  }
+  template <typename Field>
+  void write(Field& field, std::type_identity_t<Field> value) {
+    const std::lock_guard guard(stateLock);
+    field = value;
+  }
 
   /// Guards what handlers and drawing share: `rect`, `text`, `point` and the like of each class.
   /// Held for a few instructions and one drawing call at most, never while a callback runs.

@@ -21,8 +21,8 @@ class MW_API WidgetList {
   static constexpr int kNotInitialised = -1024;
 
   struct Slot {
-    int index;  ///< 0: free
-    int shown;  ///< 1: drawn by show()
+    int index;        ///< 0: free
+    int shown;        ///< 1: drawn by show()
     SKIA_Item* item;  ///< owned by the table, null while free
   };
 
@@ -51,7 +51,8 @@ class MW_API WidgetList {
   /// Lets show() draw the item, or not. 1, or kNotFound.
   static int show(int index);
   static int hide(int index);
-  /// Draws the shown items and a veil of 539 x 939 pixels over them, whatever the screen. Returns 1.
+  /// Draws the shown items and a veil of 539 x 939 pixels over them, whatever the screen.
+  /// Returns 1.
   static int hideShadow();
 
   // Changes of an item. 1, or kNotFound, which is logged; index 0 is never found.

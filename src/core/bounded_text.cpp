@@ -1,0 +1,57 @@
+#include "core/bounded_text.h"
+
+#include <algorithm>
+#include <cstring>
+
+namespace MW {
+
+namespace {
+
+constexpr unsigned char kContinuationMask = 0xC0;
+constexpr unsigned char kContinuation = 0x80;
+
+bool continuesCharacter(char byte) {
+  return (static_cast<unsigned char>(byte) & kContinuationMask) == kContinuation;
+}
+
+// Where a text that goes on behind `limit` is cut: before the character that `limit` would split.
+// Bytes that are no character at all are cut where the limit is.
+std::size_t wholeCharacters(const char* text, std::size_t limit) {
+  constexpr std::size_t kLongestTail = 3;
+  std::size_t cut = limit;
+  while (cut > 0 && limit - cut <= kLongestTail && continuesCharacter(text[cut])) --cut;
+  return continuesCharacter(text[cut]) ? limit : cut;
+}
+
+}  // namespace
+
+std::string_view boundedText(const char* given) { return boundedText(given, SKIA_TEXT_BYTES); }
+
+std::string_view boundedText(const char* given, std::size_t count) {
+  if (given == nullptr) return "";
+  const std::size_t length = strnlen(given, std::min<std::size_t>(count, SKIA_TEXT_BYTES));
+  if (length <= kTextMax) return {given, length};
+  return {given, wholeCharacters(given, kTextMax)};
+}
+
+void putTextOpen(SKIA_Text& record, std::string_view bounded) {
+  std::memmove(record.text, bounded.data(), bounded.size());
+  record.string_len = static_cast<int32_t>(bounded.size());
+}
+
+void putText(SKIA_Text& record, std::string_view bounded) {
+  putTextOpen(record, bounded);
+  record.text[bounded.size()] = '\0';
+}
+
+SKIA_Text copyText(const SKIA_Text* given) {
+  SKIA_Text record = {};
+  if (given == nullptr) return record;
+  record.color = given->color;
+  record.align = given->align;
+  record.size = given->size;
+  putText(record, boundedText(given->text));
+  return record;
+}
+
+}  // namespace MW

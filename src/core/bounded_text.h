@@ -1,0 +1,29 @@
+/// Texts that stay within their record, whatever is given.
+#pragma once
+
+#include <MW/api.h>
+#include <brimol/scene.h>
+
+#include <string_view>
+
+namespace MW {
+
+/// Most bytes of text that a SKIA_Text takes; a NUL stands behind them.
+inline constexpr int kTextMax = SKIA_TEXT_BYTES - 1;
+
+/// What a record can hold of a C string, or of its first `count` bytes: at most kTextMax bytes, up
+/// to the NUL if there is one, and no character of several bytes cut in half. Null is empty.
+MW_API std::string_view boundedText(const char* given);
+MW_API std::string_view boundedText(const char* given, std::size_t count);
+
+/// Puts the text and a NUL into the record and sets its length; the rest of the record stays.
+MW_API void putText(SKIA_Text& record, std::string_view bounded);
+/// The same without the NUL: what stood behind the new text stays there, and the length alone says
+/// where it ends.
+MW_API void putTextOpen(SKIA_Text& record, std::string_view bounded);
+
+/// A copy of an application's record: its colour, alignment and size, and its text up to the NUL
+/// with the length that this gives. Null: an empty record.
+MW_API SKIA_Text copyText(const SKIA_Text* given);
+
+}  // namespace MW

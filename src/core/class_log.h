@@ -1,0 +1,22 @@
+/// The toolkit's log lines.
+#pragma once
+
+namespace MW {
+
+enum class LogLevel { Debug = 3, Warning = 5, Error = 6 };
+
+/// Writes lines that begin with the word of the class that speaks. Any thread.
+class ClassLog {
+ public:
+  explicit constexpr ClassLog(const char* className, const char* logTag = "BRIMOL_WIDGET")
+      : word(className), tag(logTag) {}
+
+  /// One line, "[WORD] " and the message, cut to 255 bytes.
+  [[gnu::format(printf, 3, 4)]] void print(LogLevel level, const char* format, ...) const;
+
+ private:
+  const char* word;
+  const char* tag;
+};
+
+}  // namespace MW

@@ -1,0 +1,169 @@
+#include <MW/primitives.h>
+#include <MW/widget_list.h>
+
+#include <algorithm>
+#include <limits>
+
+#include "core/bounded_text.h"
+
+namespace MW {
+
+namespace {
+
+// The widgets' own numbers, and what the display-item table calls the same things: both are fixed.
+constexpr int kTypeLabel = 3;
+constexpr int kTypeImage = 5;
+constexpr int kTypeBox = 6;
+constexpr int kTypeLine = 7;
+constexpr int kTypeTextbox = 8;
+
+SKIA_Rect copyRect(const SKIA_Rect* given) { return given != nullptr ? *given : SKIA_Rect{}; }
+
+// From `from` to `to`, which lies before it; cut to what a record's word can hold.
+int32_t distance(int32_t from, int32_t to) {
+  const int64_t back = int64_t{to} - from;
+  return static_cast<int32_t>(std::max<int64_t>(back, std::numeric_limits<int32_t>::min()));
+}
+
+SKIA_Text imageName(const SKIA_Text* given) {
+  SKIA_Text record = {};
+  if (given == nullptr) return record;
+  const auto count = static_cast<std::size_t>(std::max(given->string_len, 0));
+  putText(record, boundedText(given->text, count));
+  return record;
+}
+
+}  // namespace
+
+Label::Label(const SKIA_Rect* area, const SKIA_Text* caption) {
+  type_ = kTypeLabel;
+  rect = copyRect(area);
+  text = copyText(caption);
+}
+
+int Label::show() { return show(0); }
+
+int Label::show(unsigned int) {
+  const std::lock_guard guard(stateLock);
+  return skia_add_label_c(rect, text);
+}
+
+char* Label::getText() { return text.text; }
+unsigned int Label::getTextColor() { return read(text.color); }
+int Label::getFontSize() { return read(text.size); }
+SKIA_Rect* Label::getPositionAndSize() { return &rect; }
+void Label::setFontSize(int pixels) { write(text.size, pixels); }
+
+void Label::setText(const char* newText) {
+  const std::lock_guard guard(stateLock);
+  putTextOpen(text, boundedText(newText));
+}
+
+void Label::setTextAlign(int align) { write(text.align, align); }
+void Label::setBgColor(unsigned int color) { write(rect.color, color); }
+
+int Label::add_MWWList() {
+  const std::lock_guard guard(stateLock);
+  return WidgetList::addQueue(SKIA_LABEL, &rect, nullptr, &text);
+}
+
+Textbox::Textbox(const SKIA_Rect* area, const SKIA_Text* caption) {
+  type_ = kTypeTextbox;
+  rect = copyRect(area);
+  text = copyText(caption);
+}
+
+int Textbox::show() { return show(0); }
+
+int Textbox::show(unsigned int) {
+  const std::lock_guard guard(stateLock);
+  return skia_add_textbox_c(rect, text);
+}
+
+char* Textbox::getText() { return text.text; }
+unsigned int Textbox::getTextColor() { return read(text.color); }
+int Textbox::getFontSize() { return read(text.size); }
+SKIA_Rect* Textbox::getPositionAndSize() { return &rect; }
+void Textbox::setFontSize(int pixels) { write(text.size, pixels); }
+
+void Textbox::setText(const char* newText) {
+  const std::lock_guard guard(stateLock);
+  putText(text, boundedText(newText));
+}
+
+void Textbox::setTextAlign(int align) { write(text.align, align); }
+void Textbox::setBgColor(unsigned int color) { write(rect.color, color); }
+
+int Textbox::add_MWWList() {
+  const std::lock_guard guard(stateLock);
+  return WidgetList::addQueue(SKIA_TEXTBOX, &rect, nullptr, &text);
+}
+
+Image::Image(const SKIA_Rect* area, const SKIA_Text* name) {
+  type_ = kTypeImage;
+  rect = copyRect(area);
+  text = imageName(name);
+}
+
+int Image::show() { return show(0); }
+
+int Image::show(unsigned int) {
+  const std::lock_guard guard(stateLock);
+  return skia_add_label_c(rect, text);
+}
+
+char* Image::getText() { return text.text; }
+SKIA_Rect* Image::getPositionAndSize() { return &rect; }
+
+void Image::setText(const char* newText) {
+  const std::lock_guard guard(stateLock);
+  putTextOpen(text, boundedText(newText));
+}
+
+int Image::add_MWWList() {
+  const std::lock_guard guard(stateLock);
+  return WidgetList::addQueue(SKIA_IMAGE, &rect, nullptr, &text);
+}
+
+Box::Box(const SKIA_Rect* area) {
+  type_ = kTypeBox;
+  rect = copyRect(area);
+}
+
+int Box::show() { return show(0); }
+int Box::show(unsigned int) { return skia_add_box_c(read(rect)); }
+SKIA_Rect* Box::getPositionAndSize() { return &rect; }
+void Box::setBgColor(unsigned int color) { write(rect.color, color); }
+
+int Box::add_MWWList() {
+  const std::lock_guard guard(stateLock);
+  return WidgetList::addQueue(SKIA_BOX, &rect, nullptr, nullptr);
+}
+
+Line::Line(const SKIA_Point* line) {
+  type_ = kTypeLine;
+  if (line != nullptr) point = *line;
+}
+
+int Line::show() { return show(0); }
+int Line::show(unsigned int) { return skia_add_line_c(read(point)); }
+
+SKIA_Rect* Line::getPositionAndSize() {
+  const std::lock_guard guard(stateLock);
+  // Anchored at the larger coordinates and reaching back from there: meant so.
+  rect.x = std::max(point.x1, point.x2);
+  rect.y = std::max(point.y1, point.y2);
+  rect.w = distance(rect.x, std::min(point.x1, point.x2));
+  rect.h = distance(rect.y, std::min(point.y1, point.y2));
+  rect.color = point.color;
+  return &rect;
+}
+
+void Line::setLnColor(unsigned int color) { write(point.color, color); }
+
+int Line::add_MWWList() {
+  const std::lock_guard guard(stateLock);
+  return WidgetList::addQueue(SKIA_LINE, nullptr, &point, nullptr);
+}
+
+}  // namespace MW
