@@ -22,15 +22,15 @@ class MW_API EventService {
   EventService& operator=(const EventService&) = delete;
 
   /// 1, or 0 when the thread could not be created.
-  int startEvent();
-  int stopEvent();
+  static int startEvent();
+  static int stopEvent();
   int isActive() const;
 
   /// Converts the platform's record and queues it. Without memory the event is lost and a line is
   /// logged. Any thread.
   void sendEvent(const Event* event);
   /// Fills `data` from the platform's record. A type that is not known gives kEventUnknown.
-  void parseEvent(const Event* event, event_data* data);
+  static void parseEvent(const Event* event, event_data* data);
   /// Queues a block from malloc, which the queue owns from here on; without memory it is freed and
   /// a line logged. Null is ignored. Any thread.
   void saveQueue(event_data* data);

@@ -2,7 +2,6 @@
 #pragma once
 
 #include <brimol/scene.h>
-#include <stdint.h>
 
 #ifdef __cplusplus
 namespace MW {

@@ -46,6 +46,7 @@ bool isPinned(const WidgetBlock* block) {
 }
 
 // Whether a caller of `widget` can go on only after this thread has.
+// NOLINTNEXTLINE(misc-no-recursion): as deep as `depth` says
 bool waitsForThisThread(const Widget* widget, int depth) {
   if (widget == nullptr || depth == 0) return false;
   for (const WalkRecord* record = walkRecords; record != nullptr; record = record->next) {

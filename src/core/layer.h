@@ -19,6 +19,7 @@ struct WalkRecord;
 struct WidgetBlock {
   static std::unique_ptr<WidgetBlock> make(std::size_t capacity);  // null: no memory
 
+  // NOLINTNEXTLINE(modernize-avoid-c-arrays): a vector would throw where there is no memory
   std::unique_ptr<std::atomic<Widget*>[]> places;
   std::size_t capacity = 0;
   std::atomic<std::size_t> used = 0;
