@@ -1,0 +1,35 @@
+// The example application: a factory test that shows the toolkit's widgets at work.
+#include <brimol/host.h>
+
+#include <cstdio>
+#include <cstdlib>
+#include <span>
+#include <string>
+
+#include "application.h"
+#include "options.h"
+
+namespace {
+
+constexpr int kUsageError = 2;
+
+void printHelp() {
+  std::printf("%s\nOn a PC:\n%s", factory_test::usage().c_str(), brimol_host_help());
+}
+
+}  // namespace
+
+int main(int count, char** arguments) {
+  std::string error;
+  const std::span<const char* const> all(arguments, static_cast<std::size_t>(count));
+  const auto options = factory_test::parseOptions(all.subspan(all.empty() ? 0 : 1), error);
+  if (!options) {
+    std::fprintf(stderr, "factory_test: %s\n", error.c_str());
+    return kUsageError;
+  }
+  if (options->action == factory_test::Options::Action::Help) {
+    printHelp();
+    return EXIT_SUCCESS;
+  }
+  return factory_test::runApplication(*options);
+}

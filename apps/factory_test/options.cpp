@@ -1,0 +1,73 @@
+#include "options.h"
+
+#include <algorithm>
+#include <array>
+#include <string_view>
+
+namespace factory_test {
+
+namespace {
+
+struct OptionRow {
+  std::string_view name;
+  const char* value;  // what its value is called; null: it takes none
+  const char* meaning;
+  void (*apply)(Options& options, const char* value);
+};
+
+constexpr auto kOptions = std::to_array<OptionRow>({
+    {"--help", nullptr, "print this and end",
+     [](Options& options, const char*) { options.action = Options::Action::Help; }},
+    {"--headless", nullptr, "draw to memory instead of a window",
+     [](Options& options, const char*) { options.headless = true; }},
+    {"--shot", "FILE.png", "draw the first screen, write it to FILE.png and end",
+     [](Options& options, const char* value) { options.shot = value; }},
+    {"--verbose", nullptr, "write the toolkit's log to stderr",
+     [](Options& options, const char*) { options.verbose = true; }},
+});
+
+constexpr std::size_t kNameColumns = 20;
+
+}  // namespace
+
+std::optional<Options> parseOptions(std::span<const char* const> arguments, std::string& error) {
+  Options options;
+  for (std::size_t i = 0; i < arguments.size(); ++i) {
+    const std::string_view name = arguments[i];
+    const auto* const row = std::ranges::find(kOptions, name, &OptionRow::name);
+    if (row == kOptions.end()) {
+      error = "unknown option '" + std::string(name) + "', see --help";
+      return {};
+    }
+    const char* value = nullptr;
+    if (row->value != nullptr) {
+      if (++i == arguments.size() || *arguments[i] == '\0') {
+        error = std::string(name) + " needs a value: " + row->value;
+        return {};
+      }
+      value = arguments[i];
+    }
+    row->apply(options, value);
+  }
+  return options;
+}
+
+std::string usage() {
+  std::string text =
+      "Usage: factory_test [OPTION]...\n"
+      "Shows the first screen of a factory test, built from the toolkit's widgets.\n\n"
+      "Options:\n";
+  for (const OptionRow& row : kOptions) {
+    std::string name(row.name);
+    if (row.value != nullptr) name.append(" ").append(row.value);
+    name.resize(std::max(kNameColumns, name.size() + 1), ' ');
+    text.append("  ").append(name).append(row.meaning).append("\n");
+  }
+  text +=
+      "\nEnvironment:\n"
+      "  BRIMOL_DISPLAY=window|headless   where to draw; a window when there is a display\n"
+      "  BRIMOL_SCREEN=WIDTHxHEIGHT       screen size in pixels, 1440x2560 when not set\n";
+  return text;
+}
+
+}  // namespace factory_test

@@ -1,0 +1,26 @@
+/// The command line of the factory test.
+#pragma once
+
+#include <optional>
+#include <span>
+#include <string>
+
+namespace factory_test {
+
+struct Options {
+  enum class Action { Run, Help };
+
+  Action action = Action::Run;
+  bool headless = false;  // draw to memory, without a window
+  bool verbose = false;   // write the toolkit's log to stderr
+  std::string shot;       // draw once, write this PNG file and end; empty: no
+};
+
+/// The options, or nothing for a wrong command line; `error` then says in one line what is wrong.
+/// `arguments` does not hold the program's name.
+std::optional<Options> parseOptions(std::span<const char* const> arguments, std::string& error);
+
+/// What --help prints, a line for each option, without the keys of the host.
+std::string usage();
+
+}  // namespace factory_test

@@ -1,0 +1,11 @@
+#!/usr/bin/env bash
+# Builds the example application and runs it; the arguments go to it (try --help).
+set -euo pipefail
+cd "$(dirname "$0")/.."
+
+scripts/install_packages.sh
+echo "== Building in build/release"
+[[ -f build/release/build.ninja ]] || cmake --preset release >/dev/null
+cmake --build --preset release --target factory_test
+echo "== Starting build/release/apps/factory_test/factory_test $*"
+exec build/release/apps/factory_test/factory_test "$@"

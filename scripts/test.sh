@@ -1,0 +1,38 @@
+#!/usr/bin/env bash
+# Builds and tests everything: scripts/test.sh, or only the suites named: scripts/test.sh asan tidy
+#
+#   release  the unit, thread and end-to-end tests, optimised
+#   asan     the same under the address and undefined-behaviour sanitizers
+#   tsan     the same under the thread sanitizer
+#   phone    the library alone, without the PC platform
+#   tidy     formatting and clang-tidy
+set -euo pipefail
+cd "$(dirname "$0")/.."
+
+build() {
+  echo "== Building $1 in build/$1"
+  cmake --preset "$1" >/dev/null
+  cmake --build --preset "$1"
+}
+
+run_suite() {
+  case $1 in
+    release | asan | tsan)
+      build "$1"
+      echo "== Testing $1"
+      ctest --preset "$1"
+      ;;
+    phone) build phone ;;
+    tidy) scripts/tidy.sh ;;
+    *)
+      echo "test.sh: unknown suite '$1': release, asan, tsan, phone or tidy" >&2
+      exit 2
+      ;;
+  esac
+}
+
+suites=("$@")
+((${#suites[@]} > 0)) || suites=(phone tidy asan tsan release)
+scripts/install_packages.sh
+for suite in "${suites[@]}"; do run_suite "$suite"; done
+echo "== Passed: ${suites[*]}"

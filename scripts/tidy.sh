@@ -1,0 +1,15 @@
+#!/usr/bin/env bash
+# Checks the formatting of every source and runs clang-tidy over it; any finding fails.
+set -euo pipefail
+cd "$(dirname "$0")/.."
+
+mapfile -t sources < <(git ls-files '*.h' '*.cpp' '*.c')
+mapfile -t units < <(git ls-files '*.cpp')
+
+echo "== Checking the format of ${#sources[@]} files"
+clang-format --dry-run --Werror "${sources[@]}"
+
+echo "== Running clang-tidy over ${#units[@]} files"
+cmake --preset debug >/dev/null
+printf '%s\0' "${units[@]}" |
+  xargs -0 -n 1 -P "$(nproc)" clang-tidy -p build/debug --quiet --warnings-as-errors='*' 2>/dev/null
