@@ -1,0 +1,68 @@
+/// What the input calls work on: the queue of records, the clock and its pauses.
+#pragma once
+
+#include <condition_variable>
+#include <cstdint>
+#include <functional>
+#include <mutex>
+#include <thread>
+
+#include "input/clock.h"
+#include "input/input_queue.h"
+
+namespace brimol::pc {
+
+/// Guards the queue and the clock, and lets threads pause until time or a record comes.
+/// Any thread may call any operation.
+class InputService {
+ public:
+  InputService() = default;
+  InputService(const InputService&) = delete;
+  InputService& operator=(const InputService&) = delete;
+
+  /// Records are taken from here on. The clock stays as it is.
+  void open();
+  /// Drops the records that wait, lets go of the clock, and with that ends every pause that waits
+  /// for the hand. A closed service ignores records and has none.
+  void close();
+
+  /// Adds a record and ends the polling thread's pause.
+  void post(const Event& record);
+  /// Moves the next record to `record` and returns true, or returns false when none waits. The
+  /// calling thread is the polling thread from here on.
+  bool poll(Event& record);
+
+  /// Milliseconds; wraps.
+  uint32_t now() const;
+  /// Pauses the calling thread for `ms` milliseconds of the clock. Ends early on the polling thread
+  /// while a record waits, and on every thread when the clock is taken by hand or let go.
+  void delay(uint32_t ms);
+
+  /// See Clock. What waited for the time that is reached goes on.
+  void takeHand(uint32_t start);
+  void advance(uint32_t ms);
+  void letGo();
+  /// `watcher` is called after every takeHand, advance, letGo and close, on the thread that called
+  /// these; it may not set a watcher. Empty: none. The watcher before is not running any more when
+  /// this returns.
+  void setTimeWatcher(std::function<void()> watcher);
+
+ private:
+  void tellTime();
+
+  mutable std::mutex mutex;      // guards all up to watcherMutex
+  std::condition_variable wake;  // a record arrived, or the hand moved
+  Clock clock;
+  InputQueue queue;
+  bool isOpen = false;
+  uint32_t handChanges = 0;  // how often the hand was put on or taken off
+  std::thread::id poller;
+
+  std::mutex watcherMutex;  // guards timeWatcher, and is held while it runs
+  std::function<void()> timeWatcher;
+};
+
+/// The one that the C calls work on. It lives as long as the process: threads may poll to the end.
+InputService& inputService();
+
+}  // namespace brimol::pc
