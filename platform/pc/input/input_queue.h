@@ -12,8 +12,8 @@ namespace brimol::pc {
 ///
 /// A record that arrives when the queue is full is taken all the same, and another one leaves: the
 /// oldest motion of the same finger; else the oldest motion; else the oldest record that is neither
-/// a down nor an up; else the oldest press together with its release. So nobody ever sees a
-/// finger or key without its release. The relative motion of what leaves is added to the finger's
+/// a down nor an up; else the oldest press together with its release. So nobody ever misses the
+/// release of a press that was seen. The relative motion of what leaves is added to the finger's
 /// next motion.
 class InputQueue {
  public:

@@ -48,6 +48,7 @@ class InputTranslator {
   std::optional<uint32_t> msToLongPress(uint32_t now) const;
 
  private:
+  LongPress& longPressOf(int finger) { return longPresses[static_cast<std::size_t>(finger)]; }
   void moveFinger(int finger, ScreenPoint to);
   void liftFinger(int finger);
   void liftPinned();
@@ -58,7 +59,7 @@ class InputTranslator {
   Size screen;
   InputService& service;
   Pointers pointers;
-  std::vector<LongPress> longPresses;  // by finger
+  std::vector<LongPress> longPresses;  // one for each finger
   std::vector<SDL_Keycode> keysDown;
 };
 

@@ -1,8 +1,5 @@
 # brimol_pc_input: settings, properties, clock and input of the PC platform. It opens nothing and
 # has no thread of its own.
-find_package(PkgConfig REQUIRED)
-pkg_check_modules(BRIMOL_PC_INPUT REQUIRED IMPORTED_TARGET sdl2 cairo)
-
 add_library(brimol_pc_input STATIC)
 target_sources(
   brimol_pc_input
@@ -21,5 +18,5 @@ target_include_directories(brimol_pc_input PUBLIC "${CMAKE_CURRENT_LIST_DIR}"
                                                   "${PROJECT_SOURCE_DIR}/include")
 target_link_libraries(
   brimol_pc_input
-  PUBLIC PkgConfig::BRIMOL_PC_INPUT
+  PUBLIC PkgConfig::CAIRO PkgConfig::SDL2
   PRIVATE mw_flags)
