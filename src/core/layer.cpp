@@ -88,15 +88,15 @@ std::unique_ptr<WidgetBlock> WidgetBlock::make(std::size_t capacity) {
 
 int Layer::append(Widget* widget) {
   const WidgetBlock* const full = current;
-  if ((full == nullptr || full->used == full->capacity) && !grow()) return 0;
+  if ((full == nullptr || full->used == full->capacity) && !renew()) return 0;
   WidgetBlock& block = *current;
   block.places[block.used] = widget;
   ++block.used;
   return ++live;
 }
 
-// A new block takes over the widgets that are left, so that cleared places do not add up.
-bool Layer::grow() {
+// A new block takes over the widgets that are left. The walks that go over the old one keep it.
+bool Layer::renew() {
   auto wider = WidgetBlock::make(std::max(kSmallestBlock, static_cast<std::size_t>(live) * 2));
   if (!wider) return false;
   if (WidgetBlock* const old = current) {
@@ -108,6 +108,12 @@ bool Layer::grow() {
   current = wider.release();
   freeOlderBlocks();
   return true;
+}
+
+// Cleared places cost every walk time. Without memory for a new block they stay.
+void Layer::dropClearedPlaces() {
+  const auto widgets = static_cast<std::size_t>(live);
+  if (current.load()->used > 2 * widgets + kSmallestBlock) (void)renew();
 }
 
 void Layer::freeOlderBlocks() {
@@ -139,6 +145,7 @@ Widget* Layer::removeFirst(int id) {
     Widget* const widget = block->places[i];
     if (widget == nullptr || widget->id() != id) continue;
     clear(i);
+    dropClearedPlaces();
     return widget;
   }
   return nullptr;
@@ -152,12 +159,13 @@ int Layer::removeAll(const Widget* widget) {
     clear(i);
     ++removed;
   }
+  if (removed > 0) dropClearedPlaces();
   return removed;
 }
 
 LayerWalk::LayerWalk(const Layer& layer) : record(takeRecord()) {
   if (record == nullptr) return;
-  record->thread = std::this_thread::get_id();
+  record->thread.store(std::this_thread::get_id(), std::memory_order_release);
   // Pinned first and compared then: a block that is still current was not freed before it was
   // pinned, and is not freed while it is.
   do {
@@ -167,12 +175,13 @@ LayerWalk::LayerWalk(const Layer& layer) : record(takeRecord()) {
   if (block != nullptr) end = block->used;
 }
 
+// Released in this order: whoever reads one of them sees everything that this walk did before.
 LayerWalk::~LayerWalk() {
   if (record == nullptr) return;
-  record->calling = nullptr;
-  record->pinned = nullptr;
-  record->thread = std::thread::id();
-  record->taken = false;
+  record->calling.store(nullptr, std::memory_order_release);
+  record->pinned.store(nullptr, std::memory_order_release);
+  record->thread.store(std::thread::id(), std::memory_order_release);
+  record->taken.store(false, std::memory_order_release);
 }
 
 Widget* LayerWalk::next() {
@@ -185,7 +194,7 @@ Widget* LayerWalk::next() {
     record->calling = widget;
     if (place == widget) return widget;
   }
-  if (record != nullptr) record->calling = nullptr;
+  if (record != nullptr) record->calling.store(nullptr, std::memory_order_release);
   return nullptr;
 }
 

@@ -30,7 +30,7 @@ struct WidgetBlock {
 ///
 /// Changes are made under the layer lock. Walks take no lock: they go over the block that was
 /// current when they began. A removal clears the widget's place in every block that a walk may go
-/// over, needs no memory, and so cannot fail.
+/// over, needs no memory, and so cannot fail; with memory it also makes room when many are cleared.
 class Layer {
  public:
   /// The number of widgets it then holds, or 0 when there was no memory.
@@ -46,8 +46,9 @@ class Layer {
  private:
   friend class LayerWalk;
 
-  bool grow();
+  bool renew();
   void clear(std::size_t place);
+  void dropClearedPlaces();
   void freeOlderBlocks();
 
   // Walks pin a block before they read it (LayerWalk); the chain of older blocks hangs on it.

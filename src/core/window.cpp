@@ -45,7 +45,9 @@ int truncated(double value) {
 
 template <typename Visit>
 void visitActive(int type, Visit visit) {
-  LayerWalk walk(Layers::layer(type));
+  const Layer& layer = Layers::layer(type);
+  if (layer.isEmpty()) return;
+  LayerWalk walk(layer);
   while (Widget* const widget = walk.next()) {
     if (widget->isActive()) visit(*widget);
   }

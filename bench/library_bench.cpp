@@ -1,0 +1,138 @@
+// What the toolkit adds to the platform's own calls: the passes over the layers, and registering.
+#include <MW/button.h>
+#include <MW/window.h>
+#include <android/log.h>
+#include <benchmark/benchmark.h>
+#include <brimol/frame.h>
+#include <brimol/input.h>
+
+#include <algorithm>
+#include <chrono>
+#include <cstring>
+#include <memory>
+#include <vector>
+
+namespace {
+
+using MW::Button;
+using MW::Window;
+
+constexpr int kCallsPerSample = 2000;  // widgets drawn between two looks at the clock
+constexpr unsigned int kTicks = 1000;
+
+struct Face {
+  SKIA_Rect rect = {100, 200, 600, 240, 0xFFB8C4D6};
+  SKIA_Text text = {};
+
+  Face() {
+    std::strcpy(text.text, "A button");
+    text.string_len = static_cast<int32_t>(std::strlen(text.text));
+    text.size = 48;
+  }
+};
+
+class ActiveButtons {
+ public:
+  explicit ActiveButtons(std::size_t count) {
+    const Face face;
+    for (std::size_t i = 0; i < count; ++i) {
+      buttons.push_back(std::make_unique<Button>(&face.rect, &face.text));
+      buttons.back()->setActive(1);
+    }
+  }
+
+ private:
+  std::vector<std::unique_ptr<Button>> buttons;
+};
+
+template <typename Work>
+double nanoseconds(int times, Work work) {
+  const auto start = std::chrono::steady_clock::now();
+  for (int i = 0; i < times; ++i) work();
+  return std::chrono::duration<double, std::nano>(std::chrono::steady_clock::now() - start).count();
+}
+
+double median(std::vector<double>& values) {
+  const auto middle = values.begin() + static_cast<std::ptrdiff_t>(values.size() / 2);
+  std::nth_element(values.begin(), middle, values.end());
+  return *middle;
+}
+
+// Runs `pass` and `bare` in turn, so that both meet the same machine, and reports the median of
+// each, in nanoseconds a widget, and of their ratio.
+template <typename Pass, typename Bare>
+void compare(benchmark::State& state, Pass pass, Bare bare) {
+  const auto widgets = static_cast<int>(state.range(0));
+  const int times = std::max(1, kCallsPerSample / widgets);
+  std::vector<double> passes;
+  std::vector<double> bares;
+  std::vector<double> ratios;
+  for ([[maybe_unused]] auto round : state) {
+    passes.push_back(nanoseconds(times, pass) / times / widgets);
+    bares.push_back(nanoseconds(times, bare) / times / widgets);
+    ratios.push_back(passes.back() / bares.back());
+  }
+  state.counters["pass_ns"] = median(passes);
+  state.counters["bare_ns"] = median(bares);
+  state.counters["ratio"] = median(ratios);
+}
+
+// Against the same drawing calls made by hand.
+void drawingPass(benchmark::State& state) {
+  const auto widgets = static_cast<std::size_t>(state.range(0));
+  const ActiveButtons buttons(widgets);
+  const std::vector<Face> faces(widgets);
+  const auto pass = [] {
+    skia_begin_frame_c();
+    Window::show(kTicks);
+  };
+  const auto bare = [&faces] {
+    skia_begin_frame_c();
+    for (const Face& face : faces) skia_add_buttonbox_c(face.rect, face.text);
+  };
+  compare(state, pass, bare);
+}
+
+// Against reading the clock and making the same virtual calls by hand.
+void timerPass(benchmark::State& state) {
+  const auto widgets = static_cast<std::size_t>(state.range(0));
+  const ActiveButtons buttons(widgets);
+  const Face face;
+  std::vector<std::unique_ptr<MW::Widget>> others;
+  for (std::size_t i = 0; i < widgets; ++i) {
+    others.push_back(std::make_unique<Button>(&face.rect, &face.text));
+    Window::unregisterWidget(others.back().get());
+  }
+  const auto pass = [] { Window::updateTimer(0); };
+  const auto bare = [&others] {
+    const unsigned int now = GetTicks();
+    for (const auto& widget : others) widget->updateTimer(now);
+  };
+  compare(state, pass, bare);
+}
+
+// One more button beside those that the argument counts.
+void registering(benchmark::State& state) {
+  const ActiveButtons buttons(static_cast<std::size_t>(state.range(0)));
+  const Face face;
+  Button button(&face.rect, &face.text);
+  for ([[maybe_unused]] auto round : state) {
+    Window::unregisterWidget(&button);
+    Window::registerWidget(&button);
+  }
+}
+
+BENCHMARK(drawingPass)->RangeMultiplier(10)->Range(1, 1000)->Unit(benchmark::kMicrosecond);
+BENCHMARK(timerPass)->RangeMultiplier(10)->Range(1, 1000)->Unit(benchmark::kMicrosecond);
+BENCHMARK(registering)->Arg(0)->Arg(10)->Arg(100)->Arg(1000);
+
+}  // namespace
+
+int main(int count, char** arguments) {
+  __android_log_set_minimum_priority(ANDROID_LOG_SILENT);
+  benchmark::Initialize(&count, arguments);
+  if (benchmark::ReportUnrecognizedArguments(count, arguments)) return EXIT_FAILURE;
+  benchmark::RunSpecifiedBenchmarks();
+  benchmark::Shutdown();
+  return EXIT_SUCCESS;
+}
