@@ -46,8 +46,8 @@ std::string helpLine(std::string_view label, const std::string& meaning) {
 std::string mouseHelp() {
   const std::string hold = std::to_string(LongPress::kHoldMs) + " ms";
   return helpLine("Left button", "the first finger; held still for " + hold + ": a long press") +
-         helpLine("Shift", "held as the button is released: the finger stays down until Shift is") +
-         helpLine("", "released, and the button plays the next finger") +
+         helpLine("Shift", "held as the button is released: the finger stays down,") +
+         helpLine("", "and the button plays the next one, until Shift is up") +
          helpLine("Touch", "every touch is a finger of its own");
 }
 
