@@ -1,0 +1,41 @@
+/// The picture's pixels, and the fills that go straight into them.
+#pragma once
+
+#include <cstdint>
+
+#include "cairo_handles.h"
+#include "rectangles.h"
+
+namespace brimol::pc {
+
+/// A CAIRO_FORMAT_RGB24 picture, black at first. Cairo draws into it through context(), which has
+/// no clip outside a drawing call. One thread uses it.
+class Canvas {
+ public:
+  /// A size that no memory can be had for makes a canvas of no size.
+  explicit Canvas(Size size);
+
+  Size size() const { return extent; }
+  cairo_surface_t* surface() const { return picture.get(); }
+  /// Ready for drawing after the canvas's own writes.
+  cairo_t* context() const;
+
+  /// Colours `area`, which lies within the canvas: 0xAARRGGBB, laid over what is there.
+  void fill(const Pixels& area, uint32_t color) const;
+  /// Colours one pixel of the canvas as far as `coverage`, 0 to 255, says.
+  void cover(int x, int y, uint32_t color, int coverage) const;
+  /// Colours the pixels in `area`, each as far as the CAIRO_FORMAT_A8 picture `mask` says, whose
+  /// upper left corner lies on `corner`'s. `area` lies within both.
+  void cover(const Pixels& area, const Pixels& corner, cairo_surface_t* mask, uint32_t color) const;
+
+ private:
+  uint32_t* row(int y) const { return pixels + static_cast<std::ptrdiff_t>(y) * stride; }
+
+  CairoSurface picture;
+  CairoContext drawing;
+  uint32_t* pixels;
+  std::ptrdiff_t stride;  // pixels from one row to the next
+  Size extent;
+};
+
+}  // namespace brimol::pc

@@ -1,0 +1,29 @@
+/// The project's own fonts, whatever the machine, its user and its settings prefer.
+#pragma once
+
+#include <span>
+
+#include "text_handles.h"
+
+namespace brimol::pc {
+
+/// The font files in which texts are drawn, the preferred one first.
+std::span<const char* const> projectFontFiles();
+
+/// The fonts, and how their glyphs are placed and rendered. One thread uses it.
+class Fonts {
+ public:
+  /// A file that cannot be used is told on stderr and left out; texts are drawn with the others.
+  explicit Fonts(std::span<const char* const> files);
+
+  PangoContext* context() const { return placing.get(); }
+  /// The description of the list at `size` pixels.
+  FontDescription at(int size) const;
+
+ private:
+  FontConfig config;
+  FontMap map;
+  TextContext placing;
+};
+
+}  // namespace brimol::pc

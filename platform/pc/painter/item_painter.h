@@ -1,0 +1,36 @@
+/// The drawing of every kind of display item.
+#pragma once
+
+#include "canvas.h"
+#include "item.h"
+#include "picture_cache.h"
+#include "text_painter.h"
+
+namespace brimol::pc {
+
+/// Draws display items. One thread uses it.
+class ItemPainter {
+ public:
+  /// `canvas` outlives the painter.
+  explicit ItemPainter(const Canvas& canvas);
+
+  /// Draws of the item what lies in `clip`: within the canvas, not empty.
+  void draw(const SKIA_Item& item, const Pixels& clip);
+
+ private:
+  using DrawFigure = void (ItemPainter::*)(const SKIA_Item& item, const Pixels& clip);
+  static const std::array<DrawFigure, 5> kFigures;  // by Figure
+
+  void drawGround(const SKIA_Item& item, const Pixels& clip) const;
+  void drawNothing(const SKIA_Item& item, const Pixels& clip);
+  void drawText(const SKIA_Item& item, const Pixels& clip);
+  void drawPicture(const SKIA_Item& item, const Pixels& clip);
+  void drawLine(const SKIA_Item& item, const Pixels& clip);
+  void drawArrow(const SKIA_Item& item, const Pixels& clip);
+
+  const Canvas& canvas;
+  TextPainter texts;
+  PictureCache pictures;
+};
+
+}  // namespace brimol::pc

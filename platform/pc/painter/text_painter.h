@@ -1,0 +1,45 @@
+/// Texts in the project's fonts.
+#pragma once
+
+#include <brimol/scene.h>
+
+#include <compare>
+#include <string>
+
+#include "canvas.h"
+#include "fonts.h"
+#include "lru_cache.h"
+
+namespace brimol::pc {
+
+/// Draws texts and keeps the layouts of the recent ones. One thread uses it.
+class TextPainter {
+ public:
+  explicit TextPainter(std::span<const char* const> fontFiles);
+
+  /// Draws the text in the middle of the rectangle's height, aligned as the record asks; what does
+  /// not fit is cut at the rectangle. Only pixels in `clip`, which lies within the canvas and the
+  /// rectangle, change. A size of at most 0 pixels draws nothing, one above 1024 is 1024; bytes
+  /// that are no UTF-8 draw the replacement character.
+  void draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_Text& text, const Pixels& clip);
+
+  /// Bounded by kMostLayouts.
+  std::size_t layoutCount() const { return layouts.size(); }
+  static constexpr std::size_t kMostLayouts = 1024;
+
+ private:
+  struct Key {
+    std::string text;
+    int size;
+    uint32_t color;
+    friend auto operator<=>(const Key&, const Key&) = default;
+  };
+
+  PangoLayout* layoutOf(const SKIA_Text& text);
+  TextLayout makeLayout(const Key& key) const;
+
+  Fonts fonts;
+  LruCache<Key, TextLayout> layouts;
+};
+
+}  // namespace brimol::pc
