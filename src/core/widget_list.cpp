@@ -89,7 +89,7 @@ int WidgetList::getSlot() {
   const int slot = findEmpty();
   // The code of a full table, turned positive, is taken for a slot: slot 100 is used over and over.
   if (slot < 0) return -slot;
-  if (index_num + 1 >= kIndexLimit) return kIndexesUsedUp;
+  if (index_num >= kIndexLimit - 1) return kIndexesUsedUp;
   SKIA_Item* const item = allocateItem();
   if (item == nullptr) return kNoMemory;
   slotAt(slot) = {++index_num, 1, item};
