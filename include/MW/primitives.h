@@ -55,7 +55,8 @@ class MW_API Textbox : public Widget {
 /// A picture, named by a text that the platform understands (a file's path).
 class MW_API Image : public Widget {
  public:
-  /// Takes `string_len` bytes of the text, cut to 0 to 127, and none of its other fields.
+  /// Takes `string_len` bytes of the text, none where that is negative, and none of the record's
+  /// other fields. Of a text whose length is over 127 it takes what stands before the NUL.
   Image(const SKIA_Rect* area, const SKIA_Text* name);
   /// The handle that the platform gave to the item, a label.
   int show() override;

@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <string_view>
 
 #include "core/bounded_text.h"
 
@@ -28,8 +29,10 @@ int32_t distance(int32_t from, int32_t to) {
 SKIA_Text imageName(const SKIA_Text* given) {
   SKIA_Text record = {};
   if (given == nullptr) return record;
+  // The length is believed, NULs and all, as long as the record can hold so much.
+  const bool fits = given->string_len <= kTextMax;
   const auto count = static_cast<std::size_t>(std::max(given->string_len, 0));
-  putText(record, boundedText(given->text, count));
+  putText(record, fits ? std::string_view(given->text, count) : boundedText(given->text));
   return record;
 }
 
