@@ -55,7 +55,10 @@ void parseKey(EventCode code, const BrimolKeyEvent& event, event_data& data) {
 
 }  // namespace
 
-EventService::EventService() { startEvent(); }
+EventService::EventService() {
+  thread_event.clear();  // the ended thread of a service before this one
+  startEvent();
+}
 
 EventService::~EventService() {
   active = 0;
