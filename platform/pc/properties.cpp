@@ -35,6 +35,7 @@ bool PropertyStore::set(std::string_view key, std::string_view value) {
 using brimol::pc::gProperties;
 using brimol::pc::textOf;
 
+// NOLINTNEXTLINE(readability-identifier-naming): the parameters are named as in the contract
 int property_get(const char* key, char* value, const char* default_value) {
   const std::string text = gProperties.get(textOf(key), textOf(default_value));
   if (value != nullptr) std::memcpy(value, text.c_str(), text.size() + 1);

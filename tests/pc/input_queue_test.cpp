@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
+
 #include "input/event_records.h"
 #include "record_text.h"
 
@@ -25,7 +27,7 @@ struct QueueCase {
   std::vector<std::string> kept;
 };
 
-const QueueCase kCases[] = {
+const auto kCases = std::to_array<QueueCase>({
     {"OldestMotionOfTheFingerMerges",
      {down(0), motion(1, 5, 5), motion(0, 2, 2), motion(0, 5, 3), motion(0, 6, 1)},
      {"down 0 at 0,0", "motion 1 at 5,0 by 5,0", "motion 0 at 5,0 by 5,0",
@@ -49,7 +51,7 @@ const QueueCase kCases[] = {
     {"PressesWithoutReleaseAreBoundedToo",
      {down(0), down(1), down(2), down(3), down(4)},
      {"down 1 at 0,0", "down 2 at 0,0", "down 3 at 0,0", "down 4 at 0,0"}},
-};
+});
 
 class FullQueue : public testing::TestWithParam<QueueCase> {};
 

@@ -7,20 +7,30 @@ namespace {
 
 constexpr ScreenPoint kStart = {500, 500};
 
-TEST(LongPress, ComesOnceAfterHalfASecond) {
-  for (const uint32_t pressed : {0u, 1000u, 0xFFFFFF00u}) {
-    LongPress press(1000);
-    press.press(kStart, pressed);
-    EXPECT_EQ(press.msLeft(pressed), 500u);
-    EXPECT_FALSE(press.due(pressed - 1));
-    EXPECT_FALSE(press.due(pressed + 499));
-    EXPECT_EQ(press.msLeft(pressed + 499), 1u);
-    EXPECT_EQ(press.msLeft(pressed + 700), 0u);
-    EXPECT_TRUE(press.due(pressed + 500));
-    EXPECT_FALSE(press.due(pressed + 501));
-    EXPECT_EQ(press.msLeft(pressed + 501), std::nullopt);
-  }
+class PressedAt : public testing::TestWithParam<uint32_t> {};
+
+TEST_P(PressedAt, BecomesLongOnceAfterHalfASecond) {
+  const uint32_t pressed = GetParam();
+  LongPress press(1000);
+  press.press(kStart, pressed);
+  EXPECT_FALSE(press.due(pressed - 1));
+  EXPECT_FALSE(press.due(pressed + 499));
+  EXPECT_TRUE(press.due(pressed + 500));
+  EXPECT_FALSE(press.due(pressed + 501));
 }
+
+TEST_P(PressedAt, KnowsTheTimeThatIsLeft) {
+  const uint32_t pressed = GetParam();
+  LongPress press(1000);
+  press.press(kStart, pressed);
+  EXPECT_EQ(press.msLeft(pressed), 500u);
+  EXPECT_EQ(press.msLeft(pressed + 499), 1u);
+  EXPECT_EQ(press.msLeft(pressed + 700), 0u);
+  press.due(pressed + 700);
+  EXPECT_EQ(press.msLeft(pressed + 700), std::nullopt);
+}
+
+INSTANTIATE_TEST_SUITE_P(All, PressedAt, testing::Values(0u, 1000u, 0xFFFFFF00u));
 
 TEST(LongPress, DoesNotComeOnceReleased) {
   LongPress press(1000);

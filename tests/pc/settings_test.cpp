@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <cstring>
 
 namespace brimol::pc {
@@ -22,7 +23,7 @@ constexpr auto kWindow = DisplayChoice::Window;
 constexpr auto kEither = DisplayChoice::WindowIfPossible;
 constexpr auto kHeadless = DisplayChoice::Headless;
 
-const SettingsCase kCases[] = {
+const auto kCases = std::to_array<SettingsCase>({
     {"Nothing", kNotSet, kNotSet, kNotSet, kEither, kDefaultScreen, ""},
     {"Empty", "", "", "", kEither, kDefaultScreen, ""},
     {"Desktop", kNotSet, kNotSet, ":0", kWindow, kDefaultScreen, ""},
@@ -34,7 +35,7 @@ const SettingsCase kCases[] = {
      "BRIMOL_DISPLAY=Window: wanted window or headless"},
     {"OneLine", "a\nb\x7f\xc3\xa4", kNotSet, kNotSet, kEither, kDefaultScreen,
      "BRIMOL_DISPLAY=a?b?\xc3\xa4: wanted window or headless"},
-};
+});
 
 class SettingsTest : public testing::TestWithParam<SettingsCase> {};
 

@@ -59,11 +59,11 @@ bool InputQueue::take(Event& record) {
 
 void InputQueue::makeRoom() {
   // The newest record stays, or a finger's last position would be lost.
-  const Place newest = records.end() - 1;
+  const auto newest = records.end() - 1;
   const auto ofSameFinger = [&](const Event& record) {
     return isMotion(record) && isOfSameFinger(record, *newest);
   };
-  Place leaving = std::find_if(records.begin(), newest, ofSameFinger);
+  auto leaving = std::find_if(records.begin(), newest, ofSameFinger);
   if (leaving == newest) leaving = std::find_if(records.begin(), newest, isMotion);
   if (leaving != newest) return dropMotion(leaving);
 
@@ -77,7 +77,7 @@ void InputQueue::makeRoom() {
 
 void InputQueue::dropMotion(Place motion) {
   const auto ofSameFinger = [&](const Event& record) { return isOfSameFinger(record, *motion); };
-  const Place next = std::find_if(motion + 1, records.end(), ofSameFinger);
+  const auto next = std::find_if(motion + 1, records.end(), ofSameFinger);
   if (next != records.end() && isMotion(*next)) {
     next->pointer.xrel = boundedSum(next->pointer.xrel, motion->pointer.xrel);
     next->pointer.yrel = boundedSum(next->pointer.yrel, motion->pointer.yrel);
@@ -86,13 +86,13 @@ void InputQueue::dropMotion(Place motion) {
 }
 
 void InputQueue::dropOldestPress() {
-  for (Place press = records.begin(); press != records.end(); ++press) {
+  for (auto press = records.begin(); press != records.end(); ++press) {
     if (!isPress(*press)) continue;
     const auto releases = [&](const Event& record) { return isReleaseOf(*press, record); };
-    const Place release = std::find_if(press + 1, records.end(), releases);
+    const auto release = std::find_if(press + 1, records.end(), releases);
     if (release == records.end()) continue;
     const auto distance = release - press;
-    const Place afterPress = records.erase(press);
+    const auto afterPress = records.erase(press);
     records.erase(afterPress + (distance - 1));
     return;
   }
