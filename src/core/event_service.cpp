@@ -68,12 +68,12 @@ EventService::~EventService() {
 int EventService::startEvent() {
   kLog.print(LogLevel::Debug, "startEvent->EventInit");
   EventInit(kInputFlags);
-  thread_event = new (std::nothrow) func_eventLoop;
-  if (thread_event == nullptr) {
+  thread_event = createThread<func_eventLoop>();
+  if (thread_event == nullptr || !startThread(*thread_event)) {
+    thread_event.clear();
     kLog.print(LogLevel::Error, "new func_eventLoop failed!!");
     return 0;
   }
-  thread_event->run(kEventThreadName);
   kLog.print(LogLevel::Debug, "startEvent (threadLoop)");
   return 1;
 }

@@ -1,9 +1,34 @@
-/// How the toolkit's threads are started.
+/// How the toolkit's threads are created and started.
 #pragma once
+
+#include <utils/Errors.h>
+#include <utils/Thread.h>
+
+#include <new>
 
 namespace MW {
 
 /// Both threads run under this name, with the platform's default priority and stack.
 inline constexpr const char* kEventThreadName = "event_dispatcher";
+
+/// Null where there is no memory, which the platform's own classes tell by an exception.
+template <typename Loop>
+android::sp<Loop> createThread() {
+  try {
+    return new (std::nothrow) Loop;
+  } catch (const std::bad_alloc&) {
+    return nullptr;
+  }
+}
+
+/// False where the thread does not run. It must not be waited for then: one that found no memory on
+/// its way believes that it runs, and stays behind for good.
+inline bool startThread(android::Thread& thread) {
+  try {
+    return thread.run(kEventThreadName) == android::OK;
+  } catch (const std::bad_alloc&) {
+    return false;
+  }
+}
 
 }  // namespace MW

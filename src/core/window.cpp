@@ -63,12 +63,12 @@ float Window::ydpi = 0;
 int Window::init() {
   if (event_dispatcher != nullptr) return 1;
   if (eventService == nullptr) eventService = new (std::nothrow) EventService;
-  event_dispatcher = new (std::nothrow) func_dispatchEvent;
-  if (event_dispatcher == nullptr) {
+  event_dispatcher = createThread<func_dispatchEvent>();
+  if (event_dispatcher == nullptr || !startThread(*event_dispatcher)) {
+    event_dispatcher.clear();
     kLog.print(LogLevel::Error, "init->func_dispatchEvent failed!!");
     return 0;
   }
-  event_dispatcher->run(kEventThreadName);
   return 1;
 }
 
