@@ -1,0 +1,60 @@
+#include "support/failing_malloc.h"
+
+#include <dlfcn.h>
+
+#include <cstdlib>
+#include <cstring>
+#include <new>
+
+namespace {
+
+thread_local int allocationsLeft = 0;  // 0: none fails
+
+using Malloc = void* (*)(std::size_t);
+
+// Found at the first allocation, which comes before any thread and before the program's own
+// initialisation.
+constinit Malloc nextMalloc = nullptr;
+
+Malloc findNextMalloc() {
+  void* const found = dlsym(RTLD_NEXT, "malloc");
+  Malloc next = nullptr;
+  std::memcpy(&next, &found, sizeof next);
+  return next;
+}
+
+void* allocate(std::size_t size) { return std::malloc(size > 0 ? size : 1); }
+
+void* allocateOrThrow(std::size_t size) {
+  void* const block = allocate(size);
+  if (block == nullptr) throw std::bad_alloc();
+  return block;
+}
+
+}  // namespace
+
+// The sanitizers' own operator new does not go through malloc, so that it is replaced as well.
+// They check that what it gave is given back to operator delete: those are replaced, too.
+
+extern "C" __attribute__((visibility("default"))) void* malloc(std::size_t size) noexcept {
+  if (nextMalloc == nullptr) nextMalloc = findNextMalloc();
+  if (allocationsLeft > 0 && --allocationsLeft == 0) return nullptr;
+  return nextMalloc(size);
+}
+
+void* operator new(std::size_t size) { return allocateOrThrow(size); }
+void* operator new[](std::size_t size) { return allocateOrThrow(size); }
+void* operator new(std::size_t size, const std::nothrow_t&) noexcept { return allocate(size); }
+void* operator new[](std::size_t size, const std::nothrow_t&) noexcept { return allocate(size); }
+void operator delete(void* block) noexcept { std::free(block); }
+void operator delete[](void* block) noexcept { std::free(block); }
+void operator delete(void* block, std::size_t) noexcept { std::free(block); }
+void operator delete[](void* block, std::size_t) noexcept { std::free(block); }
+
+namespace brimol::test {
+
+FailingAllocation::FailingAllocation(int nth) { allocationsLeft = nth; }
+FailingAllocation::~FailingAllocation() { allocationsLeft = 0; }
+bool FailingAllocation::hasFailed() { return allocationsLeft == 0; }
+
+}  // namespace brimol::test

@@ -1,0 +1,19 @@
+/// Lets a chosen allocation fail. Programs that link failing_malloc.cpp get their malloc and
+/// operator new from there; it forwards to the ones behind.
+#pragma once
+
+namespace brimol::test {
+
+/// While it lives, the `nth` allocation (from 1) of this thread fails, once. One at a time.
+class FailingAllocation {
+ public:
+  explicit FailingAllocation(int nth);
+  ~FailingAllocation();
+  FailingAllocation(const FailingAllocation&) = delete;
+  FailingAllocation& operator=(const FailingAllocation&) = delete;
+
+  /// Whether it came to that.
+  static bool hasFailed();
+};
+
+}  // namespace brimol::test
