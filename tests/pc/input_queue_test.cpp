@@ -45,7 +45,7 @@ const auto kCases = std::to_array<QueueCase>({
      {down(0), pointerRecord(BRIMOL_LONG_PRESS, 0, {0, 0}), up(0), down(0), up(0)},
      {"down 0 at 0,0", "up 0 at 0,0", "down 0 at 0,0", "up 0 at 0,0"}},
     {"PressLeavesWithItsRelease",
-     {up(1), down(1), keyRecord(BRIMOL_KEY_DOWN, kKey), keyRecord(BRIMOL_KEY_UP, kKey),
+     {up(1), keyRecord(BRIMOL_KEY_DOWN, kKey), down(1), keyRecord(BRIMOL_KEY_UP, kKey),
       motion(1, 1, 1)},
      {"up 1 at 0,0", "down 1 at 0,0", "motion 1 at 1,0 by 1,0"}},
     {"PressesWithoutReleaseAreBoundedToo",

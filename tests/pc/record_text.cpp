@@ -9,7 +9,9 @@ std::string pair(int a, int b) { return std::to_string(a) + "," + std::to_string
 std::string pointerText(const char* name, const BrimolPointerEvent& pointer) {
   std::string text = std::string(name) + " " + std::to_string(pointer.finger) + " at " +
                      pair(pointer.x, pointer.y);
-  if (pointer.type == BRIMOL_POINTER_MOTION) text += " by " + pair(pointer.xrel, pointer.yrel);
+  const bool moves = pointer.xrel != 0 || pointer.yrel != 0;
+  if (moves || pointer.type == BRIMOL_POINTER_MOTION)
+    text += " by " + pair(pointer.xrel, pointer.yrel);
   const int fitting = pointer.type == BRIMOL_POINTER_UP ? 0 : 1;
   if (pointer.state != fitting) text += " state " + std::to_string(pointer.state);
   return text;
