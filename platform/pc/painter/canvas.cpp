@@ -11,11 +11,16 @@ namespace brimol::pc {
 namespace {
 
 constexpr int kFull = 255;
-constexpr int kHalf = 128;  // rounds a division by 255
+constexpr int kHalf = 128;  // in a sum: rounds its division by 255
 
-// Eight bits of a product of two, for products up to 255 * 255: divided by 255 and rounded.
-constexpr int overFull(int product) { return ((product + kHalf) * 257) >> 16; }
-static_assert(overFull(kFull * kFull) == kFull && overFull(kHalf) == 1 && overFull(127) == 0);
+// A sum of products of two bytes, at most 255 * 255 + kHalf, divided by 255. Every step fits 16
+// bits, so that the compiler works on eight sums at a time.
+constexpr uint8_t overFull(uint16_t sum) {
+  return static_cast<uint8_t>(static_cast<uint16_t>(sum + (sum >> 8)) >> 8);
+}
+constexpr uint16_t roundedSum(int products) { return static_cast<uint16_t>(products + kHalf); }
+static_assert(overFull(roundedSum(kFull * kFull)) == kFull);
+static_assert(overFull(roundedSum(127)) == 0 && overFull(roundedSum(128)) == 1);
 
 constexpr std::size_t kPixelBytes = sizeof(uint32_t);
 constexpr std::size_t kBlockBytes = 16;  // what the compiler turns into one step
@@ -32,16 +37,16 @@ Overlay overlayOf(uint32_t color, int alpha) {
   Overlay overlay = {};
   overlay.keep = static_cast<uint16_t>(kFull - alpha);
   for (std::size_t i = 0; i < kBlockBytes; ++i) {
-    overlay.add[i] = static_cast<uint16_t>(bytes[i % kPixelBytes] * alpha + kHalf);
+    overlay.add[i] = roundedSum(bytes[i % kPixelBytes] * alpha);
   }
   return overlay;
 }
 
 uint8_t laidOver(uint8_t old, uint16_t keep, uint16_t add) {
-  return static_cast<uint8_t>((static_cast<uint32_t>(old * keep + add) * 257) >> 16);
+  return overFull(static_cast<uint16_t>(old * keep + add));
 }
 
-// The same for every byte of a row, in blocks whose constants stay in registers.
+// Lays the colour over every byte of a row, in blocks whose constants stay in registers.
 void layOver(uint8_t* bytes, std::size_t count, const Overlay& overlay) {
   const Overlay constants = overlay;
   std::size_t at = 0;
@@ -95,7 +100,7 @@ void Canvas::fill(const Pixels& area, uint32_t color) const {
 }
 
 void Canvas::cover(int x, int y, uint32_t color, int coverage) const {
-  const int alpha = overFull(static_cast<int>(alphaOf(color)) * coverage);
+  const int alpha = overFull(roundedSum(static_cast<int>(alphaOf(color)) * coverage));
   if (alpha == 0) return;
   layOver(bytesOf(row(y) + x), kPixelBytes, overlayOf(color, alpha));
 }
