@@ -58,8 +58,8 @@ CairoSurface Platform::copyPicture(std::chrono::milliseconds bound) {
   return picture.wait_for(bound) == std::future_status::ready ? picture.get() : nullptr;
 }
 
-void Platform::act(Action action) {
-  addWork([&action](Work& work) { work.actions.push_back(std::move(action)); });
+bool Platform::act(Action action) {
+  return addWork([&action](Work& work) { work.actions.push_back(std::move(action)); });
 }
 
 // False, and nothing changes, once the platform is closed.

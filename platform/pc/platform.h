@@ -50,7 +50,8 @@ class Platform {
   CairoSurface copyPicture(std::chrono::milliseconds bound);
 
   /// Has `action` done soon, and all actions in their order, as if the display had seen them.
-  void act(Action action);
+  /// False: the platform is closed, or is about to.
+  bool act(Action action);
 
   bool isCloseRequested() const { return closeRequested; }
 

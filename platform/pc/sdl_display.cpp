@@ -28,7 +28,8 @@ const char* visibleDrivers() {
 void setHints() {
   // The default priority leaves the last word to the environment.
   SDL_SetHintWithPriority(SDL_HINT_VIDEODRIVER, visibleDrivers(), SDL_HINT_DEFAULT);
-  SDL_SetHint(SDL_HINT_NO_SIGNAL_HANDLERS, "1");  // Ctrl-C is the application's
+  SDL_SetHint(SDL_HINT_NO_SIGNAL_HANDLERS, "1");        // Ctrl-C is the application's
+  SDL_SetHint(SDL_HINT_MOUSE_FOCUS_CLICKTHROUGH, "1");  // the click that brings the focus counts
   SDL_SetHint(SDL_HINT_TOUCH_MOUSE_EVENTS, "0");
   SDL_SetHint(SDL_HINT_MOUSE_TOUCH_EVENTS, "0");
   SDL_SetHint(SDL_HINT_VIDEO_ALLOW_SCREENSAVER, "1");

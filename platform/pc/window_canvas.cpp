@@ -1,7 +1,11 @@
 #include "window_canvas.h"
 
+#include <cstddef>
+
 namespace brimol::pc {
 namespace {
+
+constexpr int kPixelBytes = 4;
 
 // Disjoint, though the parts of `changed` may meet in one window pixel.
 Region toWindow(const WindowFit& fit, const Region& changed) {
@@ -18,39 +22,24 @@ Region toWindow(const WindowFit& fit, const Region& changed) {
   return parts;
 }
 
-void clipTo(cairo_t* context, const Region& parts) {
-  for (const cairo_rectangle_int_t& part : parts) {
-    cairo_rectangle(context, part.x, part.y, part.width, part.height);
-  }
-  cairo_clip(context);
-}
-
-// The scale belongs to the whole picture, so that a part gets the same pixels as the whole.
-void setScaledSource(cairo_t* context, cairo_surface_t* picture, const WindowFit& fit) {
-  cairo_translate(context, fit.shown.x, fit.shown.y);
-  cairo_scale(context, static_cast<double>(fit.shown.width) / fit.screen.w,
-              static_cast<double>(fit.shown.height) / fit.screen.h);
-  cairo_set_source_surface(context, picture, 0, 0);
-  cairo_pattern_t* const source = cairo_get_source(context);
-  cairo_pattern_set_filter(source, fit.isFullSize() ? CAIRO_FILTER_NEAREST : CAIRO_FILTER_GOOD);
-  cairo_pattern_set_extend(source, CAIRO_EXTEND_PAD);
-}
-
 }  // namespace
 
 WindowCanvas::WindowCanvas(Size screen, Size window)
     : placement(WindowFit::of(screen, window)),
+      scaler(screen, {placement.shown.width, placement.shown.height}),
       content(
           cairo_image_surface_create(CAIRO_FORMAT_RGB24, placement.window.w, placement.window.h)) {}
 
 Region WindowCanvas::update(cairo_surface_t* picture, const Region& changed) {
   Region parts = toWindow(placement, changed);
-  const CairoContext context(cairo_create(content.get()));
-  clipTo(context.get(), parts);
-  setScaledSource(context.get(), picture, placement);
-  cairo_set_operator(context.get(), CAIRO_OPERATOR_SOURCE);
-  cairo_paint(context.get());
-  cairo_surface_flush(content.get());
+  const cairo_rectangle_int_t& shown = placement.shown;
+  const int stride = cairo_image_surface_get_stride(content.get());
+  unsigned char* const origin = cairo_image_surface_get_data(content.get()) +
+                                std::ptrdiff_t{shown.y} * stride + shown.x * kPixelBytes;
+  for (const cairo_rectangle_int_t& part : parts) {
+    scaler.scale(picture, {part.x - shown.x, part.y - shown.y, part.width, part.height}, origin,
+                 stride);
+  }
   return parts;
 }
 

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "cairo_handles.h"
+#include "downscaler.h"
 #include "geometry.h"
 #include "window_fit.h"
 
@@ -24,6 +25,7 @@ class WindowCanvas {
 
  private:
   WindowFit placement;
+  Downscaler scaler;
   CairoSurface content;
 };
 

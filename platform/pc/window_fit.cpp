@@ -6,9 +6,6 @@
 namespace brimol::pc {
 namespace {
 
-// How far a screen pixel's colour spreads beyond its own place when it is scaled, in window pixels.
-constexpr int kFilterReach = 2;
-
 // Both sides are at most some ten thousands, so products need 64 bits.
 int scaled(int value, int multiplier, int divisor) {
   return static_cast<int>(std::int64_t{value} * multiplier / divisor);
@@ -27,9 +24,19 @@ struct Span {
 };
 
 Span toWindowAxis(Span pixels, int shown, int screen) {
-  const int start = std::max(scaled(pixels.start, shown, screen) - kFilterReach, 0);
-  const int end = scaled(pixels.start + pixels.length, shown, screen) + 1 + kFilterReach;
-  return {start, std::min(end, shown) - start};
+  const std::int64_t end = std::int64_t{pixels.start} + pixels.length;
+  const int start = scaled(pixels.start, shown, screen);
+  return {start, static_cast<int>((end * shown + screen - 1) / screen) - start};
+}
+
+int sideFor(int otherSide, int screenSide, int otherScreenSide) {
+  return std::max(scaled(screenSide, otherSide, otherScreenSide), 1);
+}
+
+// But for the rounding of one side.
+bool hasProportionsOf(Size screen, Size window) {
+  return window.w == sideFor(window.h, screen.w, screen.h) ||
+         window.h == sideFor(window.w, screen.h, screen.w);
 }
 
 }  // namespace
@@ -37,14 +44,14 @@ Span toWindowAxis(Span pixels, int shown, int screen) {
 Size fittedSize(Size screen, Size area) {
   if (screen.w <= area.w && screen.h <= area.h) return screen;
   const bool widthDecides = std::int64_t{area.w} * screen.h <= std::int64_t{area.h} * screen.w;
-  const Size fitted = widthDecides ? Size{area.w, scaled(screen.h, area.w, screen.w)}
-                                   : Size{scaled(screen.w, area.h, screen.h), area.h};
-  return {std::max(fitted.w, 1), std::max(fitted.h, 1)};
+  return widthDecides ? Size{area.w, sideFor(area.w, screen.h, screen.w)}
+                      : Size{sideFor(area.h, screen.w, screen.h), area.h};
 }
 
 WindowFit WindowFit::of(Size screen, Size window) {
   const Size area = {std::max(window.w, 1), std::max(window.h, 1)};
-  const Size fitted = fittedSize(screen, area);
+  const bool isSmaller = area.w <= screen.w && area.h <= screen.h;
+  const Size fitted = isSmaller && hasProportionsOf(screen, area) ? area : fittedSize(screen, area);
   return {screen, area, {(area.w - fitted.w) / 2, (area.h - fitted.h) / 2, fitted.w, fitted.h}};
 }
 
@@ -54,9 +61,6 @@ ScreenPoint WindowFit::toScreen(WindowPoint position) const {
 }
 
 cairo_rectangle_int_t WindowFit::toWindow(const cairo_rectangle_int_t& pixels) const {
-  if (isFullSize()) {
-    return {shown.x + pixels.x, shown.y + pixels.y, pixels.width, pixels.height};
-  }
   const Span across = toWindowAxis({pixels.x, pixels.width}, shown.width, screen.w);
   const Span down = toWindowAxis({pixels.y, pixels.height}, shown.height, screen.h);
   return {shown.x + across.start, shown.y + down.start, across.length, down.length};

@@ -14,8 +14,9 @@ struct WindowPoint {
   int y;
 };
 
-/// The largest picture of `screen` that fits into `area` in the same proportions: never larger than
-/// the screen itself, and at least one pixel each way. Sides are rounded down.
+/// The largest picture of `screen` that fits into `area`, whose sides are at least 1, in the same
+/// proportions: never larger than the screen itself, and at least one pixel each way. What is not
+/// whole is rounded down.
 Size fittedSize(Size screen, Size area);
 
 /// The screen's picture, scaled down to fit a window and centred in it.
@@ -24,7 +25,7 @@ struct WindowFit {
   Size window;
   cairo_rectangle_int_t shown;  // the picture's place, in window pixels
 
-  /// Window sides below 1 count as 1.
+  /// Window sides below 1 count as 1. A window of a fitted size is filled.
   static WindowFit of(Size screen, Size window);
 
   /// The screen pixel that a window position means, on the screen for every position. The
@@ -33,11 +34,8 @@ struct WindowFit {
   /// means the nearest pixel at its edge.
   ScreenPoint toScreen(WindowPoint position) const;
 
-  /// The window pixels in which a change of the screen's `pixels` can be seen, the reach of the
-  /// scaling filter included; within the picture.
+  /// The window pixels that cover any of the screen's `pixels`.
   cairo_rectangle_int_t toWindow(const cairo_rectangle_int_t& pixels) const;
-
-  bool isFullSize() const { return shown.width == screen.w && shown.height == screen.h; }
 };
 
 }  // namespace brimol::pc
