@@ -21,14 +21,9 @@ android::sp<Loop> createThread() {
   }
 }
 
-/// False where the thread does not run. It must not be waited for then: one that found no memory on
-/// its way believes that it runs, and stays behind for good.
+/// False where the platform could not start it.
 inline bool startThread(android::Thread& thread) {
-  try {
-    return thread.run(kEventThreadName) == android::OK;
-  } catch (const std::bad_alloc&) {
-    return false;
-  }
+  return thread.run(kEventThreadName) == android::OK;
 }
 
 }  // namespace MW
