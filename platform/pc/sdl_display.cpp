@@ -36,7 +36,17 @@ void setHints() {
   SDL_SetHint(SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0");
 }
 
-/// The room that the desktop has for a window's content.
+// On X11 the server takes the pixels as they are. The detour over a texture, which SDL prefers,
+// brings the whole window across for every change, and threads and start-up time of a graphics
+// driver. The other drivers know no other way.
+void chooseShortWay() {
+  const std::string driver = SDL_GetCurrentVideoDriver();
+  if (driver == "x11") {
+    SDL_SetHintWithPriority(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0", SDL_HINT_DEFAULT);
+  }
+}
+
+// The room that the desktop has for a window's content.
 Size desktopRoom(SDL_Window* window) {
   SDL_Rect usable = {};
   const int desktop = window != nullptr ? std::max(SDL_GetWindowDisplayIndex(window), 0) : 0;
@@ -60,7 +70,9 @@ SDL_Rect toSdl(const cairo_rectangle_int_t& part) {
 SdlVideo::SdlVideo() {
   setHints();
   isOpen = SDL_Init(SDL_INIT_VIDEO) == 0;
-  if (isOpen) SDL_StopTextInput();  // keys are keys here, no input method composes with them
+  if (!isOpen) return;
+  chooseShortWay();
+  SDL_StopTextInput();  // keys are keys here, no input method composes with them
 }
 
 SdlVideo::~SdlVideo() { SDL_Quit(); }
