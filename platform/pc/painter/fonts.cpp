@@ -74,6 +74,13 @@ TextContext contextOf(PangoFontMap* map) {
 
 std::span<const char* const> projectFontFiles() { return kFontFiles; }
 
+FontDescription projectFonts(int size) {
+  FontDescription font(pango_font_description_new());
+  pango_font_description_set_family_static(font.get(), kFamilies);
+  pango_font_description_set_absolute_size(font.get(), static_cast<double>(size) * PANGO_SCALE);
+  return font;
+}
+
 // The configuration becomes the process's own before Pango first looks for one: the machine's is
 // then never read, which saves its time and its complaints.
 Fonts::Fonts(std::span<const char* const> files) : config(configOf(files)) {
@@ -82,11 +89,10 @@ Fonts::Fonts(std::span<const char* const> files) : config(configOf(files)) {
   placing = contextOf(map.get());
 }
 
-FontDescription Fonts::at(int size) const {
-  FontDescription font(pango_font_description_new());
-  pango_font_description_set_family_static(font.get(), kFamilies);
-  pango_font_description_set_absolute_size(font.get(), static_cast<double>(size) * PANGO_SCALE);
-  return font;
+// A font map keeps its configuration for ever unless it gets another one.
+Fonts::~Fonts() {
+  pango_fc_font_map_set_config(PANGO_FC_FONT_MAP(map.get()), nullptr);
+  if (FcConfigGetCurrent() == config.get()) FcConfigSetCurrent(nullptr);
 }
 
 }  // namespace brimol::pc

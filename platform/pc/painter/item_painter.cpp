@@ -22,7 +22,7 @@ void ItemPainter::drawGround(const SKIA_Item& item, const Pixels& clip) const {
   switch (kindOf(item).ground) {
     case Ground::None: return;
     case Ground::Square: canvas.fill(clip, item.rect.color); return;
-    case Ground::Round: fillRoundBox(canvas, edgesOf(item.rect), item.rect.color, clip); return;
+    case Ground::Round: fillRoundBox({canvas, clip, item.rect.color}, edgesOf(item.rect)); return;
   }
 }
 
@@ -44,15 +44,14 @@ void ItemPainter::drawPicture(const SKIA_Item& item, const Pixels& clip) {
 
 void ItemPainter::drawLine(const SKIA_Item& item, const Pixels& clip) {
   if (isAxisAligned(item.point)) return canvas.fill(clip, item.point.color);
-  fillPolygon(canvas, {lineOutline(item.point), wholeOf(canvas.size())}, item.point.color, clip);
+  fillPolygon({canvas, clip, item.point.color}, lineOutline(item.point), wholeOf(canvas.size()));
 }
 
 void ItemPainter::drawArrow(const SKIA_Item& item, const Pixels& clip) {
   const Edges box = edgesOf(item.rect);
-  fillPolygon(canvas,
-              {item.point.width == 0 ? rightArrowOutline(box) : leftArrowOutline(box),
-               within(box, wholeOf(canvas.size()))},
-              item.point.color, clip);
+  fillPolygon({canvas, clip, item.point.color},
+              item.point.width == 0 ? rightArrowOutline(box) : leftArrowOutline(box),
+              within(box, wholeOf(canvas.size())));
 }
 
 }  // namespace brimol::pc

@@ -11,8 +11,8 @@ namespace brimol::pc {
 /// Draws display items. One thread uses it.
 class ItemPainter {
  public:
-  /// `canvas` outlives the painter.
-  explicit ItemPainter(const Canvas& canvas);
+  /// `target` outlives the painter.
+  explicit ItemPainter(const Canvas& target);
 
   /// Draws of the item what lies in `clip`: within the canvas, not empty.
   void draw(const SKIA_Item& item, const Pixels& clip);

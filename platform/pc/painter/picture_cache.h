@@ -1,9 +1,9 @@
 /// Pictures from PNG files in the sizes in which they are shown.
 #pragma once
 
-#include <compare>
 #include <string>
 #include <string_view>
+#include <tuple>
 
 #include "cairo_handles.h"
 #include "geometry.h"
@@ -34,7 +34,9 @@ class PictureCache {
     std::string name;
     int w;
     int h;
-    friend auto operator<=>(const Key&, const Key&) = default;
+    friend bool operator<(const Key& one, const Key& other) {
+      return std::tie(one.name, one.w, one.h) < std::tie(other.name, other.w, other.h);
+    }
   };
 
   LruCache<Key, CairoSurface> pictures;

@@ -1,6 +1,5 @@
 #include "shapes.h"
 
-#include <array>
 #include <cmath>
 
 namespace brimol::pc {
@@ -9,7 +8,7 @@ namespace {
 
 constexpr int64_t kSidesPerRadius = 5;  // the radius is this part of the box's smaller side
 constexpr int64_t kMostRadius = 40;     // pixels
-constexpr float kFullCoverage = 255;
+constexpr int kFullCoverage = 255;
 constexpr uint32_t kMissingColor = 0xFF808080;
 constexpr int kMissingLine = 2;  // pixels
 
@@ -24,38 +23,19 @@ int cornerCoverage(int64_t x, int64_t y, int64_t radius) {
   const float across = static_cast<float>(radius - x) - 0.5F;
   const float down = static_cast<float>(radius - y) - 0.5F;
   const float inside = static_cast<float>(radius) - std::sqrt(across * across + down * down);
-  return static_cast<int>(std::clamp(inside + 0.5F, 0.0F, 1.0F) * kFullCoverage + 0.5F);
+  return static_cast<int>(std::lround(std::clamp(inside + 0.5F, 0.0F, 1.0F) * kFullCoverage));
 }
 
-void fillRowBetween(const Canvas& canvas, const Edges& row, uint32_t color, const Pixels& clip) {
-  const Pixels area = within(row, clip);
-  if (!isEmpty(area)) canvas.fill(area, color);
-}
-
-void coverIn(const Canvas& canvas, int64_t x, int y, uint32_t color, int coverage,
-             const Pixels& clip) {
-  if (x < clip.x || x >= int64_t{clip.x} + clip.width) return;
-  canvas.cover(static_cast<int>(x), y, color, coverage);
-}
-
-// A row through two of the corners: `y` within `clip`, `depth` rows from the nearer edge.
-struct CornerRow {
-  int y;
-  int64_t depth;
-  int64_t radius;
-};
-
-void fillCornerRow(const Canvas& canvas, const Edges& box, const CornerRow& row, uint32_t color,
-                   const Pixels& clip) {
+// Fills a row through two of the corners, which lies `depth` rows from the nearer edge.
+void fillCornerRow(const Brush& brush, const Edges& row, int64_t depth, int64_t radius) {
   int64_t indent = 0;
-  for (; indent < row.radius; ++indent) {
-    const int coverage = cornerCoverage(indent, row.depth, row.radius);
-    if (coverage == static_cast<int>(kFullCoverage)) break;
-    coverIn(canvas, box.left + indent, row.y, color, coverage, clip);
-    coverIn(canvas, box.right - 1 - indent, row.y, color, coverage, clip);
+  for (; indent < radius; ++indent) {
+    const int coverage = cornerCoverage(indent, depth, radius);
+    if (coverage == kFullCoverage) break;
+    brush.cover(row.left + indent, row.top, coverage);
+    brush.cover(row.right - 1 - indent, row.top, coverage);
   }
-  fillRowBetween(canvas, {box.left + indent, row.y, box.right - indent, int64_t{row.y} + 1}, color,
-                 clip);
+  brush.fill({row.left + indent, row.top, row.right - indent, row.bottom});
 }
 
 CairoSurface maskOf(const Polygon& outline, const Pixels& bounds) {
@@ -70,45 +50,47 @@ CairoSurface maskOf(const Polygon& outline, const Pixels& bounds) {
 
 }  // namespace
 
-void fillRoundBox(const Canvas& canvas, const Edges& box, uint32_t color, const Pixels& clip) {
-  const Pixels area = within(box, clip);
+void Brush::fill(const Edges& area) const {
+  const Pixels pixels = within(area, clip);
+  if (!isEmpty(pixels)) canvas.fill(pixels, color);
+}
+
+void Brush::cover(int64_t x, int64_t y, int coverage) const {
+  const Pixels pixel = within(Edges{x, y, x + 1, y + 1}, clip);
+  if (!isEmpty(pixel)) canvas.cover(pixel.x, pixel.y, color, coverage);
+}
+
+void fillRoundBox(const Brush& brush, const Edges& box) {
   const int64_t radius = radiusOf(box);
-  fillRowBetween(canvas, {box.left, box.top + radius, box.right, box.bottom - radius}, color, clip);
-  for (int y = area.y; y < area.y + area.height; ++y) {
+  brush.fill({box.left, box.top + radius, box.right, box.bottom - radius});
+  const Edges rows = edgesOf(within(box, brush.clip));
+  for (int64_t y = rows.top; y < rows.bottom; ++y) {
     const int64_t depth = std::min(y - box.top, box.bottom - 1 - y);
-    if (depth >= radius) continue;
-    fillCornerRow(canvas, box, {y, depth, radius}, color, clip);
+    if (depth < radius) fillCornerRow(brush, {box.left, y, box.right, y + 1}, depth, radius);
   }
 }
 
-void fillPolygon(const Canvas& canvas, const CutPolygon& polygon, uint32_t color,
-                 const Pixels& clip) {
-  const Polygon outline = within(polygon.outline, polygon.limits);
-  const Pixels bounds = boundsOf(outline, polygon.limits);
-  const Pixels area = within(bounds, clip);
+void fillPolygon(const Brush& brush, const Polygon& polygon, const Pixels& limits) {
+  const Polygon outline = within(polygon, limits);
+  const Pixels bounds = boundsOf(outline, limits);
+  const Pixels area = within(bounds, brush.clip);
   if (isEmpty(area)) return;
   const CairoSurface mask = maskOf(outline, bounds);
   if (cairo_surface_status(mask.get()) != CAIRO_STATUS_SUCCESS) return;
-  canvas.cover(area, bounds, mask.get(), color);
+  brush.canvas.cover(area, bounds, mask.get(), brush.color);
 }
 
 void drawMissingPicture(const Canvas& canvas, const Edges& box, const Pixels& clip) {
+  const Brush brush = {canvas, clip, kMissingColor};
   const Edges hole = inset(box, kMissingLine);
-  const auto sides = std::to_array<Edges>({
-      {box.left, box.top, box.right, std::min(hole.top, box.bottom)},
-      {box.left, std::max(hole.bottom, box.top), box.right, box.bottom},
-      {box.left, hole.top, std::min(hole.left, box.right), hole.bottom},
-      {std::max(hole.right, box.left), hole.top, box.right, hole.bottom},
-  });
-  for (const Edges& side : sides) fillRowBetween(canvas, side, kMissingColor, clip);
-  const auto left = static_cast<double>(box.left);
-  const auto right = static_cast<double>(box.right);
-  const auto top = static_cast<double>(box.top);
-  const auto bottom = static_cast<double>(box.bottom);
-  fillPolygon(canvas,
-              {strokeOutline({left, top}, {right, bottom}, kMissingLine),
-               within(box, wholeOf(canvas.size()))},
-              kMissingColor, clip);
+  brush.fill({box.left, box.top, box.right, std::min(hole.top, box.bottom)});
+  brush.fill({box.left, std::max(hole.bottom, box.top), box.right, box.bottom});
+  brush.fill({box.left, hole.top, std::min(hole.left, box.right), hole.bottom});
+  brush.fill({std::max(hole.right, box.left), hole.top, box.right, hole.bottom});
+  const Spot corner = {static_cast<double>(box.left), static_cast<double>(box.top)};
+  const Spot opposite = {static_cast<double>(box.right), static_cast<double>(box.bottom)};
+  fillPolygon(brush, strokeOutline(corner, opposite, kMissingLine),
+              within(box, wholeOf(canvas.size())));
 }
 
 }  // namespace brimol::pc

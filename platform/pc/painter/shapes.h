@@ -1,5 +1,4 @@
-/// Antialiased shapes. What they colour of a pixel does not depend on `clip`, so that a picture
-/// painted in parts equals one painted at once. Every `clip` lies within the canvas.
+/// Antialiased shapes.
 #pragma once
 
 #include "canvas.h"
@@ -7,18 +6,24 @@
 
 namespace brimol::pc {
 
-/// A box with round corners.
-void fillRoundBox(const Canvas& canvas, const Edges& box, uint32_t color, const Pixels& clip);
+/// A colour, and the part of a canvas that it may touch. What a shape colours of a pixel does not
+/// depend on `clip`, so that a picture painted in parts equals one painted at once.
+struct Brush {
+  const Canvas& canvas;
+  Pixels clip;  // within the canvas
+  uint32_t color;
 
-/// A polygon cut to `limits`, which lie within the canvas.
-struct CutPolygon {
-  Polygon outline;
-  Pixels limits;
+  void fill(const Edges& area) const;
+  void cover(int64_t x, int64_t y, int coverage) const;
 };
-void fillPolygon(const Canvas& canvas, const CutPolygon& polygon, uint32_t color,
-                 const Pixels& clip);
 
-/// What stands where a picture is missing: an outline with a diagonal.
+/// A box with round corners.
+void fillRoundBox(const Brush& brush, const Edges& box);
+
+/// The part of a polygon that lies in `limits`, which lie within the canvas.
+void fillPolygon(const Brush& brush, const Polygon& polygon, const Pixels& limits);
+
+/// What stands where a picture is missing: an outline with a diagonal, in a colour of its own.
 void drawMissingPicture(const Canvas& canvas, const Edges& box, const Pixels& clip);
 
 }  // namespace brimol::pc

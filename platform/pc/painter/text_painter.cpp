@@ -86,7 +86,7 @@ PangoLayout* TextPainter::layoutOf(const SKIA_Text& text) {
 
 TextLayout TextPainter::makeLayout(const Key& key) const {
   TextLayout layout(pango_layout_new(fonts.context()));
-  const FontDescription font = fonts.at(key.size);
+  const FontDescription font = projectFonts(key.size);
   pango_layout_set_font_description(layout.get(), font.get());
   const AttributeList attributes = attributesOf(key.color);
   pango_layout_set_attributes(layout.get(), attributes.get());

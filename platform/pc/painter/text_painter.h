@@ -3,8 +3,8 @@
 
 #include <brimol/scene.h>
 
-#include <compare>
 #include <string>
+#include <tuple>
 
 #include "canvas.h"
 #include "fonts.h"
@@ -32,7 +32,10 @@ class TextPainter {
     std::string text;
     int size;
     uint32_t color;
-    friend auto operator<=>(const Key&, const Key&) = default;
+    friend bool operator<(const Key& one, const Key& other) {
+      return std::tie(one.text, one.size, one.color) <
+             std::tie(other.text, other.size, other.color);
+    }
   };
 
   PangoLayout* layoutOf(const SKIA_Text& text);
