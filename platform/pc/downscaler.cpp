@@ -2,6 +2,8 @@
 
 #include <algorithm>
 #include <array>
+#include <cstddef>
+#include <cstring>
 
 namespace brimol::pc {
 namespace {
@@ -16,6 +18,19 @@ static_assert(255U * kWholeDown <= 0xFFFF);
 static_assert(255ULL * kWholeDown * kWholeAcross + (1ULL << (kWholeBits - 1)) <= 0xFFFFFFFF);
 
 std::size_t bytesOf(int pixels) { return static_cast<std::size_t>(pixels) * kPixelBytes; }
+
+const unsigned char* lineOf(cairo_surface_t* picture, int row) {
+  return cairo_image_surface_get_data(picture) +
+         std::ptrdiff_t{row} * cairo_image_surface_get_stride(picture);
+}
+
+void copy(cairo_surface_t* from, const cairo_rectangle_int_t& part, unsigned char* origin,
+          int stride) {
+  for (int row = part.y; row < part.y + part.height; ++row) {
+    std::memcpy(origin + std::ptrdiff_t{row} * stride + bytesOf(part.x),
+                lineOf(from, row) + bytesOf(part.x), bytesOf(part.width));
+  }
+}
 
 }  // namespace
 
@@ -41,13 +56,15 @@ Shares::Shares(int sourceSide, int targetSide, std::uint32_t whole) {
 }
 
 Downscaler::Downscaler(Size source, Size target)
-    : across(source.w, target.w, kWholeAcross),
+    : isCopy(source == target),
+      across(source.w, target.w, kWholeAcross),
       down(source.h, target.h, kWholeDown),
       sums(bytesOf(source.w)) {}
 
 void Downscaler::scale(cairo_surface_t* from, const cairo_rectangle_int_t& part,
                        unsigned char* origin, int stride) {
   if (part.width <= 0) return;
+  if (isCopy) return copy(from, part, origin, stride);
   const auto share = [this](int column) { return across.shares[static_cast<std::size_t>(column)]; };
   const Shares::Share last = share(part.x + part.width - 1);
   for (int row = part.y; row < part.y + part.height; ++row) {
@@ -65,10 +82,8 @@ void Downscaler::addUpRows(cairo_surface_t* from, int row, int firstColumn, int 
   const std::size_t count = bytesOf(endColumn - firstColumn);
   std::uint16_t* const sum = sums.data() + start;
   std::fill_n(sum, count, std::uint16_t{0});
-  const int stride = cairo_image_surface_get_stride(from);
   for (int i = 0; i < share.count; ++i) {
-    const unsigned char* const source =
-        cairo_image_surface_get_data(from) + std::ptrdiff_t{share.first + i} * stride + start;
+    const unsigned char* const source = lineOf(from, share.first + i) + start;
     const auto weight =
         static_cast<std::uint16_t>(down.weights[share.weight + static_cast<std::size_t>(i)]);
     for (std::size_t byte = 0; byte < count; ++byte) {

@@ -45,6 +45,7 @@ class Downscaler {
   void addUpRows(cairo_surface_t* from, int row, int firstColumn, int endColumn);
   void writePixel(int column, unsigned char* pixel) const;
 
+  const bool isCopy;
   Shares across;
   Shares down;
   std::vector<std::uint16_t> sums;  // of one line's area, for each byte of a source line
