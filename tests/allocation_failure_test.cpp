@@ -8,7 +8,6 @@
 #include <MW/window.h>
 
 #include <memory>
-#include <ostream>
 
 #include "core/dispatch_thread.h"
 #include "support/failing_malloc.h"
@@ -28,13 +27,11 @@ class AllocationTest : public LiveWindowTest {
   static EventService& service() { return *Window::getEventService(); }
 };
 
-struct LossCase {
-  const char* name;
+struct LossCase : Row {
   void (*queue)(EventService&);
   int nth;
   const char* line;
 };
-std::ostream& operator<<(std::ostream& out, const LossCase& row) { return out << row.name; }
 
 class EventLoss : public AllocationTest, public testing::WithParamInterface<LossCase> {};
 
@@ -66,7 +63,7 @@ INSTANTIATE_TEST_SUITE_P(
         LossCase{"Application", raise, 1, "[EVENTSERVICE] AppEvent malloc fail!."},
         LossCase{"InputInTheQueue", sendInput, 2, "[EVENTSERVICE] saveQueue malloc fail!."},
         LossCase{"ApplicationInTheQueue", raise, 2, "[EVENTSERVICE] saveQueue malloc fail!."}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 TEST_F(WidgetTest, ADisplayItemThatFindsNoMemoryTakesNoIndex) {
   const SKIA_Rect rect = {1, 2, 3, 4, 5};
@@ -100,6 +97,7 @@ TEST_F(WidgetTest, AWidgetThatFindsNoMemoryStaysOutside) {
 TEST_F(AllocationTest, LeavingAndWalkingGoOn) {
   std::string calls;
   std::vector<std::unique_ptr<JournalWidget>> widgets;
+  widgets.reserve(20);
   for (int i = 0; i < 20; ++i) widgets.push_back(std::make_unique<JournalWidget>(calls, 'w'));
   Window::show(1);
   {

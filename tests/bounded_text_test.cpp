@@ -1,21 +1,21 @@
 #include "core/bounded_text.h"
 
-#include <gtest/gtest.h>
-
 #include <cstring>
-#include <ostream>
 #include <string>
+
+#include "support/widget_test.h"
 
 namespace {
 
-std::string letters(std::size_t count) { return std::string(count, 'a'); }
+using brimol::test::Row;
+using brimol::test::rowName;
 
-struct CutCase {
-  const char* name;
+auto letters(std::size_t count) { return std::string(count, 'a'); }
+
+struct CutCase : Row {
   std::string given;
   std::size_t kept;  // bytes
 };
-std::ostream& operator<<(std::ostream& out, const CutCase& row) { return out << row.name; }
 
 class BoundedText : public testing::TestWithParam<CutCase> {};
 
@@ -43,7 +43,7 @@ INSTANTIATE_TEST_SUITE_P(
                     CutCase{"FourBytesAcross3", letters(126) + "\U0001f600x", 126},
                     CutCase{"NoCharacters", std::string(200, '\x80'), 127},
                     CutCase{"LeadBytesOnly", std::string(200, '\xF0'), 127}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 TEST(BoundedTextTest, NullIsEmpty) {
   EXPECT_EQ(MW::boundedText(nullptr), "");

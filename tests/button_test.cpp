@@ -2,7 +2,6 @@
 #include <MW/window.h>
 
 #include <memory>
-#include <ostream>
 #include <tuple>
 
 #include "support/widget_test.h"
@@ -102,12 +101,10 @@ struct Step {
   const char* calls;  // so far
 };
 
-struct GestureCase {
-  const char* name;
+struct GestureCase : Row {
   std::vector<Step> steps;
   std::vector<std::string> log;
 };
-std::ostream& operator<<(std::ostream& out, const GestureCase& row) { return out << row.name; }
 
 class ButtonGesture : public ButtonTest, public testing::WithParamInterface<GestureCase> {};
 
@@ -165,7 +162,7 @@ INSTANTIATE_TEST_SUITE_P(
                                  {MW::kEventLongPress, kOutside, 0, true, 1, kHeld, "p"},
                                  {MW::kEventRelease, kInside, 0, true, 0, kNormal, "pc"}},
                                 {kPressedLog, "[BUTTON] long pressed!!", kReleasedLog}}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 TEST_F(ButtonTest, OtherCodesPassAHeldButton) {
   press(*button, kInside);
@@ -208,13 +205,11 @@ struct ClickTime {
   unsigned int pressed, released;
 };
 
-struct DoubleClickCase {
-  const char* name;
+struct DoubleClickCase : Row {
   std::vector<ClickTime> clicks;
   const char* calls;
   int lastCount;  // logged by the last click; 0: none
 };
-std::ostream& operator<<(std::ostream& out, const DoubleClickCase& row) { return out << row.name; }
 
 class ButtonDoubleClick : public ButtonTest, public testing::WithParamInterface<DoubleClickCase> {};
 
@@ -253,7 +248,7 @@ INSTANTIATE_TEST_SUITE_P(
                         "pcpcpcpcd",
                         2},
         DoubleClickCase{"AtTickZero", {{0, 0}, {900, 1000}, {1100, 1200}}, "pcpcpcd", 2}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 TEST_F(ButtonTest, ReleaseOutsideIsNoClickOfADoubleClick) {
   countDoubleClicks();
@@ -306,17 +301,13 @@ TEST_F(ButtonTest, DelayedShowIsInvisibleAndDeafUntilDrawn) {
 }
 
 // What a callback does to its own button, and where it is called from.
-struct ChangeCase {
-  const char* name;
+struct ChangeCase : Row {
   void (*change)(int);
 };
-std::ostream& operator<<(std::ostream& out, const ChangeCase& row) { return out << row.name; }
 
-struct WordCase {
-  const char* name;
+struct WordCase : Row {
   MW::Callback MW::Widget::*word;
 };
-std::ostream& operator<<(std::ostream& out, const WordCase& row) { return out << row.name; }
 
 class ButtonChange : public ButtonTest,
                      public testing::WithParamInterface<std::tuple<ChangeCase, WordCase>> {};

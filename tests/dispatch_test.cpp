@@ -3,7 +3,6 @@
 #include <MW/window.h>
 
 #include <memory>
-#include <ostream>
 
 #include "core/dispatch_thread.h"
 #include "support/widget_test.h"
@@ -46,15 +45,13 @@ constexpr Member kSelected = {'s', 1, true, true, false};
 constexpr Member kSelectedTaking = {'S', 1, true, true, true};
 constexpr Member kSelectedHidden = {'i', 1, false, true, false};
 
-struct RouteCase {
-  const char* name;
+struct RouteCase : Row {
   std::vector<Member> members;  // in the order of registering
   int live;
   const char* offered;
   int redraw;
   int asked;  // how often the display was asked whether it is live
 };
-std::ostream& operator<<(std::ostream& out, const RouteCase& row) { return out << row.name; }
 
 class DispatchRoute : public DispatchTest, public testing::WithParamInterface<RouteCase> {};
 
@@ -95,7 +92,7 @@ INSTANTIATE_TEST_SUITE_P(
         RouteCase{"SelectedHidden", {kSelectedHidden, kWidget}, 1, "iw", 0, 1},
         RouteCase{
             "NoSelectedPassForDialogs", {kDialog, {'s', 0, true, true, true}}, 1, "Ds", 1, 1}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 TEST_F(DispatchTest, PassesTheEventWithZero) {
   int calls = 0;

@@ -4,7 +4,6 @@
 #include <array>
 #include <bit>
 #include <limits>
-#include <ostream>
 #include <thread>
 
 #include "core/input_thread.h"
@@ -33,12 +32,10 @@ class EventServiceTest : public LiveWindowTest {
   }
 };
 
-struct ParseCase {
-  const char* name;
+struct ParseCase : Row {
   uint8_t type;
   std::vector<uint32_t> words;  // those of event_data that the type fills
 };
-std::ostream& operator<<(std::ostream& out, const ParseCase& row) { return out << row.name; }
 
 class EventParse : public testing::TestWithParam<ParseCase> {};
 
@@ -68,7 +65,7 @@ INSTANTIATE_TEST_SUITE_P(
                     ParseCase{"User", 24, {7, 0xFBFAF9F8, 0xF7F6F5F4}},
                     ParseCase{"Unlisted", 7, {8, 0, 0}}, ParseCase{"UnlistedZero", 0, {8, 0, 0}},
                     ParseCase{"UnlistedHighest", 255, {8, 0, 0}}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 TEST(EventParseTest, NullRecordsAreNoInput) {
   event_data data = {.type = 3, .value = 4};
@@ -171,13 +168,11 @@ TEST_F(WidgetTest, WindowStartsAndStopsInput) {
             logLines(kError, {"[EVENTSERVICE] stopEvent End", "[WINDOW] event_dispatcher End"}));
 }
 
-struct HitCase {
-  const char* name;
+struct HitCase : Row {
   SKIA_Rect area;
   Spot spot;
   bool forMe, aroundMe;
 };
-std::ostream& operator<<(std::ostream& out, const HitCase& row) { return out << row.name; }
 
 class EventHit : public testing::TestWithParam<HitCase> {};
 
@@ -212,7 +207,7 @@ INSTANTIATE_TEST_SUITE_P(
         HitCase{"JustBelowZero", kEverything, {-2, -2}, true, true},
         HitCase{"Highest", kEverything, {kMax, kMax}, false, false},
         HitCase{"WideAtTheEnd", {kMax - 5, kMax - 5, kMax, kMax, 0}, {kMax, kMax}, true, true}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 TEST(EventHitTest, OnlyPointersAreSomewhere) {
   for (int code = 0; code <= 8; ++code) {

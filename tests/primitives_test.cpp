@@ -4,7 +4,6 @@
 #include <cstring>
 #include <limits>
 #include <memory>
-#include <ostream>
 
 #include "support/widget_test.h"
 
@@ -27,8 +26,7 @@ std::unique_ptr<MW::Widget> makeImage() { return std::make_unique<MW::Image>(&kR
 std::unique_ptr<MW::Widget> makeBox() { return std::make_unique<MW::Box>(&kRect); }
 std::unique_ptr<MW::Widget> makeLine() { return std::make_unique<MW::Line>(&kLine); }
 
-struct KindCase {
-  const char* name;
+struct KindCase : Row {
   std::unique_ptr<MW::Widget> (*make)();
   int type;
   Drawing drawn;
@@ -37,7 +35,6 @@ struct KindCase {
   Drawing changed;
   const char* text;  // after "XY" replaced "abcdef"; null: no text
 };
-std::ostream& operator<<(std::ostream& out, const KindCase& row) { return out << row.name; }
 
 constexpr SKIA_Rect kBlueRect = {10, 20, 30, 40, 0xFF0000FF};
 constexpr SKIA_Point kGreenLine = {10, 20, 30, 5, 0xFF00FF00, 3};
@@ -129,8 +126,7 @@ TEST_P(Primitive, TakesNoEvents) {
   EXPECT_TRUE(widget->isActive());
 }
 
-INSTANTIATE_TEST_SUITE_P(Kinds, Primitive, testing::ValuesIn(kinds()),
-                         [](const auto& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Kinds, Primitive, testing::ValuesIn(kinds()), rowName);
 
 TEST_F(PrimitivesTest, OnlyAnImageBelievesALength) {
   SKIA_Text text = textRecord("abcdef");
@@ -144,12 +140,10 @@ TEST_F(PrimitivesTest, OnlyAnImageBelievesALength) {
   EXPECT_STREQ(image.getText(), "ab");
 }
 
-struct LengthCase {
-  const char* name;
+struct LengthCase : Row {
   int given;
   std::size_t kept;
 };
-std::ostream& operator<<(std::ostream& out, const LengthCase& row) { return out << row.name; }
 
 class ImageLength : public WidgetTest, public testing::WithParamInterface<LengthCase> {};
 
@@ -169,7 +163,7 @@ INSTANTIATE_TEST_SUITE_P(Lengths, ImageLength,
                                          LengthCase{"FarTooMany", kMax, 3},
                                          LengthCase{"Negative", -1, 0},
                                          LengthCase{"Lowest", kMin, 0}),
-                         [](const auto& row) { return row.param.name; });
+                         rowName);
 
 TEST_F(PrimitivesTest, AbsentRecordsAreEmpty) {
   MW::Label label(nullptr, nullptr);
@@ -197,12 +191,10 @@ TEST_F(PrimitivesTest, TextsAreCutAtTheirRecord) {
   }
 }
 
-struct LineCase {
-  const char* name;
+struct LineCase : Row {
   SKIA_Point line;
   SKIA_Rect rect;
 };
-std::ostream& operator<<(std::ostream& out, const LineCase& row) { return out << row.name; }
 
 class LineRect : public testing::TestWithParam<LineCase> {};
 
@@ -218,6 +210,6 @@ INSTANTIATE_TEST_SUITE_P(
                     LineCase{"Point", {3, 4, 3, 4, 7, 1}, {3, 4, 0, 0, 7}},
                     LineCase{
                         "Longest", {kMin, kMax, kMax, kMin, 7, 1}, {kMax, kMax, kMin, kMin, 7}}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 }  // namespace

@@ -3,13 +3,14 @@
 
 #include <array>
 #include <cstring>
-#include <ostream>
 #include <type_traits>
 
 #include "support/widget_test.h"
 
 namespace {
 
+using brimol::test::Row;
+using brimol::test::rowName;
 using brimol::test::WidgetTest;
 using MW::Callback;
 using MW::Widget;
@@ -100,11 +101,9 @@ struct BlinkStep {
   unsigned int now, color;
 };
 
-struct BlinkCase {
-  const char* name;
+struct BlinkCase : Row {
   std::vector<BlinkStep> steps;
 };
-std::ostream& operator<<(std::ostream& out, const BlinkCase& row) { return out << row.name; }
 
 class WidgetBlink : public testing::TestWithParam<BlinkCase> {};
 
@@ -129,7 +128,7 @@ INSTANTIATE_TEST_SUITE_P(
         // A toggle at tick 0 stands for none and is set anew behind the wrap.
         BlinkCase{"SurvivesAToggleAtTickZero",
                   {{0xFFFFFE0C, kRed}, {0x10, kRed}, {0x204, kRed}, {0x205, kBlack}}}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 TEST_F(WidgetTest, BlinkEndsAndStartsAnew) {
   Widget widget;
@@ -148,11 +147,9 @@ class KeyDirWidget : public Widget {
   using Widget::keyDir;
 };
 
-struct KeyCase {
-  const char* name;
+struct KeyCase : Row {
   int key, canLeft, canRight, keyDir, result;
 };
-std::ostream& operator<<(std::ostream& out, const KeyCase& row) { return out << row.name; }
 
 class WidgetKeys : public testing::TestWithParam<KeyCase> {};
 
@@ -172,7 +169,7 @@ INSTANTIATE_TEST_SUITE_P(
                     KeyCase{"SelectLeft", 327, 1, 0, 7, 1},
                     KeyCase{"SelectRight", 327, 0, -1, 7, 1},
                     KeyCase{"SelectNothing", 327, 0, 0, 7, 0}, KeyCase{"Up", 273, 1, 1, 7, 0}),
-    [](const auto& row) { return row.param.name; });
+    rowName);
 
 TEST(CallbackTest, WordsStandInOrder) {
   using Word = Callback Widget::*;

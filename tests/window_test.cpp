@@ -4,7 +4,6 @@
 #include <cmath>
 #include <limits>
 #include <memory>
-#include <ostream>
 #include <utility>
 
 #include "support/widget_test.h"
@@ -133,20 +132,34 @@ TEST_F(WindowTest, PassesTellTheTime) {
   EXPECT_EQ(told, (std::vector<unsigned int>{5, 70, 70})) << "the timer pass reads the clock";
 }
 
-// What a callback of the pass does to a layer of three widgets a, b, c while a is drawn.
-struct ChangeCase {
-  const char* name;
-  std::function<void(std::vector<std::unique_ptr<JournalWidget>>&, std::string&)> change;
-  const char* first;  // calls of this pass
-  const char* next;   // and of the next
+using Widgets = std::vector<std::unique_ptr<JournalWidget>>;
+
+void unregisterFirst(Widgets& all, std::string&) { Window::unregisterWidget(all[0].get()); }
+void unregisterSecond(Widgets& all, std::string&) { Window::unregisterWidget(all[1].get()); }
+void deleteSecond(Widgets& all, std::string&) { all[1].reset(); }
+void deleteAllBehind(Widgets& all, std::string&) { all.resize(1); }
+void drawOnceMore(Widgets&, std::string&) { Window::show(1); }
+
+void addMany(Widgets& all, std::string& calls) {
+  for (int i = 0; i < 40; ++i) all.push_back(std::make_unique<JournalWidget>(calls, 'n'));
+}
+
+void moveSecondToTheEnd(Widgets& all, std::string&) {
+  Window::unregisterWidget(all[1].get());
+  Window::registerWidget(all[1].get());
+}
+
+// What is done to a layer of three widgets a, b, c while a is drawn.
+struct ChangeCase : Row {
+  void (*change)(Widgets&, std::string& calls);
+  std::string first, next;  // calls of this pass and of the next
 };
-std::ostream& operator<<(std::ostream& out, const ChangeCase& row) { return out << row.name; }
 
 class WindowChange : public WidgetTest, public testing::WithParamInterface<ChangeCase> {};
 
 TEST_P(WindowChange, DuringAPassSkipsAndRepeatsNothing) {
   std::string calls;
-  std::vector<std::unique_ptr<JournalWidget>> widgets;
+  Widgets widgets;
   for (const char name : {'a', 'b', 'c'}) {
     widgets.push_back(std::make_unique<JournalWidget>(calls, name));
   }
@@ -162,35 +175,16 @@ TEST_P(WindowChange, DuringAPassSkipsAndRepeatsNothing) {
   EXPECT_EQ(calls, GetParam().next);
 }
 
-using Widgets = std::vector<std::unique_ptr<JournalWidget>>;
 INSTANTIATE_TEST_SUITE_P(
     Changes, WindowChange,
-    testing::Values(
-        ChangeCase{"UnregistersTheNext",
-                   [](Widgets& all, std::string&) { Window::unregisterWidget(all[1].get()); }, "ac",
-                   "ac"},
-        ChangeCase{"DeletesTheNext", [](Widgets& all, std::string&) { all[1].reset(); }, "ac",
-                   "ac"},
-        ChangeCase{"UnregistersItself",
-                   [](Widgets& all, std::string&) { Window::unregisterWidget(all[0].get()); },
-                   "abc", "bc"},
-        ChangeCase{"DeletesAllBehind", [](Widgets& all, std::string&) { all.resize(1); }, "a", "a"},
-        ChangeCase{"AddsMany",
-                   [](Widgets& all, std::string& calls) {
-                     for (int i = 0; i < 40; ++i) {
-                       all.push_back(std::make_unique<JournalWidget>(calls, 'n'));
-                     }
-                   },
-                   "abc", "abcnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnnn"},
-        ChangeCase{"MovesTheNextBehindTheOthers",
-                   [](Widgets& all, std::string&) {
-                     Window::unregisterWidget(all[1].get());
-                     Window::registerWidget(all[1].get());
-                   },
-                   "ac", "acb"},
-        ChangeCase{"DrawsOnceMore", [](Widgets&, std::string&) { Window::show(1); }, "aabcbc",
-                   "abc"}),
-    [](const auto& row) { return row.param.name; });
+    testing::Values(ChangeCase{"UnregistersTheNext", unregisterSecond, "ac", "ac"},
+                    ChangeCase{"DeletesTheNext", deleteSecond, "ac", "ac"},
+                    ChangeCase{"UnregistersItself", unregisterFirst, "abc", "bc"},
+                    ChangeCase{"DeletesAllBehind", deleteAllBehind, "a", "a"},
+                    ChangeCase{"AddsMany", addMany, "abc", "abc" + std::string(40, 'n')},
+                    ChangeCase{"MovesTheNextToTheEnd", moveSecondToTheEnd, "ac", "acb"},
+                    ChangeCase{"DrawsOnceMore", drawOnceMore, "aabcbc", "abc"}),
+    rowName);
 
 TEST_F(WindowTest, KnowsADefaultSize) {
   int width = 0;
@@ -211,12 +205,10 @@ constexpr float kNan = std::numeric_limits<float>::quiet_NaN();
 constexpr int kIntMax = std::numeric_limits<int>::max();
 constexpr int kIntMin = std::numeric_limits<int>::min();
 
-struct MuraCase {
-  const char* name;
+struct MuraCase : Row {
   float dpi, mm, kept;
   int pixels;
 };
-std::ostream& operator<<(std::ostream& out, const MuraCase& row) { return out << row.name; }
 
 class WindowMura : public WidgetTest, public testing::WithParamInterface<MuraCase> {};
 
@@ -247,7 +239,7 @@ INSTANTIATE_TEST_SUITE_P(Densities, WindowMura,
                                          MuraCase{"HugeLength", 400, 3e38F, 400, kIntMax},
                                          MuraCase{"NoDensity", kNan, 10, 0, 0},
                                          MuraCase{"NoLength", 400, kNan, 400, 0}),
-                         [](const auto& row) { return row.param.name; });
+                         rowName);
 
 TEST_F(WindowTest, AsksForTheDensityOnce) {
   platform().xdpi = platform().ydpi = 401.6F;

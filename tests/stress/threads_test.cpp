@@ -6,7 +6,6 @@
 
 #include <latch>
 #include <memory>
-#include <ostream>
 #include <thread>
 
 #include "support/widget_test.h"
@@ -73,11 +72,9 @@ TEST_F(ThreadsTest, ACallbackMayEndTheWindow) {
   EXPECT_EQ(platform().quits, 1);
 }
 
-struct LeaveCase {
-  const char* name;
+struct LeaveCase : Row {
   void (*leave)(std::unique_ptr<ProbeWidget>&);
 };
-std::ostream& operator<<(std::ostream& out, const LeaveCase& row) { return out << row.name; }
 
 class Leaving : public WidgetTest, public testing::WithParamInterface<LeaveCase> {};
 
@@ -115,6 +112,6 @@ INSTANTIATE_TEST_SUITE_P(Ways, Leaving,
                                                      twin.setId(widget->id());
                                                      Window::unregisterWidget(&twin);
                                                    }}),
-                         [](const auto& row) { return row.param.name; });
+                         rowName);
 
 }  // namespace

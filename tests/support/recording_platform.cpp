@@ -140,21 +140,22 @@ int RecordingPlatform::poll(Event& event) {
 }
 
 void RecordingPlatform::delay(unsigned int ms) {
-  {
-    std::unique_lock guard(lock);
-    if (std::this_thread::get_id() == testThread) {
-      delays.push_back(ms);
-      return;
-    }
-    if (std::this_thread::get_id() != pollingThread) cycleDue = 1;
-    if (pauses == Pauses::Parked) {
-      ++parked;
-      changed.notify_all();
-      changed.wait(guard, [&] { return pauses == Pauses::Short; });
-      --parked;
-    }
+  std::unique_lock guard(lock);
+  if (std::this_thread::get_id() == testThread) {
+    delays.push_back(ms);
+    return;
   }
+  if (std::this_thread::get_id() != pollingThread) cycleDue = 1;
+  if (pauses == Pauses::Parked) park(guard);
+  guard.unlock();
   std::this_thread::sleep_for(kShortPause);
+}
+
+void RecordingPlatform::park(std::unique_lock<std::mutex>& guard) {
+  ++parked;
+  changed.notify_all();
+  changed.wait(guard, [&] { return pauses == Pauses::Short; });
+  --parked;
 }
 
 }  // namespace brimol::test
@@ -216,10 +217,10 @@ void getDpi(float* xdpi, float* ydpi) {
   *ydpi = platform().ydpi;
 }
 
-int property_get(const char* key, char* value, const char* default_value) {
+int property_get(const char* key, char* value, const char* fallback) {
   const auto found = platform().properties.find(key);
   const std::string text = found != platform().properties.end() ? found->second
-                           : default_value != nullptr           ? default_value
+                           : fallback != nullptr                ? fallback
                                                                 : "";
   const std::size_t length = text.copy(value, BRIMOL_PROPERTY_BYTES - 1);
   value[length] = '\0';

@@ -74,6 +74,8 @@ class RecordingPlatform {
     std::array<char, 320> message;
   };
 
+  void park(std::unique_lock<std::mutex>& guard);
+
   std::mutex lock;  // guards all below
   std::condition_variable changed;
   std::vector<Drawing> drawings;

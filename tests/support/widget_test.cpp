@@ -8,6 +8,8 @@ namespace brimol::test {
 using MW::event_data;
 using MW::Widget;
 
+std::ostream& operator<<(std::ostream& out, const Row& row) { return out << row.name; }
+
 event_data pointerEvent(MW::EventCode code, Spot spot, unsigned int finger) {
   return {.type = code, .mouse = {0, finger, spot.x, spot.y, 0, 0}};
 }
@@ -51,6 +53,7 @@ std::vector<Drawing> shown(Widget& widget) {
 
 std::vector<LogLine> logLines(int priority, const std::vector<std::string>& messages) {
   std::vector<LogLine> lines;
+  lines.reserve(messages.size());
   for (const std::string& message : messages) lines.push_back({priority, "BRIMOL_WIDGET", message});
   return lines;
 }

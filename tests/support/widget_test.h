@@ -7,12 +7,22 @@
 #include <gtest/gtest.h>
 
 #include <functional>
+#include <ostream>
 #include <string>
 #include <vector>
 
 #include "support/recording_platform.h"
 
 namespace brimol::test {
+
+/// What the rows of a table of cases begin with.
+struct Row {
+  const char* name;
+};
+std::ostream& operator<<(std::ostream& out, const Row& row);
+
+/// Names a table's tests after its rows.
+inline constexpr auto rowName = [](const auto& info) { return std::string(info.param.name); };
 
 /// A place on the screen, in pixels.
 struct Spot {
