@@ -15,8 +15,6 @@ using MW::Button;
 using MW::Callback;
 using MW::Widget;
 
-constexpr int kAlignLeft = 1;
-constexpr int kAlignCentred = 5;
 constexpr int kLateMs = 1000;
 constexpr uint32_t kBoxColor = 0xFF3FA66B;
 
@@ -35,7 +33,8 @@ SKIA_Text textOf(const char* words, uint32_t color, int align, int size) {
 }
 
 MW::Textbox statusLine(const Layout& layout) {
-  const SKIA_Text text = textOf("Use a button", MW::kColorBlack, kAlignCentred, layout.textSize);
+  const SKIA_Text text =
+      textOf("Use a button", MW::kColorBlack, SKIA_ALIGN_CENTRE, layout.textSize);
   return {&layout.status, &text};
 }
 
@@ -69,9 +68,10 @@ FirstScreen::~FirstScreen() { MW::WidgetList::destroy(); }
 
 // What never changes goes to the display-item table, which keeps copies.
 void FirstScreen::placePrimitives(const Layout& layout, const char* picture) {
-  const SKIA_Text title = textOf("Factory test", MW::kColorWhite, kAlignCentred, layout.titleSize);
+  const SKIA_Text title =
+      textOf("Factory test", MW::kColorWhite, SKIA_ALIGN_CENTRE, layout.titleSize);
   const SKIA_Text caption =
-      textOf("Label,\npicture,\nbox, line", MW::kColorWhite, kAlignLeft, layout.textSize);
+      textOf("Label,\npicture,\nbox, line", MW::kColorWhite, SKIA_ALIGN_LEFT, layout.textSize);
   const SKIA_Text name = textOf(picture, 0, 0, 0);
   SKIA_Rect box = layout.box;
   box.color = kBoxColor;
@@ -87,12 +87,13 @@ void FirstScreen::placePrimitives(const Layout& layout, const char* picture) {
 void FirstScreen::placeButtons(const Layout& layout) {
   for (std::size_t i = 0; i < kButtonCount; ++i) {
     const ButtonRow& row = kButtons.at(i);
-    const SKIA_Text caption = textOf(row.caption, MW::kColorBlack, kAlignCentred, layout.textSize);
+    const SKIA_Text caption =
+        textOf(row.caption, MW::kColorBlack, SKIA_ALIGN_CENTRE, layout.textSize);
     Button& button = buttons.at(i).emplace(&layout.buttons.at(i), &caption);
     button.*row.callback = row.handler;
     if (i != kLate) button.setActive(1);
   }
-  const SKIA_Text caption = textOf("End", MW::kColorBlack, kAlignCentred, layout.textSize);
+  const SKIA_Text caption = textOf("End", MW::kColorBlack, SKIA_ALIGN_CENTRE, layout.textSize);
   endButton.emplace(&layout.end, &caption);
   endButton->clickCallback = [](int) { onScreen->ended = true; };
   endButton->setActive(1);

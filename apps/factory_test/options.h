@@ -13,7 +13,7 @@ struct Options {
   Action action = Action::Run;
   bool headless = false;  // draw to memory, without a window
   bool verbose = false;   // write the toolkit's log to stderr
-  std::string shot;       // draw once, write this PNG file and end; empty: no
+  std::string shot = {};  // draw once, write this PNG file and end; empty: no
 };
 
 /// The options, or nothing for a wrong command line; `error` then says in one line what is wrong.

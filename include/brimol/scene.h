@@ -38,12 +38,15 @@ typedef struct SKIA_Point {
 
 enum { SKIA_TEXT_BYTES = 128 };
 
+/* Where a text stands in its rectangle; any other code is left. */
+enum SKIA_Align { SKIA_ALIGN_LEFT = 1, SKIA_ALIGN_RIGHT = 2, SKIA_ALIGN_CENTRE = 5 };
+
 /* A text of at most 127 bytes of UTF-8 and a NUL. */
 typedef struct SKIA_Text {
   char text[SKIA_TEXT_BYTES];
   int32_t string_len; /* bytes of `text` that are drawn */
   uint32_t color;     /* 0xAARRGGBB */
-  int32_t align;      /* 1 left, 2 right, 5 centred, any other left */
+  int32_t align;      /* enum SKIA_Align */
   int32_t size;       /* font size in pixels */
 } SKIA_Text;
 
