@@ -99,7 +99,7 @@ void SdlDisplay::present(cairo_surface_t* picture, const Region& changed) {
 }
 
 void SdlDisplay::wait(std::optional<uint32_t> ms) {
-  constexpr uint32_t longest = std::numeric_limits<int>::max();
+  const uint32_t longest = std::numeric_limits<int>::max();
   SDL_Event event;
   int isEvent = ms ? SDL_WaitEventTimeout(&event, static_cast<int>(std::min(*ms, longest)))
                    : SDL_WaitEvent(&event);

@@ -35,7 +35,8 @@ Region WindowCanvas::update(cairo_surface_t* picture, const Region& changed) {
   const cairo_rectangle_int_t& shown = placement.shown;
   const int stride = cairo_image_surface_get_stride(content.get());
   unsigned char* const origin = cairo_image_surface_get_data(content.get()) +
-                                std::ptrdiff_t{shown.y} * stride + shown.x * kPixelBytes;
+                                std::ptrdiff_t{shown.y} * stride +
+                                std::ptrdiff_t{shown.x} * kPixelBytes;
   for (const cairo_rectangle_int_t& part : parts) {
     scaler.scale(picture, {part.x - shown.x, part.y - shown.y, part.width, part.height}, origin,
                  stride);

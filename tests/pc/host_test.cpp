@@ -12,13 +12,13 @@
 #include <atomic>
 #include <cmath>
 #include <cstdlib>
-#include <cstring>
 #include <filesystem>
 #include <thread>
 
 #include "cairo_handles.h"
 #include "input/input_service.h"
 #include "open_platform.h"
+#include "painting.h"
 #include "record_text.h"
 
 namespace brimol::pc {
@@ -27,7 +27,6 @@ namespace {
 namespace fs = std::filesystem;
 using testing::HasSubstr;
 
-constexpr std::uint32_t kRed = 0xFFFF0000;
 constexpr std::uint32_t kGreen = 0xFF00FF00;
 
 void showBox(const SKIA_Rect& box) {
@@ -36,18 +35,12 @@ void showBox(const SKIA_Rect& box) {
   skia_end_frame_c();
 }
 
-/// The colour of a pixel in a picture file.
+/// The colour of a pixel in a picture file; 0 where there is none.
 std::uint32_t colourAt(const fs::path& file, int x, int y) {
-  const CairoSurface picture(cairo_image_surface_create_from_png(file.c_str()));
-  if (cairo_surface_status(picture.get()) != CAIRO_STATUS_SUCCESS) return 0;
-  if (x >= cairo_image_surface_get_width(picture.get())) return 0;
-  if (y >= cairo_image_surface_get_height(picture.get())) return 0;
-  std::uint32_t pixel = 0;
-  std::memcpy(&pixel,
-              cairo_image_surface_get_data(picture.get()) +
-                  y * cairo_image_surface_get_stride(picture.get()) + x * 4,
-              sizeof pixel);
-  return pixel | 0xFF000000;
+  const CairoSurface surface(cairo_image_surface_create_from_png(file.c_str()));
+  if (cairo_surface_status(surface.get()) != CAIRO_STATUS_SUCCESS) return 0;
+  const Picture picture = pictureOf(surface.get());
+  return x < picture.size.w && y < picture.size.h ? kBlack | picture.at(x, y) : 0;
 }
 
 class HostTest : public testing::Test {
@@ -77,8 +70,8 @@ TEST_F(HostTest, ShowsFramesAndTakesScreenshots) {
   ASSERT_EQ(brimol_host_screenshot(shot.c_str()), 1) << brimol_host_error();
   EXPECT_EQ(colourAt(shot, 10, 20), kRed);
   EXPECT_EQ(colourAt(shot, 39, 59), kRed);
-  EXPECT_EQ(colourAt(shot, 40, 60), 0xFF000000) << "the frame before is gone";
-  EXPECT_EQ(colourAt(shot, 199, 299), 0xFF000000) << "the picture has the screen's size";
+  EXPECT_EQ(colourAt(shot, 40, 60), kBlack) << "the frame before is gone";
+  EXPECT_EQ(colourAt(shot, 199, 299), kBlack) << "the picture has the screen's size";
   EXPECT_EQ(std::distance(fs::directory_iterator(folder), {}), 1) << "nothing else was left";
 }
 

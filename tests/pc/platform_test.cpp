@@ -4,10 +4,10 @@
 #include <gtest/gtest.h>
 
 #include <atomic>
-#include <cstring>
 #include <latch>
 #include <thread>
 
+#include "painting.h"
 #include "record_text.h"
 
 namespace brimol::pc {
@@ -19,24 +19,12 @@ using testing::ElementsAre;
 
 constexpr Size kScreen = {200, 300};
 constexpr seconds kLong{60};  // longer than anything takes here
-constexpr std::uint32_t kRed = 0xFFFF0000;
-constexpr std::uint32_t kBlue = 0xFF0000FF;
 
-Frame filledWith(std::uint32_t colour) {
-  SKIA_Item box = {};
-  box.kind = SKIA_BOX;
-  box.rect = {0, 0, kScreen.w, kScreen.h, colour};
-  return {box};
-}
+Frame filledWith(std::uint32_t colour) { return {boxItem({0, 0, kScreen.w, kScreen.h, colour})}; }
 
-/// The colour in the middle; 0 where there is no picture.
+/// The colour in the middle.
 std::uint32_t colourOf(const CairoSurface& picture) {
-  if (!picture) return 0;
-  const auto* const row = cairo_image_surface_get_data(picture.get()) +
-                          kScreen.h / 2 * cairo_image_surface_get_stride(picture.get());
-  std::uint32_t pixel = 0;
-  std::memcpy(&pixel, row + kScreen.w / 2 * 4, sizeof pixel);
-  return pixel | 0xFF000000;
+  return picture ? kBlack | pictureOf(picture.get()).at(kScreen.w / 2, kScreen.h / 2) : 0;
 }
 
 class PlatformTest : public testing::Test {
@@ -73,7 +61,7 @@ class PlatformTest : public testing::Test {
 };
 
 TEST_F(PlatformTest, ShowsTheNewestFrame) {
-  EXPECT_EQ(colourOf(platform->copyPicture(kLong)), 0xFF000000) << "before any frame";
+  EXPECT_EQ(colourOf(platform->copyPicture(kLong)), kBlack) << "before any frame";
   platform->submit(filledWith(kRed));
   EXPECT_EQ(colourOf(platform->copyPicture(kLong)), kRed);
   keepBusy();

@@ -9,8 +9,9 @@
 
 #include <chrono>
 #include <cstdlib>
-#include <functional>
 #include <memory>
+#include <string>
+#include <vector>
 
 #include "open_platform.h"
 #include "record_text.h"
@@ -99,6 +100,20 @@ class WindowTest : public testing::Test {
     EXPECT_NE(openedPlatform()->copyPicture(std::chrono::seconds(60)), nullptr);
   }
 
+  /// The next two input records.
+  static std::vector<std::string> takeTwo() {
+    std::vector<std::string> taken;
+    while (taken.size() < 2) {
+      Event record = {};
+      if (PollEvent(&record) != 0) {
+        taken.push_back(textOf(record));
+      } else {
+        Delay(60'000);
+      }
+    }
+    return taken;
+  }
+
   std::uint32_t shownAt(int x, int y) const { return desktop.colourAt(place.x + x, place.y + y); }
 
   const Desktop desktop;
@@ -122,32 +137,14 @@ TEST_F(WindowTest, MapsClicksToTheScreen) {
   const std::string lastPixel =
       std::to_string(place.x + kShown.w - 1) + " " + std::to_string(place.y + kShown.h - 1);
   ASSERT_EQ(std::system(("xdotool mousemove " + lastPixel + " click 1").c_str()), 0);
-  std::vector<std::string> taken;
-  while (taken.size() < 2) {
-    Event record = {};
-    if (PollEvent(&record) != 0) {
-      taken.push_back(textOf(record));
-    } else {
-      Delay(60'000);
-    }
-  }
-  EXPECT_THAT(taken, testing::ElementsAre("down 0 at 1439,2559", "up 0 at 1439,2559"));
+  EXPECT_THAT(takeTwo(), testing::ElementsAre("down 0 at 1439,2559", "up 0 at 1439,2559"));
 }
 
 TEST_F(WindowTest, TellsThatItIsToBeClosed) {
   EXPECT_EQ(brimol_host_close_requested(), 0);
   openedPlatform()->act([](InputTranslator& input) { input.keyDown(SDLK_UP); });
   desktop.askToClose(window);
-  std::vector<std::string> taken;
-  while (taken.size() < 2) {
-    Event record = {};
-    if (PollEvent(&record) != 0) {
-      taken.push_back(textOf(record));
-    } else {
-      Delay(60'000);
-    }
-  }
-  EXPECT_THAT(taken, testing::ElementsAre("key down 273", "key up 273"));
+  EXPECT_THAT(takeTwo(), testing::ElementsAre("key down 273", "key up 273"));
   openedPlatform()->copyPicture(std::chrono::seconds(60));
   EXPECT_NE(brimol_host_close_requested(), 0);
 }
