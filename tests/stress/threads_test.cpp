@@ -73,8 +73,17 @@ TEST_F(ThreadsTest, ACallbackMayEndTheWindow) {
 }
 
 struct LeaveCase : Row {
+  bool leftBefore;  // its own handler has unregistered it
   void (*leave)(std::unique_ptr<ProbeWidget>&);
 };
+
+void unregister(std::unique_ptr<ProbeWidget>& widget) { Window::unregisterWidget(widget.get()); }
+void destroy(std::unique_ptr<ProbeWidget>& widget) { widget.reset(); }
+void unregisterTwin(std::unique_ptr<ProbeWidget>& widget) {
+  ProbeWidget twin;
+  twin.setId(widget->id());
+  Window::unregisterWidget(&twin);
+}
 
 class Leaving : public WidgetTest, public testing::WithParamInterface<LeaveCase> {};
 
@@ -85,6 +94,7 @@ TEST_P(Leaving, WaitsForAHandlerOnAnotherThread) {
   std::atomic<bool> done = false;
   auto widget = std::make_unique<ProbeWidget>();
   widget->onShow = [&](unsigned int) {
+    if (GetParam().leftBefore) Window::unregisterWidget(widget.get());
     entered.count_down();
     goOn.wait();
     for (int i = 0; i < kWork; ++i) std::this_thread::yield();
@@ -101,17 +111,11 @@ TEST_P(Leaving, WaitsForAHandlerOnAnotherThread) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Ways, Leaving,
-                         testing::Values(LeaveCase{"Unregistered",
-                                                   [](auto& widget) {
-                                                     Window::unregisterWidget(widget.get());
-                                                   }},
-                                         LeaveCase{"Deleted", [](auto& widget) { widget.reset(); }},
-                                         LeaveCase{"RemovedByAnEqualId",
-                                                   [](auto& widget) {
-                                                     ProbeWidget twin;
-                                                     twin.setId(widget->id());
-                                                     Window::unregisterWidget(&twin);
-                                                   }}),
+                         testing::Values(LeaveCase{"Unregistered", false, unregister},
+                                         LeaveCase{"UnregisteredAgain", true, unregister},
+                                         LeaveCase{"Deleted", false, destroy},
+                                         LeaveCase{"DeletedWhenGone", true, destroy},
+                                         LeaveCase{"RemovedByAnEqualId", false, unregisterTwin}),
                          rowName);
 
 }  // namespace
