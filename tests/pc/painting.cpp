@@ -63,11 +63,12 @@ Picture pictureOf(cairo_surface_t* surface) {
   Picture picture = {
       {cairo_image_surface_get_width(surface), cairo_image_surface_get_height(surface)}, {}};
   const unsigned char* const data = cairo_image_surface_get_data(surface);
-  const int stride = cairo_image_surface_get_stride(surface);
+  const std::ptrdiff_t stride = cairo_image_surface_get_stride(surface);
   for (int y = 0; y < picture.size.h; ++y) {
     for (int x = 0; x < picture.size.w; ++x) {
       uint32_t pixel = 0;
-      std::memcpy(&pixel, data + y * stride + x * static_cast<int>(sizeof pixel), sizeof pixel);
+      std::memcpy(&pixel, data + y * stride + x * static_cast<std::ptrdiff_t>(sizeof pixel),
+                  sizeof pixel);
       picture.pixels.push_back(pixel & kRgb);
     }
   }
@@ -81,8 +82,8 @@ Picture painted(const Frame& frame, Size screen) {
 }
 
 std::string writePicture(const std::string& name, Size size, uint32_t color) {
-  const std::string path = testing::TempDir() + "/" +
-                           testing::UnitTest::GetInstance()->current_test_info()->name() + name;
+  std::string path = testing::TempDir() + "/" +
+                     testing::UnitTest::GetInstance()->current_test_info()->name() + name;
   const CairoSurface surface(cairo_image_surface_create(CAIRO_FORMAT_RGB24, size.w, size.h));
   const CairoContext context(cairo_create(surface.get()));
   constexpr double kFull = 255;

@@ -20,7 +20,7 @@ Picture shown(int32_t kind, const std::string& file, int32_t size = 0) {
 }
 
 std::string fileOf(const std::string& name, const std::string& bytes) {
-  const std::string path = testing::TempDir() + "/" + name;
+  std::string path = testing::TempDir() + "/" + name;
   std::ofstream(path, std::ios::binary) << bytes;
   return path;
 }
