@@ -63,7 +63,7 @@ INSTANTIATE_TEST_SUITE_P(
         LossCase{"Application", raise, 1, "[EVENTSERVICE] AppEvent malloc fail!."},
         LossCase{"InputInTheQueue", sendInput, 2, "[EVENTSERVICE] saveQueue malloc fail!."},
         LossCase{"ApplicationInTheQueue", raise, 2, "[EVENTSERVICE] saveQueue malloc fail!."}),
-    rowName);
+    kRowName);
 
 TEST_F(WidgetTest, ADisplayItemThatFindsNoMemoryTakesNoIndex) {
   const SKIA_Rect rect = {1, 2, 3, 4, 5};

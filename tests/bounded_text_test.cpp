@@ -7,8 +7,8 @@
 
 namespace {
 
+using brimol::test::kRowName;
 using brimol::test::Row;
-using brimol::test::rowName;
 
 auto letters(std::size_t count) { return std::string(count, 'a'); }
 
@@ -43,7 +43,7 @@ INSTANTIATE_TEST_SUITE_P(
                     CutCase{"FourBytesAcross3", letters(126) + "\U0001f600x", 126},
                     CutCase{"NoCharacters", std::string(200, '\x80'), 127},
                     CutCase{"LeadBytesOnly", std::string(200, '\xF0'), 127}),
-    rowName);
+    kRowName);
 
 TEST(BoundedTextTest, NullIsEmpty) {
   EXPECT_EQ(MW::boundedText(nullptr), "");

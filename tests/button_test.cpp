@@ -162,7 +162,7 @@ INSTANTIATE_TEST_SUITE_P(
                                  {MW::kEventLongPress, kOutside, 0, true, 1, kHeld, "p"},
                                  {MW::kEventRelease, kInside, 0, true, 0, kNormal, "pc"}},
                                 {kPressedLog, "[BUTTON] long pressed!!", kReleasedLog}}),
-    rowName);
+    kRowName);
 
 TEST_F(ButtonTest, OtherCodesPassAHeldButton) {
   press(*button, kInside);
@@ -248,7 +248,7 @@ INSTANTIATE_TEST_SUITE_P(
                         "pcpcpcpcd",
                         2},
         DoubleClickCase{"AtTickZero", {{0, 0}, {900, 1000}, {1100, 1200}}, "pcpcpcd", 2}),
-    rowName);
+    kRowName);
 
 TEST_F(ButtonTest, ReleaseOutsideIsNoClickOfADoubleClick) {
   countDoubleClicks();

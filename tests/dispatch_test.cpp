@@ -92,7 +92,7 @@ INSTANTIATE_TEST_SUITE_P(
         RouteCase{"SelectedHidden", {kSelectedHidden, kWidget}, 1, "iw", 0, 1},
         RouteCase{
             "NoSelectedPassForDialogs", {kDialog, {'s', 0, true, true, true}}, 1, "Ds", 1, 1}),
-    rowName);
+    kRowName);
 
 TEST_F(DispatchTest, PassesTheEventWithZero) {
   int calls = 0;

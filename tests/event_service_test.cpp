@@ -65,7 +65,7 @@ INSTANTIATE_TEST_SUITE_P(
                     ParseCase{"User", 24, {7, 0xFBFAF9F8, 0xF7F6F5F4}},
                     ParseCase{"Unlisted", 7, {8, 0, 0}}, ParseCase{"UnlistedZero", 0, {8, 0, 0}},
                     ParseCase{"UnlistedHighest", 255, {8, 0, 0}}),
-    rowName);
+    kRowName);
 
 TEST(EventParseTest, NullRecordsAreNoInput) {
   event_data data = {.type = 3, .value = 4};
@@ -207,7 +207,7 @@ INSTANTIATE_TEST_SUITE_P(
         HitCase{"JustBelowZero", kEverything, {-2, -2}, true, true},
         HitCase{"Highest", kEverything, {kMax, kMax}, false, false},
         HitCase{"WideAtTheEnd", {kMax - 5, kMax - 5, kMax, kMax, 0}, {kMax, kMax}, true, true}),
-    rowName);
+    kRowName);
 
 TEST(EventHitTest, OnlyPointersAreSomewhere) {
   for (int code = 0; code <= 8; ++code) {

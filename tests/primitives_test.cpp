@@ -126,7 +126,7 @@ TEST_P(Primitive, TakesNoEvents) {
   EXPECT_TRUE(widget->isActive());
 }
 
-INSTANTIATE_TEST_SUITE_P(Kinds, Primitive, testing::ValuesIn(kinds()), rowName);
+INSTANTIATE_TEST_SUITE_P(Kinds, Primitive, testing::ValuesIn(kinds()), kRowName);
 
 TEST_F(PrimitivesTest, OnlyAnImageBelievesALength) {
   SKIA_Text text = textRecord("abcdef");
@@ -163,7 +163,7 @@ INSTANTIATE_TEST_SUITE_P(Lengths, ImageLength,
                                          LengthCase{"FarTooMany", kMax, 3},
                                          LengthCase{"Negative", -1, 0},
                                          LengthCase{"Lowest", kMin, 0}),
-                         rowName);
+                         kRowName);
 
 TEST_F(PrimitivesTest, AbsentRecordsAreEmpty) {
   MW::Label label(nullptr, nullptr);
@@ -210,6 +210,6 @@ INSTANTIATE_TEST_SUITE_P(
                     LineCase{"Point", {3, 4, 3, 4, 7, 1}, {3, 4, 0, 0, 7}},
                     LineCase{
                         "Longest", {kMin, kMax, kMax, kMin, 7, 1}, {kMax, kMax, kMin, kMin, 7}}),
-    rowName);
+    kRowName);
 
 }  // namespace

@@ -9,8 +9,8 @@
 
 namespace {
 
+using brimol::test::kRowName;
 using brimol::test::Row;
-using brimol::test::rowName;
 using brimol::test::WidgetTest;
 using MW::Callback;
 using MW::Widget;
@@ -128,7 +128,7 @@ INSTANTIATE_TEST_SUITE_P(
         // A toggle at tick 0 stands for none and is set anew behind the wrap.
         BlinkCase{"SurvivesAToggleAtTickZero",
                   {{0xFFFFFE0C, kRed}, {0x10, kRed}, {0x204, kRed}, {0x205, kBlack}}}),
-    rowName);
+    kRowName);
 
 TEST_F(WidgetTest, BlinkEndsAndStartsAnew) {
   Widget widget;
@@ -169,7 +169,7 @@ INSTANTIATE_TEST_SUITE_P(
                     KeyCase{"SelectLeft", 327, 1, 0, 7, 1},
                     KeyCase{"SelectRight", 327, 0, -1, 7, 1},
                     KeyCase{"SelectNothing", 327, 0, 0, 7, 0}, KeyCase{"Up", 273, 1, 1, 7, 0}),
-    rowName);
+    kRowName);
 
 TEST(CallbackTest, WordsStandInOrder) {
   using Word = Callback Widget::*;

@@ -184,7 +184,7 @@ INSTANTIATE_TEST_SUITE_P(
                     ChangeCase{"AddsMany", addMany, "abc", "abc" + std::string(40, 'n')},
                     ChangeCase{"MovesTheNextToTheEnd", moveSecondToTheEnd, "ac", "acb"},
                     ChangeCase{"DrawsOnceMore", drawOnceMore, "aabcbc", "abc"}),
-    rowName);
+    kRowName);
 
 TEST_F(WindowTest, KnowsADefaultSize) {
   int width = 0;
@@ -239,7 +239,7 @@ INSTANTIATE_TEST_SUITE_P(Densities, WindowMura,
                                          MuraCase{"HugeLength", 400, 3e38F, 400, kIntMax},
                                          MuraCase{"NoDensity", kNan, 10, 0, 0},
                                          MuraCase{"NoLength", 400, kNan, 400, 0}),
-                         rowName);
+                         kRowName);
 
 TEST_F(WindowTest, AsksForTheDensityOnce) {
   platform().xdpi = platform().ydpi = 401.6F;

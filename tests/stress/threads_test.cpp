@@ -116,6 +116,6 @@ INSTANTIATE_TEST_SUITE_P(Ways, Leaving,
                                          LeaveCase{"Deleted", false, destroy},
                                          LeaveCase{"DeletedWhenGone", true, destroy},
                                          LeaveCase{"RemovedByAnEqualId", false, unregisterTwin}),
-                         rowName);
+                         kRowName);
 
 }  // namespace

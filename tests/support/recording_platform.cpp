@@ -217,10 +217,11 @@ void getDpi(float* xdpi, float* ydpi) {
   *ydpi = platform().ydpi;
 }
 
-int property_get(const char* key, char* value, const char* fallback) {
+// NOLINTNEXTLINE(readability-identifier-naming): the contract's name
+int property_get(const char* key, char* value, const char* default_value) {
   const auto found = platform().properties.find(key);
   const std::string text = found != platform().properties.end() ? found->second
-                           : fallback != nullptr                ? fallback
+                           : default_value != nullptr           ? default_value
                                                                 : "";
   const std::size_t length = text.copy(value, BRIMOL_PROPERTY_BYTES - 1);
   value[length] = '\0';

@@ -17,12 +17,13 @@ namespace brimol::test {
 
 /// What the rows of a table of cases begin with.
 struct Row {
+  constexpr Row(const char* rowsName) : name(rowsName) {}  // a table begins its rows with the text
   const char* name;
 };
 std::ostream& operator<<(std::ostream& out, const Row& row);
 
 /// Names a table's tests after its rows.
-inline constexpr auto rowName = [](const auto& info) { return std::string(info.param.name); };
+inline constexpr auto kRowName = [](const auto& info) { return std::string(info.param.name); };
 
 /// A place on the screen, in pixels.
 struct Spot {
