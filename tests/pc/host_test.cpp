@@ -1,46 +1,45 @@
-// The C calls as an application makes them, without a window or with one that nobody sees.
+// The platform as an application and its user meet it, without a window or with one that nobody
+// sees.
 #include <brimol/display.h>
 #include <brimol/frame.h>
 #include <brimol/host.h>
 #include <brimol/input.h>
-#include <brimol/scene.h>
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
-
 #include <unistd.h>
 
 #include <atomic>
-#include <cmath>
 #include <cstdlib>
 #include <filesystem>
+#include <latch>
 #include <thread>
 
-#include "cairo_handles.h"
 #include "input/input_service.h"
 #include "open_platform.h"
 #include "painting.h"
 #include "record_text.h"
+#include "recorder.h"
 
 namespace brimol::pc {
 namespace {
 
 namespace fs = std::filesystem;
+using std::chrono::milliseconds;
 using testing::HasSubstr;
 
-constexpr std::uint32_t kGreen = 0xFF00FF00;
+constexpr Size kScreen = {200, 300};
+constexpr milliseconds kLong{60'000};  // longer than anything takes here
+const Frame kRedFrame = {boxItem({10, 20, 30, 40, kRed})};
+const Frame kBlueFrame = {boxItem({0, 0, 200, 300, kBlue})};
 
-void showBox(const SKIA_Rect& box) {
+void show(const Frame& frame) {
   skia_begin_frame_c();
-  skia_add_box_c(box);
+  for (const SKIA_Item& item : frame) skia_add_widget_c(&item);
   skia_end_frame_c();
 }
 
-/// The colour of a pixel in a picture file; 0 where there is none.
-std::uint32_t colourAt(const fs::path& file, int x, int y) {
-  const CairoSurface surface(cairo_image_surface_create_from_png(file.c_str()));
-  if (cairo_surface_status(surface.get()) != CAIRO_STATUS_SUCCESS) return 0;
-  const Picture picture = pictureOf(surface.get());
-  return x < picture.size.w && y < picture.size.h ? kBlack | picture.at(x, y) : 0;
+void setEnvironment(const char* display, const char* screen) {
+  setenv("BRIMOL_DISPLAY", display, 1);
+  setenv("BRIMOL_SCREEN", screen, 1);
 }
 
 class HostTest : public testing::Test {
@@ -54,59 +53,60 @@ class HostTest : public testing::Test {
     fs::remove_all(folder);
   }
 
-  static void setEnvironment(const char* display, const char* screen) {
-    setenv("BRIMOL_DISPLAY", display, 1);
-    setenv("BRIMOL_SCREEN", screen, 1);
+  static Picture screen() {
+    const CairoSurface copy = openedPlatform()->copyPicture(kLong);
+    return copy ? pictureOf(copy.get()) : Picture{};
+  }
+  /// Keeps the platform's thread busy until `release` counts down.
+  void keepBusy() {
+    std::latch begun(1);
+    openedPlatform()->act([this, &begun](InputTranslator&) {
+      begun.count_down();
+      release.wait();
+    });
+    begun.wait();
   }
 
   const fs::path folder = fs::path(testing::TempDir()) / ("host_test." + std::to_string(getpid()));
   const fs::path shot = folder / "shot.png";
+  std::latch release{1};
 };
 
-TEST_F(HostTest, ShowsFramesAndTakesScreenshots) {
-  ASSERT_EQ(brimol_host_open(), 1);
-  showBox({0, 0, 200, 300, kGreen});
-  showBox({10, 20, 30, 40, kRed});
-  ASSERT_EQ(brimol_host_screenshot(shot.c_str()), 1) << brimol_host_error();
-  EXPECT_EQ(colourAt(shot, 10, 20), kRed);
-  EXPECT_EQ(colourAt(shot, 39, 59), kRed);
-  EXPECT_EQ(colourAt(shot, 40, 60), kBlack) << "the frame before is gone";
-  EXPECT_EQ(colourAt(shot, 199, 299), kBlack) << "the picture has the screen's size";
-  EXPECT_EQ(std::distance(fs::directory_iterator(folder), {}), 1) << "nothing else was left";
-}
-
-TEST_F(HostTest, OpensOnceAndAgainAfterItWasClosed) {
-  for (const int side : {100, 250}) {
-    const std::string size = std::to_string(side) + "x80";
-    setEnvironment("headless", size.c_str());
-    EXPECT_EQ(brimol_host_open(), 1);
+TEST_F(HostTest, OpensShowsAndClosesAgainAndAgain) {
+  setenv("SDL_VIDEODRIVER", "dummy", 1);
+  for (const char* const display : {"headless", "window", "headless"}) {
+    setEnvironment(display, "3000x2000");
+    EXPECT_EQ(brimol_host_open(), 1) << brimol_host_error();
     EXPECT_EQ(EventInit(0), 1) << "open already";
-    EXPECT_EQ(brimol_host_open(), 1) << "open already";
+    setEnvironment(display, "77x77");
+    Size size = {};
+    brimol_host_screen_size(&size.w, nullptr);
+    brimol_host_screen_size(nullptr, &size.h);
+    EXPECT_EQ(size, (Size{3000, 2000}));
+    show(kBlueFrame);
+    show(kRedFrame);
+    ASSERT_EQ(brimol_host_screenshot(shot.c_str()), 1) << brimol_host_error();
+    const CairoSurface file(cairo_image_surface_create_from_png(shot.c_str()));
+    EXPECT_EQ(pictureOf(file.get()), painted(kRedFrame, {3000, 2000})) << "in full size";
+    EXPECT_EQ(std::distance(fs::directory_iterator(folder), {}), 1) << "nothing else was left";
     EXPECT_NE(skia_live_widget_c(), 0);
-    showBox({side - 1, 79, 1, 1, kRed});
-    EXPECT_EQ(brimol_host_screenshot(shot.c_str()), 1);
-    EXPECT_EQ(colourAt(shot, side - 1, 79), kRed);
+    EventQuit();
     EventQuit();
     EXPECT_EQ(skia_live_widget_c(), 0);
-    EventQuit();
   }
 }
 
-TEST_F(HostTest, SaysWhatIsWrongWithTheEnvironment) {
-  setEnvironment("headless", "abc");
-  EXPECT_EQ(brimol_host_open(), 0);
-  EXPECT_STREQ(brimol_host_error(), "BRIMOL_SCREEN=abc: wanted WIDTHxHEIGHT, each 1 to 16384");
-  testing::internal::CaptureStderr();
-  EXPECT_EQ(EventInit(0), 0);
-  EXPECT_EQ(testing::internal::GetCapturedStderr(), std::string(brimol_host_error()) + "\n");
-}
-
-TEST_F(HostTest, SaysThatThereIsNoDisplay) {
+TEST_F(HostTest, SaysWhyItDoesNotOpen) {
   setEnvironment("window", "200x300");
   setenv("SDL_VIDEODRIVER", "none", 1);
   EXPECT_EQ(brimol_host_open(), 0);
   EXPECT_THAT(brimol_host_error(), HasSubstr("cannot open a window"));
-  unsetenv("SDL_VIDEODRIVER");
+  setEnvironment("headless", "abc");
+  EXPECT_EQ(brimol_host_open(), 0);
+  testing::internal::CaptureStderr();
+  EXPECT_EQ(EventInit(0), 0);
+  EXPECT_EQ(testing::internal::GetCapturedStderr(), std::string(brimol_host_error()) + "\n");
+  EXPECT_STREQ(brimol_host_error(), "BRIMOL_SCREEN=abc: wanted WIDTHxHEIGHT, each 1 to 16384");
 }
 
 TEST_F(HostTest, WritesNoBrokenScreenshot) {
@@ -114,88 +114,122 @@ TEST_F(HostTest, WritesNoBrokenScreenshot) {
   EXPECT_STREQ(brimol_host_error(), "no screen is open");
   ASSERT_EQ(brimol_host_open(), 1);
   EXPECT_EQ(brimol_host_screenshot(nullptr), 0);
-  EXPECT_EQ(brimol_host_screenshot(""), 0);
   EXPECT_EQ(brimol_host_screenshot((folder / "none" / "shot.png").c_str()), 0);
   EXPECT_THAT(brimol_host_error(), HasSubstr("none/shot.png: No such file or directory"));
   EXPECT_EQ(brimol_host_screenshot(folder.c_str()), 0);
-  EXPECT_THAT(brimol_host_error(), HasSubstr("is not a file"));
   EXPECT_EQ(brimol_host_screenshot("/dev/null"), 0) << "a device is not replaced";
+  EXPECT_THAT(brimol_host_error(), HasSubstr("is not a file"));
   EXPECT_TRUE(fs::is_empty(folder));
 }
 
-TEST_F(HostTest, TellsSizeAndDensityOpenOrNot) {
-  int width = 0;
-  int height = 0;
-  brimol_host_screen_size(&width, &height);
-  EXPECT_EQ((Size{width, height}), (Size{200, 300})) << "what it would be";
+TEST_F(HostTest, EachDrawingCallShowsItsKind) {
   ASSERT_EQ(brimol_host_open(), 1);
-  setEnvironment("headless", "77x77");
-  brimol_host_screen_size(&width, nullptr);
-  brimol_host_screen_size(nullptr, &height);
-  EXPECT_EQ((Size{width, height}), (Size{200, 300})) << "what is open";
-  float xdpi = 0;
-  float ydpi = 0;
-  getDpi(&xdpi, nullptr);
-  getDpi(nullptr, &ydpi);
-  EXPECT_NEAR(std::hypot(1440 / xdpi, 2560 / ydpi), 6, 0.01) << "inches of the default screen";
-  EXPECT_EQ(brimol_host_close_requested(), 0);
+  const SKIA_Text text = textOf("words");
+  const SKIA_Point point = {150, 6, 190, 280, kBlue, 9};
+  Frame frame;
+  for (int i = 0; i <= 10; ++i) frame.push_back({i, {i * 3, i * 25, 120, 24, kRed}, point, text});
+  skia_begin_frame_c();
+  skia_add_label_c(frame[SKIA_LABEL].rect, text);
+  skia_add_textbox_c(frame[SKIA_TEXTBOX].rect, text);
+  skia_add_buttonbox_c(frame[SKIA_BUTTONBOX].rect, text);
+  skia_add_box_c(frame[SKIA_BOX].rect);
+  skia_add_roundbox_c(frame[SKIA_ROUNDBOX].rect);
+  skia_add_staticbox_c(frame[SKIA_STATICBOX].rect, text);
+  skia_add_line_c(point);
+  skia_add_widget_c(&frame[SKIA_IMAGE]);
+  skia_add_roundtextbox_c(frame[SKIA_ROUNDTEXTBOX].rect, text);
+  skia_add_roundbuttonbox_c(frame[SKIA_ROUNDBUTTONBOX].rect, text);
+  EXPECT_EQ(skia_add_arrow_c(frame[SKIA_ARROW].rect, point), 10);
+  skia_end_frame_c();
+  EXPECT_EQ(screen(), painted(frame, kScreen));
 }
 
-TEST_F(HostTest, DeliversInputUntilItIsClosed) {
+TEST_F(HostTest, TakesItemsOnlyIntoTheThreadsOwnFrameWithRoom) {
+  ASSERT_EQ(brimol_host_open(), 1);
+  const SKIA_Rect box = {0, 0, 9, 9, kRed};
+  const auto expectNotTaken = [&box] { EXPECT_EQ(skia_add_box_c(box), kNotTaken); };
+  expectNotTaken();
+  skia_end_frame_c();
+  skia_begin_frame_c();
+  skia_add_box_c(box);
+  skia_begin_frame_c();  // drops the frame that was not ended
+  const SKIA_Item unknown = boxItem(box, SKIA_ARROW + 1);
+  EXPECT_EQ(skia_add_widget_c(&unknown), kNotTaken);
+  EXPECT_EQ(skia_add_widget_c(nullptr), kNotTaken);
+  std::thread(expectNotTaken).join();
+  for (int i = 0; i < kMostItems; ++i) ASSERT_EQ(skia_add_box_c({}), i);
+  expectNotTaken();
+  skia_end_frame_c();
+  expectNotTaken();
+  EXPECT_EQ(screen(), painted({}, kScreen));
+}
+
+TEST_F(HostTest, ShowsTheNewestFrameAndKeepsNobodyWaiting) {
+  ASSERT_EQ(brimol_host_open(), 1);
+  EXPECT_EQ(screen(), painted({}, kScreen)) << "before any frame";
+  keepBusy();
+  for (int i = 0; i < 1000; ++i) show(kRedFrame);
+  show(kBlueFrame);
+  EXPECT_EQ(openedPlatform()->copyPicture(milliseconds(1)), nullptr) << "the thread is busy";
+  release.count_down();
+  EXPECT_EQ(screen(), painted(kBlueFrame, kScreen));
+}
+
+TEST_F(HostTest, AnswersWhoWaitsForAPictureAsItCloses) {
+  ASSERT_EQ(brimol_host_open(), 1);
+  const auto platform = openedPlatform();
+  keepBusy();
+  std::thread waiter([&] { EXPECT_EQ(platform->copyPicture(kLong), nullptr); });
+  std::thread closer([] { EventQuit(); });
+  const auto notAnyMore = [](InputTranslator&) { ADD_FAILURE() << "done though it closes"; };
+  while (platform->act(notAnyMore)) std::this_thread::yield();
+  release.count_down();
+  closer.join();
+  waiter.join();
+  EXPECT_EQ(platform->copyPicture(kLong), nullptr) << "closed";
+}
+
+TEST_F(HostTest, ReportsALongPressByHandAndByItself) {
   ASSERT_EQ(EventInit(0), 1);
-  openedPlatform()->act([](InputTranslator& input) { input.pointerDown(kMouse, {500, 7}, 0); });
-  Event record = {};
-  while (PollEvent(&record) == 0) Delay(60'000);
-  EXPECT_EQ(textOf(record), "down 0 at 199,7");
-  inputService().takeHand(GetTicks());
-  std::thread waiter([] { Delay(200); });
-  EventQuit();
-  waiter.join();  // the hand is gone: nobody waits for it any more
-  EXPECT_EQ(PollEvent(&record), 0);
-}
-
-// SDL's own driver without a screen: everything but the pixels on a desktop.
-TEST_F(HostTest, RunsAWindowThatNobodySees) {
-  setEnvironment("window", "3000x3000");
-  setenv("SDL_VIDEODRIVER", "dummy", 1);
-  for (int round = 0; round < 3; ++round) {
-    ASSERT_EQ(brimol_host_open(), 1) << brimol_host_error();
-    showBox({0, 0, 3000, 3000, kGreen});
-    showBox({2999, 2999, 1, 1, kRed});
-    ASSERT_EQ(brimol_host_screenshot(shot.c_str()), 1) << brimol_host_error();
-    EXPECT_EQ(colourAt(shot, 2999, 2999), kRed) << "in full size, whatever the window's";
-    EventQuit();
+  const auto expectNext = [](const char* text) {
+    Event record = {};
+    while (PollEvent(&record) == 0) Delay(60'000);
+    EXPECT_EQ(textOf(record), text);
+  };
+  inputService().takeHand(1000);
+  for (const uint32_t advance : {500, 0}) {
+    openedPlatform()->act([](InputTranslator& in) {
+      in.pointerDown(kMouse, {999, 7}, GetTicks());
+    });
+    expectNext("down 0 at 199,7");
+    inputService().advance(advance);
+    expectNext("long 0 at 199,7");
+    openedPlatform()->act([](InputTranslator& in) { in.releaseAll(); });
+    expectNext("up 0 at 199,7");
+    inputService().letGo();
   }
-  unsetenv("SDL_VIDEODRIVER");
 }
 
 TEST_F(HostTest, SurvivesDrawingAndPollingWhileItOpensAndCloses) {
   std::atomic<bool> isOver = false;
   std::thread drawer([&] {
-    while (!isOver) showBox({0, 0, 200, 300, kRed});
+    while (!isOver) show(kRedFrame);
   });
   std::thread poller([&] {
-    Event record = {};
-    while (!isOver) {
-      if (PollEvent(&record) == 0) Delay(1);
-      skia_live_widget_c();
+    for (Event record = {}; !isOver; Delay(1)) {
+      PollEvent(&record);
+      inputService().advance(1);
     }
   });
   for (int round = 0; round < 20; ++round) {
     EXPECT_EQ(brimol_host_open(), 1);
     EXPECT_EQ(brimol_host_screenshot(shot.c_str()), 1);
-    EventQuit();
+    inputService().takeHand(GetTicks());
+    EventQuit();  // and the clock is real again: nobody waits for the hand any more
   }
   isOver = true;
   drawer.join();
   poller.join();
-}
-
-TEST(HostHelp, HasAShortLineForEachKeyAndForTheMouse) {
-  const std::string help = brimol_host_help();
-  EXPECT_THAT(help, HasSubstr("Left button"));
-  EXPECT_THAT(help, HasSubstr("Enter"));
-  EXPECT_EQ(help.back(), '\n');
 }
 
 }  // namespace

@@ -1,117 +1,92 @@
+// What the user does with mouse, fingers and keys, and the records that come of it.
 #include "input/input_translator.h"
 
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
+#include <array>
+#include <limits>
+
+#include "input/keymap.h"
 #include "record_text.h"
+#include "sdl_input.h"
 
 namespace brimol::pc {
 namespace {
 
 using testing::ElementsAre;
-using testing::IsEmpty;
 
-constexpr PointerId kThumb = {1, 40};
-constexpr PointerId kIndex = {1, 41};
-constexpr PointerId kOtherDevice = {2, 40};
+constexpr Size kScreen = {1000, 2000};
+constexpr Size kWindow = {500, 1000};
+constexpr float kNoNumber = std::numeric_limits<float>::quiet_NaN();
+constexpr float kInfinity = std::numeric_limits<float>::infinity();
+
+SDL_Event mouse(Uint32 type, int x, int y, Uint8 which = SDL_BUTTON_LEFT, Uint32 device = 0) {
+  SDL_Event event = {};
+  event.button = {type, 0, 0, device, which, 0, 0, 0, x, y};  // a motion has them in the same place
+  return event;
+}
+SDL_Event touch(Uint32 type, SDL_FingerID finger, float x, float y, SDL_TouchID device = 7) {
+  SDL_Event event = {};
+  event.tfinger = {type, 0, device, finger, x, y, 0, 0, 0, 0};
+  return event;
+}
+SDL_Event key(Uint32 type, SDL_Keycode code) {
+  SDL_Event event = {};
+  event.key = {type, 0, 0, 0, 0, 0, 0, {SDL_SCANCODE_UNKNOWN, code, 0, 0}};
+  return event;
+}
+
+struct Play {
+  const char* name;
+  std::vector<SDL_Event> events;
+  std::vector<std::string> records;
+};
+
+constexpr Uint32 kDown = SDL_MOUSEBUTTONDOWN;
+constexpr Uint32 kMove = SDL_MOUSEMOTION;
+constexpr Uint32 kUp = SDL_MOUSEBUTTONUP;
+
+const auto kPlays = std::to_array<Play>({
+    {"the left button alone, and no mouse that a touch plays",
+     {mouse(kMove, 1, 1), mouse(kDown, 0, 0, SDL_BUTTON_RIGHT),
+      mouse(kDown, 0, 0, SDL_BUTTON_LEFT, SDL_TOUCH_MOUSEID), mouse(kDown, 499, 999),
+      mouse(kMove, -9, 999), mouse(kMove, -99, 999), mouse(kUp, 0, 0), mouse(kUp, 0, 0)},
+     {"down 0 at 999,1999", "motion 0 at 0,1999 by -999,0", "up 0 at 0,0"}},
+    {"touches, the lowest free finger each, and none that the mouse plays",
+     {touch(SDL_FINGERDOWN, 5, 0, 0, SDL_MOUSE_TOUCHID), touch(SDL_FINGERDOWN, 5, 1, kInfinity),
+      touch(SDL_FINGERDOWN, 6, kNoNumber, -3), touch(SDL_FINGERDOWN, 5, 0, 0, 8),
+      touch(SDL_FINGERUP, 5, 1, 1), touch(SDL_FINGERMOTION, 6, 1, 0), mouse(kDown, 0, 0)},
+     {"down 0 at 999,1999", "down 1 at 0,0", "down 2 at 0,0", "up 0 at 999,1999",
+      "motion 1 at 999,0 by 999,0", "down 0 at 0,0"}},
+    {"Shift pins the mouse's fingers",
+     {key(SDL_KEYDOWN, SDLK_LSHIFT), mouse(kDown, 0, 0), mouse(kUp, 499, 0), mouse(kDown, 0, 999),
+      touch(SDL_FINGERDOWN, 5, 0, 0), touch(SDL_FINGERUP, 5, 0, 0), key(SDL_KEYDOWN, SDLK_RSHIFT),
+      key(SDL_KEYUP, SDLK_LSHIFT), mouse(kMove, 0, 0), key(SDL_KEYUP, SDLK_RSHIFT),
+      mouse(kUp, 0, 0)},
+     {"down 0 at 0,0", "motion 0 at 999,0 by 999,0", "down 1 at 0,1999", "down 2 at 0,0",
+      "up 2 at 0,0", "motion 1 at 0,0 by 0,-1999", "up 0 at 999,0", "up 1 at 0,0"}},
+    {"keys, once however they repeat",
+     {key(SDL_KEYUP, SDLK_UP), key(SDL_KEYDOWN, SDLK_UP), key(SDL_KEYDOWN, SDLK_UP),
+      key(SDL_KEYDOWN, SDLK_q), key(SDL_KEYDOWN, SDLK_RETURN), key(SDL_KEYDOWN, SDLK_KP_ENTER),
+      key(SDL_KEYUP, SDLK_RETURN), key(SDL_KEYUP, SDLK_KP_ENTER), key(SDL_KEYUP, SDLK_UP)},
+     {"key down 273", "key down 327", "key up 327", "key up 273"}},
+});
 
 class TranslatorTest : public testing::Test {
  protected:
   TranslatorTest() { service.open(); }
-  std::vector<std::string> taken() { return takeTexts(service); }
 
   InputService service;
-  InputTranslator input{{1000, 2000}, service};
+  InputTranslator input{kScreen, service};
 };
 
-TEST_F(TranslatorTest, TellsPressMotionAndReleaseOfTheMouse) {
-  input.pointerMove(kMouse, {1, 1}, 0);
-  input.pointerDown(kMouse, {10, 20}, 0);
-  input.pointerMove(kMouse, {15, 18}, 1);
-  input.pointerMove(kMouse, {15, 18}, 2);
-  input.pointerUp(kMouse, {16, 18}, 3);
-  input.pointerUp(kMouse, {16, 18}, 4);
-  EXPECT_THAT(taken(),
-              ElementsAre("down 0 at 10,20", "motion 0 at 15,18 by 5,-2", "up 0 at 16,18"));
-}
-
-TEST_F(TranslatorTest, GivesEveryPointerTheLowestFreeFinger) {
-  input.pointerDown(kThumb, {1, 1}, 0);
-  input.pointerDown(kMouse, {2, 2}, 0);
-  input.pointerDown(kOtherDevice, {3, 3}, 0);
-  input.pointerUp(kThumb, {1, 1}, 1);
-  input.pointerMove(kOtherDevice, {4, 3}, 1);
-  input.pointerDown(kIndex, {5, 5}, 1);
-  input.pointerUp(kOtherDevice, {4, 3}, 2);
-  input.pointerUp(kMouse, {2, 2}, 2);
-  EXPECT_THAT(taken(),
-              ElementsAre("down 0 at 1,1", "down 1 at 2,2", "down 2 at 3,3", "up 0 at 1,1",
-                          "motion 2 at 4,3 by 1,0", "down 0 at 5,5", "up 2 at 4,3", "up 1 at 2,2"));
-}
-
-TEST_F(TranslatorTest, IgnoresPointersBeyondTheFingers) {
-  for (int i = 0; i <= Pointers::kFingers; ++i) input.pointerDown({1, i}, {i, 0}, 0);
-  EXPECT_EQ(taken().size(), static_cast<std::size_t>(Pointers::kFingers));
-  input.pointerMove({1, Pointers::kFingers}, {50, 50}, 1);
-  input.pointerUp({1, Pointers::kFingers}, {50, 50}, 1);
-  EXPECT_THAT(taken(), IsEmpty());
-}
-
-TEST_F(TranslatorTest, KeepsPositionsOnTheScreen) {
-  input.pointerDown(kMouse, {-5, 2000}, 0);
-  input.pointerMove(kMouse, {5000, -1}, 1);
-  input.pointerMove(kMouse, {6000, -9}, 1);
-  input.pointerUp(kMouse, {1000, 3}, 2);
-  EXPECT_THAT(taken(),
-              ElementsAre("down 0 at 0,1999", "motion 0 at 999,0 by 999,-1999", "up 0 at 999,3"));
-}
-
-TEST_F(TranslatorTest, PinsFingersOfTheMouseWhileShiftIsDown) {
-  input.keyDown(SDLK_LSHIFT);
-  input.pointerDown(kMouse, {1, 1}, 0);
-  input.pointerUp(kMouse, {2, 1}, 1);
-  input.pointerDown(kMouse, {5, 5}, 2);
-  input.pointerMove(kMouse, {6, 5}, 3);
-  input.pointerDown(kThumb, {9, 9}, 3);
-  input.pointerUp(kThumb, {9, 9}, 3);
-  EXPECT_THAT(taken(), ElementsAre("down 0 at 1,1", "motion 0 at 2,1 by 1,0", "down 1 at 5,5",
-                                   "motion 1 at 6,5 by 1,0", "down 2 at 9,9", "up 2 at 9,9"));
-  input.keyDown(SDLK_RSHIFT);
-  input.keyUp(SDLK_LSHIFT);
-  EXPECT_THAT(taken(), IsEmpty());
-  input.keyUp(SDLK_RSHIFT);
-  input.pointerUp(kMouse, {6, 5}, 4);
-  EXPECT_THAT(taken(), ElementsAre("up 0 at 2,1", "up 1 at 6,5"));
-}
-
-TEST_F(TranslatorTest, ReportsLongPressesInTheOrderOfTime) {
-  input.pointerDown(kMouse, {1, 1}, 1000);
-  input.pointerDown(kThumb, {2, 2}, 1200);
-  EXPECT_EQ(input.msToLongPress(1300), 200u);
-  input.tick(1499);
-  input.pointerMove(kMouse, {2, 1}, 1499);
-  input.pointerUp(kMouse, {2, 1}, 1600);
-  EXPECT_EQ(input.msToLongPress(1600), 100u);
-  input.pointerUp(kThumb, {2, 2}, 1699);
-  input.tick(5000);
-  EXPECT_EQ(input.msToLongPress(5000), std::nullopt);
-  EXPECT_THAT(taken(), ElementsAre("down 0 at 1,1", "down 1 at 2,2", "motion 0 at 2,1 by 1,0",
-                                   "long 0 at 2,1", "up 0 at 2,1", "up 1 at 2,2"));
-}
-
-TEST_F(TranslatorTest, TellsEveryKeyOnceHoweverItRepeats) {
-  input.keyUp(SDLK_UP);
-  input.keyDown(SDLK_UP);
-  input.keyDown(SDLK_UP);
-  input.keyDown(SDLK_q);
-  input.keyDown(SDLK_RETURN);
-  input.keyDown(SDLK_KP_ENTER);
-  input.keyUp(SDLK_RETURN);
-  EXPECT_THAT(taken(), ElementsAre("key down 273", "key down 327"));
-  input.keyUp(SDLK_KP_ENTER);
-  input.keyUp(SDLK_q);
-  input.keyUp(SDLK_UP);
-  EXPECT_THAT(taken(), ElementsAre("key up 327", "key up 273"));
+TEST_F(TranslatorTest, MakesRecordsOfWhatTheUserDoes) {
+  for (const auto& [name, events, records] : kPlays) {
+    for (const SDL_Event& event : events) passOn(event, WindowFit::of(kScreen, kWindow), 0, input);
+    EXPECT_EQ(takeTexts(service), records) << name;
+    input.releaseAll();
+    takeTexts(service);
+  }
 }
 
 TEST_F(TranslatorTest, LiftsEverythingWhenTheFocusIsLost) {
@@ -119,16 +94,54 @@ TEST_F(TranslatorTest, LiftsEverythingWhenTheFocusIsLost) {
   input.keyDown(SDLK_h);
   input.pointerDown(kMouse, {1, 1}, 0);
   input.pointerUp(kMouse, {1, 1}, 0);
-  input.pointerDown(kMouse, {7, 7}, 0);
-  taken();
+  input.pointerDown(kMouse, {-7, 2000}, 0);
   input.releaseAll();
-  EXPECT_THAT(taken(), ElementsAre("key up 323", "up 0 at 1,1", "up 1 at 7,7"));
   input.keyUp(SDLK_h);
   input.pointerUp(kMouse, {7, 7}, 1);
   input.tick(1000);
-  input.pointerDown(kMouse, {8, 8}, 1000);
-  input.pointerUp(kMouse, {8, 8}, 1001);
-  EXPECT_THAT(taken(), ElementsAre("down 0 at 8,8", "up 0 at 8,8"));
+  EXPECT_THAT(takeTexts(service), ElementsAre("key down 323", "down 0 at 1,1", "down 1 at 0,1999",
+                                              "key up 323", "up 0 at 1,1", "up 1 at 0,1999"));
+}
+
+TEST_F(TranslatorTest, ReportsLongPressesInTheOrderOfTime) {
+  for (const uint32_t start : {0U, 0xFFFFFF00U}) {
+    input.pointerDown(kMouse, {1, 1}, start);
+    input.pointerDown({1, 40}, {2, 2}, start + 200);
+    EXPECT_EQ(input.msToLongPress(start + 300), 200U);
+    input.tick(start + 499);
+    input.pointerMove(kMouse, {2, 1}, start + 499);
+    input.pointerUp(kMouse, {2, 1}, start + 500);
+    EXPECT_EQ(input.msToLongPress(start + 600), 100U);
+    input.pointerUp({1, 40}, {2, 2}, start + 699);
+    EXPECT_EQ(input.msToLongPress(start + 800), std::nullopt);
+    EXPECT_THAT(takeTexts(service),
+                ElementsAre("down 0 at 1,1", "down 1 at 2,2", "motion 0 at 2,1 by 1,0",
+                            "long 0 at 2,1", "up 0 at 2,1", "up 1 at 2,2"));
+  }
+}
+
+TEST(LongPress, AllowsMotionOfTwoPercentOfTheWidth) {
+  const auto staysWith = [](int width, ScreenPoint by) {
+    LongPress finger(width);
+    finger.press({500, 500}, 0);
+    finger.move({500 + by.x, 500 + by.y});
+    finger.move({500, 500});  // coming back does not help
+    return finger.due(500) && !finger.due(501);
+  };
+  EXPECT_TRUE(staysWith(1000, {12, -16}));
+  EXPECT_FALSE(staysWith(1000, {-13, 16}));
+  EXPECT_TRUE(staysWith(1440, {0, 28}));
+  EXPECT_FALSE(staysWith(1440, {0, 29}));
+  EXPECT_FALSE(staysWith(16384, {16383, 0}));
+}
+
+TEST(Keymap, PlaysTheKeysOfThePhoneAndSaysWhich) {
+  std::vector<uint32_t> codes;
+  for (const SDL_Keycode code : {SDLK_UP, SDLK_DOWN, SDLK_RIGHT, SDLK_LEFT, SDLK_RETURN}) {
+    codes.push_back(phoneKey(code).value_or(0));
+  }
+  EXPECT_THAT(codes, ElementsAre(273, 274, 275, 276, 327));
+  EXPECT_THAT(helpText(), testing::HasSubstr("\n  Keypad Enter        select (327)\n"));
 }
 
 }  // namespace

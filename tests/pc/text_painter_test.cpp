@@ -1,177 +1,189 @@
+// Texts and picture files as an item shows them.
 #include "painter/text_painter.h"
 
 #include <gtest/gtest.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 #include <algorithm>
+#include <array>
+#include <clocale>
+#include <filesystem>
+#include <fstream>
 #include <limits>
-#include <span>
-#include <string>
 
+#include "painter/picture_cache.h"
 #include "painting.h"
 
 namespace brimol::pc {
 namespace {
 
-using Area = cairo_rectangle_int_t;
+using namespace std::string_literals;
 
 constexpr SKIA_Rect kWide = {20, 10, 400, 80, 0};
 constexpr Area kWideArea = {20, 10, 400, 80};
 constexpr Size kScreen = {440, 100};
 
-class TextPainterTest : public testing::Test {
- protected:
-  // What a canvas shows of the text in `rect`, of which no more than `clip` is painted.
-  Picture drawn(const SKIA_Text& text, SKIA_Rect rect = kWide, Area clip = kWideArea) {
-    const Canvas canvas(kScreen);
-    painter.draw(canvas, rect, text, clip);
-    return pictureOf(canvas.surface());
-  }
-
-  Area inkOf(const SKIA_Text& text) { return drawn(text).inked(); }
-
-  TextPainter painter = TextPainter(projectFontFiles());
-};
-
-TEST_F(TextPainterTest, AlignsLeftRightAndCentred) {
-  const Area left = inkOf(textOf("Hill", 40, kWhite, 1));
-  const Area right = inkOf(textOf("Hill", 40, kWhite, 2));
-  const Area centred = inkOf(textOf("Hill", 40, kWhite, 5));
-  EXPECT_NEAR(left.x, 20, 8);
-  EXPECT_NEAR(right.x + right.width, 420, 8);
-  EXPECT_NEAR(2 * centred.x + centred.width, 440, 8);
-  EXPECT_EQ(left.width, right.width);
-  for (const int32_t other : {0, 3, 4, 6, -1}) {
-    EXPECT_EQ(inkOf(textOf("Hill", 40, kWhite, other)), left) << other;
-  }
+/// A file for the test that runs.
+std::string fileOf(const std::string& name, const std::string& bytes) {
+  std::string path = testing::TempDir() + "/text_test." + std::to_string(getpid()) + name;
+  std::ofstream(path, std::ios::binary) << bytes;
+  return path;
 }
 
-TEST_F(TextPainterTest, SizeIsInPixelsAndCentredInHeight) {
-  // A capital of the font is 0.711 of the size high.
+Picture drawn(const SKIA_Text& text) {
+  return painted({textItem(SKIA_TEXTBOX, kWide, text)}, kScreen);
+}
+Picture drawn(std::string_view words, int32_t size = 40) { return drawn(textOf(words, size)); }
+
+TEST(Text, IsAlignedLineByLineAndCentredInHeight) {
+  const auto inkOf = [](int32_t align) { return drawn(textOf("Hill", 40, kWhite, align)).inked(); };
+  EXPECT_NEAR(inkOf(1).x, 20, 8);
+  EXPECT_NEAR(inkOf(2).x + inkOf(2).width, 420, 8);
+  EXPECT_NEAR(2 * inkOf(5).x + inkOf(5).width, 440, 8);
+  for (const int32_t other : {0, 3, 4, 6, -1}) EXPECT_EQ(inkOf(other), inkOf(1)) << other;
+  const Picture lines = drawn(textOf("i\nwide words", 30, kWhite, 2));
+  EXPECT_GT(lines.inkIn({410, 15, 10, 35}), 0) << "the short line stands at the right edge";
+  EXPECT_EQ(lines.inkIn({20, 15, 380, 30}), 0) << "and nowhere else";
   for (const int size : {20, 40, 60}) {
-    const Area ink = inkOf(textOf("H", size));
-    EXPECT_NEAR(ink.height, 0.711 * size, 1.5) << size;
+    const Area ink = drawn("H", size).inked();
+    EXPECT_NEAR(ink.height, 0.711 * size, 1.5) << "a capital's share of the size";
     EXPECT_NEAR(2 * ink.y + ink.height, 100, size / 5.0 + 2) << size;
   }
 }
 
-TEST_F(TextPainterTest, CutsAtTheRectangle) {
-  const SKIA_Text text = textOf("wide words that do not fit", 60, kWhite, 5);
-  const Picture whole = drawn(text);
-  EXPECT_GT(whole.inked().width, 390);
-  EXPECT_EQ(whole.inkIn({0, 0, 20, 100}) + whole.inkIn({420, 0, 20, 100}), 0);
-  const Picture part = drawn(text, kWide, {100, 30, 37, 21});
-  for (int y = 30; y < 51; ++y) {
-    for (int x = 100; x < 137; ++x) ASSERT_EQ(part.at(x, y), whole.at(x, y)) << x << "," << y;
-  }
-  EXPECT_EQ(part.inkIn({0, 0, 440, 100}), part.inkIn({100, 30, 37, 21}));
+TEST(Text, IsCutAtTheRectangle) {
+  const Picture text = drawn(textOf("wide words that do not fit", 120, kWhite, 5));
+  EXPECT_GT(text.inked().width, 350);
+  EXPECT_EQ(text.inkIn({0, 0, 440, 100}), text.inkIn(kWideArea));
 }
 
-TEST_F(TextPainterTest, EachLineIsAligned) {
-  const Picture picture = drawn(textOf("i\nwide words", 30, kWhite, 2));
-  EXPECT_GT(picture.inkIn({410, 15, 10, 35}), 0) << "the short line stands at the right edge";
-  EXPECT_EQ(picture.inkIn({20, 15, 380, 30}), 0) << "and nowhere else";
-  EXPECT_GT(picture.inkIn({20, 50, 400, 40}), 100) << "above the long one";
+TEST(Text, TakesColourAndAlphaFromTheRecord) {
+  const auto pixelOf = [](uint32_t color) { return drawn(textOf("████", 60, color)).at(60, 50); };
+  EXPECT_EQ(pixelOf(0xFF123456), 0x123456U);
+  EXPECT_EQ(pixelOf(0x80FFFFFF), 0x808080U);
+  EXPECT_EQ(pixelOf(0x00FFFFFF), 0U);
 }
 
-TEST_F(TextPainterTest, TakesColourAndAlphaFromTheRecord) {
-  const auto pixelsOf = [this](uint32_t color) {
-    return drawn(textOf("████", 60, color)).at(60, 50);
-  };
-  EXPECT_EQ(pixelsOf(0xFF123456), 0x123456U);
-  EXPECT_EQ(pixelsOf(0x80FFFFFF), 0x808080U);
-  EXPECT_EQ(pixelsOf(0x00FFFFFF), 0U);
-}
-
-TEST_F(TextPainterTest, ReadsNoMoreThanItsBytes) {
+TEST(Text, OfAnyLengthSizeAndBytesIsDrawnAsFarAsItGoes) {
+  const Picture nothing = drawn("");
   SKIA_Text text = textOf("HillHill", 40);
-  const Picture whole = drawn(text);
   text.string_len = 4;
-  EXPECT_EQ(drawn(text), drawn(textOf("Hill", 40)));
-  text.string_len = 1'000'000;
-  EXPECT_EQ(drawn(text), whole);
+  EXPECT_EQ(drawn(text), drawn("Hill"));
   text.string_len = -5;
-  EXPECT_EQ(drawn(text), drawn(textOf("", 40)));
+  EXPECT_EQ(drawn(text), nothing);
   std::ranges::fill(text.text, 'i');
   text.string_len = std::numeric_limits<int32_t>::max();
-  EXPECT_EQ(drawn(text), drawn(textOf(std::string(127, 'i'), 40)));
+  EXPECT_EQ(drawn(text), drawn(std::string(127, 'i')));
+  EXPECT_EQ(drawn("a\xFF z"), drawn("a\uFFFD z"));
+  EXPECT_EQ(drawn("H", -40), nothing);
+  EXPECT_EQ(drawn("H", std::numeric_limits<int32_t>::max()), drawn("H", 1024));
 }
 
-TEST_F(TextPainterTest, BytesThatAreNoCharacterShowAsReplacement) {
-  EXPECT_EQ(drawn(textOf("a\xFF z", 40)), drawn(textOf("a\uFFFD z", 40)));
-  EXPECT_EQ(drawn(textOf("a\xE4\xB8", 40)), drawn(textOf("a\uFFFD\uFFFD", 40)));
-  EXPECT_NE(drawn(textOf("a\xFF z", 40)), drawn(textOf("a z", 40)));
+TEST(Text, OfEveryScriptHasGlyphsAndDirection) {
+  const Picture missing = drawn("\U000F0000", 60);
+  for (const char* const sign : {"한", "中", "あ", "ש", "ع", "ไ", "ह", "Ж", "Ω"}) {
+    EXPECT_NE(drawn(sign, 60).inkIn(kWideArea), missing.inkIn(kWideArea)) << sign;
+    EXPECT_GT(drawn(sign, 60).inkIn(kWideArea), 50) << sign;
+  }
+  // Alef alone stands where a text of alef and three bets starts: at its right end.
+  const Area end = {390, 10, 30, 80};
+  const int alef = drawn(textOf("א", 60, kWhite, 2)).inkIn(end);
+  EXPECT_GT(alef, 50);
+  EXPECT_EQ(drawn(textOf("אבבב", 60, kWhite, 2)).inkIn(end), alef);
 }
 
-TEST_F(TextPainterTest, BoundsTheSize) {
-  const Picture nothing = drawn(textOf("", 40));
-  EXPECT_EQ(drawn(textOf("H", 0)), nothing);
-  EXPECT_EQ(drawn(textOf("H", -40)), nothing);
-  EXPECT_EQ(drawn(textOf("H", std::numeric_limits<int32_t>::max())), drawn(textOf("H", 1024)));
+// The sum of a picture with texts of many scripts, painted by a process of its own: what is painted
+// first settles much for the rest of a process.
+std::size_t sumWith(std::string setting) {
+  const std::string file = fileOf("sum", "");
+  const pid_t child = fork();
+  if (child == 0) {
+    putenv(setting.data());
+    std::setlocale(LC_ALL, "");
+    std::size_t sum = 0;
+    const Picture picture = drawn("fi İ i 骨直令 한 عربي ہے שלום हिन्दी ไทย Ж", 30);
+    for (const uint32_t pixel : picture.pixels) sum = sum * 31 + pixel;
+    std::ofstream(file) << sum << std::flush;
+    _exit(0);
+  }
+  waitpid(child, nullptr, 0);
+  std::size_t sum = 0;
+  EXPECT_TRUE(std::ifstream(file) >> sum);
+  return sum;
 }
 
-TEST_F(TextPainterTest, ScriptsOfTheListHaveTheirGlyphs) {
-  constexpr auto kPairs = std::to_array<std::pair<const char*, const char*>>({
-      {"한", "국"},
-      {"中", "文"},
-      {"日", "語"},
-      {"あ", "ん"},
-      {"ש", "ל"},
-      {"ع", "س"},
-      {"ไ", "ย"},
-      {"ह", "न"},
-      {"Ж", "Я"},
-      {"Ω", "Σ"},
-  });
-  const int missing = drawn(textOf("\U000F0000", 60)).inkIn(kWideArea);
-  for (const auto& [one, other] : kPairs) {
-    const Picture first = drawn(textOf(one, 60));
-    const Picture second = drawn(textOf(other, 60));
-    EXPECT_GT(first.inkIn(kWideArea), 50) << one;
-    EXPECT_NE(first, second) << one << " looks like " << other << ", a missing glyph?";
-    EXPECT_NE(first.inkIn(kWideArea), missing) << one;
+TEST(Text, LooksTheSameInAnySurroundings) {
+  const std::string fonts =
+      fileOf("fonts",
+             "<fontconfig><match target='font'><edit name='embolden' mode='assign'>"
+             "<bool>true</bool></edit></match><dir>/usr/share/fonts</dir></fontconfig>");
+  const std::size_t expected = sumWith("LC_ALL=C");
+  for (const auto& setting : {"LC_ALL=C.UTF-8"s, "PANGO_LANGUAGE=ja:ur:tr:mr:sr"s, "FC_LANG=ja"s,
+                              "GDK_DPI_SCALE=2"s, "FONTCONFIG_FILE=" + fonts}) {
+    EXPECT_EQ(sumWith(setting), expected) << setting;
   }
 }
 
-TEST_F(TextPainterTest, RightToLeftTextRunsFromTheRight) {
-  // Alef alone stands where a text of alef and three bets starts: at its right end.
-  const Picture text = drawn(textOf("אבבב", 60, kWhite, 2));
-  const Picture first = drawn(textOf("א", 60, kWhite, 2));
-  const Area end = {390, 10, 30, 80};
-  EXPECT_GT(first.inkIn(end), 50);
-  EXPECT_EQ(text.inkIn(end), first.inkIn(end));
+TEST(Text, KeepsABoundedNumberOfLayouts) {
+  TextPainter painter(projectFontFiles());
+  const Canvas canvas({1, 1});
+  for (int i = 0; i < 4000; ++i) {
+    painter.draw(canvas, kWide, textOf(std::to_string(i / 2), 10), {0, 0, 1, 1});
+    EXPECT_EQ(painter.layoutCount(),
+              std::min(static_cast<std::size_t>(i / 2 + 1), TextPainter::kMostLayouts));
+  }
 }
 
-TEST_F(TextPainterTest, KeepsABoundedNumberOfLayouts) {
-  drawn(textOf("kept", 30));
-  const Picture before = drawn(textOf("kept", 30));
-  EXPECT_EQ(painter.layoutCount(), 1U);
-  drawn(textOf("kept", 31));
-  drawn(textOf("kept", 30, kRed));
-  EXPECT_EQ(painter.layoutCount(), 3U);
-  for (int i = 0; i < 2000; ++i) drawn(textOf(std::to_string(i), 10));
-  EXPECT_EQ(painter.layoutCount(), TextPainter::kMostLayouts);
-  EXPECT_EQ(drawn(textOf("kept", 30)), before);
+/// A PNG file of one colour.
+std::string redFile() {
+  std::string path = fileOf("red.png", "");
+  Painter painter({3, 3});
+  painter.paint({boxItem({0, 0, 3, 3, kRed})});
+  EXPECT_EQ(cairo_surface_write_to_png(painter.picture(), path.c_str()), CAIRO_STATUS_SUCCESS);
+  return path;
 }
 
-TEST(MissingFontTest, IsToldOnceAndTextIsStillDrawn) {
-  const auto files = std::to_array<const char*>({"/nowhere/None.ttf", projectFontFiles()[0]});
-  testing::internal::CaptureStderr();
-  TextPainter painter(files);
-  const Canvas canvas(kScreen);
-  painter.draw(canvas, kWide, textOf("Hill", 40), kWideArea);
-  const std::string told = testing::internal::GetCapturedStderr();
-  EXPECT_EQ(std::ranges::count(told, '\n'), 1);
-  EXPECT_NE(told.find("/nowhere/None.ttf"), std::string::npos);
-  EXPECT_GT(pictureOf(canvas.surface()).inkIn(kWideArea), 100);
+Picture shown(int32_t kind, const std::string& file, int32_t size = 0) {
+  return painted({textItem(kind, {10, 10, 30, 20, 0}, textOf(file, size))});
 }
 
-TEST(MissingFontTest, WithoutAnyFontNothingFails) {
-  testing::internal::CaptureStderr();
-  TextPainter painter(std::span<const char* const>{});
-  const Canvas canvas(kScreen);
-  painter.draw(canvas, kWide, textOf("Hill 한국어", 40), kWideArea);
-  testing::internal::GetCapturedStderr();
-  EXPECT_EQ(canvas.size(), kScreen);
+TEST(PictureFile, FillsItsRectangleOrAnUnsizedLabel) {
+  const std::string file = redFile();
+  EXPECT_EQ(shown(SKIA_IMAGE, file), painted({boxItem({10, 10, 30, 20, kRed})}));
+  EXPECT_EQ(shown(SKIA_LABEL, file), shown(SKIA_IMAGE, file));
+  EXPECT_NE(shown(SKIA_LABEL, file, 12), shown(SKIA_IMAGE, file));
+  EXPECT_EQ(shown(SKIA_LABEL, ""), painted({}));
+}
+
+TEST(PictureFile, ThatIsNoneShowsAnOutlineWithADiagonal) {
+  const std::string pipe = fileOf("pipe", "") + "2";
+  mkfifo(pipe.c_str(), 0600);
+  const Picture missing = shown(SKIA_IMAGE, "/nowhere/none.png");
+  EXPECT_EQ(missing.inked(), (Area{10, 10, 30, 20}));
+  EXPECT_EQ(missing.at(10, 29), 0x808080U) << "the outline";
+  EXPECT_EQ(missing.at(25, 20), 0x808080U) << "the diagonal";
+  const std::string empty = fileOf("empty", "");
+  const std::string words = fileOf("text", "no picture at all, though long enough to be one");
+  for (const std::string& file : {pipe, testing::TempDir(), empty, words, "/dev/zero"s}) {
+    EXPECT_EQ(shown(SKIA_IMAGE, file), missing) << file;
+  }
+}
+
+TEST(PictureFile, IsKeptInABoundedCacheThatForgetsTheLeastRecent) {
+  PictureCache cache;
+  const std::string file = redFile();
+  EXPECT_EQ(cache.scaled(file, {8193, 1}), nullptr);
+  EXPECT_EQ(cache.scaled(file, {8000, 8000}), nullptr);
+  const auto isKept = [&](int width) { return cache.scaled(file, {width, 1000}) != nullptr; };
+  for (int width = 1001; width < 1030; ++width) EXPECT_TRUE(isKept(1000) && isKept(width));
+  std::filesystem::remove(file);
+  EXPECT_TRUE(isKept(1000) && isKept(1029) && isKept(1020)) << "from the cache";
+  EXPECT_FALSE(isKept(1001));
+  EXPECT_LE(cache.bytes(), PictureCache::kMostBytes);
+  EXPECT_EQ(redFile(), file);
+  EXPECT_TRUE(isKept(1001)) << "tried anew";
 }
 
 }  // namespace
