@@ -96,29 +96,27 @@ TEST_F(HostTest, OpensShowsAndClosesAgainAndAgain) {
   }
 }
 
-TEST_F(HostTest, SaysWhyItDoesNotOpen) {
-  setEnvironment("window", "200x300");
+TEST_F(HostTest, SaysWhyItDoesNotOpenOrWriteAScreenshot) {
+  const auto expectError = [](int result, const char* error) {
+    EXPECT_EQ(result, 0);
+    EXPECT_THAT(brimol_host_error(), HasSubstr(error));
+  };
   setenv("SDL_VIDEODRIVER", "none", 1);
-  EXPECT_EQ(brimol_host_open(), 0);
-  EXPECT_THAT(brimol_host_error(), HasSubstr("cannot open a window"));
+  setEnvironment("window", "200x300");
+  expectError(brimol_host_open(), "cannot open a window");
   setEnvironment("headless", "abc");
-  EXPECT_EQ(brimol_host_open(), 0);
+  expectError(brimol_host_open(), "BRIMOL_SCREEN=abc: wanted WIDTHxHEIGHT, each 1 to 16384");
   testing::internal::CaptureStderr();
   EXPECT_EQ(EventInit(0), 0);
   EXPECT_EQ(testing::internal::GetCapturedStderr(), std::string(brimol_host_error()) + "\n");
-  EXPECT_STREQ(brimol_host_error(), "BRIMOL_SCREEN=abc: wanted WIDTHxHEIGHT, each 1 to 16384");
-}
-
-TEST_F(HostTest, WritesNoBrokenScreenshot) {
-  EXPECT_EQ(brimol_host_screenshot(shot.c_str()), 0);
-  EXPECT_STREQ(brimol_host_error(), "no screen is open");
+  expectError(brimol_host_screenshot(shot.c_str()), "no screen is open");
+  setEnvironment("headless", "200x300");
   ASSERT_EQ(brimol_host_open(), 1);
-  EXPECT_EQ(brimol_host_screenshot(nullptr), 0);
-  EXPECT_EQ(brimol_host_screenshot((folder / "none" / "shot.png").c_str()), 0);
-  EXPECT_THAT(brimol_host_error(), HasSubstr("none/shot.png: No such file or directory"));
-  EXPECT_EQ(brimol_host_screenshot(folder.c_str()), 0);
-  EXPECT_EQ(brimol_host_screenshot("/dev/null"), 0) << "a device is not replaced";
-  EXPECT_THAT(brimol_host_error(), HasSubstr("is not a file"));
+  expectError(brimol_host_screenshot(nullptr), "needs a file name");
+  expectError(brimol_host_screenshot("/none/shot.png"),
+              "/none/shot.png: No such file or directory");
+  expectError(brimol_host_screenshot(folder.c_str()), "is not a file");
+  expectError(brimol_host_screenshot("/dev/null"), "is not a file");
   EXPECT_TRUE(fs::is_empty(folder));
 }
 
@@ -191,11 +189,6 @@ TEST_F(HostTest, AnswersWhoWaitsForAPictureAsItCloses) {
 
 TEST_F(HostTest, ReportsALongPressByHandAndByItself) {
   ASSERT_EQ(EventInit(0), 1);
-  const auto expectNext = [](const char* text) {
-    Event record = {};
-    while (PollEvent(&record) == 0) Delay(60'000);
-    EXPECT_EQ(textOf(record), text);
-  };
   inputService().takeHand(1000);
   for (const uint32_t advance : {500, 0}) {
     openedPlatform()->act([](InputTranslator& in) {
@@ -216,10 +209,7 @@ TEST_F(HostTest, SurvivesDrawingAndPollingWhileItOpensAndCloses) {
     while (!isOver) show(kRedFrame);
   });
   std::thread poller([&] {
-    for (Event record = {}; !isOver; Delay(1)) {
-      PollEvent(&record);
-      inputService().advance(1);
-    }
+    for (Event record = {}; !isOver; Delay(1)) PollEvent(&record);
   });
   for (int round = 0; round < 20; ++round) {
     EXPECT_EQ(brimol_host_open(), 1);

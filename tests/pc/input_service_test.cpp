@@ -84,19 +84,20 @@ TEST(InputService, TakesABoundedNumberOfRecordsWhileOpen) {
 }
 
 TEST(InputService, LosesNoWakeUp) {
-  constexpr uint32_t kRecords = 3000;
   InputService service;
   service.open();
   std::atomic<uint32_t> taken = 0;
   std::thread poller([&] {
-    for (Event record = {}; taken < kRecords; service.delay(kForeverMs)) {
-      if (!service.poll(record)) continue;
-      ++taken;
-      taken.notify_one();
-      if (taken == kRecords) return;
+    for (Event record = {}; taken < 3000;) {
+      if (!service.poll(record)) {
+        service.delay(kForeverMs);
+      } else {
+        ++taken;
+        taken.notify_one();
+      }
     }
   });
-  for (uint32_t posted = 0; posted < kRecords; ++posted) {
+  for (uint32_t posted = 0; posted < 3000; ++posted) {
     service.post(kKeyDown);
     taken.wait(posted);
   }

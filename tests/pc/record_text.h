@@ -2,6 +2,7 @@
 #pragma once
 
 #include <brimol/input.h>
+#include <gtest/gtest.h>
 
 #include <map>
 #include <sstream>
@@ -38,6 +39,13 @@ inline std::vector<std::string> takeTexts(InputService& service) {
   std::vector<std::string> texts;
   for (Event record = {}; service.poll(record);) texts.push_back(textOf(record));
   return texts;
+}
+
+/// Waits for the next record of the C calls and compares it.
+inline void expectNext(const std::string& text) {
+  Event record = {};
+  while (PollEvent(&record) == 0) Delay(60'000);
+  EXPECT_EQ(textOf(record), text);
 }
 
 }  // namespace brimol::pc

@@ -5,51 +5,36 @@
 
 #include <array>
 #include <string>
-#include <vector>
 
 #include "properties.h"
 
 namespace brimol::pc {
 namespace {
 
-constexpr const char* kNotSet = nullptr;
-
-struct SettingsCase {
-  const char* display;  // BRIMOL_DISPLAY
-  const char* screen;   // BRIMOL_SCREEN
-  const char* desktop;  // DISPLAY
-  DisplayChoice choice;
-  Size size;
-  std::string error;
-};
+// What the environment's BRIMOL_DISPLAY, BRIMOL_SCREEN and DISPLAY lead to.
+std::string textFor(const char* display, const char* screen, const char* desktop) {
+  const auto [settings, error] = readSettings([=](const std::string& name) -> const char* {
+    if (name == "BRIMOL_DISPLAY") return display;
+    if (name == "BRIMOL_SCREEN") return screen;
+    return name == "DISPLAY" ? desktop : nullptr;
+  });
+  constexpr auto kChoices = std::to_array<const char*>({"window", "either", "headless"});
+  return kChoices.at(static_cast<std::size_t>(settings.display)) + std::string(" ") +
+         std::to_string(settings.screen.w) + "x" + std::to_string(settings.screen.h) + error;
+}
 
 TEST(Settings, FollowTheEnvironment) {
-  constexpr auto kEither = DisplayChoice::WindowIfPossible;
-  const std::string wrongDisplay = ": wanted window or headless";
-  const std::string wrongSize = ": wanted WIDTHxHEIGHT, each 1 to 16384";
-  std::vector<SettingsCase> cases = {
-      {kNotSet, kNotSet, kNotSet, kEither, {1440, 2560}, ""},
-      {"", "", ":0", DisplayChoice::Window, {1440, 2560}, ""},
-      {"window", "7x9", kNotSet, DisplayChoice::Window, {7, 9}, ""},
-      {"headless", "1x16384", ":0", DisplayChoice::Headless, {1, 16384}, ""},
-      {"Window", "1x", ":0", kEither, kDefaultScreen, "BRIMOL_DISPLAY=Window" + wrongDisplay},
-      {"a\n\x7f\xc3\xa4", "", "", kEither, kDefaultScreen,
-       "BRIMOL_DISPLAY=a??\xc3\xa4" + wrongDisplay},
-  };
+  const std::string wanted = ": wanted window or headless";
+  EXPECT_EQ(textFor(nullptr, nullptr, nullptr), "either 1440x2560");
+  EXPECT_EQ(textFor("", "", ":0"), "window 1440x2560");
+  EXPECT_EQ(textFor("window", "7x9", nullptr), "window 7x9");
+  EXPECT_EQ(textFor("headless", "1x16384", ":0"), "headless 1x16384");
+  EXPECT_EQ(textFor("Window", "1x", ":0"), "either 1440x2560BRIMOL_DISPLAY=Window" + wanted);
+  EXPECT_EQ(textFor("a\n\x7f", "", ""), "either 1440x2560BRIMOL_DISPLAY=a??" + wanted);
   for (const char* const size : {"abc", "x1", "0x1", "-1x1", "+1x1", "16385x1", "1x", "1x-1",
                                  "99999999999x1", "10X1", " 10x1", "1x1 ", "10x20x1"}) {
-    cases.push_back(
-        {"", size, "", kEither, kDefaultScreen, std::string("BRIMOL_SCREEN=") + size + wrongSize});
-  }
-  for (const SettingsCase& wanted : cases) {
-    const auto [settings, error] = readSettings([&](const std::string& name) {
-      if (name == "BRIMOL_DISPLAY") return wanted.display;
-      if (name == "BRIMOL_SCREEN") return wanted.screen;
-      return name == "DISPLAY" ? wanted.desktop : kNotSet;
-    });
-    EXPECT_EQ(settings.display, wanted.choice) << wanted.error;
-    EXPECT_EQ(settings.screen, wanted.size) << wanted.error;
-    EXPECT_EQ(error, wanted.error);
+    EXPECT_EQ(textFor("", size, ""), std::string("either 1440x2560BRIMOL_SCREEN=") + size +
+                                         ": wanted WIDTHxHEIGHT, each 1 to 16384");
   }
 }
 

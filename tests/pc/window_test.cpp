@@ -5,7 +5,6 @@
 #include <brimol/scene.h>
 #include <gtest/gtest.h>
 
-#include <array>
 #include <cstdlib>
 
 #include "open_platform.h"
@@ -17,64 +16,40 @@ namespace {
 
 constexpr std::uint32_t kRed = 0xFFFF0000;
 constexpr std::uint32_t kBlue = 0xFF0000FF;
-constexpr Size kShown = {506, 900};  // the share of the desktop's height that the screen gets
+constexpr std::uint32_t kRgb = 0xFFFFFF;
 
-class WindowTest : public testing::Test {
- protected:
-  WindowTest() {
-    setenv("BRIMOL_DISPLAY", "window", 1);
-    unsetenv("BRIMOL_SCREEN");
-    EXPECT_EQ(brimol_host_open(), 1) << brimol_host_error();
-    place = desktop.findWindow();
-  }
-  ~WindowTest() override { EventQuit(); }
+/// Returns once everything so far is presented.
+void settle() { openedPlatform()->copyPicture(std::chrono::seconds(60)); }
 
-  /// Returns once everything so far is presented.
-  static void settle() { openedPlatform()->copyPicture(std::chrono::seconds(60)); }
-
-  /// The next two input records.
-  static std::string takeTwo() {
-    std::string taken;
-    Event record = {};
-    for (int count = 0; count < 2; ++count) {
-      while (PollEvent(&record) == 0) Delay(60'000);
-      taken += textOf(record) + "; ";
-    }
-    return taken;
-  }
-
+TEST(Window, ShowsTheScreenScaledDownAndTellsWhatTheUserDoesThere) {
+  setenv("BRIMOL_DISPLAY", "window", 1);
+  ASSERT_EQ(brimol_host_open(), 1) << brimol_host_error();
   const test::Desktop desktop;
-  test::Desktop::Place place;
-};
-
-TEST_F(WindowTest, ShowsTheWholeScreenScaledDown) {
-  EXPECT_EQ((Size{place.width, place.height}), kShown);
-  for (const auto& [x, first, last] :
-       {std::array{0U, kRed, kBlue}, std::array{720U, kBlue, kRed}}) {
-    const auto start = static_cast<int>(x);
+  const auto [window, x, y, width, height] = desktop.findWindow();
+  EXPECT_EQ((Size{width, height}), (Size{506, 900})) << "the desktop's height";
+  for (const bool isFirst : {true, false}) {
     skia_begin_frame_c();
     skia_add_box_c({0, 0, 1440, 2560, kBlue});
-    skia_add_box_c({start, 0, 720, 2560, kRed});
+    skia_add_box_c({isFirst ? 0 : 720, 0, 720, 2560, kRed});
     skia_end_frame_c();
     settle();
-    EXPECT_EQ(desktop.row(place.x, place.y + 450, 252), std::vector(252, first & 0xFFFFFF));
-    EXPECT_EQ(desktop.row(place.x + 254, place.y + 899, 252), std::vector(252, last & 0xFFFFFF));
+    const std::vector red(252, kRed & kRgb);
+    const std::vector blue(252, kBlue & kRgb);
+    EXPECT_EQ(desktop.row(x, y, 252), isFirst ? red : blue);
+    EXPECT_EQ(desktop.row(x + 254, y + 899, 252), isFirst ? blue : red);
   }
-}
-
-TEST_F(WindowTest, MapsClicksToTheScreen) {
-  const std::string lastPixel =
-      std::to_string(place.x + kShown.w - 1) + " " + std::to_string(place.y + kShown.h - 1);
+  const std::string lastPixel = std::to_string(x + 505) + " " + std::to_string(y + 899);
   ASSERT_EQ(std::system(("xdotool mousemove " + lastPixel + " click 1").c_str()), 0);
-  EXPECT_EQ(takeTwo(), "down 0 at 1439,2559; up 0 at 1439,2559; ");
-}
-
-TEST_F(WindowTest, ReleasesKeysAndTellsWhenItIsToBeClosed) {
+  expectNext("down 0 at 1439,2559");
+  expectNext("up 0 at 1439,2559");
+  EXPECT_EQ(brimol_host_close_requested(), 0);
   openedPlatform()->act([](InputTranslator& input) { input.keyDown(SDLK_UP); });
-  desktop.askToClose(place.window);
-  EXPECT_EQ(takeTwo(), "key down 273; key up 273; ");
+  expectNext("key down 273");
+  desktop.askToClose(window);
+  expectNext("key up 273");
   settle();
   EXPECT_NE(brimol_host_close_requested(), 0);
+  EventQuit();
 }
 
 }  // namespace
