@@ -24,7 +24,6 @@ namespace {
 
 namespace fs = std::filesystem;
 using std::chrono::milliseconds;
-using testing::HasSubstr;
 
 constexpr Size kScreen = {200, 300};
 constexpr milliseconds kLong{60'000};  // longer than anything takes here
@@ -99,8 +98,9 @@ TEST_F(HostTest, OpensShowsAndClosesAgainAndAgain) {
 TEST_F(HostTest, SaysWhyItDoesNotOpenOrWriteAScreenshot) {
   const auto expectError = [](int result, const char* error) {
     EXPECT_EQ(result, 0);
-    EXPECT_THAT(brimol_host_error(), HasSubstr(error));
+    EXPECT_THAT(brimol_host_error(), testing::HasSubstr(error));
   };
+  expectError(brimol_host_screenshot(shot.c_str()), "no screen is open");
   setenv("SDL_VIDEODRIVER", "none", 1);
   setEnvironment("window", "200x300");
   expectError(brimol_host_open(), "cannot open a window");
@@ -109,15 +109,11 @@ TEST_F(HostTest, SaysWhyItDoesNotOpenOrWriteAScreenshot) {
   testing::internal::CaptureStderr();
   EXPECT_EQ(EventInit(0), 0);
   EXPECT_EQ(testing::internal::GetCapturedStderr(), std::string(brimol_host_error()) + "\n");
-  expectError(brimol_host_screenshot(shot.c_str()), "no screen is open");
   setEnvironment("headless", "200x300");
   ASSERT_EQ(brimol_host_open(), 1);
   expectError(brimol_host_screenshot(nullptr), "needs a file name");
-  expectError(brimol_host_screenshot("/none/shot.png"),
-              "/none/shot.png: No such file or directory");
-  expectError(brimol_host_screenshot(folder.c_str()), "is not a file");
+  expectError(brimol_host_screenshot("/none/shot.png"), "/none/shot.png: No such file");
   expectError(brimol_host_screenshot("/dev/null"), "is not a file");
-  EXPECT_TRUE(fs::is_empty(folder));
 }
 
 TEST_F(HostTest, EachDrawingCallShowsItsKind) {
@@ -190,7 +186,7 @@ TEST_F(HostTest, AnswersWhoWaitsForAPictureAsItCloses) {
 TEST_F(HostTest, ReportsALongPressByHandAndByItself) {
   ASSERT_EQ(EventInit(0), 1);
   inputService().takeHand(1000);
-  for (const uint32_t advance : {500, 0}) {
+  for (const uint32_t advance : {500U, 0U}) {
     openedPlatform()->act([](InputTranslator& in) {
       in.pointerDown(kMouse, {999, 7}, GetTicks());
     });

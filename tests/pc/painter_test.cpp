@@ -80,8 +80,9 @@ TEST(Scene, RepaintsNoMoreThanWhatChanged) {
   const SKIA_Item label = textItem(SKIA_LABEL, {10, 10, 20, 20, kRed}, textOf("one"));
   const Frame some = {label, lineItem({10, 10, 20, 30, kRed, 2}), boxItem({5, 5, 9, 9, kBlue})};
   Frame more = some;
-  more[0].rect.color = kBlue;    // a label has no ground
-  more[0].text.text[100] = 'x';  // behind the NUL
+  more[0].rect.color = kBlue;       // a label has no ground
+  more[0].text.string_len = kMost;  // and what lies behind a NUL is not drawn
+  more[0].text.text[100] = 'x';
   more.insert(more.begin() + 1, boxItem({-5, 50, 10, kMost, kRed}));
   EXPECT_THAT(changedRegion(some, more, kScreen), ElementsAre(Area{0, 50, 5, 10}));
   EXPECT_THAT(changedRegion(more, some, kScreen), ElementsAre(Area{0, 50, 5, 10}));
