@@ -1,6 +1,4 @@
 /* Every header for C, as C sees it. */
-#include "c_api_test.h"
-
 #include <MW/c_api.h>
 #include <brimol/display.h>
 #include <brimol/frame.h>
@@ -9,17 +7,18 @@
 #include <brimol/properties.h>
 #include <brimol/scene.h>
 
-int addBoxFromC(int width) {
-  const SKIA_Rect rect = {1, 2, width, 4, 0xFF00FF00U};
-  return MWWList_addQueue_c(SKIA_BOX, &rect, 0, 0);
-}
+void callFromC(int results[7]);
 
-int raiseFlagFromC(void) { return EventService_AppEvent_c(0) + isDisplayUpdate_c(0); }
-
-int takeFlagFromC(void) { return isDisplayUpdate_c(1) + EventService_GetEvent_c(); }
-
-int isFirstFingerFromC(int type, unsigned int finger) {
-  mw_event_data event = {.type = type};
-  event.mouse.finger = finger;
-  return isFirstFinger_c(&event);
+/* What the entry points answer. */
+void callFromC(int results[7]) {
+  const SKIA_Rect rect = {1, 2, 33, 4, 0xFF00FF00U};
+  mw_event_data event = {.type = 2};
+  results[0] = MWWList_addQueue_c(SKIA_BOX, &rect, 0, 0);
+  results[1] = EventService_AppEvent_c(0) + isDisplayUpdate_c(0); /* raised, and taken */
+  results[2] = isDisplayUpdate_c(1) + EventService_GetEvent_c();
+  results[3] = EventService_GetEvent_c();
+  results[4] = isFirstFinger_c(&event);
+  event.mouse.finger = 1;
+  results[5] = isFirstFinger_c(&event);
+  results[6] = isFirstFinger_c(0);
 }

@@ -3,9 +3,12 @@
 
 #include <array>
 #include <bit>
-#include <limits>
-#include <thread>
+#include <cctype>
+#include <climits>
+#include <memory>
+#include <utility>
 
+#include "core/dispatch_thread.h"
 #include "core/input_thread.h"
 #include "support/widget_test.h"
 
@@ -15,221 +18,184 @@ using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's
 using MW::event_data;
 using MW::EventService;
 
-constexpr int kMax = std::numeric_limits<int>::max();
-constexpr int kMin = std::numeric_limits<int>::min();
-
+// The test's own threads of input and dispatch take a round when it says so.
 class EventServiceTest : public LiveWindowTest {
  protected:
   static EventService& service() { return *MW::Window::getEventService(); }
-
-  // The type of every event that is queued, and 6's value.
-  static std::vector<std::pair<int, int>> drain() {
-    std::vector<std::pair<int, int>> events;
-    while (const event_data* event = service().recvEvent()) {
-      events.emplace_back(event->type, event->type == MW::kEventApplication ? event->value : 0);
-    }
-    return events;
+  void dispatchOne() {
+    EXPECT_TRUE(dispatcher->threadLoop());
+    EXPECT_EQ(std::exchange(platform().paused, 0), 1U);
   }
+
+  const android::sp<MW::func_dispatchEvent> dispatcher = new MW::func_dispatchEvent;
+  const android::sp<MW::func_eventLoop> input = new MW::func_eventLoop;
 };
 
-struct ParseCase : Row {
-  uint8_t type;
-  std::vector<uint32_t> words;  // those of event_data that the type fills
-};
-
-class EventParse : public testing::TestWithParam<ParseCase> {};
-
-TEST_P(EventParse, FillsTheRecord) {
+TEST(EventParseTest, FillsTheRecord) {
   Event event = {};
   for (std::size_t i = 0; i < sizeof event; ++i) event.bytes[i] = static_cast<uint8_t>(0xF0 + i);
-  event.type = GetParam().type;
-  event_data data = {.type = -1, .mouse = {9, 9, 9, 9, 9, 9}};
-  EventService::parseEvent(&event, &data);
-  const auto words = std::bit_cast<std::array<uint32_t, 7>>(data);
-  for (std::size_t i = 0; i < GetParam().words.size(); ++i) {
-    EXPECT_EQ(words.at(i), GetParam().words[i]) << "word " << i + 1;
-  }
-}
-
-// The record's bytes are 0xF0 and up: unsigned ones stay so, and motion is negative.
-constexpr auto kXMotion = static_cast<uint32_t>(-0x0608);
-constexpr auto kYMotion = static_cast<uint32_t>(-0x0406);
-INSTANTIATE_TEST_SUITE_P(
-    Types, EventParse,
-    testing::Values(ParseCase{"Motion", 4, {0, 0xF3, 0xF2, 0xF5F4, 0xF7F6, kXMotion, kYMotion}},
-                    ParseCase{"Down", 5, {1, 0xF3, 0xF2, 0xF5F4, 0xF7F6, 0, 0}},
-                    ParseCase{"Up", 6, {2, 0xF3, 0xF2, 0xF5F4, 0xF7F6, 0, 0}},
-                    ParseCase{"LongPress", 18, {3, 0xF3, 0xF2, 0xF5F4, 0xF7F6, 0, 0}},
-                    ParseCase{"KeyDown", 2, {4, 0xF2, 0xFBFAF9F8}},
-                    ParseCase{"KeyUp", 3, {5, 0xF2, 0xFBFAF9F8}},
-                    ParseCase{"User", 24, {7, 0xFBFAF9F8, 0xF7F6F5F4}},
-                    ParseCase{"Unlisted", 7, {8, 0, 0}}, ParseCase{"UnlistedZero", 0, {8, 0, 0}},
-                    ParseCase{"UnlistedHighest", 255, {8, 0, 0}}),
-    kRowName);
-
-TEST(EventParseTest, NullRecordsAreNoInput) {
-  event_data data = {.type = 3, .value = 4};
-  EventService::parseEvent(nullptr, &data);
-  EXPECT_EQ(data.type, MW::kEventUnknown);
-  const Event event = pointerInput(BRIMOL_POINTER_DOWN, {1, 2});
+  // The bytes are 0xF0 and up: unsigned ones stay so, and motion is negative.
+  using Words = std::array<uint32_t, 7>;
+  const auto parsed = [&event](uint8_t type) {
+    event.type = type;
+    event_data data = {.type = -1, .mouse = {9, 9, 9, 9, 9, 9}};
+    EventService::parseEvent(&event, &data);
+    return std::bit_cast<Words>(data);
+  };
+  EXPECT_EQ(parsed(4), (Words{0, 0xF3, 0xF2, 0xF5F4, 0xF7F6, 0U - 0x0608, 0U - 0x0406}));
+  EXPECT_EQ(parsed(5), (Words{1, 0xF3, 0xF2, 0xF5F4, 0xF7F6}));
+  EXPECT_EQ(parsed(6), (Words{2, 0xF3, 0xF2, 0xF5F4, 0xF7F6}));
+  EXPECT_EQ(parsed(18), (Words{3, 0xF3, 0xF2, 0xF5F4, 0xF7F6}));
+  EXPECT_EQ(parsed(2), (Words{4, 0xF2, 0xFBFAF9F8}));
+  EXPECT_EQ(parsed(3), (Words{5, 0xF2, 0xFBFAF9F8}));
+  EXPECT_EQ(parsed(24), (Words{7, 0xFBFAF9F8, 0xF7F6F5F4}));
+  EXPECT_EQ(parsed(0), Words{8});
+  EXPECT_EQ(parsed(255), Words{8});
   EventService::parseEvent(&event, nullptr);
 }
 
-TEST_F(EventServiceTest, EventsComeOutInTheirOrder) {
-  EXPECT_EQ(service().recvEvent(), nullptr);
-  const Event input = pointerInput(BRIMOL_POINTER_UP, {3, 4});
+TEST_F(EventServiceTest, EventsComeOutInTheirOrderInOneRecord) {
   service().AppEvent(-5);
-  service().sendEvent(&input);
   service().sendEvent(nullptr);
   service().saveQueue(nullptr);
   service().AppEvent(6);
-  using Events = std::vector<std::pair<int, int>>;
-  EXPECT_EQ(drain(), (Events{{6, -5}, {2, 0}, {8, 0}, {6, 6}}));
-  EXPECT_EQ(service().recvEvent(), nullptr);
-}
-
-TEST_F(EventServiceTest, HandsEventsOutInOneRecord) {
-  service().AppEvent(1);
-  service().AppEvent(2);
   const event_data* const handedOut = service().recvEvent();
-  EXPECT_EQ(handedOut->value, 1);
+  EXPECT_EQ(handedOut->value, -5);
   EXPECT_EQ(service().recvEvent(), handedOut);
-  EXPECT_EQ(handedOut->value, 2);
+  EXPECT_EQ(handedOut->type, MW::kEventUnknown);
+  EXPECT_EQ(service().recvEvent(), handedOut);
   EXPECT_EQ(service().recvEvent(), nullptr);
-  EXPECT_EQ(handedOut->value, 2) << "an empty queue leaves the record";
-}
-
-TEST_F(EventServiceTest, TwoProducersKeepTheirOrders) {
-  constexpr int kEvents = 2000;
-  const auto produce = [](int first) {
-    for (int i = 0; i < kEvents; ++i) service().AppEvent(first + i);
-  };
-  std::thread other(produce, kEvents);
-  produce(0);
-  other.join();
-  std::array<int, 2> next = {0, kEvents};
-  for (const auto& [type, value] : drain()) EXPECT_EQ(value, next.at(value < kEvents ? 0 : 1)++);
-  EXPECT_EQ(next, (std::array{kEvents, 2 * kEvents}));
+  EXPECT_EQ(handedOut->value, 6) << "an empty queue leaves the record";
 }
 
 TEST_F(EventServiceTest, InputThreadDrainsAtFullSpeed) {
-  const android::sp<MW::func_eventLoop> loop = new MW::func_eventLoop;
-  platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
-  platform().feed(pointerInput(BRIMOL_POINTER_UP, {3, 4}));
-  EXPECT_TRUE(loop->threadLoop());
-  EXPECT_TRUE(loop->threadLoop());
-  EXPECT_TRUE(platform().takeDelays().empty());
-  EXPECT_TRUE(loop->threadLoop());
-  EXPECT_EQ(platform().takeDelays(), std::vector{1U});
-  EXPECT_EQ(drain().size(), 2U);
+  for (const unsigned int paused : {0U, 0U, 1U}) {
+    if (paused == 0) platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
+    EXPECT_TRUE(input->threadLoop());
+    EXPECT_EQ(platform().paused, paused);
+    EXPECT_EQ(service().recvEvent() == nullptr, paused == 1);
+  }
 }
 
-TEST_F(WidgetTest, InputWithoutAServiceIsLost) {
-  const android::sp<MW::func_eventLoop> loop = new MW::func_eventLoop;
-  platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
-  EXPECT_TRUE(loop->threadLoop());
-  loop->requestExit();
-  loop->threadLoop();
-  const std::vector<LogLine> log = platform().takeLog();
-  ASSERT_EQ(log.size(), 3U);
-  EXPECT_EQ(log[0], logLines(kDebug, {"[EVENTSERVICE] func_eventLoop start!"})[0]);
-  EXPECT_EQ(log[1],
-            logLines(kError, {"[EVENTSERVICE] eventLoop Window::getEventService FAIL 1!"})[0]);
-  EXPECT_EQ(log[2],
-            logLines(kDebug, {"[EVENTSERVICE] func_eventLoop->threadLoop exitPending: 1"})[0]);
-}
-
-TEST_F(WidgetTest, WindowStartsAndStopsInput) {
-  platform().setPauses(Pauses::Parked);
-  EXPECT_EQ(MW::Window::getEventService(), nullptr);
-  EXPECT_EQ(MW::Window::init(), 1);
-  platform().awaitParked(2);
-  std::vector<LogLine> log = platform().takeLog();
-  // Threads of a test before this one may still be on their way out.
-  std::erase_if(log, [](const LogLine& line) { return line.message.ends_with("destory!"); });
-  EXPECT_EQ(log, logLines(kDebug, {"[EVENTSERVICE] startEvent->EventInit",
-                                   "[EVENTSERVICE] func_eventLoop start!",
-                                   "[EVENTSERVICE] startEvent (threadLoop)",
-                                   "[WINDOW] func_dispatchEvent start!"}));
-  EventService* const service = MW::Window::getEventService();
+TEST_F(EventServiceTest, WindowStartsAndStopsInput) {
   EXPECT_EQ(MW::Window::init(), 1) << "runs already";
-  EXPECT_EQ(MW::Window::getEventService(), service);
-  EXPECT_EQ(service->isActive(), 1);
+  EXPECT_EQ(service().isActive(), 1);
   EXPECT_EQ(platform().inits, 1);
   EXPECT_EQ(platform().initFlags, 0x01000001U);
-  platform().setPauses(Pauses::Short);
-  MW::Window::destroy();
-  EXPECT_EQ(MW::Window::getEventService(), nullptr);
+  LiveWindowTest::TearDown();
   EXPECT_EQ(platform().quits, 1);
-  // Lines at error level: those of the ending threads come when they come.
-  log = platform().takeLog();
-  std::erase_if(log, [](const LogLine& line) { return line.priority != kError; });
-  EXPECT_EQ(log,
-            logLines(kError, {"[EVENTSERVICE] stopEvent End", "[WINDOW] event_dispatcher End"}));
+  EXPECT_EQ(MW::Window::getEventService(), nullptr);
+  platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
+  platform().takeLog();
+  EXPECT_TRUE(input->threadLoop());
+  EXPECT_EQ(platform().takeLog().back(),
+            logLines(kError, {"[EVENTSERVICE] eventLoop Window::getEventService FAIL 1!"})[0]);
 }
 
-struct HitCase : Row {
-  SKIA_Rect area;
-  Spot spot;
-  bool forMe, aroundMe;
+struct RouteCase {
+  // In the order of registering. Capitals stand in the top layer; t, x and h take what they are
+  // offered, s, x and i are selected, h and i are hidden, w is none of it.
+  const char* members;
+  const char* offered;
+  int live, redraw;
+  int asked;  // how often the display was asked whether it is live
 };
 
-class EventHit : public testing::TestWithParam<HitCase> {};
-
-TEST_P(EventHit, TestsThePoint) {
-  const HitCase& row = GetParam();
-  const event_data event = pointerEvent(MW::kEventLongPress, row.spot, 3);
-  EXPECT_EQ(EventService::isMouseEventForMe(&row.area, &event), row.forMe);
-  EXPECT_EQ(EventService::isMouseEventAroundMe(&row.area, &event), row.aroundMe);
+TEST_F(EventServiceTest, AnEventIsOfferedByTheRules) {
+  for (const RouteCase& row : std::vector<RouteCase>{{"", "", 1, 0, 0},
+                                                     {"ww", "ww", 1, 0, 1},
+                                                     {"wtw", "wt", 1, 1, 1},
+                                                     {"t", "", 0, 0, 1},
+                                                     {"tH", "", 0, 0, 1},
+                                                     {"hw", "w", 1, 0, 1},
+                                                     {"tW", "W", 1, 0, 1},
+                                                     {"tWTW", "WT", 1, 1, 1},
+                                                     {"tIH", "t", 1, 1, 2},
+                                                     {"tHW", "W", 1, 0, 1},
+                                                     {"ws", "sws", 1, 0, 1},
+                                                     {"tsxs", "sx", 1, 1, 1},
+                                                     {"iw", "iw", 1, 0, 1},
+                                                     {"WX", "WX", 1, 1, 1}}) {
+    SCOPED_TRACE(row.members);
+    std::string offered;
+    std::vector<std::unique_ptr<JournalWidget>> widgets;
+    for (const char* member = row.members; *member != 0; ++member) {
+      const std::string letter(1, static_cast<char>(std::tolower(*member)));
+      const bool takes = letter.find_first_of("txh") == 0;
+      const int layer = std::isupper(*member) != 0 ? 0 : 1;
+      widgets.push_back(std::make_unique<JournalWidget>(offered, *member, layer, takes));
+      widgets.back()->setActive(letter.find_first_not_of("hi") == 0 ? 1 : 0);
+      widgets.back()->setSelect(letter.find_first_of("sxi") == 0 ? 1 : 0);
+    }
+    platform().live = row.live;
+    platform().liveAsked = 0;
+    service().AppEvent(1);
+    dispatchOne();
+    EXPECT_EQ(offered, row.offered);
+    EXPECT_EQ(MW::isDisplayUpdate(0), row.redraw);
+    EXPECT_EQ(platform().liveAsked, row.asked);
+  }
 }
 
-constexpr SKIA_Rect kArea = {100, 200, 50, 60, 0};
-constexpr SKIA_Rect kEverything = {kMin, kMin, kMax, kMax, 0};
-INSTANTIATE_TEST_SUITE_P(
-    Points, EventHit,
-    testing::Values(
-        HitCase{"TopLeft", kArea, {100, 200}, true, true},
-        HitCase{"BottomRight", kArea, {149, 259}, true, true},
-        HitCase{"RightEdge", kArea, {150, 230}, false, true},
-        HitCase{"BottomEdge", kArea, {120, 260}, false, true},
-        HitCase{"LeftOf", kArea, {80, 230}, false, true},
-        HitCase{"TooFarLeft", kArea, {79, 230}, false, false},
-        HitCase{"RightOf", kArea, {169, 230}, false, true},
-        HitCase{"TooFarRight", kArea, {170, 230}, false, false},
-        HitCase{"Above", kArea, {120, 180}, false, true},
-        HitCase{"TooFarAbove", kArea, {120, 179}, false, false},
-        HitCase{"TooFarBelow", kArea, {120, 280}, false, false},
-        HitCase{"BesideTheCorner", kArea, {165, 275}, false, false},
-        HitCase{"OverANarrowStrip", {100, 200, 5, 5, 0}, {90, 202}, false, false},
-        HitCase{"Empty", {100, 200, 0, 60, 0}, {100, 230}, false, false},
-        HitCase{"Negative", {100, 200, -50, 60, 0}, {80, 230}, false, false},
-        HitCase{"Lowest", kEverything, {kMin, kMin}, true, true},
-        HitCase{"JustBelowZero", kEverything, {-2, -2}, true, true},
-        HitCase{"Highest", kEverything, {kMax, kMax}, false, false},
-        HitCase{"WideAtTheEnd", {kMax - 5, kMax - 5, kMax, kMax, 0}, {kMax, kMax}, true, true}),
-    kRowName);
+// A handler deletes a neighbour and its own widget, in either pass, and adds another.
+TEST_F(EventServiceTest, HandlersMayChangeTheLayers) {
+  for (const int selected : {0, 1}) {
+    std::string offered;
+    auto a = std::make_unique<JournalWidget>(offered, 'a');
+    auto b = std::make_unique<JournalWidget>(offered, 'b');
+    const JournalWidget c(offered, 'c');
+    std::unique_ptr<JournalWidget> d;
+    a->setSelect(selected);
+    a->onEvent = [&](const event_data* event, unsigned int arg) {
+      EXPECT_EQ(std::pair(event->value, arg), std::pair(7, 0U));
+      b.reset();
+      d = std::make_unique<JournalWidget>(offered, 'd');
+      a.reset();
+      return false;
+    };
+    service().AppEvent(7);
+    dispatchOne();
+    EXPECT_EQ(offered, selected != 0 ? "cd" : "c");
+  }
+}
+
+// '#' is on the area, '+' around it.
+std::string hits(std::initializer_list<Spot> spots, SKIA_Rect area = {100, 200, 50, 60, 0}) {
+  std::string marks;
+  for (const Spot& spot : spots) {
+    const event_data event = pointerEvent(MW::kEventLongPress, spot, 3);
+    const bool isOn = EventService::isMouseEventForMe(&area, &event);
+    const bool isAround = EventService::isMouseEventAroundMe(&area, &event);
+    marks += isOn && isAround ? '#' : isAround ? '+' : isOn ? '!' : '.';
+  }
+  return marks;
+}
+
+TEST(EventHitTest, TestsThePoint) {
+  EXPECT_EQ(hits({{79, 230}, {80, 230}, {99, 230}, {100, 230}}), ".++#");
+  EXPECT_EQ(hits({{149, 230}, {150, 230}, {169, 230}, {170, 230}}), "#++.");
+  EXPECT_EQ(hits({{120, 179}, {120, 180}, {120, 199}, {120, 200}}), ".++#");
+  EXPECT_EQ(hits({{120, 259}, {120, 260}, {120, 279}, {120, 280}}), "#++.");
+  EXPECT_EQ(hits({{165, 275}, {85, 185}}), "..") << "beside a corner";
+  EXPECT_EQ(hits({{100, 230}, {80, 230}}, {100, 200, 0, 60, 0}), "..");
+  EXPECT_EQ(hits({{100, 230}, {80, 230}}, {100, 200, -50, 60, 0}), "..");
+  EXPECT_EQ(hits({{INT_MIN, INT_MIN}, {-2, -2}, {INT_MAX, INT_MAX}},
+                 {INT_MIN, INT_MIN, INT_MAX, INT_MAX, 0}),
+            "##.");
+  EXPECT_EQ(hits({{INT_MAX, INT_MAX}, {0, 0}}, {INT_MAX - 5, INT_MAX - 5, INT_MAX, INT_MAX, 0}),
+            "#.");
+}
 
 TEST(EventHitTest, OnlyPointersAreSomewhere) {
+  const SKIA_Rect area = {0, 0, 9, 9, 0};
   for (int code = 0; code <= 8; ++code) {
-    const event_data event = {.type = code, .mouse = {0, 0, 110, 210, 0, 0}};
-    EXPECT_EQ(EventService::isMouseEventForMe(&kArea, &event), code < 4) << code;
-    EXPECT_EQ(EventService::isMouseEventAroundMe(&kArea, &event), code < 4) << code;
-  }
-  const event_data event = pointerEvent(MW::kEventPress, {110, 210});
-  EXPECT_FALSE(EventService::isMouseEventForMe(nullptr, &event));
-  EXPECT_FALSE(EventService::isMouseEventForMe(&kArea, nullptr));
-  EXPECT_FALSE(EventService::isMouseEventAroundMe(nullptr, &event));
-  EXPECT_FALSE(EventService::isMouseEventAroundMe(&kArea, nullptr));
-}
-
-TEST(FirstFingerTest, IsFingerZeroOfAPointer) {
-  for (int code = 0; code <= 8; ++code) {
-    event_data event = {.type = code, .mouse = {}};
+    const event_data event = {.type = code, .mouse = {}};
+    EXPECT_EQ(EventService::isMouseEventForMe(&area, &event), code < 4) << code;
+    EXPECT_EQ(EventService::isMouseEventAroundMe(&area, &event), code < 4) << code;
     EXPECT_EQ(MW::isFirstFinger(&event), code < 4) << code;
-    event.mouse.finger = 1;
-    EXPECT_FALSE(MW::isFirstFinger(&event)) << code;
   }
-  EXPECT_FALSE(MW::isFirstFinger(nullptr));
+  EXPECT_FALSE(EventService::isMouseEventForMe(&area, nullptr));
+  EXPECT_FALSE(EventService::isMouseEventAroundMe(nullptr, nullptr));
 }
 
 }  // namespace

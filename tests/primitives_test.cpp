@@ -1,10 +1,11 @@
 #include <MW/primitives.h>
 #include <MW/widget_list.h>
 
+#include <climits>
 #include <cstring>
-#include <limits>
-#include <memory>
+#include <utility>
 
+#include "core/bounded_text.h"
 #include "support/widget_test.h"
 
 namespace {
@@ -14,202 +15,124 @@ using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's
 using PrimitivesTest = WidgetTest;
 
 constexpr SKIA_Rect kRect = {10, 20, 30, 40, 0xFF112233};
-constexpr SKIA_Point kLine = {10, 20, 30, 5, 0xFF445566, 3};
-constexpr int kMax = std::numeric_limits<int>::max();
-constexpr int kMin = std::numeric_limits<int>::min();
-const SKIA_Text kText = textRecord("abcdef", 0xFF778899, 5, 48);
-const DrawnText kDrawnText = {"abcdef", 0xFF778899, 5, 48};
-
-std::unique_ptr<MW::Widget> makeLabel() { return std::make_unique<MW::Label>(&kRect, &kText); }
-std::unique_ptr<MW::Widget> makeTextbox() { return std::make_unique<MW::Textbox>(&kRect, &kText); }
-std::unique_ptr<MW::Widget> makeImage() { return std::make_unique<MW::Image>(&kRect, &kText); }
-std::unique_ptr<MW::Widget> makeBox() { return std::make_unique<MW::Box>(&kRect); }
-std::unique_ptr<MW::Widget> makeLine() { return std::make_unique<MW::Line>(&kLine); }
-
-struct KindCase : Row {
-  std::unique_ptr<MW::Widget> (*make)();
-  int type;
-  Drawing drawn;
-  int kind;  // in the display-item table
-  // What the table's setters change of `drawn`, where the class has the setter.
-  Drawing changed;
-  const char* text;  // after "XY" replaced "abcdef"; null: no text
-};
-
 constexpr SKIA_Rect kBlueRect = {10, 20, 30, 40, 0xFF0000FF};
+constexpr SKIA_Point kLine = {10, 20, 30, 5, 0xFF445566, 3};
 constexpr SKIA_Point kGreenLine = {10, 20, 30, 5, 0xFF00FF00, 3};
-const DrawnText kChangedText = {"XY", 0xFF778899, 2, 60};
 
-std::vector<KindCase> kinds() {
-  return {{"Label",
-           makeLabel,
-           3,
-           {.call = Call::Label, .rect = kRect, .text = kDrawnText},
-           0,
-           {.call = Call::Label, .rect = kBlueRect, .text = kChangedText},
-           "XYcdef"},
-          {"Textbox",
-           makeTextbox,
-           8,
-           {.call = Call::Textbox, .rect = kRect, .text = kDrawnText},
-           1,
-           {.call = Call::Textbox, .rect = kBlueRect, .text = kChangedText},
-           "XY"},
-          {"Image",
-           makeImage,
-           5,
-           {.call = Call::Label, .rect = kRect, .text = {"abcdef"}},
-           7,
-           {.call = Call::Label, .rect = kRect, .text = {"XY"}},
-           "XYcdef"},
-          {"Box",
-           makeBox,
-           6,
-           {.call = Call::Box, .rect = kRect},
-           3,
-           {.call = Call::Box, .rect = kBlueRect},
-           nullptr},
-          {"Line",
-           makeLine,
-           7,
-           {.call = Call::Line, .line = kLine},
-           6,
-           {.call = Call::Line, .line = kGreenLine},
-           nullptr}};
+void changeEverything(MW::Widget& widget) {
+  widget.setText("XY");
+  widget.setTextAlign(2);
+  widget.setFontSize(60);
+  widget.setBgColor(0xFF0000FF);
+  widget.setLnColor(0xFF00FF00);
+  widget.setTextColor(1);
+  widget.setBdColor(2);
+  widget.setRect(0, &kBlueRect);
 }
 
-class Primitive : public WidgetTest, public testing::WithParamInterface<KindCase> {
- protected:
-  const std::unique_ptr<MW::Widget> widget = GetParam().make();
-};
-
-TEST_P(Primitive, DrawsItsRecordsByOneCall) {
+// A widget draws a record, puts it into the display-item table as another kind, and is changed by
+// the setters that its class has.
+void expectDrawing(MW::Widget& widget, const Drawing& drawn, int kind, const Drawing& changed) {
+  SCOPED_TRACE(drawn);
   platform().nextHandle = 77;
-  EXPECT_EQ(widget->type(), GetParam().type);
-  EXPECT_FALSE(widget->isActive());
-  EXPECT_EQ(widget->show(123), 77);
-  EXPECT_EQ(widget->show(), 77);
-  EXPECT_EQ(platform().takeDrawings(), std::vector(2, GetParam().drawn));
-}
-
-TEST_P(Primitive, CopiesItselfToTheDisplayItems) {
-  EXPECT_EQ(widget->add_MWWList(), -1024);
+  EXPECT_EQ(widget.show(123) + widget.show(), 2 * 77);
+  EXPECT_EQ(platform().takeDrawings(), std::vector(2, drawn));
+  EXPECT_EQ(widget.add_MWWList(), -1024);
   MW::WidgetList::init();
-  EXPECT_EQ(widget->add_MWWList(), 1);
+  EXPECT_GT(widget.add_MWWList(), 0);
   MW::WidgetList::show();
-  Drawing item = GetParam().drawn;
-  item.call = Call::Item;
-  item.kind = GetParam().kind;
+  MW::WidgetList::destroy();
+  const Drawing item = {Call::Item, drawn.rect, drawn.line, drawn.text, kind};
   EXPECT_EQ(platform().takeDrawings(), std::vector{item});
+  changeEverything(widget);
+  EXPECT_EQ(shown(widget), std::vector{changed});
+  EXPECT_FALSE(press(widget, {15, 25}));
 }
 
-TEST_P(Primitive, ChangesWhatItsKindHas) {
-  widget->setText("XY");
-  widget->setTextAlign(2);
-  widget->setFontSize(60);
-  widget->setBgColor(0xFF0000FF);
-  widget->setLnColor(0xFF00FF00);
-  widget->setTextColor(1);
-  widget->setBdColor(2);
-  widget->setRect(0, &kBlueRect);
-  EXPECT_EQ(shown(*widget), std::vector{GetParam().changed});
-  EXPECT_EQ(widget->getBgColor(), 0U);
-  EXPECT_EQ(widget->getTextColor(), GetParam().changed.text.color);
-  EXPECT_EQ(widget->getFontSize(), GetParam().changed.text.size);
-  EXPECT_STREQ(widget->getText(), GetParam().text);
+TEST_F(PrimitivesTest, DrawAndChangeTheirRecords) {
+  const SKIA_Text caption = textRecord("abcdef", 0xFF778899, 5, 48);
+  const DrawnText drawn = {"abcdef", 0xFF778899, 5, 48};
+  const DrawnText changed = {"XY", 0xFF778899, 2, 60};
+  MW::Label label(&kRect, &caption);
+  MW::Textbox textbox(&kRect, &caption);
+  MW::Image image(&kRect, &caption);
+  MW::Box box(&kRect);
+  MW::Line line(&kLine);
+  expectDrawing(label, {Call::Label, kRect, {}, drawn}, 0, {Call::Label, kBlueRect, {}, changed});
+  expectDrawing(textbox, {Call::Textbox, kRect, {}, drawn}, 1,
+                {Call::Textbox, kBlueRect, {}, changed});
+  expectDrawing(image, {Call::Label, kRect, {}, {"abcdef"}}, 7, {Call::Label, kRect, {}, {"XY"}});
+  expectDrawing(box, {Call::Box, kRect}, 3, {Call::Box, kBlueRect});
+  expectDrawing(line, {Call::Line, {}, kLine}, 6, {Call::Line, {}, kGreenLine});
+  EXPECT_STREQ(label.getText(), "XYcdef") << "its length alone ends it";
+  EXPECT_STREQ(textbox.getText(), "XY");
+  EXPECT_STREQ(image.getText(), "XYcdef");
 }
-
-TEST_P(Primitive, TakesNoEvents) {
-  widget->setActive(1);
-  EXPECT_FALSE(press(*widget, {15, 25}));
-  EXPECT_EQ(widget->hide(), 0);
-  EXPECT_TRUE(widget->isActive());
-}
-
-INSTANTIATE_TEST_SUITE_P(Kinds, Primitive, testing::ValuesIn(kinds()), kRowName);
 
 TEST_F(PrimitivesTest, OnlyAnImageBelievesALength) {
-  SKIA_Text text = textRecord("abcdef");
-  text.string_len = 2;
-  MW::Label label(&kRect, &text);
-  MW::Textbox textbox(&kRect, &text);
-  MW::Image image(&kRect, &text);
-  EXPECT_EQ(shown(label)[0].text.text, "abcdef");
-  EXPECT_EQ(shown(textbox)[0].text.text, "abcdef");
-  EXPECT_EQ(shown(image)[0].text.text, "ab");
-  EXPECT_STREQ(image.getText(), "ab");
-}
-
-struct LengthCase : Row {
-  int given;
-  std::size_t kept;
-};
-
-class ImageLength : public WidgetTest, public testing::WithParamInterface<LengthCase> {};
-
-TEST_P(ImageLength, IsWithinTheRecord) {
-  SKIA_Text text = textRecord("abc");
-  text.string_len = GetParam().given;
-  MW::Image image(&kRect, &text);
-  std::string expected = "abc";
-  expected.resize(GetParam().kept);
-  EXPECT_EQ(shown(image)[0].text.text, expected);
-}
-
-INSTANTIATE_TEST_SUITE_P(Lengths, ImageLength,
-                         testing::Values(LengthCase{"AsGiven", 5, 5}, LengthCase{"None", 0, 0},
-                                         LengthCase{"Whole", 127, 127},
-                                         LengthCase{"OneTooMany", 128, 3},
-                                         LengthCase{"FarTooMany", kMax, 3},
-                                         LengthCase{"Negative", -1, 0},
-                                         LengthCase{"Lowest", kMin, 0}),
-                         kRowName);
-
-TEST_F(PrimitivesTest, AbsentRecordsAreEmpty) {
-  MW::Label label(nullptr, nullptr);
-  MW::Textbox textbox(nullptr, nullptr);
-  MW::Image image(nullptr, nullptr);
-  MW::Box box(nullptr);
-  MW::Line line(nullptr);
-  EXPECT_EQ(shown(label), (std::vector{Drawing{.call = Call::Label}}));
-  EXPECT_EQ(shown(textbox), (std::vector{Drawing{.call = Call::Textbox}}));
-  EXPECT_EQ(shown(image), (std::vector{Drawing{.call = Call::Label}}));
-  EXPECT_EQ(shown(box), (std::vector{Drawing{.call = Call::Box}}));
-  EXPECT_EQ(shown(line), (std::vector{Drawing{.call = Call::Line}}));
-}
-
-TEST_F(PrimitivesTest, TextsAreCutAtTheirRecord) {
-  const std::string tooLong(300, 'x');
-  MW::Label label(&kRect, &kText);
-  MW::Textbox textbox(&kRect, &kText);
-  MW::Image image(&kRect, &kText);
-  for (MW::Widget* each : std::initializer_list<MW::Widget*>{&label, &textbox, &image}) {
-    each->setText(tooLong.c_str());
-    EXPECT_EQ(shown(*each)[0].text.text, std::string(127, 'x'));
-    each->setText(nullptr);
-    EXPECT_EQ(shown(*each)[0].text.text, "");
+  const std::vector<std::pair<int, std::size_t>> lengths = {
+      {2, 2}, {0, 0}, {5, 5}, {127, 127}, {128, 3}, {INT_MAX, 3}, {INT_MIN, 0}};
+  for (const auto& [given, kept] : lengths) {
+    SKIA_Text text = textRecord("abc");
+    text.string_len = given;
+    MW::Label label(&kRect, &text);
+    MW::Image image(&kRect, &text);
+    EXPECT_EQ(shown(label)[0].text.text, "abc");
+    std::string expected = "abc";
+    expected.resize(kept);
+    EXPECT_EQ(shown(image)[0].text.text, expected) << given;
   }
 }
 
-struct LineCase : Row {
-  SKIA_Point line;
-  SKIA_Rect rect;
-};
-
-class LineRect : public testing::TestWithParam<LineCase> {};
-
-TEST_P(LineRect, StartsAtTheLargerCoordinates) {
-  MW::Line line(&GetParam().line);
-  EXPECT_EQ(*line.getPositionAndSize(), GetParam().rect);
+TEST_F(PrimitivesTest, AbsentRecordsAreEmptyAndTextsAreCut) {
+  SKIA_Text unbounded;
+  std::memset(&unbounded, 'x', sizeof unbounded);
+  MW::Label label(nullptr, nullptr);
+  MW::Textbox textbox(nullptr, nullptr);
+  MW::Image image(nullptr, &unbounded);
+  MW::Box box(nullptr);
+  MW::Line line(nullptr);
+  EXPECT_EQ(shown(box), std::vector{Drawing{.call = Call::Box}});
+  EXPECT_EQ(shown(line), std::vector{Drawing{.call = Call::Line}});
+  EXPECT_EQ(shown(image)[0].text.text, std::string(127, 'x'));
+  for (MW::Widget* each : std::vector<MW::Widget*>{&label, &textbox, &image}) {
+    each->setText(nullptr);
+    EXPECT_EQ(shown(*each)[0].text.text, "");
+    each->setText(std::string(300, 'x').c_str());
+    EXPECT_EQ(shown(*each)[0].text.text, std::string(127, 'x'));
+  }
+  textbox.setText(textbox.getText() + 120);
+  EXPECT_EQ(shown(textbox)[0].text.text, "xxxxxxx") << "a part of its own text";
 }
 
-INSTANTIATE_TEST_SUITE_P(
-    Lines, LineRect,
-    testing::Values(LineCase{"Rising", {10, 20, 30, 5, 7, 1}, {30, 20, -20, -15, 7}},
-                    LineCase{"Falling", {30, 5, 10, 20, 7, 1}, {30, 20, -20, -15, 7}},
-                    LineCase{"Point", {3, 4, 3, 4, 7, 1}, {3, 4, 0, 0, 7}},
-                    LineCase{
-                        "Longest", {kMin, kMax, kMax, kMin, 7, 1}, {kMax, kMax, kMin, kMin, 7}}),
-    kRowName);
+void expectCut(const std::string& given, std::size_t kept) {
+  EXPECT_EQ(MW::boundedText(given.c_str()), given.substr(0, kept));
+  EXPECT_EQ(MW::boundedText(given.c_str(), given.size()), given.substr(0, kept));
+}
+
+TEST(BoundedTextTest, CutsAtAWholeCharacter) {
+  expectCut("", 0);
+  expectCut(std::string(127, 'a'), 127);
+  expectCut(std::string(200, '\x80'), 127);
+  expectCut(std::string(200, '\xF0'), 127);
+  for (const std::string character : {"a", "\u00e9", "\uac00", "\U0001f600"}) {
+    for (std::size_t start = 120; start < 130; ++start) {
+      const bool isSplit = start < 127 && start + character.size() > 127;
+      expectCut(std::string(start, 'a') + character + "behind", isSplit ? start : 127);
+      if (isSplit) expectCut(std::string(start, 'a') + character, start);
+    }
+  }
+  EXPECT_EQ(MW::boundedText("abcdef", 3), "abc");
+  EXPECT_EQ(MW::boundedText("abc", 100), "abc");
+  EXPECT_EQ(MW::boundedText(nullptr, 5), "");
+}
+
+TEST_F(PrimitivesTest, ALinesRectStartsAtTheLargerCoordinates) {
+  const std::vector<std::pair<SKIA_Point, SKIA_Rect>> lines = {
+      {{10, 20, 30, 5, 7, 1}, {30, 20, -20, -15, 7}},
+      {{30, 5, 10, 20, 7, 1}, {30, 20, -20, -15, 7}},
+      {{INT_MIN, INT_MAX, INT_MAX, INT_MIN, 7, 1}, {INT_MAX, INT_MAX, INT_MIN, INT_MIN, 7}}};
+  for (const auto& [given, rect] : lines) EXPECT_EQ(*MW::Line(&given).getPositionAndSize(), rect);
+}
 
 }  // namespace

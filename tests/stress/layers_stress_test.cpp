@@ -6,11 +6,9 @@
 #include <MW/window.h>
 
 #include <array>
-#include <atomic>
 #include <latch>
 #include <memory>
 #include <thread>
-#include <vector>
 
 #include "support/widget_test.h"
 
@@ -20,171 +18,91 @@ using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's
 using MW::Button;
 using MW::Window;
 
-constexpr int kRegistrations = 200'000;
+constexpr int kEntries = 200'000;
 constexpr int kOffers = 2'000;  // to the gardener, at least
-constexpr int kFirstOwnId = 1'000'000;
 constexpr SKIA_Rect kScreen = {0, 0, 1000, 1000, 0xFF000000};
-constexpr Spot kSpot = {5, 5};
 
-std::atomic<int> registrations;
-std::atomic<int> offers;
+std::atomic<int> entries;
 std::atomic<int> faults;
-std::atomic<int> lastOwnId;
 
-void enter(MW::Widget& widget) {
-  Window::registerWidget(&widget);
-  ++registrations;
-}
-
-// Ids are numbers of a layer's size, and so others unregister this widget in place of theirs. With
-// an id of its own that ends.
-void enterWithOwnId(MW::Widget& widget) {
-  enter(widget);
-  widget.setId(++lastOwnId);
-}
-
-// Knows whether it is called after its end, or after it was told that it has left.
+// Knows whether it is called after its end.
 class Mortal : public MW::Widget {
  public:
-  explicit Mortal(int layer = 1) { type_ = layer; }
+  explicit Mortal(int layer) { type_ = layer; }
   ~Mortal() override {
     leaveLayers();
-    state = kDead;
+    isAlive = false;
   }
   int show(unsigned int) override { return check(); }
   void updateTimer(unsigned int) override { check(); }
-  bool onRecvEvent(MW::event_data*, unsigned int) override {
-    check();
-    return false;
-  }
-
-  // Not for a widget that another one's removal may have hit: then it can be in the layer still.
-  void unregisterForGood() {
-    Window::unregisterWidget(this);
-    if (inside != 0) ++faults;
-    state = kLeft;
+  bool onRecvEvent(MW::event_data*, unsigned int) override { return check() != 0; }
+  void enter() {
+    setActive(1);
+    Window::registerWidget(this);
+    ++entries;
   }
 
  private:
-  static constexpr unsigned int kLives = 0x600DF00D;
-  static constexpr unsigned int kLeft = 0x1EF7;
-  static constexpr unsigned int kDead = 0xDEAD;
-
-  int check() {
-    ++inside;
-    if (state != kLives) ++faults;
+  int check() const {
+    if (!isAlive) ++faults;
     std::this_thread::yield();
-    if (state != kLives) ++faults;
-    --inside;
+    if (!isAlive) ++faults;
     return 0;
   }
 
-  std::atomic<unsigned int> state = kLives;
-  std::atomic<int> inside = 0;
+  std::atomic<bool> isAlive = true;
 };
 
-// Registers and deletes others from inside its handlers, of the event and of the drawing pass.
-class Gardener : public Mortal {
- public:
-  Gardener() { setActive(1); }
-  ~Gardener() override { leaveLayers(); }
-  int show(unsigned int) override {
-    plant(drawn);
-    return 0;
-  }
-  bool onRecvEvent(MW::event_data*, unsigned int) override {
-    ++offers;
-    plant(offered);
-    return false;
-  }
-
- private:
-  using Bed = std::array<std::unique_ptr<Mortal>, 3>;
-
-  void plant(Bed& bed) {
-    std::unique_ptr<Mortal>& place = bed.at(next++ % bed.size());
-    place = std::make_unique<Mortal>();
-    place->setActive(1);
-    enter(*place);
-  }
-
-  std::atomic<std::size_t> next = 0;
-  Bed drawn;    // of the application's thread
-  Bed offered;  // of the dispatch thread
-};
-
-// Whoever takes the pointer out deletes: the widget itself from its handler, or the application.
-class DeletesItself : public Mortal {
- public:
-  ~DeletesItself() override { leaveLayers(); }
-  bool onRecvEvent(MW::event_data*, unsigned int) override {
-    delete one.exchange(nullptr);
-    return false;
-  }
-
-  static std::atomic<DeletesItself*> one;
-};
-std::atomic<DeletesItself*> DeletesItself::one = nullptr;
-
-std::atomic<Button*> doomedButton = nullptr;
-
-// What one thread does until there were enough registrations.
-void churn() {
-  for (int i = 0; registrations < kRegistrations; ++i) {
-    auto a = std::make_unique<Mortal>(i % 8 == 0 ? 0 : 1);
-    auto b = std::make_unique<Mortal>();
-    a->setActive(1);
-    b->setActive(1);
-    enter(*a);
-    enter(*b);
-    if (i % 3 == 0) enter(*a);
-    if (i % 2 == 0) Window::unregisterWidget(a.get());
-    if (i % 5 == 0) a.reset();
-    Button button(&kScreen, nullptr);
-    ++registrations;
-    button.setActive(1);
-    auto left = std::make_unique<Mortal>();
-    left->setActive(1);
-    enterWithOwnId(*left);
-    left->unregisterForGood();
-    std::this_thread::yield();
-  }
+std::unique_ptr<Mortal> makeMortal(int layer = 1) {
+  auto made = std::make_unique<Mortal>(layer);
+  made->enter();
+  return made;
 }
 
-// The application's own part besides the passes.
+// Whoever takes the pointer out deletes: a click from inside its handler, or the application.
+std::atomic<Button*> doomedButton = nullptr;
+
 void replaceDoomed(int round) {
-  if (round % 64 == 0) {
-    delete DeletesItself::one.exchange(nullptr);
-    delete doomedButton.exchange(nullptr);
-  }
-  if (DeletesItself::one == nullptr) {
-    auto added = std::make_unique<DeletesItself>();
-    added->setActive(1);
-    enter(*added);
-    DeletesItself::one = added.release();
-  }
-  if (doomedButton == nullptr) {
-    auto added = std::make_unique<Button>(&kScreen, nullptr);
-    ++registrations;
-    added->clickCallback = [](int) { delete doomedButton.exchange(nullptr); };
-    added->setActive(1);
-    doomedButton = added.release();
+  if (round % 64 == 0) delete doomedButton.exchange(nullptr);
+  if (doomedButton != nullptr) return;
+  auto added = std::make_unique<Button>(&kScreen, nullptr);
+  ++entries;
+  added->clickCallback = [](int) { delete doomedButton.exchange(nullptr); };
+  added->setActive(1);
+  doomedButton = added.release();
+}
+
+// What one thread does until there were enough entries. Ids are numbers of a layer's size, and
+// so the threads unregister each other's widgets.
+void churn() {
+  for (int i = 0; entries < kEntries; ++i) {
+    auto a = makeMortal(i % 8 == 0 ? 0 : 1);
+    const auto b = makeMortal();
+    if (i % 3 == 0) a->enter();
+    if (i % 2 == 0) Window::unregisterWidget(a.get());
+    if (i % 5 == 0) a.reset();
+    std::this_thread::yield();
   }
 }
 
 TEST_F(WidgetTest, WidgetsComeAndGoWhileWalksRun) {
-  registrations = offers = faults = 0;
-  lastOwnId = kFirstOwnId;
   platform().records = false;
-  platform().feedOverAndOver({pointerInput(BRIMOL_POINTER_DOWN, kSpot),
-                              pointerInput(BRIMOL_POINTER_MOTION, kSpot),
-                              pointerInput(BRIMOL_POINTER_UP, kSpot)});
+  std::atomic<int> offers = 0;
+  std::unique_ptr<Mortal> drawn;    // of the application's thread
+  std::unique_ptr<Mortal> offered;  // of the dispatch thread
   {
-    Gardener gardener;
-    enterWithOwnId(gardener);
+    ProbeWidget gardener;  // registers and deletes others from inside its handlers
+    gardener.onShow = [&](unsigned int) { drawn = makeMortal(); };
+    gardener.onEvent = [&](MW::event_data*, unsigned int) {
+      offered = makeMortal();
+      return ++offers == 0;
+    };
+    gardener.enter();
+    gardener.setId(-1);  // nobody else's, so that it stays
     ASSERT_EQ(Window::init(), 1);
     std::array<std::thread, 2> others = {std::thread(churn), std::thread(churn)};
-    for (int i = 0; registrations < kRegistrations || offers < kOffers; ++i) {
+    for (int i = 0; entries < kEntries || offers < kOffers; ++i) {
+      platform().feed(pointerInput(i % 2 == 0 ? BRIMOL_POINTER_DOWN : BRIMOL_POINTER_UP, {5, 5}));
       Window::show(0);
       replaceDoomed(i);
       Window::updateTimer(0);
@@ -192,47 +110,90 @@ TEST_F(WidgetTest, WidgetsComeAndGoWhileWalksRun) {
     for (std::thread& each : others) each.join();
     Window::destroy();
   }
-  delete DeletesItself::one.exchange(nullptr);
   delete doomedButton.exchange(nullptr);
   EXPECT_EQ(faults, 0);
   EXPECT_EQ(MW::isDisplayUpdate(0), 1) << "buttons took events";
 }
 
-// Each of so many threads draws, and from inside its widget unregisters the next thread's one.
-class Ring : public WidgetTest, public testing::WithParamInterface<std::size_t> {};
-
 thread_local std::size_t ownWidget = 0;
 
-TEST_P(Ring, OfThreadsThatUnregisterEachOthersWidgetDoesNotHang) {
-  const std::size_t size = GetParam();
-  std::latch allInside(static_cast<std::ptrdiff_t>(size));
-  std::vector<std::unique_ptr<ProbeWidget>> widgets;
-  std::atomic<int> calls = 0;
-  for (std::size_t i = 0; i < size; ++i) {
-    ProbeWidget& widget = *widgets.emplace_back(std::make_unique<ProbeWidget>());
-    widget.onShow = [&, i](unsigned int) {
-      ++calls;
-      if (ownWidget != i) return;
-      allInside.arrive_and_wait();
-      Window::unregisterWidget(widgets[(i + 1) % size].get());
-    };
-    widget.setActive(1);
-    Window::registerWidget(&widget);
+// Each of so many threads draws, and from inside its widget unregisters the next thread's one.
+TEST_F(WidgetTest, ThreadsThatUnregisterEachOthersWidgetDoNotHang) {
+  for (const std::size_t size : {2U, 5U}) {
+    std::latch allInside(static_cast<std::ptrdiff_t>(size));
+    std::vector<ProbeWidget> widgets(size);
+    std::vector<std::thread> threads;
+    for (std::size_t i = 0; i < size; ++i) {
+      widgets[i].onShow = [&, i](unsigned int) {
+        if (ownWidget != i) return;
+        allInside.arrive_and_wait();
+        Window::unregisterWidget(&widgets[(i + 1) % size]);
+      };
+      widgets[i].enter();
+    }
+    for (std::size_t i = 0; i < size; ++i) {
+      threads.emplace_back([i] {
+        ownWidget = i;
+        Window::show(0);
+      });
+    }
+    for (std::thread& each : threads) each.join();
+    EXPECT_EQ(layerSize(1), 0);
   }
-  std::vector<std::thread> threads;
-  for (std::size_t i = 0; i < size; ++i) {
-    threads.emplace_back([i] {
-      ownWidget = i;
-      Window::show(0);
-    });
-  }
-  for (std::thread& each : threads) each.join();
-  EXPECT_EQ(layerSize(1), 0);
-  const int before = calls;
-  Window::show(0);
-  EXPECT_EQ(calls, before);
 }
 
-INSTANTIATE_TEST_SUITE_P(Sizes, Ring, testing::Values(2, 3, 5));
+// An input event reaches a widget and raises the flag, again and again, and at last ends the
+// window.
+TEST_F(WidgetTest, TheWindowsThreadsBringInputToAWidget) {
+  for (int i = 20; i >= 0; --i) {
+    std::latch offered(1);
+    ProbeWidget widget;
+    widget.onEvent = [&](const MW::event_data* event, unsigned int) {
+      EXPECT_EQ(event->mouse.x, i);
+      if (i == 0) Window::destroy();
+      offered.count_down();
+      return true;
+    };
+    widget.enter();
+    ASSERT_EQ(Window::init(), 1);
+    platform().feed(pointerInput(BRIMOL_POINTER_UP, {i, 5}));
+    offered.wait();
+    if (i == 0) break;
+    Window::destroy();  // after the round that the event belongs to
+    EXPECT_EQ(MW::isDisplayUpdate(0), 1);
+  }
+  EXPECT_EQ(Window::getEventService(), nullptr);
+}
+
+TEST_F(WidgetTest, LeavingWaitsForAHandlerOnAnotherThread) {
+  using Leave = void (*)(std::unique_ptr<ProbeWidget>&);
+  const Leave unregister = [](auto& widget) { Window::unregisterWidget(widget.get()); };
+  const Leave destroy = [](auto& widget) { widget.reset(); };
+  const Leave unregisterTwin = [](auto& widget) {
+    ProbeWidget twin;
+    twin.setId(widget->id());
+    Window::unregisterWidget(&twin);
+  };
+  // Some handlers have taken their own widget out before.
+  for (const auto& [leave, leftBefore] :
+       {std::pair(unregister, false), std::pair(destroy, false), std::pair(unregisterTwin, false),
+        std::pair(unregister, true), std::pair(destroy, true)}) {
+    std::latch entered(1);
+    std::atomic<bool> done = false;
+    auto widget = std::make_unique<ProbeWidget>();
+    widget->onShow = [&](unsigned int) {
+      if (leftBefore) Window::unregisterWidget(widget.get());
+      entered.count_down();
+      for (int i = 0; i < 2000; ++i) std::this_thread::yield();
+      done = true;
+    };
+    widget->enter();
+    std::thread drawing([] { Window::show(0); });
+    entered.wait();
+    leave(widget);
+    EXPECT_TRUE(done);
+    drawing.join();
+  }
+}
 
 }  // namespace

@@ -1,22 +1,17 @@
 #include "support/records.h"
 
-#include <algorithm>
 #include <array>
-#include <tuple>
+#include <bit>
 
-namespace {
-auto fields(const SKIA_Rect& rect) { return std::tie(rect.x, rect.y, rect.w, rect.h, rect.color); }
-auto fields(const SKIA_Point& line) {
-  return std::tie(line.x1, line.y1, line.x2, line.y2, line.color, line.width);
-}
-}  // namespace
-
+// The records are nothing but words, without gaps.
 bool operator==(const SKIA_Rect& left, const SKIA_Rect& right) {
-  return fields(left) == fields(right);
+  using Words = std::array<int32_t, 5>;
+  return std::bit_cast<Words>(left) == std::bit_cast<Words>(right);
 }
 
 bool operator==(const SKIA_Point& left, const SKIA_Point& right) {
-  return fields(left) == fields(right);
+  using Words = std::array<int32_t, 6>;
+  return std::bit_cast<Words>(left) == std::bit_cast<Words>(right);
 }
 
 std::ostream& operator<<(std::ostream& out, const SKIA_Rect& rect) {
@@ -46,11 +41,8 @@ std::ostream& operator<<(std::ostream& out, const LogLine& line) {
 }
 
 SKIA_Text textRecord(const std::string& text, uint32_t color, int32_t align, int32_t size) {
-  SKIA_Text record = {};
+  SKIA_Text record = {.text = {}, .string_len = 0, .color = color, .align = align, .size = size};
   record.string_len = static_cast<int32_t>(text.copy(record.text, SKIA_TEXT_BYTES - 1));
-  record.color = color;
-  record.align = align;
-  record.size = size;
   return record;
 }
 

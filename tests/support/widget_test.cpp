@@ -5,47 +5,12 @@
 
 namespace brimol::test {
 
-using MW::event_data;
-using MW::Widget;
-
-std::ostream& operator<<(std::ostream& out, const Row& row) { return out << row.name; }
-
-event_data pointerEvent(MW::EventCode code, Spot spot, unsigned int finger) {
-  return {.type = code, .mouse = {0, finger, spot.x, spot.y, 0, 0}};
+Event pointerInput(BrimolEventType type, Spot spot) {
+  const auto place = [](int pixels) { return static_cast<uint16_t>(pixels); };
+  return {.pointer = {static_cast<uint8_t>(type), 0, 0, 0, place(spot.x), place(spot.y), 0, 0}};
 }
 
-event_data keyEvent(MW::EventCode code, unsigned int key) {
-  return {.type = code, .key = {0, key}};
-}
-
-Event pointerInput(BrimolEventType type, Spot spot, unsigned int finger) {
-  Event event = {};
-  event.pointer.type = static_cast<uint8_t>(type);
-  event.pointer.finger = static_cast<uint8_t>(finger);
-  event.pointer.x = static_cast<uint16_t>(spot.x);
-  event.pointer.y = static_cast<uint16_t>(spot.y);
-  return event;
-}
-
-bool offer(Widget& widget, event_data event) { return widget.onRecvEvent(&event, 0); }
-
-bool press(Widget& widget, Spot spot, unsigned int finger) {
-  return offer(widget, pointerEvent(MW::kEventPress, spot, finger));
-}
-
-bool drag(Widget& widget, Spot to, unsigned int finger) {
-  return offer(widget, pointerEvent(MW::kEventMotion, to, finger));
-}
-
-bool release(Widget& widget, Spot spot, unsigned int finger) {
-  return offer(widget, pointerEvent(MW::kEventRelease, spot, finger));
-}
-
-bool longPress(Widget& widget, Spot spot, unsigned int finger) {
-  return offer(widget, pointerEvent(MW::kEventLongPress, spot, finger));
-}
-
-std::vector<Drawing> shown(Widget& widget) {
+std::vector<Drawing> shown(MW::Widget& widget) {
   platform().takeDrawings();
   widget.show(platform().ticks);
   return platform().takeDrawings();
@@ -59,39 +24,24 @@ std::vector<LogLine> logLines(int priority, const std::vector<std::string>& mess
 }
 
 int layerSize(int type) {
-  Widget last;
-  last.setType(type);
-  MW::Window::registerWidget(&last);
+  ProbeWidget last(type);
+  last.enter();
   return last.id() - 1;
 }
 
-ProbeWidget::ProbeWidget(int layer) { type_ = layer; }
-ProbeWidget::~ProbeWidget() { leaveLayers(); }
-
-int ProbeWidget::show(unsigned int ticks) {
-  if (onShow) onShow(ticks);
-  return 0;
-}
-
-void ProbeWidget::updateTimer(unsigned int ticks) {
-  if (onTimer) onTimer(ticks);
-}
-
-bool ProbeWidget::onRecvEvent(event_data* event, unsigned int arg) {
-  return onEvent && onEvent(event, arg);
+void ProbeWidget::enter() {
+  setActive(1);
+  MW::Window::registerWidget(this);
 }
 
 JournalWidget::JournalWidget(std::string& journal, char name, int layer, bool taken)
     : ProbeWidget(layer) {
-  const auto write = [&journal, name](unsigned int) { journal += name; };
-  onShow = write;
-  onTimer = write;
-  onEvent = [write, taken](event_data*, unsigned int arg) {
-    write(arg);
+  onShow = onTimer = [&journal, name](auto) { journal += name; };
+  onEvent = [&journal, name, taken](auto*, auto) {
+    journal += name;
     return taken;
   };
-  setActive(1);
-  MW::Window::registerWidget(this);
+  enter();
 }
 
 void WidgetTest::SetUp() {
@@ -105,19 +55,19 @@ void WidgetTest::SetUp() {
 
 void WidgetTest::TearDown() {
   MW::WidgetList::destroy();
-  EXPECT_EQ(layerSize(0), 0);
-  EXPECT_EQ(layerSize(1), 0);
+  EXPECT_EQ(layerSize(0) + layerSize(1), 0);
 }
 
 void LiveWindowTest::SetUp() {
   WidgetTest::SetUp();
-  platform().setPauses(Pauses::Parked);
+  platform().parks = true;
   ASSERT_EQ(MW::Window::init(), 1);
-  platform().awaitParked(2);
+  for (int parked = 0; parked != 2; parked = platform().parked) platform().parked.wait(parked);
 }
 
 void LiveWindowTest::TearDown() {
-  platform().setPauses(Pauses::Short);
+  platform().parks = false;
+  platform().parks.notify_all();
   MW::Window::destroy();
   WidgetTest::TearDown();
 }

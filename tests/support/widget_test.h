@@ -20,7 +20,7 @@ struct Row {
   constexpr Row(const char* rowsName) : name(rowsName) {}  // a table begins its rows with the text
   const char* name;
 };
-std::ostream& operator<<(std::ostream& out, const Row& row);
+inline std::ostream& operator<<(std::ostream& out, const Row& row) { return out << row.name; }
 
 /// Names a table's tests after its rows.
 inline constexpr auto kRowName = [](const auto& info) { return std::string(info.param.name); };
@@ -30,17 +30,31 @@ struct Spot {
   int x, y;
 };
 
-MW::event_data pointerEvent(MW::EventCode code, Spot spot, unsigned int finger = 0);
-MW::event_data keyEvent(MW::EventCode code, unsigned int key);
-/// The platform's record of a pointer.
-Event pointerInput(BrimolEventType type, Spot spot, unsigned int finger = 0);
+inline MW::event_data pointerEvent(MW::EventCode code, Spot spot, unsigned int finger = 0) {
+  return {.type = code, .mouse = {0, finger, spot.x, spot.y, 0, 0}};
+}
+inline MW::event_data keyEvent(MW::EventCode code, unsigned int key) {
+  return {.type = code, .key = {0, key}};
+}
+/// The platform's record of the first finger.
+Event pointerInput(BrimolEventType type, Spot spot);
 
 /// Offers a widget an event as the dispatcher does. The widget's answer.
-bool offer(MW::Widget& widget, MW::event_data event);
-bool press(MW::Widget& widget, Spot spot, unsigned int finger = 0);
-bool drag(MW::Widget& widget, Spot to, unsigned int finger = 0);
-bool release(MW::Widget& widget, Spot spot, unsigned int finger = 0);
-bool longPress(MW::Widget& widget, Spot spot, unsigned int finger = 0);
+inline bool offer(MW::Widget& widget, MW::event_data event) {
+  return widget.onRecvEvent(&event, 0);
+}
+inline bool press(MW::Widget& widget, Spot spot, unsigned int finger = 0) {
+  return offer(widget, pointerEvent(MW::kEventPress, spot, finger));
+}
+inline bool drag(MW::Widget& widget, Spot to, unsigned int finger = 0) {
+  return offer(widget, pointerEvent(MW::kEventMotion, to, finger));
+}
+inline bool release(MW::Widget& widget, Spot spot, unsigned int finger = 0) {
+  return offer(widget, pointerEvent(MW::kEventRelease, spot, finger));
+}
+inline bool longPress(MW::Widget& widget, Spot spot, unsigned int finger = 0) {
+  return offer(widget, pointerEvent(MW::kEventLongPress, spot, finger));
+}
 
 /// The drawing calls of one show(ticks), at the platform's time.
 std::vector<Drawing> shown(MW::Widget& widget);
@@ -57,19 +71,21 @@ int layerSize(int type);
 /// A widget that does what a test says. Its layer is the base one.
 class ProbeWidget : public MW::Widget {
  public:
-  explicit ProbeWidget(int layer = 1);
-  ~ProbeWidget() override;
-  int show(unsigned int ticks) override;
-  void updateTimer(unsigned int ticks) override;
-  bool onRecvEvent(MW::event_data* event, unsigned int arg) override;
+  explicit ProbeWidget(int layer = 1) { type_ = layer; }
+  ~ProbeWidget() override { leaveLayers(); }
+  int show(unsigned int ticks) override { return onShow(ticks), 0; }
+  void updateTimer(unsigned int ticks) override { onTimer(ticks); }
+  bool onRecvEvent(MW::event_data* event, unsigned int arg) override { return onEvent(event, arg); }
+  /// Activates and registers it.
+  void enter();
 
-  std::function<bool(MW::event_data*, unsigned int)> onEvent;
-  std::function<void(unsigned int)> onShow;
-  std::function<void(unsigned int)> onTimer;
+  std::function<bool(MW::event_data*, unsigned int)> onEvent = [](auto*, auto) { return false; };
+  std::function<void(unsigned int)> onShow = [](auto) {};
+  std::function<void(unsigned int)> onTimer = onShow;
 };
 
-/// A registered and active probe that writes `name` behind `journal` for every call, and answers
-/// `taken` to events.
+/// A probe that has entered, writes `name` behind `journal` for every call, and answers `taken` to
+/// events.
 class JournalWidget : public ProbeWidget {
  public:
   JournalWidget(std::string& journal, char name, int layer = 1, bool taken = false);
