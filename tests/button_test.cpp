@@ -1,7 +1,5 @@
 #include <MW/button.h>
-#include <MW/window.h>
 
-#include <memory>
 #include <sstream>
 
 #include "support/widget_test.h"

@@ -1,12 +1,10 @@
 #include <MW/event_service.h>
-#include <MW/window.h>
 
 #include <array>
 #include <bit>
 #include <cctype>
 #include <climits>
-#include <memory>
-#include <utility>
+#include <cstring>
 
 #include "core/dispatch_thread.h"
 #include "core/input_thread.h"
@@ -18,16 +16,10 @@ using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's
 using MW::event_data;
 using MW::EventService;
 
-// The test's own threads of input and dispatch take a round when it says so.
 class EventServiceTest : public LiveWindowTest {
  protected:
   static EventService& service() { return *MW::Window::getEventService(); }
-  void dispatchOne() {
-    EXPECT_TRUE(dispatcher->threadLoop());
-    EXPECT_EQ(std::exchange(platform().paused, 0), 1U);
-  }
 
-  const android::sp<MW::func_dispatchEvent> dispatcher = new MW::func_dispatchEvent;
   const android::sp<MW::func_eventLoop> input = new MW::func_eventLoop;
 };
 
@@ -68,95 +60,65 @@ TEST_F(EventServiceTest, EventsComeOutInTheirOrderInOneRecord) {
   EXPECT_EQ(handedOut->value, 6) << "an empty queue leaves the record";
 }
 
-TEST_F(EventServiceTest, InputThreadDrainsAtFullSpeed) {
-  for (const unsigned int paused : {0U, 0U, 1U}) {
-    if (paused == 0) platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
-    EXPECT_TRUE(input->threadLoop());
-    EXPECT_EQ(platform().paused, paused);
-    EXPECT_EQ(service().recvEvent() == nullptr, paused == 1);
-  }
-}
-
-TEST_F(EventServiceTest, WindowStartsAndStopsInput) {
+TEST_F(EventServiceTest, InputThreadDrainsAtFullSpeedWhileThereIsAService) {
+  platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
+  input->threadLoop();
+  EXPECT_NE(service().recvEvent(), nullptr);
+  EXPECT_EQ(platform().paused, 0U);
+  EXPECT_TRUE(input->threadLoop());
+  EXPECT_EQ(platform().paused, 1U);
   EXPECT_EQ(MW::Window::init(), 1) << "runs already";
-  EXPECT_EQ(service().isActive(), 1);
-  EXPECT_EQ(platform().inits, 1);
-  EXPECT_EQ(platform().initFlags, 0x01000001U);
+  EXPECT_EQ(std::pair(platform().inits, platform().initFlags), std::pair(1, 0x01000001U));
   LiveWindowTest::TearDown();
   EXPECT_EQ(platform().quits, 1);
-  EXPECT_EQ(MW::Window::getEventService(), nullptr);
   platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
-  platform().takeLog();
   EXPECT_TRUE(input->threadLoop());
   EXPECT_EQ(platform().takeLog().back(),
             logLines(kError, {"[EVENTSERVICE] eventLoop Window::getEventService FAIL 1!"})[0]);
 }
 
-struct RouteCase {
-  // In the order of registering. Capitals stand in the top layer; t, x and h take what they are
-  // offered, s, x and i are selected, h and i are hidden, w is none of it.
-  const char* members;
-  const char* offered;
-  int live, redraw;
-  int asked;  // how often the display was asked whether it is live
-};
-
-TEST_F(EventServiceTest, AnEventIsOfferedByTheRules) {
-  for (const RouteCase& row : std::vector<RouteCase>{{"", "", 1, 0, 0},
-                                                     {"ww", "ww", 1, 0, 1},
-                                                     {"wtw", "wt", 1, 1, 1},
-                                                     {"t", "", 0, 0, 1},
-                                                     {"tH", "", 0, 0, 1},
-                                                     {"hw", "w", 1, 0, 1},
-                                                     {"tW", "W", 1, 0, 1},
-                                                     {"tWTW", "WT", 1, 1, 1},
-                                                     {"tIH", "t", 1, 1, 2},
-                                                     {"tHW", "W", 1, 0, 1},
-                                                     {"ws", "sws", 1, 0, 1},
-                                                     {"tsxs", "sx", 1, 1, 1},
-                                                     {"iw", "iw", 1, 0, 1},
-                                                     {"WX", "WX", 1, 1, 1}}) {
-    SCOPED_TRACE(row.members);
+class RouteTest : public EventServiceTest {
+ protected:
+  // Who is offered an event, ! when that raises the redraw flag, and how often the display is asked
+  // whether it is live. The members are registered in this order. Capitals stand in the top layer;
+  // t, x and h take what they are offered, s, x and i are selected, h and i are hidden.
+  std::string route(const std::string& members) {
     std::string offered;
     std::vector<std::unique_ptr<JournalWidget>> widgets;
-    for (const char* member = row.members; *member != 0; ++member) {
-      const std::string letter(1, static_cast<char>(std::tolower(*member)));
-      const bool takes = letter.find_first_of("txh") == 0;
-      const int layer = std::isupper(*member) != 0 ? 0 : 1;
-      widgets.push_back(std::make_unique<JournalWidget>(offered, *member, layer, takes));
-      widgets.back()->setActive(letter.find_first_not_of("hi") == 0 ? 1 : 0);
-      widgets.back()->setSelect(letter.find_first_of("sxi") == 0 ? 1 : 0);
+    for (const char name : members) {
+      const auto isOneOf = [name](const char* names) {
+        return std::strchr(names, name) != nullptr;
+      };
+      const int layer = std::isupper(name) != 0 ? 0 : 1;
+      widgets.push_back(std::make_unique<JournalWidget>(offered, name, layer, isOneOf("txhTXH")));
+      widgets.back()->setActive(isOneOf("hiHI") ? 0 : 1);
+      widgets.back()->setSelect(isOneOf("sxiSXI") ? 1 : 0);
     }
-    platform().live = row.live;
     platform().liveAsked = 0;
     service().AppEvent(1);
-    dispatchOne();
-    EXPECT_EQ(offered, row.offered);
-    EXPECT_EQ(MW::isDisplayUpdate(0), row.redraw);
-    EXPECT_EQ(platform().liveAsked, row.asked);
+    EXPECT_TRUE(dispatcher->threadLoop());
+    EXPECT_EQ(std::exchange(platform().paused, 0), 1U);
+    return offered + (MW::isDisplayUpdate(0) != 0 ? "!" : "") +
+           std::to_string(platform().liveAsked);
   }
-}
 
-// A handler deletes a neighbour and its own widget, in either pass, and adds another.
-TEST_F(EventServiceTest, HandlersMayChangeTheLayers) {
-  for (const int selected : {0, 1}) {
-    std::string offered;
-    auto a = std::make_unique<JournalWidget>(offered, 'a');
-    auto b = std::make_unique<JournalWidget>(offered, 'b');
-    const JournalWidget c(offered, 'c');
-    std::unique_ptr<JournalWidget> d;
-    a->setSelect(selected);
-    a->onEvent = [&](const event_data* event, unsigned int arg) {
-      EXPECT_EQ(std::pair(event->value, arg), std::pair(7, 0U));
-      b.reset();
-      d = std::make_unique<JournalWidget>(offered, 'd');
-      a.reset();
-      return false;
-    };
-    service().AppEvent(7);
-    dispatchOne();
-    EXPECT_EQ(offered, selected != 0 ? "cd" : "c");
-  }
+  const android::sp<MW::func_dispatchEvent> dispatcher = new MW::func_dispatchEvent;
+};
+
+TEST_F(RouteTest, GoesThroughTheLayersByTheRules) {
+  EXPECT_EQ(route(""), "0");
+  EXPECT_EQ(route("ww"), "ww1");
+  EXPECT_EQ(route("wtw"), "wt!1");
+  EXPECT_EQ(route("tW"), "W1") << "an active dialog deafens the base layer";
+  EXPECT_EQ(route("tWTW"), "WT!1");
+  EXPECT_EQ(route("tIH"), "t!2") << "a hidden one does not";
+  EXPECT_EQ(route("ws"), "sws1") << "the selected first, and once more";
+  EXPECT_EQ(route("tsxs"), "sx!1");
+  EXPECT_EQ(route("iw"), "iw1") << "the selected even while hidden";
+  EXPECT_EQ(route("WX"), "WX!1") << "no such pass among dialogs";
+  platform().live = 0;
+  EXPECT_EQ(route("t"), "1");
+  EXPECT_EQ(route("tH"), "1");
 }
 
 // '#' is on the area, '+' around it.
@@ -164,9 +126,8 @@ std::string hits(std::initializer_list<Spot> spots, SKIA_Rect area = {100, 200, 
   std::string marks;
   for (const Spot& spot : spots) {
     const event_data event = pointerEvent(MW::kEventLongPress, spot, 3);
-    const bool isOn = EventService::isMouseEventForMe(&area, &event);
-    const bool isAround = EventService::isMouseEventAroundMe(&area, &event);
-    marks += isOn && isAround ? '#' : isAround ? '+' : isOn ? '!' : '.';
+    const char off = EventService::isMouseEventAroundMe(&area, &event) ? '+' : '.';
+    marks += EventService::isMouseEventForMe(&area, &event) ? '#' : off;
   }
   return marks;
 }
@@ -179,11 +140,10 @@ TEST(EventHitTest, TestsThePoint) {
   EXPECT_EQ(hits({{165, 275}, {85, 185}}), "..") << "beside a corner";
   EXPECT_EQ(hits({{100, 230}, {80, 230}}, {100, 200, 0, 60, 0}), "..");
   EXPECT_EQ(hits({{100, 230}, {80, 230}}, {100, 200, -50, 60, 0}), "..");
-  EXPECT_EQ(hits({{INT_MIN, INT_MIN}, {-2, -2}, {INT_MAX, INT_MAX}},
-                 {INT_MIN, INT_MIN, INT_MAX, INT_MAX, 0}),
-            "##.");
-  EXPECT_EQ(hits({{INT_MAX, INT_MAX}, {0, 0}}, {INT_MAX - 5, INT_MAX - 5, INT_MAX, INT_MAX, 0}),
-            "#.");
+  constexpr int kMin = INT_MIN;
+  constexpr int kMax = INT_MAX;
+  EXPECT_EQ(hits({{kMin, kMin}, {-2, -2}, {0, kMax}}, {kMin, kMin, kMax, kMax, 0}), "##.");
+  EXPECT_EQ(hits({{kMax, kMax}, {0, 0}}, {kMax - 5, kMax - 5, kMax, kMax, 0}), "#.");
 }
 
 TEST(EventHitTest, OnlyPointersAreSomewhere) {

@@ -1,10 +1,7 @@
-#include <MW/window.h>
 
 #include <algorithm>
 #include <climits>
 #include <cmath>
-#include <memory>
-#include <utility>
 
 #include "support/widget_test.h"
 

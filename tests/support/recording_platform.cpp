@@ -5,7 +5,6 @@
 
 #include <chrono>
 #include <new>
-#include <utility>
 
 namespace brimol::test {
 
@@ -50,21 +49,6 @@ void RecordingPlatform::reset() {
   __android_log_set_minimum_priority(ANDROID_LOG_VERBOSE);
   static_cast<PlatformState&>(*this) = {};
   testThread = std::this_thread::get_id();
-}
-
-std::vector<Drawing> RecordingPlatform::takeDrawings() {
-  const std::lock_guard guard(lock);
-  return std::exchange(drawings, {});
-}
-
-std::vector<LogLine> RecordingPlatform::takeLog() {
-  const std::lock_guard guard(lock);
-  return std::exchange(lines, {});
-}
-
-void RecordingPlatform::feed(const Event& event) {
-  const std::lock_guard guard(lock);
-  fed.push_back(event);
 }
 
 }  // namespace brimol::test

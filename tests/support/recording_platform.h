@@ -8,6 +8,7 @@
 #include <deque>
 #include <mutex>
 #include <thread>
+#include <utility>
 #include <vector>
 
 #include "support/records.h"
@@ -36,11 +37,14 @@ struct RecordingPlatform : PlatformState {
   void reset();
 
   /// What happened since the reset or the last take, oldest first. Taking forgets it.
-  std::vector<Drawing> takeDrawings();
-  std::vector<LogLine> takeLog();
+  std::vector<Drawing> takeDrawings() { return take(drawings); }
+  std::vector<LogLine> takeLog() { return take(lines); }
 
   /// PollEvent returns it after those that were fed before.
-  void feed(const Event& event);
+  void feed(const Event& event) {
+    const std::lock_guard guard(lock);
+    fed.push_back(event);
+  }
 
   /// Whether threads other than the test's stay in Delay, and how many are there.
   std::atomic<bool> parks = false;
@@ -48,6 +52,13 @@ struct RecordingPlatform : PlatformState {
 
   std::thread::id testThread;
   std::mutex lock;  // guards `records` and the lists
+
+ private:
+  template <typename List>
+  List take(List& list) {
+    const std::lock_guard guard(lock);
+    return std::exchange(list, {});
+  }
 };
 
 RecordingPlatform& platform();

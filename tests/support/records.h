@@ -3,14 +3,32 @@
 
 #include <brimol/scene.h>
 
+#include <array>
+#include <bit>
 #include <ostream>
 #include <string>
 
 /// The records have no operators of their own: they are C.
-bool operator==(const SKIA_Rect& left, const SKIA_Rect& right);
-bool operator==(const SKIA_Point& left, const SKIA_Point& right);
-std::ostream& operator<<(std::ostream& out, const SKIA_Rect& rect);
-std::ostream& operator<<(std::ostream& out, const SKIA_Point& line);
+// The records are nothing but words, without gaps.
+inline bool operator==(const SKIA_Rect& left, const SKIA_Rect& right) {
+  using Words = std::array<int32_t, 5>;
+  return std::bit_cast<Words>(left) == std::bit_cast<Words>(right);
+}
+
+inline bool operator==(const SKIA_Point& left, const SKIA_Point& right) {
+  using Words = std::array<int32_t, 6>;
+  return std::bit_cast<Words>(left) == std::bit_cast<Words>(right);
+}
+
+inline std::ostream& operator<<(std::ostream& out, const SKIA_Rect& rect) {
+  return out << '(' << rect.x << ", " << rect.y << ") " << rect.w << " x " << rect.h << " 0x"
+             << std::hex << rect.color << std::dec;
+}
+
+inline std::ostream& operator<<(std::ostream& out, const SKIA_Point& line) {
+  return out << '(' << line.x1 << ", " << line.y1 << ") to (" << line.x2 << ", " << line.y2
+             << ") 0x" << std::hex << line.color << std::dec << " width " << line.width;
+}
 
 namespace brimol::test {
 
@@ -48,7 +66,15 @@ struct Drawing {
 
   bool operator==(const Drawing&) const = default;
 };
-std::ostream& operator<<(std::ostream& out, const Drawing& drawing);
+inline std::ostream& operator<<(std::ostream& out, const Drawing& drawing) {
+  constexpr auto kNames =
+      std::to_array<const char*>({"box", "round box", "line", "label", "textbox", "round textbox",
+                                  "button box", "round button box", "static box", "arrow", "item"});
+  return out << kNames.at(static_cast<std::size_t>(drawing.call)) << " kind " << drawing.kind
+             << " rect " << drawing.rect << " line " << drawing.line << " text \""
+             << drawing.text.text << "\" 0x" << std::hex << drawing.text.color << std::dec
+             << " align " << drawing.text.align << " size " << drawing.text.size;
+}
 
 /// One log line; its text is what stands behind the tag.
 struct LogLine {
@@ -58,10 +84,16 @@ struct LogLine {
 
   bool operator==(const LogLine&) const = default;
 };
-std::ostream& operator<<(std::ostream& out, const LogLine& line);
+inline std::ostream& operator<<(std::ostream& out, const LogLine& line) {
+  return out << line.priority << ' ' << line.tag << ": " << line.message;
+}
 
 /// A text record that holds `text`, cut to what it takes, with length, and the given looks.
-SKIA_Text textRecord(const std::string& text, uint32_t color = 0, int32_t align = 0,
-                     int32_t size = 0);
+inline SKIA_Text textRecord(const std::string& text, uint32_t color = 0, int32_t align = 0,
+                            int32_t size = 0) {
+  SKIA_Text record = {.text = {}, .string_len = 0, .color = color, .align = align, .size = size};
+  record.string_len = static_cast<int32_t>(text.copy(record.text, SKIA_TEXT_BYTES - 1));
+  return record;
+}
 
 }  // namespace brimol::test

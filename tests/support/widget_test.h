@@ -3,12 +3,16 @@
 
 #include <MW/records.h>
 #include <MW/widget.h>
+#include <MW/widget_list.h>
+#include <MW/window.h>
 #include <brimol/input.h>
 #include <gtest/gtest.h>
 
 #include <functional>
+#include <memory>
 #include <ostream>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "support/recording_platform.h"
@@ -37,7 +41,10 @@ inline MW::event_data keyEvent(MW::EventCode code, unsigned int key) {
   return {.type = code, .key = {0, key}};
 }
 /// The platform's record of the first finger.
-Event pointerInput(BrimolEventType type, Spot spot);
+inline Event pointerInput(BrimolEventType type, Spot spot) {
+  const auto place = [](int pixels) { return static_cast<uint16_t>(pixels); };
+  return {.pointer = {static_cast<uint8_t>(type), 0, 0, 0, place(spot.x), place(spot.y), 0, 0}};
+}
 
 /// Offers a widget an event as the dispatcher does. The widget's answer.
 inline bool offer(MW::Widget& widget, MW::event_data event) {
@@ -57,16 +64,22 @@ inline bool longPress(MW::Widget& widget, Spot spot, unsigned int finger = 0) {
 }
 
 /// The drawing calls of one show(ticks), at the platform's time.
-std::vector<Drawing> shown(MW::Widget& widget);
+inline std::vector<Drawing> shown(MW::Widget& widget) {
+  platform().takeDrawings();
+  widget.show(platform().ticks);
+  return platform().takeDrawings();
+}
 
 /// The log since the last look, as lines of one priority and tag.
-std::vector<LogLine> logLines(int priority, const std::vector<std::string>& messages);
+inline std::vector<LogLine> logLines(int priority, const std::vector<std::string>& messages) {
+  std::vector<LogLine> lines;
+  lines.reserve(messages.size());
+  for (const std::string& message : messages) lines.push_back({priority, "BRIMOL_WIDGET", message});
+  return lines;
+}
 inline constexpr int kDebug = 3;
 inline constexpr int kWarning = 5;
 inline constexpr int kError = 6;
-
-/// How many widgets stand in a layer.
-int layerSize(int type);
 
 /// A widget that does what a test says. Its layer is the base one.
 class ProbeWidget : public MW::Widget {
@@ -77,7 +90,10 @@ class ProbeWidget : public MW::Widget {
   void updateTimer(unsigned int ticks) override { onTimer(ticks); }
   bool onRecvEvent(MW::event_data* event, unsigned int arg) override { return onEvent(event, arg); }
   /// Activates and registers it.
-  void enter();
+  void enter() {
+    setActive(1);
+    MW::Window::registerWidget(this);
+  }
 
   std::function<bool(MW::event_data*, unsigned int)> onEvent = [](auto*, auto) { return false; };
   std::function<void(unsigned int)> onShow = [](auto) {};
@@ -88,23 +104,58 @@ class ProbeWidget : public MW::Widget {
 /// events.
 class JournalWidget : public ProbeWidget {
  public:
-  JournalWidget(std::string& journal, char name, int layer = 1, bool taken = false);
+  JournalWidget(std::string& journal, char name, int layer = 1, bool taken = false)
+      : ProbeWidget(layer) {
+    onShow = onTimer = [&journal, name](auto) { journal += name; };
+    onEvent = [&journal, name, taken](auto*, auto arg) {
+      journal += arg == 0 ? name : '!';
+      return taken;
+    };
+    enter();
+  }
 };
+
+/// How many widgets stand in a layer.
+inline int layerSize(int type) {
+  ProbeWidget last(type);
+  last.enter();
+  return last.id() - 1;
+}
 
 /// Resets the platform, the window and the display-item table before each test, and checks that
 /// nothing stands in the window's layers behind it.
 class WidgetTest : public testing::Test {
  protected:
-  void SetUp() override;
-  void TearDown() override;
+  void SetUp() override {
+    platform().reset();
+    MW::isDisplayUpdate(0);
+    MW::Window::width = MW::Window::height = 0;
+    MW::Window::xdpi = MW::Window::ydpi = 0;
+    MW::WidgetList::destroy();
+    MW::WidgetList::index_num = 0;
+  }
+  void TearDown() override {
+    MW::WidgetList::destroy();
+    EXPECT_EQ(layerSize(0) + layerSize(1), 0);
+  }
 };
 
 /// With Window::init done and both of its threads parked after their first round, so that the test
 /// takes the rounds itself.
 class LiveWindowTest : public WidgetTest {
  protected:
-  void SetUp() override;
-  void TearDown() override;
+  void SetUp() override {
+    WidgetTest::SetUp();
+    platform().parks = true;
+    ASSERT_EQ(MW::Window::init(), 1);
+    for (int parked = 0; parked != 2; parked = platform().parked) platform().parked.wait(parked);
+  }
+  void TearDown() override {
+    platform().parks = false;
+    platform().parks.notify_all();
+    MW::Window::destroy();
+    WidgetTest::TearDown();
+  }
 };
 
 }  // namespace brimol::test
