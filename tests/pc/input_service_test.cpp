@@ -84,18 +84,19 @@ TEST(InputService, TakesABoundedNumberOfRecordsWhileOpen) {
   EXPECT_EQ(PollEvent(nullptr), 0);
 }
 
+void takeOne(InputService& service) {
+  for (Event record = {}; !service.poll(record);) service.delay(kForeverMs);
+}
+
 TEST(InputService, LosesNoWakeUp) {
   InputService service;
   service.open();
   std::atomic<uint32_t> taken = 0;
   std::thread poller([&] {
-    for (Event record = {}; taken < 3000;) {
-      if (!service.poll(record)) {
-        service.delay(kForeverMs);
-      } else {
-        ++taken;
-        taken.notify_one();
-      }
+    for (int i = 0; i < 3000; ++i) {
+      takeOne(service);
+      ++taken;
+      taken.notify_one();
     }
   });
   for (uint32_t posted = 0; posted < 3000; ++posted) {

@@ -3,8 +3,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <array>
-#include <cstring>
 #include <random>
 
 #include "painting.h"
@@ -48,6 +48,13 @@ void addNoise(cairo_surface_t* picture, const Area& part, std::mt19937& random) 
   }
 }
 
+void copyPart(const Picture& from, const Area& part, Picture& to) {
+  for (int y = part.y; y < part.y + part.height; ++y) {
+    const auto start = y * from.size.w + part.x;
+    std::copy_n(from.pixels.begin() + start, part.width, to.pixels.begin() + start);
+  }
+}
+
 TEST(WindowCanvas, IsTheSameByPartsAndAtOnce) {
   std::mt19937 random(20);
   const auto upTo = [&](int most) { return std::uniform_int_distribution(0, most)(random); };
@@ -64,12 +71,7 @@ TEST(WindowCanvas, IsTheSameByPartsAndAtOnce) {
       for (const Area& part : changed) addNoise(noise.get(), part, random);
       const Region told = byParts.update(noise.get(), changed);
       const Picture shown = pictureOf(byParts.pixels());
-      for (const Area& part : told) {
-        for (int y = part.y; y < part.y + part.height; ++y) {
-          const auto start = y * window.w + part.x;
-          std::copy_n(shown.pixels.begin() + start, part.width, presented.pixels.begin() + start);
-        }
-      }
+      for (const Area& part : told) copyPart(shown, part, presented);
       WindowCanvas atOnce(kScreen, window);
       atOnce.update(noise.get(), {kAll});
       ASSERT_TRUE(presented == pictureOf(atOnce.pixels())) << window.w << ", round " << round;
@@ -90,6 +92,10 @@ TEST(WindowCanvas, AveragesWhatIsScaledAndLeavesTheRestBlack) {
   const Picture shown = pictureOf(half.pixels());
   EXPECT_EQ(shown.inkIn({10, 0, 100, 150}, 0x808080), 0) << "every second column is white";
   EXPECT_EQ(shown.inked(), (Area{10, 0, 100, 150}));
+  painter.paint({boxItem({0, 0, kScreen.w, kScreen.h, kWhite})});
+  WindowCanvas uneven(kScreen, {74, 111});
+  uneven.update(painter.picture(), {kAll});
+  EXPECT_EQ(pictureOf(uneven.pixels()).inkIn({0, 0, 74, 111}, kWhite), 0);
 }
 
 }  // namespace
