@@ -4,7 +4,6 @@
 #include <bit>
 #include <cctype>
 #include <climits>
-#include <cstring>
 
 #include "core/dispatch_thread.h"
 #include "core/input_thread.h"
@@ -16,12 +15,9 @@ using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's
 using MW::event_data;
 using MW::EventService;
 
-class EventServiceTest : public LiveWindowTest {
- protected:
-  static EventService& service() { return *MW::Window::getEventService(); }
+using EventServiceTest = LiveWindowTest;
 
-  const android::sp<MW::func_eventLoop> input = new MW::func_eventLoop;
-};
+EventService& service() { return *MW::Window::getEventService(); }
 
 TEST(EventParseTest, FillsTheRecord) {
   Event event = {};
@@ -61,51 +57,44 @@ TEST_F(EventServiceTest, EventsComeOutInTheirOrderInOneRecord) {
 }
 
 TEST_F(EventServiceTest, InputThreadDrainsAtFullSpeedWhileThereIsAService) {
+  const android::sp<MW::func_eventLoop> input = new MW::func_eventLoop;
+  EXPECT_EQ(MW::Window::init(), 1) << "runs already";
+  EXPECT_EQ(std::pair(platform().inits, platform().initFlags), std::pair(1, 0x01000001U));
   platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
-  input->threadLoop();
+  EXPECT_TRUE(input->threadLoop());
   EXPECT_NE(service().recvEvent(), nullptr);
   EXPECT_EQ(platform().paused, 0U);
   EXPECT_TRUE(input->threadLoop());
   EXPECT_EQ(platform().paused, 1U);
-  EXPECT_EQ(MW::Window::init(), 1) << "runs already";
-  EXPECT_EQ(std::pair(platform().inits, platform().initFlags), std::pair(1, 0x01000001U));
   LiveWindowTest::TearDown();
-  EXPECT_EQ(platform().quits, 1);
   platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
   EXPECT_TRUE(input->threadLoop());
   EXPECT_EQ(platform().takeLog().back(),
             logLines(kError, {"[EVENTSERVICE] eventLoop Window::getEventService FAIL 1!"})[0]);
 }
 
-class RouteTest : public EventServiceTest {
- protected:
-  // Who is offered an event, ! when that raises the redraw flag, and how often the display is asked
-  // whether it is live. The members are registered in this order. Capitals stand in the top layer;
-  // t, x and h take what they are offered, s, x and i are selected, h and i are hidden.
-  std::string route(const std::string& members) {
-    std::string offered;
-    std::vector<std::unique_ptr<JournalWidget>> widgets;
-    for (const char name : members) {
-      const auto isOneOf = [name](const char* names) {
-        return std::strchr(names, name) != nullptr;
-      };
-      const int layer = std::isupper(name) != 0 ? 0 : 1;
-      widgets.push_back(std::make_unique<JournalWidget>(offered, name, layer, isOneOf("txhTXH")));
-      widgets.back()->setActive(isOneOf("hiHI") ? 0 : 1);
-      widgets.back()->setSelect(isOneOf("sxiSXI") ? 1 : 0);
-    }
-    platform().liveAsked = 0;
-    service().AppEvent(1);
-    EXPECT_TRUE(dispatcher->threadLoop());
-    EXPECT_EQ(std::exchange(platform().paused, 0), 1U);
-    return offered + (MW::isDisplayUpdate(0) != 0 ? "!" : "") +
-           std::to_string(platform().liveAsked);
-  }
-
+// Who is offered an event, ! when that raises the redraw flag, and how often the display is asked
+// whether it is live. The members are registered in this order. Capitals stand in the top layer;
+// t, x and h take what they are offered, s, x and i are selected, h and i are hidden.
+std::string route(const std::string& members) {
   const android::sp<MW::func_dispatchEvent> dispatcher = new MW::func_dispatchEvent;
-};
+  std::string offered;
+  std::vector<std::unique_ptr<JournalWidget>> widgets;
+  for (const char name : members) {
+    const auto isOneOf = [name](std::string_view names) { return names.find(name) < names.size(); };
+    const int layer = std::isupper(name) != 0 ? 0 : 1;
+    widgets.push_back(std::make_unique<JournalWidget>(offered, name, layer, isOneOf("txhTXH")));
+    widgets.back()->setActive(isOneOf("hiHI") ? 0 : 1);
+    widgets.back()->setSelect(isOneOf("sxiSXI") ? 1 : 0);
+  }
+  platform().liveAsked = 0;
+  service().AppEvent(1);
+  EXPECT_TRUE(dispatcher->threadLoop());
+  EXPECT_EQ(std::exchange(platform().paused, 0), 1U);
+  return offered + (MW::isDisplayUpdate(0) != 0 ? "!" : "") + std::to_string(platform().liveAsked);
+}
 
-TEST_F(RouteTest, GoesThroughTheLayersByTheRules) {
+TEST_F(EventServiceTest, EventsGoThroughTheLayersByTheRules) {
   EXPECT_EQ(route(""), "0");
   EXPECT_EQ(route("ww"), "ww1");
   EXPECT_EQ(route("wtw"), "wt!1");

@@ -25,7 +25,6 @@ std::atomic<int> entries;
 std::unique_ptr<ProbeWidget> makeWidget(int layer = 1) {
   auto made = std::make_unique<ProbeWidget>(layer);
   made->onShow = made->onTimer = [](unsigned int) { std::this_thread::yield(); };
-  made->onEvent = [](MW::event_data*, unsigned int) { return std::this_thread::yield(), false; };
   made->enter();
   ++entries;
   return made;
@@ -39,7 +38,8 @@ void churn() {
   for (int i = 0; entries < kEntries; ++i) {
     auto a = makeWidget(i % 8 == 0 ? 0 : 1);
     const auto b = makeWidget();
-    if (i % 3 == 0) Window::registerWidget(a.get());
+    if (i % 3 == 0) Window::registerWidget(a.get());  // twice; its end takes both out
+    if (i % 7 == 0) a->setType(1 - a->type());        // and from where they are
     if (i % 2 == 0) Window::unregisterWidget(a.get());
     if (i % 5 == 0) a.reset();
     std::this_thread::yield();
@@ -61,7 +61,7 @@ TEST_F(WidgetTest, WidgetsComeAndGoWhileWalksRun) {
     gardener.enter();
     gardener.setId(-1);  // nobody else's, so that it stays
     ASSERT_EQ(Window::init(), 1);
-    std::array<std::thread, 2> others = {std::thread(churn), std::thread(churn)};
+    const std::array<std::jthread, 2> others = {std::jthread(churn), std::jthread(churn)};
     for (int i = 0; entries < kEntries || offers < kOffers; ++i) {
       platform().feed(pointerInput(i % 2 == 0 ? BRIMOL_POINTER_DOWN : BRIMOL_POINTER_UP, {5, 5}));
       Window::show(0);
@@ -73,9 +73,8 @@ TEST_F(WidgetTest, WidgetsComeAndGoWhileWalksRun) {
       }
       Window::updateTimer(0);
     }
-    for (std::thread& each : others) each.join();
-    Window::destroy();
   }
+  Window::destroy();
   delete doomedButton.exchange(nullptr);
   EXPECT_EQ(MW::isDisplayUpdate(0), 1) << "buttons took events";
 }
@@ -85,7 +84,6 @@ thread_local std::size_t ownWidget = 0;
 // Each of three threads draws, and from inside its widget unregisters the next thread's one.
 TEST_F(WidgetTest, ThreadsThatUnregisterEachOthersWidgetDoNotHang) {
   std::array<ProbeWidget, 3> widgets;
-  std::array<std::thread, 3> threads;
   std::latch allInside(3);
   for (std::size_t i = 0; i < 3; ++i) {
     widgets.at(i).onShow = [&, i](unsigned int) {
@@ -95,13 +93,14 @@ TEST_F(WidgetTest, ThreadsThatUnregisterEachOthersWidgetDoNotHang) {
     };
     widgets.at(i).enter();
   }
-  for (std::size_t i = 0; i < 3; ++i) {
-    threads.at(i) = std::thread([i] {
-      ownWidget = i;
-      Window::show(0);
-    });
+  const auto draw = [](std::size_t own) {
+    ownWidget = own;
+    Window::show(0);
+  };
+  {
+    const std::array<std::jthread, 3> threads = {std::jthread(draw, 0), std::jthread(draw, 1),
+                                                 std::jthread(draw, 2)};
   }
-  for (std::thread& each : threads) each.join();
   EXPECT_EQ(layerSize(1), 0);
 }
 
@@ -128,39 +127,33 @@ TEST_F(WidgetTest, TheWindowsThreadsBringInputToAWidget) {
   EXPECT_EQ(Window::getEventService(), nullptr);
 }
 
-using Leave = std::function<void(std::unique_ptr<ProbeWidget>&)>;
-
-void expectWaits(const Leave& leaveBefore, const Leave& leave) {
-  std::latch entered(1);
-  std::atomic<bool> done = false;
-  auto widget = std::make_unique<ProbeWidget>();
-  widget->onShow = [&](unsigned int) {
-    leaveBefore(widget);
-    entered.count_down();
-    for (int i = 0; i < 2000; ++i) std::this_thread::yield();
-    done = true;
-  };
-  widget->enter();
-  std::thread drawing([] { Window::show(0); });
-  entered.wait();
-  leave(widget);
-  EXPECT_TRUE(done);
-  drawing.join();
+void unregister(std::unique_ptr<ProbeWidget>& widget) { Window::unregisterWidget(widget.get()); }
+void destroy(std::unique_ptr<ProbeWidget>& widget) { widget.reset(); }
+void unregisterTwin(std::unique_ptr<ProbeWidget>& widget) {
+  ProbeWidget twin;
+  twin.setId(widget->id());
+  Window::unregisterWidget(&twin);
 }
 
 TEST_F(WidgetTest, LeavingWaitsForAHandlerOnAnotherThread) {
-  const Leave stay = [](auto&) {};
-  const Leave unregister = [](auto& widget) { Window::unregisterWidget(widget.get()); };
-  const Leave destroy = [](auto& widget) { widget.reset(); };
-  expectWaits(stay, unregister);
-  expectWaits(stay, destroy);
-  expectWaits(unregister, unregister);
-  expectWaits(unregister, destroy);
-  expectWaits(stay, [](auto& widget) {
-    ProbeWidget twin;
-    twin.setId(widget->id());
-    Window::unregisterWidget(&twin);
-  });
+  for (const auto leave : {unregister, destroy, unregisterTwin}) {
+    for (const bool leftBefore : {false, leave != unregisterTwin}) {
+      std::latch entered(1);
+      std::atomic<bool> done = false;
+      auto widget = std::make_unique<ProbeWidget>();
+      widget->onShow = [&](unsigned int) {
+        if (leftBefore) unregister(widget);
+        entered.count_down();
+        for (int i = 0; i < 2000; ++i) std::this_thread::yield();
+        done = true;
+      };
+      widget->enter();
+      const std::jthread drawing([] { Window::show(0); });
+      entered.wait();
+      leave(widget);
+      EXPECT_TRUE(done);
+    }
+  }
 }
 
 }  // namespace

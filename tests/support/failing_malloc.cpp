@@ -6,9 +6,9 @@
 #include <cstdlib>
 #include <new>
 
-namespace {
+using brimol::test::allocationsLeft;
 
-thread_local int allocationsLeft = 0;  // 0: none fails
+namespace {
 
 using Malloc = void* (*)(std::size_t);
 
@@ -38,11 +38,3 @@ void* operator new(std::size_t size) {
 void operator delete(void* block) noexcept { std::free(block); }
 void operator delete(void* block, const std::nothrow_t&) noexcept { std::free(block); }
 void operator delete(void* block, std::size_t) noexcept { std::free(block); }
-
-namespace brimol::test {
-
-FailingAllocation::FailingAllocation(int nth) { allocationsLeft = nth; }
-FailingAllocation::~FailingAllocation() { allocationsLeft = 0; }
-bool FailingAllocation::hasFailed() { return allocationsLeft == 0; }
-
-}  // namespace brimol::test

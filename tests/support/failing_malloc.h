@@ -4,16 +4,18 @@
 
 namespace brimol::test {
 
+inline thread_local constinit int allocationsLeft = 0;  // until the one that fails; 0: none does
+
 /// While it lives, the `nth` allocation (from 1) of this thread fails, once. One at a time.
 class FailingAllocation {
  public:
-  explicit FailingAllocation(int nth);
-  ~FailingAllocation();
+  explicit FailingAllocation(int nth) { allocationsLeft = nth; }
+  ~FailingAllocation() { allocationsLeft = 0; }
   FailingAllocation(const FailingAllocation&) = delete;
   FailingAllocation& operator=(const FailingAllocation&) = delete;
 
   /// Whether it came to that.
-  static bool hasFailed();
+  static bool hasFailed() { return allocationsLeft == 0; }
 };
 
 }  // namespace brimol::test

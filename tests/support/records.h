@@ -67,13 +67,10 @@ struct Drawing {
   bool operator==(const Drawing&) const = default;
 };
 inline std::ostream& operator<<(std::ostream& out, const Drawing& drawing) {
-  constexpr auto kNames =
-      std::to_array<const char*>({"box", "round box", "line", "label", "textbox", "round textbox",
-                                  "button box", "round button box", "static box", "arrow", "item"});
-  return out << kNames.at(static_cast<std::size_t>(drawing.call)) << " kind " << drawing.kind
-             << " rect " << drawing.rect << " line " << drawing.line << " text \""
-             << drawing.text.text << "\" 0x" << std::hex << drawing.text.color << std::dec
-             << " align " << drawing.text.align << " size " << drawing.text.size;
+  return out << "call " << static_cast<int>(drawing.call) << " kind " << drawing.kind << " rect "
+             << drawing.rect << " line " << drawing.line << " text \"" << drawing.text.text
+             << "\" 0x" << std::hex << drawing.text.color << std::dec << " align "
+             << drawing.text.align << " size " << drawing.text.size;
 }
 
 /// One log line; its text is what stands behind the tag.

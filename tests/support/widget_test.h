@@ -1,19 +1,14 @@
 /// The fixture of the toolkit's tests, and what they do to widgets.
 #pragma once
 
-#include <MW/records.h>
 #include <MW/widget.h>
 #include <MW/widget_list.h>
 #include <MW/window.h>
-#include <brimol/input.h>
 #include <gtest/gtest.h>
 
 #include <functional>
 #include <memory>
-#include <ostream>
-#include <string>
 #include <utility>
-#include <vector>
 
 #include "support/recording_platform.h"
 
