@@ -89,10 +89,11 @@ Fonts::Fonts(std::span<const char* const> files) : config(configOf(files)) {
   placing = contextOf(map.get());
 }
 
-// A font map keeps its configuration for ever unless it gets another one.
+// A font map keeps its configuration for ever unless it gets another one. An empty one takes its
+// place in the process: without any, what Pango still asks for would have the machine's be read.
 Fonts::~Fonts() {
   pango_fc_font_map_set_config(PANGO_FC_FONT_MAP(map.get()), nullptr);
-  if (FcConfigGetCurrent() == config.get()) FcConfigSetCurrent(nullptr);
+  if (FcConfigGetCurrent() == config.get()) FcConfigSetCurrent(FontConfig(FcConfigCreate()).get());
 }
 
 }  // namespace brimol::pc
