@@ -31,7 +31,8 @@ const char* brimol_host_help(void);
 int brimol_host_close_requested(void);
 
 /* Waits until the newest ended frame is painted and writes it as a PNG file in full size. Returns
- * 1, or 0 when there is no open screen or the file cannot be written; brimol_host_error() says why. */
+ * 1, or 0 when there is no open screen or the file cannot be written; brimol_host_error() says why.
+ */
 int brimol_host_screenshot(const char* path);
 
 #pragma GCC visibility pop

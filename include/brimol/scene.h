@@ -90,7 +90,8 @@ int skia_add_staticbox_c(SKIA_Rect rect, SKIA_Text text);
 /* An arrow within the rectangle, in the point record's colour. The record's `width` is the
  * direction word: 0 points right, any other left. */
 int skia_add_arrow_c(SKIA_Rect rect, SKIA_Point direction);
-/* The item is copied. A null pointer or an unknown kind adds nothing and returns a negative number. */
+/* The item is copied. A null pointer or an unknown kind adds nothing and returns a negative number.
+ */
 int skia_add_widget_c(const SKIA_Item* item);
 
 /* Non-zero while the display takes part in input: what is false for a dark display. */
