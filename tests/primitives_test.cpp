@@ -25,7 +25,9 @@ constexpr SKIA_Point kGreenLine = {10, 20, 30, 5, 0xFF00FF00, 3};
 
 // A widget draws a record, puts it into the display-item table as another kind, and is changed by
 // the setters that its class has.
-void expectDrawing(MW::Widget& widget, const Drawing& drawn, int kind, const Drawing& changed) {
+void expectDrawing(MW::Widget& widget, int type, const Drawing& drawn, int kind,
+                   const Drawing& changed) {
+  EXPECT_EQ(widget.type(), type);
   SCOPED_TRACE(drawn);
   platform().nextHandle = 77;
   EXPECT_EQ(widget.show(123) + widget.show(), 2 * 77);
@@ -56,12 +58,14 @@ TEST_F(PrimitivesTest, DrawAndChangeTheirRecords) {
   MW::Image image(&kRect, &caption);
   MW::Box box(&kRect);
   MW::Line line(&kLine);
-  expectDrawing(label, {Call::Label, kRect, {}, drawn}, 0, {Call::Label, kBlueRect, {}, changed});
-  expectDrawing(textbox, {Call::Textbox, kRect, {}, drawn}, 1,
+  expectDrawing(label, 3, {Call::Label, kRect, {}, drawn}, 0,
+                {Call::Label, kBlueRect, {}, changed});
+  expectDrawing(textbox, 8, {Call::Textbox, kRect, {}, drawn}, 1,
                 {Call::Textbox, kBlueRect, {}, changed});
-  expectDrawing(image, {Call::Label, kRect, {}, {"abcdef"}}, 7, {Call::Label, kRect, {}, {"XY"}});
-  expectDrawing(box, {Call::Box, kRect}, 3, {Call::Box, kBlueRect});
-  expectDrawing(line, {Call::Line, {}, kLine}, 6, {Call::Line, {}, kGreenLine});
+  expectDrawing(image, 5, {Call::Label, kRect, {}, {"abcdef"}}, 7,
+                {Call::Label, kRect, {}, {"XY"}});
+  expectDrawing(box, 6, {Call::Box, kRect}, 3, {Call::Box, kBlueRect});
+  expectDrawing(line, 7, {Call::Line, {}, kLine}, 6, {Call::Line, {}, kGreenLine});
   EXPECT_STREQ(label.getText(), "XYcdef") << "its length alone ends it";
   EXPECT_STREQ(textbox.getText(), "XY");
 }
@@ -195,9 +199,11 @@ TEST_F(WidgetListTest, ChangesAnItemWithinItsRecord) {
   EXPECT_EQ(drawn(), std::vector{changed});
   List::setText(1, std::string(300, 'x').c_str(), 300);
   EXPECT_EQ(drawn()[0].text.text, std::string(127, 'x'));
-  const SKIA_Text endless = {{}, INT_MAX, 0, 0, 0};
+  SKIA_Text endless = {{}, INT_MAX, 0, 0, 0};
+  endless.text[127] = 'y';
   List::addQueue(SKIA_LABEL, nullptr, nullptr, &endless);
-  EXPECT_EQ(drawn()[1].text.text.size(), 127U);
+  EXPECT_EQ(drawn()[1].text.text, std::string(127, '\0'));
+  EXPECT_EQ(List::save[1].item->text.text[127], '\0');
   EXPECT_EQ(List::setText(3, "a", 1) + List::setColor(0, 1, 2, 3), 2 * -104);
   EXPECT_EQ(List::setRect(0, kRect) + List::setFontSize(-5, 1), 2 * -104);
   EXPECT_EQ(platform().takeLog().at(3),

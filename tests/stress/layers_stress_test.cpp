@@ -30,7 +30,7 @@ std::unique_ptr<ProbeWidget> makeWidget(int layer = 1) {
   return made;
 }
 
-std::atomic<Button*> doomedButton = nullptr;  // its click deletes it
+std::atomic<Button*> doomedButton = nullptr;  // whoever takes it out deletes it
 
 // What one thread does until there were enough entries. Ids are numbers of a layer's size, and
 // so the threads unregister each other's widgets.
@@ -65,6 +65,7 @@ TEST_F(WidgetTest, WidgetsComeAndGoWhileWalksRun) {
     for (int i = 0; entries < kEntries || offers < kOffers; ++i) {
       platform().feed(pointerInput(i % 2 == 0 ? BRIMOL_POINTER_DOWN : BRIMOL_POINTER_UP, {5, 5}));
       Window::show(0);
+      if (i % 64 == 0) delete doomedButton.exchange(nullptr);  // it may stand in no layer
       if (doomedButton == nullptr) {
         auto added = std::make_unique<Button>(&kScreen, nullptr);
         added->clickCallback = [](int) { delete doomedButton.exchange(nullptr); };

@@ -12,7 +12,8 @@ namespace {
 
 constexpr std::chrono::microseconds kShortPause{20};
 
-RecordingPlatform thePlatform;
+// Never deleted: threads still log while the program ends.
+RecordingPlatform& thePlatform = *new RecordingPlatform;
 
 // A line that finds no memory is lost: tests let allocations fail.
 void receiveLog(const __android_logger_data* data, const char* message) {
@@ -44,9 +45,9 @@ int draw(Call call, const SKIA_Rect& rect, const SKIA_Text& text = {}, const SKI
 RecordingPlatform& platform() { return thePlatform; }
 
 void RecordingPlatform::reset() {
-  const std::lock_guard guard(lock);
   __android_log_set_logger(receiveLog);
   __android_log_set_minimum_priority(ANDROID_LOG_VERBOSE);
+  const std::lock_guard guard(lock);
   static_cast<PlatformState&>(*this) = {};
   testThread = std::this_thread::get_id();
 }
