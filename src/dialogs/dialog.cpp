@@ -165,7 +165,7 @@ void Dialog::onRelease(event_data* event) {
 }
 
 void Dialog::onPlugKey(kbd_event key) {
-  kLog.print(LogLevel::Debug, "key onPlugKey sym = %u", key.code);
+  kLog.print(LogLevel::Debug, "key onPlugKey sym = %d", static_cast<int>(key.code));
   plugCallback(&key);
 }
 
@@ -237,7 +237,7 @@ void Dialog::onPressKey(kbd_event key) {
     if (kind == kHookKeyKind) onHookKeyPressed();
     return;
   }
-  kLog.print(LogLevel::Debug, "key pressed sym = %u", key.code);
+  kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
   keyPressCallback(&key);
 }
 
@@ -245,7 +245,7 @@ void Dialog::onReleaseKey(kbd_event key) {
   keyClicks.follow(key, GetTicks());
   const LifeGuard self(this);
   onKeyClickCount(key);
-  kLog.print(LogLevel::Debug, "key onReleaseKey sym = %u", key.code);
+  kLog.print(LogLevel::Debug, "key onReleaseKey sym = %d", static_cast<int>(key.code));
   if (self.isAlive()) keyReleaseCallback(&key);
 }
 

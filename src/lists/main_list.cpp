@@ -253,7 +253,8 @@ bool MainList::isTouched(const event_data* event) const {
   const bool isDrag = event->type >= kEventMotion && event->type <= kEventRelease;
   if (isDrag && select != 0 && select != static_cast<int>(event->mouse.finger + 1)) {
     if (event->type != kEventMotion) {
-      kLog.print(LogLevel::Debug, "onRecvEvent-> T:%d, F:%u", event->type, event->mouse.finger);
+      kLog.print(LogLevel::Debug, "onRecvEvent-> T:%d, F:%d", event->type,
+                 static_cast<int>(event->mouse.finger));
     }
     return false;
   }
@@ -262,12 +263,12 @@ bool MainList::isTouched(const event_data* event) const {
 }
 
 void MainList::onPressKey(kbd_event key) {
-  kLog.print(LogLevel::Debug, "key pressed sym = %u", key.code);
+  kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
   if (auto* const call = keyPressCallback) call(&key, this);
 }
 
 void MainList::onReleaseKey(kbd_event key) {
-  kLog.print(LogLevel::Debug, "key onReleaseKey sym = %u", key.code);
+  kLog.print(LogLevel::Debug, "key onReleaseKey sym = %d", static_cast<int>(key.code));
   if (auto* const call = keyReleaseCallback) call(&key, this);
 }
 

@@ -118,10 +118,10 @@ bool Slide::grabOrCancel(event_data* event) {
 
 void Slide::onPress(event_data* event) {
   if (event == nullptr) return;
-  const unsigned int finger = event->mouse.finger;
-  select = static_cast<int>(finger + 1);
-  ownerFinger = static_cast<int>(finger);
-  kLog.print(LogLevel::Debug, "pressed!!: %u", finger);
+  const auto finger = static_cast<int>(event->mouse.finger);
+  select = static_cast<int>(event->mouse.finger + 1);
+  ownerFinger = finger;
+  kLog.print(LogLevel::Debug, "pressed!!: %d", finger);
   if (locked != 0 && doubleClickCallback) clicks.press(GetTicks());
 }
 
@@ -129,7 +129,7 @@ void Slide::onRelease(event_data* event) {
   if (event == nullptr) return;
   letGo();
   snapKnob();
-  kLog.print(LogLevel::Debug, "released!!:%u", event->mouse.finger);
+  kLog.print(LogLevel::Debug, "released!!:%d", static_cast<int>(event->mouse.finger));
   if (locked != 0 && isOnKnob(event) && doubleClickCallback && clicks.isRunning()) {
     onTouchClickCount(event->mouse);
   }
