@@ -25,8 +25,8 @@ namespace MW {
 class MW_API Slide : public Widget {
  public:
   /// Copies the records; `area`'s colour is not read. `second` may be null; otherwise both captions
-  /// stand on the knob, one above the other, and of the second one as many bytes are taken as its
-  /// `size` says, up to its length.
+  /// stand on the knob, one above the other. The second one has its record's `string_len`, 0 to
+  /// 127, and of its text as many bytes as its `size` says; behind them stand NULs.
   Slide(int startState, const SKIA_Rect* area, const SKIA_Text* first, const SKIA_Text* second);
   ~Slide() override;
 

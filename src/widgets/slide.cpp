@@ -36,14 +36,19 @@ constexpr bool isLeftState(int state) { return state == kFullLeft || state == kH
 constexpr SKIA_Text kOn = {"ON", 2, kColorGreen, SKIA_ALIGN_CENTRE, kLegendSize};
 constexpr SKIA_Text kOff = {"OFF", 3, kOffColor, SKIA_ALIGN_CENTRE, kLegendSize};
 
-// Of the second caption as many bytes as its size field says are copied, and the NUL stands at its
-// length: meant so.
+// The second caption has the length that its record says, and of its text as many bytes as its size
+// says; NULs fill what is missing: meant so.
 SKIA_Text secondCaption(const SKIA_Text* given) {
-  SKIA_Text caption = copyText(given);
-  const std::string_view bytes(caption.text, static_cast<std::size_t>(caption.string_len));
-  const std::size_t taken =
-      cutText(bytes, static_cast<std::size_t>(std::max(caption.size, 0))).size();
-  std::fill(caption.text + taken, caption.text + bytes.size(), '\0');
+  SKIA_Text caption = {};
+  if (given == nullptr) return caption;
+  const auto length = static_cast<std::size_t>(std::clamp(given->string_len, 0, kTextMax));
+  const auto taken = static_cast<std::size_t>(std::max(given->size, 0));
+  const std::string_view bytes = cutText({given->text, length}, taken);
+  std::copy(bytes.begin(), bytes.end(), caption.text);
+  caption.string_len = static_cast<int32_t>(length);
+  caption.color = given->color;
+  caption.align = given->align;
+  caption.size = given->size;
   return caption;
 }
 
