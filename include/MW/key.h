@@ -19,9 +19,10 @@ namespace MW {
 /// on the dispatch thread, and a plug event that was held back on the thread that draws.
 ///
 /// Plug events (user events) of the codes 2, 17 and 18 are held back for 100 ms, so that a plug
-/// that bounces is told once it has settled: 17 and 18 are then told as 2. Another code that comes
-/// meanwhile is dropped while 17 or 18 is held; a held 2 is given up for it. Nothing is held while
-/// `plugCallback` is null.
+/// that bounces is told once it has settled: 17 and 18 are then told as 2. Another code is told at
+/// once when the last one of these was 2 or was told as 2, and a 2 that is still held is given up
+/// for it; before the first of them, and while 17 or 18 is held, it is dropped. Nothing is held
+/// while `plugCallback` is null.
 class MW_API Key : public Widget {
  public:
   Key();

@@ -90,8 +90,8 @@ class MW_API MainList : public Widget {
   void onPress(mouse_event mouse);
   void onRelease(mouse_event mouse);
   void onHover(mouse_event mouse);
-  /// The item at the position; its top and bottom edges do not belong to it. -1 where an item of
-  /// kind 0 ends the list, -100 past the last one and in the gaps.
+  /// The item at the position; its first row of pixels does not belong to it. Where there is none,
+  /// -1, or -100 if all 64 items are there and none of kind 0 ends the list.
   int position2index(mouse_event mouse);
   /// Adds a motion to the drag; one that is too long takes the click away.
   void inClick(int dx, int dy);
@@ -136,7 +136,7 @@ class MW_API MainList : public Widget {
   ClickSlop click;
   int touchSlop = 0;  // pixels
   int shown = 0;      // 1 between the first drawing and hide()
-  int lcdState = 1;   // dispatch thread
+  std::atomic<int> lcdState = 1;
 
  private:
   template <typename Change>

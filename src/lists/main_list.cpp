@@ -178,9 +178,7 @@ int MainList::hide() {
 }
 
 void MainList::lcdOn(int on) {
-  if (lcdState == on) return;
-  lcdState = on;
-  setSelect(0);
+  if (lcdState.exchange(on) != on) setSelect(0);
 }
 
 template <typename Change>
