@@ -1,4 +1,4 @@
-/// One program at a time for a file that is replaced on every write.
+/// One owner at a time for a file that is replaced on every write.
 #pragma once
 
 #include <filesystem>
@@ -8,13 +8,14 @@
 
 namespace factory_test {
 
-/// Keeps a file for one owner with a lock on a hidden empty file beside it. The lock ends with the
-/// object or with the program, however that ends. Default constructed it holds nothing.
+/// Keeps a file for one owner, by the system's lock on a hidden empty file beside it. It ends with
+/// the object, which removes that file, or with the program, however that ends. Default constructed
+/// it holds nothing.
 class FileLock {
  public:
   FileLock() = default;
-  /// Takes the lock for `file`, which need not exist. On a failure isHeld() is false, and `error`
-  /// says in one line why.
+  /// Takes the lock for `file`, which need not exist. On a failure isHeld() is false and `error`
+  /// says why in one line.
   FileLock(const std::filesystem::path& file, std::string& error);
   ~FileLock();
   FileLock(FileLock&& other) noexcept = default;
@@ -25,6 +26,8 @@ class FileLock {
   bool isHeld() const { return descriptor.isOpen(); }
 
  private:
+  void release();
+
   std::filesystem::path lockFile = {};
   UniqueFd descriptor = {};
 };

@@ -7,26 +7,27 @@
 #include <string_view>
 #include <vector>
 
-#include "results/file_lock.h"
+#include "results/atomic_file.h"
 #include "results/test_result.h"
 
 namespace factory_test {
 
 /// The results of all tests that were done, a test's newest only, and the file that keeps them.
-/// The file's layout is described in results_json.h. One thread at a time uses a book; nothing
-/// here throws. While a book is open, opening another one for the same file fails.
+/// The file's layout stands in results_json.h. One thread at a time uses a book; nothing here
+/// throws.
 class ResultBook {
  public:
   /// Resumes the file at `path`, or starts an empty book if there is none; the file then appears
   /// with the first record(). A symbolic link is followed. An empty `path`: the results stay in
-  /// memory. Nothing is returned for a file that cannot be read, is damaged or is in use by another
-  /// program; `error` then says so in one line with the file's name, and the file stays as it is.
+  /// memory. Nothing is returned for a file that cannot be read, is damaged or is another open
+  /// book's (in this program or another), or whose directory cannot be written to; `error` then
+  /// says so in one line that begins with the file's name, and the file stays as it is.
   static std::optional<ResultBook> open(const std::filesystem::path& path, std::string& error);
 
   /// Puts `result`, made storable(), in the place of the test's earlier one or at the end, and
-  /// writes the whole file. When this returns true, the result survives a crash of the machine.
-  /// False: it stays in memory (and goes out with the next record()), the file holds what it
-  /// held before, and `error` says in one line why. Waits for the disk, often some milliseconds.
+  /// writes the whole file. True: the result survives a crash of the machine. False: it stays in
+  /// memory and goes out with the next record(), the file holds what it held before, and `error`
+  /// says why in one line. Waits for the disk, often some milliseconds.
   bool record(TestResult result, std::string& error);
 
   /// The test's result, or null. Valid until the next record().
@@ -38,8 +39,7 @@ class ResultBook {
  private:
   ResultBook() = default;
 
-  std::filesystem::path file = {};  // the regular file that links lead to; empty: memory only
-  FileLock lock = {};
+  std::optional<AtomicFile> file = {};  // nothing: in memory only
   std::vector<TestResult> kept = {};
 };
 
