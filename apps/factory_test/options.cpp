@@ -20,13 +20,17 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char*) { options.action = Options::Action::Help; }},
     {"--headless", nullptr, "draw to memory instead of a window",
      [](Options& options, const char*) { options.headless = true; }},
-    {"--shot", "FILE.png", "draw the first screen, write it to FILE.png and end",
+    {"--results", "FILE.json", "keep the verdicts in FILE.json, and go on from what it holds",
+     [](Options& options, const char* value) { options.results = value; }},
+    {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
+     [](Options& options, const char* value) { options.junit = value; }},
+    {"--shot", "FILE.png", "draw the menu, write it to FILE.png and end",
      [](Options& options, const char* value) { options.shot = value; }},
     {"--verbose", nullptr, "write the toolkit's log to stderr",
      [](Options& options, const char*) { options.verbose = true; }},
 });
 
-constexpr std::size_t kNameColumns = 20;
+constexpr std::size_t kNameColumns = 22;
 
 }  // namespace
 
@@ -55,7 +59,7 @@ std::optional<Options> parseOptions(std::span<const char* const> arguments, std:
 std::string usage() {
   std::string text =
       "Usage: factory_test [OPTION]...\n"
-      "Shows the first screen of a factory test, built from the toolkit's widgets.\n\n"
+      "A factory test's menu, built from the toolkit's widgets: by touch or by keys.\n\n"
       "Options:\n";
   for (const OptionRow& row : kOptions) {
     std::string name(row.name);
