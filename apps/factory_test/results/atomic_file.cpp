@@ -83,19 +83,24 @@ bool keepDirectory(const std::filesystem::path& directory) {
 
 }  // namespace
 
-std::optional<AtomicFile> AtomicFile::own(const std::filesystem::path& path, std::string& error) {
+std::optional<AtomicFile> AtomicFile::own(const std::filesystem::path& path, std::size_t mostBytes,
+                                          std::string& error) {
   auto target = followLinks(path, error);
   if (!target) return {};
   FileLock held(*target, error);
   if (!held.isHeld()) return {};
   ::unlink(hiddenSibling(*target, ".tmp").c_str());  // what a killed owner left
-  return AtomicFile(*std::move(target), std::move(held));
+  return AtomicFile(*std::move(target), std::move(held), mostBytes);
 }
 
-AtomicFile::AtomicFile(std::filesystem::path target, FileLock held)
-    : file(std::move(target)), lock(std::move(held)) {}
+AtomicFile::AtomicFile(std::filesystem::path target, FileLock held, std::size_t mostBytes)
+    : file(std::move(target)), lock(std::move(held)), limit(mostBytes) {}
 
 bool AtomicFile::replace(std::string_view bytes, std::string& error) {
+  if (bytes.size() > limit) {
+    error = fileError(file, "would be longer than " + std::to_string(limit) + " bytes");
+    return false;
+  }
   struct stat old = {};
   const bool exists = ::stat(file.c_str(), &old) == 0;
   if (exists && !S_ISREG(old.st_mode)) {  // a device must not give way to a file

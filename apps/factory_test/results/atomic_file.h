@@ -19,10 +19,11 @@ class AtomicFile {
  public:
   /// Follows symbolic links and owns the file that they lead to. Nothing if that is in use, or its
   /// directory is missing or cannot be written to; `error` then says so in one line.
-  static std::optional<AtomicFile> own(const std::filesystem::path& path, std::string& error);
+  /// More bytes than `mostBytes` are neither read nor written.
+  static std::optional<AtomicFile> own(const std::filesystem::path& path, std::size_t mostBytes,
+                                       std::string& error);
 
-  /// What it holds, at most `limit` bytes.
-  FileText read(std::size_t limit) const { return readFile(file, limit); }
+  FileText read() const { return readFile(file, limit); }
 
   /// Puts `bytes` in the place of what it holds, on the disk too. The new file has the old one's
   /// permissions; other hard links keep the old bytes. False: the file is as it was, and `error`
@@ -31,10 +32,11 @@ class AtomicFile {
   bool replace(std::string_view bytes, std::string& error);
 
  private:
-  AtomicFile(std::filesystem::path target, FileLock held);
+  AtomicFile(std::filesystem::path target, FileLock held, std::size_t mostBytes);
 
   std::filesystem::path file;
   FileLock lock;
+  std::size_t limit;
 };
 
 }  // namespace factory_test

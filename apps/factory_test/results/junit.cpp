@@ -13,6 +13,7 @@ namespace factory_test {
 namespace {
 
 constexpr std::string_view kSuite = "factory_test";
+constexpr std::size_t kLongestReport = std::size_t{1} << 24;  // bytes
 constexpr char kFirstPrintable = ' ';
 constexpr int64_t kMillisecondsPerSecond = 1000;
 constexpr std::size_t kMillisecondDigits = 3;
@@ -122,7 +123,7 @@ std::string junitXml(std::span<const TestResult> results) {
 
 bool writeJunit(const std::filesystem::path& path, std::span<const TestResult> results,
                 std::string& error) {
-  auto file = AtomicFile::own(path, error);
+  auto file = AtomicFile::own(path, kLongestReport, error);
   return file && file->replace(junitXml(results), error);
 }
 

@@ -11,9 +11,9 @@ namespace factory_test {
 std::optional<ResultBook> ResultBook::open(const std::filesystem::path& path, std::string& error) {
   ResultBook book;
   if (path.empty()) return book;
-  book.file = AtomicFile::own(path, error);
+  book.file = AtomicFile::own(path, kLongestJson, error);
   if (!book.file) return {};
-  FileText stored = book.file->read(kLongestJson);
+  FileText stored = book.file->read();
   if (stored.text) {
     auto results = parseResults(*stored.text, stored.reason);
     if (results) book.kept = *std::move(results);
@@ -32,10 +32,7 @@ bool ResultBook::record(TestResult result, std::string& error) {
     *earlier = std::move(result);
   }
   if (!file) return true;
-  const std::string text = resultsJson(kept);
-  if (text.size() <= kLongestJson) return file->replace(text, error);
-  error = "the results are longer than " + std::to_string(kLongestJson) + " bytes";
-  return false;
+  return file->replace(resultsJson(kept), error);
 }
 
 const TestResult* ResultBook::find(std::string_view test) const {
