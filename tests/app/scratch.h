@@ -2,8 +2,8 @@
 #pragma once
 
 #include <gtest/gtest.h>
-#include <stdlib.h>
 
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
@@ -26,13 +26,13 @@ class Scratch {
   Scratch(Scratch&&) = delete;
   Scratch& operator=(Scratch&&) = delete;
 
-  std::filesystem::path at(std::string_view relative) const { return made / relative; }
+  std::filesystem::path at(const std::filesystem::path& relative) const { return made / relative; }
 
-  void write(std::string_view relative, std::string_view bytes) const {
+  void write(const std::filesystem::path& relative, std::string_view bytes) const {
     std::filesystem::create_directories(at(relative).parent_path());
     std::ofstream(at(relative), std::ios::binary) << bytes;
   }
-  std::string read(std::string_view relative) const {
+  std::string read(const std::filesystem::path& relative) const {
     std::ifstream file(at(relative), std::ios::binary);
     return {std::istreambuf_iterator<char>(file), {}};
   }

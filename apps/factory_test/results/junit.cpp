@@ -1,6 +1,7 @@
 #include "results/junit.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <string_view>
 #include <vector>
 

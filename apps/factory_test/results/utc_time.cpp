@@ -1,9 +1,9 @@
 #include "results/utc_time.h"
 
 #include <algorithm>
-#include <array>
 #include <charconv>
 #include <cstddef>
+#include <cstdint>
 
 namespace factory_test {
 
