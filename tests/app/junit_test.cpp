@@ -2,6 +2,7 @@
 
 #include <expat.h>
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 
 #include <map>
 #include <memory>
@@ -132,8 +133,10 @@ TEST(Junit, IsWrittenWholeOrNotAtAll) {
   EXPECT_FALSE(writeJunit(scratch.at("missing/report.xml"), kResults, error));
   EXPECT_EQ(error, scratch.at("missing/report.xml").native() +
                        ": no lock can be made beside it: No such file or directory");
-  EXPECT_FALSE(writeJunit("/dev/full", kResults, error));
-  EXPECT_EQ(error, "/dev/full: is not a regular file");
+  ASSERT_EQ(::mkfifo(scratch.at("pipe").c_str(), 0600), 0);
+  EXPECT_FALSE(writeJunit(scratch.at("pipe"), kResults, error));
+  EXPECT_EQ(error, scratch.at("pipe").native() + ": is not a regular file");
+  EXPECT_TRUE(std::filesystem::is_fifo(scratch.at("pipe")));
 }
 
 TEST(Junit, SparesTheResultsFile) {
