@@ -78,7 +78,7 @@ class MW_API MainList : public Widget {
   // The status texts. `length` bytes, 1 to 126, of `newText`; null, another length or number:
   // nothing.
 
-  void setTextOption(int option, const char* newText, int length);
+  void setTextOption(int number, const char* newText, int length);
   void setTextBattery(const char* newText, int length);
   void setTextTa(const char* newText, int length);
   void setTextBrightness(const char* newText, int length);

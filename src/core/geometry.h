@@ -34,8 +34,8 @@ static_assert(percentOf(199, 50) == 99 && percentOf(-199, 50) == -99);
 
 /// The rectangle that lies `by` pixels further out on every side.
 constexpr SKIA_Rect grown(const SKIA_Rect& area, int by, uint32_t color) {
-  return makeRect(int64_t{area.x} - by, int64_t{area.y} - by, int64_t{area.w} + 2 * by,
-                  int64_t{area.h} + 2 * by, color);
+  return makeRect(int64_t{area.x} - by, int64_t{area.y} - by, int64_t{area.w} + int64_t{2} * by,
+                  int64_t{area.h} + int64_t{2} * by, color);
 }
 
 /// Everything, and one pixel more to the right and below.

@@ -18,7 +18,7 @@ constexpr int kHookKeyKind = 13;
 constexpr int kDoubleKey = 2;
 constexpr int kTripleKey = 3;
 constexpr uint32_t kMostStars = 10;
-constexpr int kTextMargin = 10;        // pixels
+constexpr int64_t kTextMargin = 10;    // pixels
 constexpr int kSmallTextPercent = 30;  // of a row, where there are two lines
 
 // The second line of the kind that was constructed last and had one. A kind without one keeps it:

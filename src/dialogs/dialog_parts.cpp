@@ -3,10 +3,10 @@
 namespace MW {
 
 namespace {
-constexpr int kTitleMarginX = 20;  // pixels, and so the rest
-constexpr int kTitleMarginY = 10;
-constexpr int kFaceMarginX = 10;
-constexpr int kFaceMarginY = 5;
+constexpr int64_t kTitleMarginX = 20;  // pixels, and so the rest
+constexpr int64_t kTitleMarginY = 10;
+constexpr int64_t kFaceMarginX = 10;
+constexpr int64_t kFaceMarginY = 5;
 constexpr int kFaceLoss = 15;  // what margins take from half of the width
 constexpr int kCaptionPercent = 35;
 constexpr int kButtonRow = 2;  // rows above the buttons

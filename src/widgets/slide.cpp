@@ -192,8 +192,8 @@ void Slide::setRect(int newState, const SKIA_Rect* area) {
   lockRect = {to.x, to.y, kTrackUnits * unit, height, kColorShadow};
   leftSlot = {to.x, to.y, kKnobUnits * unit, height, kColorWhite};
   if (look == Look::Plain) leftSlot = {to.x, to.y, to.w, to.h, kColorWhite};
-  rightSlot = makeRect(int64_t{to.x} + int64_t{kTravelUnits} * unit, to.y, kKnobUnits * unit,
-                       height, kColorWhite);
+  rightSlot = makeRect(int64_t{to.x} + int64_t{kTravelUnits} * unit, to.y,
+                       int64_t{kKnobUnits} * unit, height, kColorWhite);
   rect = isRightState(newState) ? rightSlot : leftSlot;
   labelRect1 = rect;
   labelRect2 = rect;

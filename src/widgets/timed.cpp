@@ -15,7 +15,7 @@ constexpr ClassLog kBarLog("PROGRESSBAR");
 constexpr int kRedraw = 1;
 constexpr int kTwoLines = 2;
 constexpr uint32_t kBarFrameColor = 0xFF4F4F4F;
-constexpr int kBarMargin = 2;  // pixels
+constexpr int64_t kBarMargin = 2;  // pixels
 constexpr uint32_t kMostStars = 10;
 }  // namespace
 
