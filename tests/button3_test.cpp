@@ -55,11 +55,11 @@ TEST_P(Button3Grid, PlacesByPosition) {
 
 INSTANTIATE_TEST_SUITE_P(
     Screens, Button3Grid,
-    testing::Values(GridCase{"Tall1440", 1440, 2560, 441, 28, 497, 966, 28, 1060, 2091},
-                    GridCase{"Tall1080", 1080, 1920, 331, 21, 373, 725, 21, 795, 1568},
-                    GridCase{"Tall720", 720, 1280, 220, 14, 248, 482, 14, 530, 1046},
-                    GridCase{"Landscape", 2560, 1440, 785, 51, 887, 1723, 51, 328, 604},
-                    GridCase{"Odd", 1081, 1921, 331, 21, 373, 725, 21, 795, 1569}),
+    testing::Values(GridCase{{"Tall1440"}, 1440, 2560, 441, 28, 497, 966, 28, 1060, 2091},
+                    GridCase{{"Tall1080"}, 1080, 1920, 331, 21, 373, 725, 21, 795, 1568},
+                    GridCase{{"Tall720"}, 720, 1280, 220, 14, 248, 482, 14, 530, 1046},
+                    GridCase{{"Landscape"}, 2560, 1440, 785, 51, 887, 1723, 51, 328, 604},
+                    GridCase{{"Odd"}, 1081, 1921, 331, 21, 373, 725, 21, 795, 1569}),
     rowName);
 
 TEST_F(Button3Test, OtherPositionsKeepThePlace) {
@@ -80,8 +80,6 @@ TEST_F(Button3Test, CaptionsItselfByPosition) {
     Button3 button(position);
     const std::string verdict = position == 1 ? "PASS" : position == 5 ? "RETRY" : "FAIL";
     EXPECT_EQ(shown(button).at(1).text, (DrawnText{verdict, 0, 0, 0})) << position;
-    EXPECT_EQ(button.type(), 1);
-    EXPECT_FALSE(button.isActive());
   }
 }
 
@@ -124,16 +122,16 @@ TEST_P(Button3Caption, KeepsItsFirstLength) {
 
 const std::string kLong(300, 'x');
 
-INSTANTIATE_TEST_SUITE_P(Texts, Button3Caption,
-                         testing::Values(CaptionCase{"Same", "DONE", "DONE", 4},
-                                         CaptionCase{"Longer", "RETRY", "RETR", 5},
-                                         CaptionCase{"Shorter", "OK", "OK" + nuls(2), 2},
-                                         CaptionCase{"Empty", "", nuls(4), 0},
-                                         CaptionCase{"Absent", nullptr, nuls(4), 0},
-                                         CaptionCase{"TooLong", kLong.c_str(), "xxxx", 127},
-                                         CaptionCase{"WholeCharacters", "a\u00e4\u00f6",
-                                                     "a\u00e4" + nuls(1), 5}),
-                         rowName);
+INSTANTIATE_TEST_SUITE_P(
+    Texts, Button3Caption,
+    testing::Values(CaptionCase{{"Same"}, "DONE", "DONE", 4},
+                    CaptionCase{{"Longer"}, "RETRY", "RETR", 5},
+                    CaptionCase{{"Shorter"}, "OK", "OK" + nuls(2), 2},
+                    CaptionCase{{"Empty"}, "", nuls(4), 0},
+                    CaptionCase{{"Absent"}, nullptr, nuls(4), 0},
+                    CaptionCase{{"TooLong"}, kLong.c_str(), "xxxx", 127},
+                    CaptionCase{{"WholeCharacters"}, "a\u00e4\u00f6", "a\u00e4" + nuls(1), 5}),
+    rowName);
 
 TEST_F(Button3Test, IsPressedAsAButtonUnderItsOwnName) {
   setScreen(1080, 1920);

@@ -1,4 +1,4 @@
-// What callbacks may do to the widget that calls them.
+// How widgets start, and what callbacks may do to the widget that calls them.
 
 #include <MW/button3.h>
 #include <MW/dialog.h>
@@ -6,6 +6,7 @@
 #include <MW/main_list.h>
 #include <MW/screen.h>
 #include <MW/slide.h>
+#include <MW/timed.h>
 
 #include <memory>
 #include <tuple>
@@ -18,6 +19,10 @@ using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's
 using MW::Callback;
 using MW::Widget;
 
+constexpr SKIA_Rect kArea = {0, 300, 500, 500, 0};
+constexpr Spot kSpot = {150, 400};  // on every widget but the dialog
+constexpr Spot kOnBoth = {900, 1500};
+
 std::unique_ptr<Widget> widget;
 int changes;
 void (*change)();
@@ -26,17 +31,13 @@ void withInt(int) { change(); }
 void withTouch(MW::mouse_event*) { change(); }
 void withKey(MW::kbd_event*) { change(); }
 void withRow(MW::mouse_event*, MW::MainList*) { change(); }
-void withRowKey(MW::kbd_event*, MW::MainList*) { change(); }
-
-constexpr SKIA_Rect kArea = {0, 300, 500, 500, 0};
-constexpr Spot kSpot = {150, 400};  // on every widget but the dialog
-constexpr Spot kOnBoth = {900, 1500};
 
 std::unique_ptr<Widget> makeList() {
   auto list = std::make_unique<MW::MainList>("Menu");
   const SKIA_Text caption = textRecord("x");
   list->addIndex(1, &caption, 3000);
   list->initFinish();
+  list->clickCallback = withRow;
   return list;
 }
 
@@ -55,41 +56,51 @@ std::unique_ptr<Widget> makeButton() {
   return std::make_unique<MW::Button3>(7);
 }
 
-template <typename Type>
-std::unique_ptr<Widget> make() {
-  return std::make_unique<Type>();
-}
-
-// It answers as two buttons at once.
+std::unique_ptr<Widget> makeScreen() { return std::make_unique<MW::Screen>(); }
+std::unique_ptr<Widget> makeKey() { return std::make_unique<MW::Key>(); }
 std::unique_ptr<Widget> makeDialog() { return std::make_unique<MW::Dialog>(6); }
-std::unique_ptr<Widget> makeHook() { return std::make_unique<MW::Dialog>(13); }
 
-template <auto word>
-void setInt(Widget& of) {
-  of.*word = withInt;
-}
-template <auto word>
-void setTouch(Widget& of) {
-  of.*word = withTouch;
-}
-template <auto word>
-void setKey(Widget& of) {
-  of.*word = withKey;
-}
-template <auto word>
-void setRow(Widget& of) {
-  dynamic_cast<MW::MainList&>(of).*word = withRow;
-}
-template <auto word>
-void setRowKey(Widget& of) {
-  dynamic_cast<MW::MainList&>(of).*word = withRowKey;
-}
+std::unique_ptr<Widget> makeToast() { return std::make_unique<MW::Toastbox>(&kArea, nullptr); }
+std::unique_ptr<Widget> makeBar() { return std::make_unique<MW::Progressbar>(0, &kArea, nullptr); }
+std::unique_ptr<Widget> makeFill() { return std::make_unique<MW::FullScreen>(0); }
 
 struct CallerCase : Row {
   std::unique_ptr<Widget> (*make)();
-  void (*setWord)(Widget&);
-  bool hasDoubleClick = false;  // another word that the same gesture may call afterwards
+  Callback Widget::*word;
+  Callback function;
 };
+
+struct StartCase : Row {
+  std::unique_ptr<Widget> (*make)();
+  int layer;
+  bool isActive;
+};
+
+class WidgetStart : public WidgetTest, public testing::WithParamInterface<StartCase> {};
+
+// Registered, with a word of its class where it says one, and for most of them inactive.
+TEST_P(WidgetStart, StandsInItsLayer) {
+  const auto made = GetParam().make();
+  const std::string line = "[" + std::string(GetParam().name) + "] call registerWidget";
+  const bool isSilent = std::string(GetParam().name) == "BUTTON3" || made->type() == 0;
+  const LogLine first = platform().takeLog().front();
+  EXPECT_EQ(first == (LogLine{kDebug, "BRIMOL_WIDGET", line}), !isSilent) << first;
+  EXPECT_EQ(made->type(), GetParam().layer);
+  EXPECT_EQ(layerSize(GetParam().layer), 1);
+  EXPECT_EQ(made->isActive(), GetParam().isActive);
+  EXPECT_EQ(made->isSelect(), 0);
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Classes, WidgetStart,
+    testing::Values(StartCase{{"BUTTON3"}, makeButton, 1, false},
+                    StartCase{{"BUTTON"}, makeScreen, 1, false},  // the screen's word, too
+                    StartCase{{"SLIDE"}, makeSlide, 1, false}, StartCase{{"KEY"}, makeKey, 1, true},
+                    StartCase{{"DIALOG"}, makeDialog, 0, false},
+                    StartCase{{"TOASTBOX"}, makeToast, 1, false},
+                    StartCase{{"PROGRESSBAR"}, makeBar, 1, false},
+                    StartCase{{"FULLSCREEN"}, makeFill, 0, false}),
+    rowName);
 
 struct ChangeCase : Row {
   void (*change)();
@@ -119,8 +130,7 @@ TEST_P(CallbackChange, FromInside) {
   change = what.change;
   widget = caller.make();
   widget->setActive(1);
-  if (caller.hasDoubleClick) widget->doubleClickCallback = withInt;
-  caller.setWord(*widget);
+  (*widget).*caller.word = caller.function;
   for (const Spot spot : {kSpot, kOnBoth}) {
     for (const auto code : {MW::kEventPress, MW::kEventRelease, MW::kEventPress, MW::kEventRelease,
                             MW::kEventPress, MW::kEventLongPress}) {
@@ -142,50 +152,35 @@ TEST_P(CallbackChange, FromInside) {
   EXPECT_GT(changes, 0) << "was called";
 }
 
-const auto kChanges = testing::Values(ChangeCase{"Deletes",
+const auto kChanges = testing::Values(ChangeCase{{"Deletes"},
                                                  [] {
                                                    ++changes;
                                                    widget.reset();
                                                  }},
-                                      ChangeCase{"Hides", [] {
+                                      ChangeCase{{"Hides"}, [] {
                                                    ++changes;
                                                    widget->hide();
                                                  }});
 const auto kCallers = testing::Values(
-    CallerCase{"Button3Press", makeButton, setInt<&Widget::pressCallback>, true},
-    CallerCase{"Button3Click", makeButton, setInt<&Widget::clickCallback>, true},
-    CallerCase{"Button3Long", makeButton, setInt<&Widget::longPressCallback>},
-    CallerCase{"Button3Double", makeButton, setInt<&Widget::doubleClickCallback>},
-    CallerCase{"ScreenPress", make<MW::Screen>, setTouch<&Widget::pressCallback>, true},
-    CallerCase{"ScreenClick", make<MW::Screen>, setTouch<&Widget::clickCallback>, true},
-    CallerCase{"ScreenLong", make<MW::Screen>, setTouch<&Widget::longPressCallback>},
-    CallerCase{"ScreenHover", make<MW::Screen>, setTouch<&Widget::hoverCallback>},
-    CallerCase{"ScreenDouble", make<MW::Screen>, setInt<&Widget::doubleClickCallback>},
-    CallerCase{"SlideRight", makeSlide, setInt<&Widget::rightCallback>},
-    CallerCase{"SlideLeft", makeSlide, setInt<&Widget::leftCallback>},
-    CallerCase{"SlideDouble", makeLocked, setTouch<&Widget::doubleClickCallback>},
-    CallerCase{"KeyPress", make<MW::Key>, setKey<&Widget::keyPressCallback>},
-    CallerCase{"KeyRelease", make<MW::Key>, setKey<&Widget::keyReleaseCallback>},
-    CallerCase{"KeyDouble", make<MW::Key>, setKey<&Widget::doubleKeyCallback>},
-    CallerCase{"KeyTriple", make<MW::Key>, setKey<&Widget::tripleKeyCallback>},
-    CallerCase{"KeyPlug", make<MW::Key>, setKey<&Widget::plugCallback>},
-    CallerCase{"KeyTouch", make<MW::Key>, setTouch<&Widget::touchPressCallback>},
-    CallerCase{"KeyLong", make<MW::Key>, setTouch<&Widget::longPressCallback>},
-    CallerCase{"DialogLeft", makeDialog, setInt<&Widget::button1Callback>},
-    CallerCase{"DialogRight", makeDialog, setInt<&Widget::button2Callback>},
-    CallerCase{"DialogPress", makeDialog, setTouch<&Widget::pressCallback>},
-    CallerCase{"DialogHover", makeDialog, setTouch<&Widget::hoverCallback>},
-    CallerCase{"DialogTouch", makeDialog, setTouch<&Widget::clickCallback>},
-    CallerCase{"DialogDouble", makeDialog, setKey<&Widget::doubleKeyCallback>},
-    CallerCase{"DialogTriple", makeDialog, setKey<&Widget::tripleKeyCallback>},
-    CallerCase{"DialogKey", makeDialog, setKey<&Widget::keyReleaseCallback>},
-    CallerCase{"DialogPlug", makeDialog, setKey<&Widget::plugCallback>},
-    CallerCase{"DialogHook", makeHook, setInt<&Widget::hookKeyCallback>},
-    CallerCase{"ListPress", makeList, setRow<&MW::MainList::pressCallback>},
-    CallerCase{"ListClick", makeList, setRow<&MW::MainList::clickCallback>},
-    CallerCase{"ListRelease", makeList, setRow<&MW::MainList::releaseCallback>},
-    CallerCase{"ListScroll", makeList, setRow<&MW::MainList::scrollCallback>},
-    CallerCase{"ListKey", makeList, setRowKey<&MW::MainList::keyReleaseCallback>});
+    CallerCase{{"Button3Press"}, makeButton, &Widget::pressCallback, withInt},
+    CallerCase{{"Button3Click"}, makeButton, &Widget::clickCallback, withInt},
+    CallerCase{{"Button3Double"}, makeButton, &Widget::doubleClickCallback, withInt},
+    CallerCase{{"ScreenPress"}, makeScreen, &Widget::pressCallback, withTouch},
+    CallerCase{{"ScreenClick"}, makeScreen, &Widget::clickCallback, withTouch},
+    CallerCase{{"ScreenDouble"}, makeScreen, &Widget::doubleClickCallback, withInt},
+    CallerCase{{"SlideRight"}, makeSlide, &Widget::rightCallback, withInt},
+    CallerCase{{"SlideLeft"}, makeSlide, &Widget::leftCallback, withInt},
+    CallerCase{{"SlideTaps"}, makeLocked, &Widget::doubleClickCallback, withTouch},
+    CallerCase{{"KeyRelease"}, makeKey, &Widget::keyReleaseCallback, withKey},
+    CallerCase{{"KeyDouble"}, makeKey, &Widget::doubleKeyCallback, withKey},
+    CallerCase{{"KeyPlug"}, makeKey, &Widget::plugCallback, withKey},
+    CallerCase{{"DialogLeft"}, makeDialog, &Widget::button1Callback, withInt},
+    CallerCase{{"DialogRight"}, makeDialog, &Widget::button2Callback, withInt},
+    CallerCase{{"DialogPress"}, makeDialog, &Widget::pressCallback, withTouch},
+    CallerCase{{"DialogHover"}, makeDialog, &Widget::hoverCallback, withTouch},
+    CallerCase{{"DialogDouble"}, makeDialog, &Widget::doubleKeyCallback, withKey},
+    // By its own word; the base's is not called.
+    CallerCase{{"ListClick"}, makeList, &Widget::hoverCallback, nullptr});
 
 INSTANTIATE_TEST_SUITE_P(Callers, CallbackChange, testing::Combine(kChanges, kCallers),
                          [](const auto& row) {

@@ -71,13 +71,6 @@ class DialogInput : public WidgetTest {
   static unsigned int rightColor() { return faceColor(10); }
 };
 
-TEST_F(DialogInput, StartsInactiveInTheTopLayer) {
-  Dialog other(0);
-  EXPECT_EQ(other.type(), 0);
-  EXPECT_FALSE(other.isActive());
-  EXPECT_EQ(other.isSelect(), 0);
-}
-
 TEST_F(DialogInput, LeftButtonAnswersAndStays) {
   EXPECT_TRUE(press(*dialog, kOnLeft, 2));
   EXPECT_EQ(dialog->isSelect(), 3);
@@ -160,7 +153,7 @@ TEST_F(DialogInput, CountsReleasesOfOneKey) {
     platform().ticks = at;
     EXPECT_TRUE(offer(*dialog, keyEvent(MW::kEventKeyRelease, key)));
   };
-  for (const unsigned int at : {1000, 1999, 2998, 3000}) releaseAt(at, 5);
+  for (const unsigned int at : {1000U, 1999U, 2998U, 3000U}) releaseAt(at, 5);
   EXPECT_EQ(calls, "r5 D5 r5 T5 r5 r5 ");
   EXPECT_EQ(platform().takeLog().back().message, "[DIALOG] key onReleaseKey sym = 5");
   calls.clear();
@@ -188,13 +181,6 @@ TEST_F(DialogInput, ProgressGrowsToTenStarsAndStartsAgain) {
   offer(*dialog, keyEvent(MW::kEventKeyRelease, 5));
   platform().ticks += 100;
   EXPECT_EQ(stars(), 2U) << "a key delays it";
-}
-
-TEST_F(DialogInput, ProgressIsOfferedAloneToo) {
-  open(23);
-  platform().takeDrawings();
-  dialog->updateProgress(500);
-  EXPECT_EQ(platform().takeDrawings().size(), 2U);
 }
 
 TEST_F(DialogInput, BlinksInItsBody) {

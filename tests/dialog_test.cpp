@@ -12,7 +12,7 @@ using MW::Dialog;
 constexpr unsigned int kWhite = 0xFFFFFFFF;
 constexpr unsigned int kBlack = 0xFF000000;
 constexpr unsigned int kBlue = 0xFF87CEFA;
-constexpr unsigned int kHeld = 0xFF87CEFA;
+constexpr unsigned int kGrey = 0xFFBFBFBF;
 constexpr unsigned int kShadow = 0x7F000000;
 constexpr unsigned int kAlarm = 0xFFFF0000;
 constexpr int kLeft = 1;
@@ -21,15 +21,9 @@ constexpr int kCentre = 5;
 // On the default screen of 1440 x 2560; the lower rows of tall and low dialogs share their height.
 constexpr Spot kOnLeft = {300, 1530};
 constexpr Spot kOnRight = {900, 1530};
-constexpr Spot kBeside = {10, 10};
 
 std::string calls;
 std::unique_ptr<Dialog> dialog;
-
-void noteButtons() {
-  dialog->button1Callback = [](int value) { calls += value == 0 ? '1' : '!'; };
-  dialog->button2Callback = [](int) { calls += dialog->isActive() ? '!' : '2'; };
-}
 
 class DialogTest : public WidgetTest {
  protected:
@@ -45,17 +39,23 @@ class DialogTest : public WidgetTest {
   static void open(int kind) {
     dialog = std::make_unique<Dialog>(kind);
     dialog->setActive(1);
-    noteButtons();
-    platform().takeLog();
+    dialog->button1Callback = [](int value) { calls += value == 0 ? '1' : '!'; };
+    dialog->button2Callback = [](int value) { calls += value == 0 ? '2' : '!'; };
   }
 };
 
+struct Frame {
+  int w, h;  // of the screen
+  SKIA_Rect outer, titleBar, body, title;
+};
+
 struct Layout : Row {
-  int w, h, kind;
-  SKIA_Rect backdrop, frame, titleBar, body;
-  int lineLeft, lineRight;  // in the body's first row
-  SKIA_Rect title, message;
-  int messageSize, align;
+  Frame frame;
+  int kind;
+  unsigned int backdrop;
+  int align;
+  SKIA_Rect message;
+  int messageSize;
   SKIA_Rect second;  // of no width: not drawn
   int secondSize;
   std::vector<Drawing> below;
@@ -65,21 +65,22 @@ class DialogLayout : public DialogTest, public testing::WithParamInterface<Layou
 
 TEST_P(DialogLayout, IsDrawnInItsOrder) {
   const Layout& at = GetParam();
-  setScreen(at.w, at.h);
+  const auto& [w, h, outer, titleBar, body, title] = at.frame;
+  setScreen(w, h);
   open(at.kind);
   dialog->setTitle("Title");
   dialog->setDesc("Message");
   std::vector<Drawing> expected = {
-      box(at.backdrop),
-      box(at.frame),
-      box(at.titleBar),
-      box(at.body),
-      line({at.lineLeft, at.body.y, at.lineRight, at.body.y, kBlue, 1}),
-      label(at.title, {"Title", kBlue, at.align, 70}),
+      box({0, 0, w + 1, h + 1, at.backdrop}),
+      box(outer),
+      box(titleBar),
+      box(body),
+      line({body.x, body.y, body.x + body.w, body.y, kBlue, 1}),
+      label(title, {"Title", kBlue, at.align, 70}),
       label(at.message, {"Message", kWhite, at.align, at.messageSize})};
-  std::vector<Drawing> drawn = shown(*dialog);
+  const std::vector<Drawing> drawn = shown(*dialog);
+  ASSERT_GT(drawn.size(), 7U - (at.second.w == 0 ? 1 : 0));
   if (at.second.w != 0) {
-    ASSERT_GT(drawn.size(), 7U);
     const DrawnText words = {drawn.at(7).text.text, kWhite, at.align, at.secondSize};
     expected.push_back(label(at.second, words));
   }
@@ -87,231 +88,51 @@ TEST_P(DialogLayout, IsDrawnInItsOrder) {
   EXPECT_EQ(drawn, expected);
 }
 
-// Two buttons in row `y`, and one whose caption is a row of stars or a word.
-std::vector<Drawing> twoButtons(const SKIA_Rect& left, const SKIA_Rect& right, int size) {
-  return {roundBox({left.x - 1, left.y - 1, left.w + 2, left.h + 2, kBlack}),
-          roundTextbox(left, {"OK", kBlack, kCentre, size}),
-          roundBox({right.x - 1, right.y - 1, right.w + 2, right.h + 2, kBlack}),
-          roundTextbox(right, {"CANCEL", kBlack, kCentre, size})};
+// Two buttons of one size, at these places.
+std::vector<Drawing> buttons(Spot left, Spot right, Spot size, int textSize) {
+  std::vector<Drawing> drawn;
+  for (const auto& [at, words] : {std::pair(left, "OK"), std::pair(right, "CANCEL")}) {
+    drawn.push_back(roundBox({at.x - 1, at.y - 1, size.x + 2, size.y + 2, kBlack}));
+    drawn.push_back(
+        roundTextbox({at.x, at.y, size.x, size.y, kWhite}, {words, kBlack, kCentre, textSize}));
+  }
+  return drawn;
 }
-const std::vector<Drawing> kProgress1440 = {
-    box({153, 1399, 1134, 222, kBlack}),
-    textbox({154, 1400, 1132, 220, kWhite}, {"*", kBlack, kCentre, 80})};
+
+// clang-format off
+constexpr Frame kTall1440 = {1440, 2560, {144, 935, 1152, 690, kGrey}, {145, 936, 1150, 230, kBlack}, {145, 1166, 1150, 228, kBlack}, {164, 945, 1112, 210, 0}};
+constexpr Frame kLow1440 = {1440, 2560, {144, 1050, 1152, 460, kGrey}, {145, 1051, 1150, 230, kBlack}, {145, 1281, 1150, 228, kBlack}, {164, 1060, 1112, 210, 0}};
+constexpr Frame kTall1080 = {1080, 1920, {108, 702, 864, 516, kGrey}, {109, 703, 862, 172, kBlack}, {109, 875, 862, 170, kBlack}, {128, 712, 824, 152, 0}};
+constexpr Frame kTallOdd = {1081, 1921, {108, 702, 864, 516, kGrey}, {109, 703, 862, 172, kBlack}, {109, 875, 862, 170, kBlack}, {128, 712, 824, 152, 0}};
+constexpr Frame kTall720 = {720, 1280, {72, 467, 576, 345, kGrey}, {73, 468, 574, 115, kBlack}, {73, 583, 574, 113, kBlack}, {92, 477, 536, 95, 0}};
+constexpr Frame kLow720 = {720, 1280, {72, 525, 576, 230, kGrey}, {73, 526, 574, 115, kBlack}, {73, 641, 574, 113, kBlack}, {92, 535, 536, 95, 0}};
+constexpr Frame kTallWide = {2560, 1440, {704, 375, 1152, 690, kGrey}, {705, 376, 1150, 230, kBlack}, {705, 606, 1150, 228, kBlack}, {724, 385, 1112, 210, 0}};
+constexpr Frame kLowWide = {2560, 1440, {704, 490, 1152, 460, kGrey}, {705, 491, 1150, 230, kBlack}, {705, 721, 1150, 228, kBlack}, {724, 500, 1112, 210, 0}};
+
+const auto kButtons1440 = buttons({154, 1400}, {725, 1400}, {561, 220}, 80);
+const auto kButtons1080 = buttons({118, 1051}, {545, 1051}, {417, 162}, 60);
+const auto kButtons720 = buttons({82, 702}, {365, 702}, {273, 105}, 40);
+const auto kButtonsWide = buttons({714, 840}, {1285, 840}, {561, 220}, 80);
+const std::vector<Drawing> kOneButton1080 = {roundBox({117, 1050, 846, 164, kBlack}), roundTextbox({118, 1051, 844, 162, kWhite}, {"OK", kBlack, kCentre, 60})};
+const std::vector<Drawing> kProgress1440 = {box({153, 1399, 1134, 222, kBlack}), textbox({154, 1400, 1132, 220, kWhite}, {"*", kBlack, kCentre, 80})};
 
 INSTANTIATE_TEST_SUITE_P(
-    Standard, DialogLayout,
+    ScreensAndClasses, DialogLayout,
     testing::Values(
-        Layout{"Tall1440",
-               1440,
-               2560,
-               0,
-               {0, 0, 1441, 2561, kShadow},
-               {144, 935, 1152, 690, 0xFFBFBFBF},
-               {145, 936, 1150, 230, kBlack},
-               {145, 1166, 1150, 228, kBlack},
-               145,
-               1295,
-               {164, 945, 1112, 210, 0},
-               {154, 1175, 1132, 210, 0},
-               60,
-               kLeft,
-               {},
-               0,
-               twoButtons({154, 1400, 561, 220, kWhite}, {725, 1400, 561, 220, kWhite}, 80)},
-        Layout{"Tall1080",
-               1080,
-               1920,
-               0,
-               {0, 0, 1081, 1921, kShadow},
-               {108, 702, 864, 516, 0xFFBFBFBF},
-               {109, 703, 862, 172, kBlack},
-               {109, 875, 862, 170, kBlack},
-               109,
-               971,
-               {128, 712, 824, 152, 0},
-               {118, 884, 844, 152, 0},
-               60,
-               kLeft,
-               {},
-               0,
-               twoButtons({118, 1051, 417, 162, kWhite}, {545, 1051, 417, 162, kWhite}, 60)},
-        Layout{"Tall720",
-               720,
-               1280,
-               0,
-               {0, 0, 721, 1281, kShadow},
-               {72, 467, 576, 345, 0xFFBFBFBF},
-               {73, 468, 574, 115, kBlack},
-               {73, 583, 574, 113, kBlack},
-               73,
-               647,
-               {92, 477, 536, 95, 0},
-               {82, 592, 556, 95, 0},
-               60,
-               kLeft,
-               {},
-               0,
-               twoButtons({82, 702, 273, 105, kWhite}, {365, 702, 273, 105, kWhite}, 40)},
-        Layout{"Landscape",
-               2560,
-               1440,
-               0,
-               {0, 0, 2561, 1441, kShadow},
-               {704, 375, 1152, 690, 0xFFBFBFBF},
-               {705, 376, 1150, 230, kBlack},
-               {705, 606, 1150, 228, kBlack},
-               705,
-               1855,
-               {724, 385, 1112, 210, 0},
-               {714, 615, 1132, 210, 0},
-               60,
-               kLeft,
-               {},
-               0,
-               twoButtons({714, 840, 561, 220, kWhite}, {1285, 840, 561, 220, kWhite}, 80)},
-        Layout{"Odd",
-               1081,
-               1921,
-               0,
-               {0, 0, 1082, 1922, kShadow},
-               {108, 702, 864, 516, 0xFFBFBFBF},
-               {109, 703, 862, 172, kBlack},
-               {109, 875, 862, 170, kBlack},
-               109,
-               971,
-               {128, 712, 824, 152, 0},
-               {118, 884, 844, 152, 0},
-               60,
-               kLeft,
-               {},
-               0,
-               twoButtons({118, 1051, 417, 162, kWhite}, {545, 1051, 417, 162, kWhite}, 60)}),
+        Layout{{"Standard1440"}, kTall1440, 0, kShadow, kLeft, {154, 1175, 1132, 210, 0}, 60, {}, 0, kButtons1440},
+        Layout{{"Standard1080"}, kTall1080, 0, kShadow, kLeft, {118, 884, 844, 152, 0}, 60, {}, 0, kButtons1080},
+        Layout{{"Standard720"}, kTall720, 0, kShadow, kLeft, {82, 592, 556, 95, 0}, 60, {}, 0, kButtons720},
+        Layout{{"StandardWide"}, kTallWide, 0, kShadow, kLeft, {714, 615, 1132, 210, 0}, 60, {}, 0, kButtonsWide},
+        Layout{{"StandardOdd"}, kTallOdd, 0, kShadow, kLeft, {118, 884, 844, 152, 0}, 60, {}, 0, kButtons1080},
+        Layout{{"TwoLine"}, kTall1440, 4, kShadow, kLeft, {154, 1175, 1132, 69, 0}, 54, {154, 1290, 1132, 69, 0}, 54, kButtons1440},
+        Layout{{"Hook"}, kLow1440, 13, kShadow, kLeft, {154, 1290, 1132, 210, 0}, 60, {}, 0, {}},
+        Layout{{"Earjack"}, kLow720, 14, kShadow, kLeft, {82, 650, 556, 34, 0}, 34, {82, 707, 556, 34, 0}, 34, {}},
+        Layout{{"OkOnly"}, kTall1080, 15, kShadow, kCentre, {118, 884, 844, 152, 0}, 51, {}, 0, kOneButton1080},
+        Layout{{"TouchWarning"}, kTall1440, 23, kAlarm, kCentre, {154, 1175, 1132, 210, 0}, 60, {}, 0, kProgress1440},
+        Layout{{"TouchCaution"}, kTall1440, 24, kAlarm, kCentre, {154, 1175, 1132, 69, 0}, 54, {154, 1290, 1132, 69, 0}, 54, kProgress1440},
+        Layout{{"Wait"}, kLowWide, 38, kShadow, kLeft, {714, 730, 1132, 210, 0}, 60, {}, 0, {}}),
     rowName);
-
-INSTANTIATE_TEST_SUITE_P(OtherClasses, DialogLayout,
-                         testing::Values(Layout{"TwoLine",
-                                                1440,
-                                                2560,
-                                                4,
-                                                {0, 0, 1441, 2561, kShadow},
-                                                {144, 935, 1152, 690, 0xFFBFBFBF},
-                                                {145, 936, 1150, 230, kBlack},
-                                                {145, 1166, 1150, 228, kBlack},
-                                                145,
-                                                1295,
-                                                {164, 945, 1112, 210, 0},
-                                                {154, 1175, 1132, 69, 0},
-                                                54,
-                                                kLeft,
-                                                {154, 1290, 1132, 69, 0},
-                                                54,
-                                                twoButtons({154, 1400, 561, 220, kWhite},
-                                                           {725, 1400, 561, 220, kWhite}, 80)},
-                                         Layout{"Hook",
-                                                1440,
-                                                2560,
-                                                13,
-                                                {0, 0, 1441, 2561, kShadow},
-                                                {144, 1050, 1152, 460, 0xFFBFBFBF},
-                                                {145, 1051, 1150, 230, kBlack},
-                                                {145, 1281, 1150, 228, kBlack},
-                                                145,
-                                                1295,
-                                                {164, 1060, 1112, 210, 0},
-                                                {154, 1290, 1132, 210, 0},
-                                                60,
-                                                kLeft,
-                                                {},
-                                                0,
-                                                {}},
-                                         Layout{"Earjack",
-                                                720,
-                                                1280,
-                                                14,
-                                                {0, 0, 721, 1281, kShadow},
-                                                {72, 525, 576, 230, 0xFFBFBFBF},
-                                                {73, 526, 574, 115, kBlack},
-                                                {73, 641, 574, 113, kBlack},
-                                                73,
-                                                647,
-                                                {92, 535, 536, 95, 0},
-                                                {82, 650, 556, 34, 0},
-                                                34,
-                                                kLeft,
-                                                {82, 707, 556, 34, 0},
-                                                34,
-                                                {}},
-                                         Layout{"OkOnly",
-                                                1080,
-                                                1920,
-                                                15,
-                                                {0, 0, 1081, 1921, kShadow},
-                                                {108, 702, 864, 516, 0xFFBFBFBF},
-                                                {109, 703, 862, 172, kBlack},
-                                                {109, 875, 862, 170, kBlack},
-                                                109,
-                                                971,
-                                                {128, 712, 824, 152, 0},
-                                                {118, 884, 844, 152, 0},
-                                                51,
-                                                kCentre,
-                                                {},
-                                                0,
-                                                {roundBox({117, 1050, 846, 164, kBlack}),
-                                                 roundTextbox({118, 1051, 844, 162, kWhite},
-                                                              {"OK", kBlack, kCentre, 60})}},
-                                         Layout{"TouchWarning",
-                                                1440,
-                                                2560,
-                                                23,
-                                                {0, 0, 1441, 2561, kAlarm},
-                                                {144, 935, 1152, 690, 0xFFBFBFBF},
-                                                {145, 936, 1150, 230, kBlack},
-                                                {145, 1166, 1150, 228, kBlack},
-                                                145,
-                                                1295,
-                                                {164, 945, 1112, 210, 0},
-                                                {154, 1175, 1132, 210, 0},
-                                                60,
-                                                kCentre,
-                                                {},
-                                                0,
-                                                kProgress1440},
-                                         Layout{"TouchCaution",
-                                                1440,
-                                                2560,
-                                                24,
-                                                {0, 0, 1441, 2561, kAlarm},
-                                                {144, 935, 1152, 690, 0xFFBFBFBF},
-                                                {145, 936, 1150, 230, kBlack},
-                                                {145, 1166, 1150, 228, kBlack},
-                                                145,
-                                                1295,
-                                                {164, 945, 1112, 210, 0},
-                                                {154, 1175, 1132, 69, 0},
-                                                54,
-                                                kCentre,
-                                                {154, 1290, 1132, 69, 0},
-                                                54,
-                                                kProgress1440},
-                                         Layout{"Wait",
-                                                2560,
-                                                1440,
-                                                38,
-                                                {0, 0, 2561, 1441, kShadow},
-                                                {704, 490, 1152, 460, 0xFFBFBFBF},
-                                                {705, 491, 1150, 230, kBlack},
-                                                {705, 721, 1150, 228, kBlack},
-                                                705,
-                                                1855,
-                                                {724, 500, 1112, 210, 0},
-                                                {714, 730, 1132, 210, 0},
-                                                60,
-                                                kLeft,
-                                                {},
-                                                0,
-                                                {}}),
-                         rowName);
+// clang-format on
 
 struct KindCase {
   int kind, number;  // of its class

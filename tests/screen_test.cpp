@@ -27,7 +27,7 @@ class ScreenTest : public WidgetTest {
     screen->clickCallback = [](MW::mouse_event* mouse) { note('c', mouse); };
     screen->longPressCallback = [](MW::mouse_event* mouse) { note('l', mouse); };
     screen->hoverCallback = [](MW::mouse_event* mouse) { note('h', mouse); };
-    constructionLog = platform().takeLog();
+    platform().takeLog();
   }
   void TearDown() override {
     screen.reset();
@@ -50,16 +50,7 @@ class ScreenTest : public WidgetTest {
   }
 
   std::unique_ptr<Screen> screen;
-  std::vector<LogLine> constructionLog;
 };
-
-TEST_F(ScreenTest, StartsInactiveUnderTheButtonsName) {
-  EXPECT_EQ(constructionLog.front(),
-            (LogLine{kDebug, "BRIMOL_WIDGET", "[BUTTON] call registerWidget"}));
-  EXPECT_EQ(screen->type(), 1);
-  EXPECT_FALSE(screen->isActive());
-  EXPECT_TRUE(shown(*screen).empty());
-}
 
 TEST_F(ScreenTest, ReportsEveryTouchWhereverItIs) {
   EXPECT_TRUE(press(*screen, {-5, 9000}, 2));
@@ -69,6 +60,7 @@ TEST_F(ScreenTest, ReportsEveryTouchWhereverItIs) {
   EXPECT_TRUE(release(*screen, {5, 6}, 7));
   EXPECT_EQ(screen->isSelect(), 0);
   EXPECT_EQ(calls, "p-5,9000 h1,2 l3,4 c5,6 ");
+  EXPECT_TRUE(shown(*screen).empty());
   EXPECT_EQ(platform().takeLog(), logLines(kDebug, {"[BUTTON] pressed!!"}));
   for (int code = 4; code <= 8; ++code) EXPECT_FALSE(offer(*screen, {.type = code, .mouse = {}}));
   EXPECT_FALSE(screen->onRecvEvent(nullptr, 0));
@@ -103,18 +95,18 @@ TEST_P(ScreenSquare, SaysWhetherATapCounts) {
 
 INSTANTIATE_TEST_SUITE_P(
     Places, ScreenSquare,
-    testing::Values(SquareCase{"Still", {500, 500}, {500, 500}, true},
-                    SquareCase{"TopLeftIn", {500, 500}, {475, 475}, true},
-                    SquareCase{"LeftOut", {500, 500}, {474, 500}, false},
-                    SquareCase{"BottomRightIn", {500, 500}, {524, 524}, true},
-                    SquareCase{"BottomOut", {500, 500}, {500, 525}, false},
-                    SquareCase{"AtTheNearEdges", {50, 50}, {50, 50}, true},
-                    SquareCase{"TooFarLeft", {49, 500}, {49, 500}, false},
-                    SquareCase{"TooFarUp", {500, 49}, {500, 49}, false},
-                    SquareCase{"AtTheFarEdges", {950, 1950}, {950, 1950}, true},
-                    SquareCase{"TooFarRight", {951, 500}, {951, 500}, false},
-                    SquareCase{"TooFarDown", {500, 1951}, {500, 1951}, false},
-                    SquareCase{"OffTheScreen", {INT_MIN, INT_MAX}, {INT_MIN, INT_MAX}, false}),
+    testing::Values(SquareCase{{"Still"}, {500, 500}, {500, 500}, true},
+                    SquareCase{{"TopLeftIn"}, {500, 500}, {475, 475}, true},
+                    SquareCase{{"LeftOut"}, {500, 500}, {474, 500}, false},
+                    SquareCase{{"BottomRightIn"}, {500, 500}, {524, 524}, true},
+                    SquareCase{{"BottomOut"}, {500, 500}, {500, 525}, false},
+                    SquareCase{{"AtTheNearEdges"}, {50, 50}, {50, 50}, true},
+                    SquareCase{{"TooFarLeft"}, {49, 500}, {49, 500}, false},
+                    SquareCase{{"TooFarUp"}, {500, 49}, {500, 49}, false},
+                    SquareCase{{"AtTheFarEdges"}, {950, 1950}, {950, 1950}, true},
+                    SquareCase{{"TooFarRight"}, {951, 500}, {951, 500}, false},
+                    SquareCase{{"TooFarDown"}, {500, 1951}, {500, 1951}, false},
+                    SquareCase{{"OffTheScreen"}, {INT_MIN, INT_MAX}, {INT_MIN, INT_MAX}, false}),
     rowName);
 
 struct TapTime {
@@ -147,32 +139,17 @@ TEST_P(ScreenDoubleTap, GoesByTheClock) {
 INSTANTIATE_TEST_SUITE_P(
     Times, ScreenDoubleTap,
     testing::Values(
-        TapCase{"Three", {{1000, 1100}, {1200, 1300}, {1400, 1500}}, {1, 2, 3}},
-        TapCase{"FarApart", {{1000, 1100}, {1200, 1300, {60, 1900}}}, {1, 2}},
-        TapCase{"Held499", {{1000, 1499}, {1600, 1700}}, {1, 2}},
-        TapCase{"Held500", {{1000, 1500}, {1600, 1700}}, {0, 1}},
-        TapCase{"SecondReleased499", {{1000, 1100}, {1200, 1599}}, {1, 2}},
-        TapCase{"SecondReleased500", {{1000, 1100}, {1200, 1600}}, {1, 0}},
-        TapCase{"SecondPressed501", {{1000, 1100}, {1601, 1650}}, {1, 1}},
-        TapCase{"EdgeBetween", {{1000, 1100}, {1200, 1250, {10, 10}}, {1300, 1400}}, {1, 0, 2}},
+        TapCase{{"Three"}, {{1000, 1100}, {1200, 1300}, {1400, 1500}}, {1, 2, 3}},
+        TapCase{{"FarApart"}, {{1000, 1100}, {1200, 1300, {60, 1900}}}, {1, 2}},
+        TapCase{{"Held499"}, {{1000, 1499}, {1600, 1700}}, {1, 2}},
+        TapCase{{"Held500"}, {{1000, 1500}, {1600, 1700}}, {0, 1}},
+        TapCase{{"SecondReleased499"}, {{1000, 1100}, {1200, 1599}}, {1, 2}},
+        TapCase{{"SecondReleased500"}, {{1000, 1100}, {1200, 1600}}, {1, 0}},
+        TapCase{{"SecondPressed501"}, {{1000, 1100}, {1601, 1650}}, {1, 1}},
+        TapCase{{"EdgeBetween"}, {{1000, 1100}, {1200, 1250, {10, 10}}, {1300, 1400}}, {1, 0, 2}},
         TapCase{
-            "BehindTheWrap", {{0xFFFFFFF0, 0xFFFFFFF8}, {1000, 1100}, {1200, 1300}}, {0, 1, 2}}),
+            {"BehindTheWrap"}, {{0xFFFFFFF0, 0xFFFFFFF8}, {1000, 1100}, {1200, 1300}}, {0, 1, 2}}),
     rowName);
-
-TEST_F(ScreenTest, CountsNothingUnasked) {
-  platform().ticks = 1000;
-  tap({500, 500}, {500, 500}, 1);
-  tap({500, 500}, {500, 500}, 1);
-  EXPECT_EQ(platform().takeLog(), logLines(kDebug, {"[BUTTON] pressed!!", "[BUTTON] pressed!!"}));
-}
-
-TEST_F(ScreenTest, HideLetsTheFingerBe) {
-  screen->setActive(1);
-  press(*screen, {500, 500});
-  EXPECT_EQ(screen->hide(), 1);
-  EXPECT_FALSE(screen->isActive());
-  EXPECT_EQ(screen->isSelect(), 1);
-}
 
 TEST_F(ScreenTest, TakesAnyScreen) {
   for (const int size : kHostileSizes) {
@@ -210,16 +187,16 @@ TEST_P(FullScreenFill, CoversTheScreen) {
 
 INSTANTIATE_TEST_SUITE_P(
     Screens, FullScreenFill,
-    testing::Values(FillCase{"White", 1440, 2560, 0, {0, 0, 1441, 2561, 0xFFFFFFFF}},
-                    FillCase{"Red", 1080, 1920, 1, {0, 0, 1081, 1921, 0xFFFF0000}},
-                    FillCase{"Green", 720, 1280, 2, {0, 0, 721, 1281, 0xFF00FF00}},
-                    FillCase{"Blue", 2560, 1440, 3, {0, 0, 2561, 1441, 0xFF0000FF}},
-                    FillCase{"Grey", 1081, 1921, 4, {0, 0, 1082, 1922, 0xFFBFBFBF}},
-                    FillCase{"Seven", 1080, 1920, 7, {0, 0, 1081, 1921, 0xFFBFBFBF}},
-                    FillCase{"Negative", 1080, 1920, -1, {0, 0, 1081, 1921, 0xFFBFBFBF}},
-                    FillCase{"DefaultSize", 0, 0, INT_MIN, {0, 0, 1441, 2561, 0xFFBFBFBF}},
+    testing::Values(FillCase{{"White"}, 1440, 2560, 0, {0, 0, 1441, 2561, 0xFFFFFFFF}},
+                    FillCase{{"Red"}, 1080, 1920, 1, {0, 0, 1081, 1921, 0xFFFF0000}},
+                    FillCase{{"Green"}, 720, 1280, 2, {0, 0, 721, 1281, 0xFF00FF00}},
+                    FillCase{{"Blue"}, 2560, 1440, 3, {0, 0, 2561, 1441, 0xFF0000FF}},
+                    FillCase{{"Grey"}, 1081, 1921, 4, {0, 0, 1082, 1922, 0xFFBFBFBF}},
+                    FillCase{{"Seven"}, 1080, 1920, 7, {0, 0, 1081, 1921, 0xFFBFBFBF}},
+                    FillCase{{"Negative"}, 1080, 1920, -1, {0, 0, 1081, 1921, 0xFFBFBFBF}},
+                    FillCase{{"DefaultSize"}, 0, 0, INT_MIN, {0, 0, 1441, 2561, 0xFFBFBFBF}},
                     FillCase{
-                        "Huge", INT_MAX, INT_MIN, 0, {0, 0, INT_MAX, INT_MIN + 1, 0xFFFFFFFF}}),
+                        {"Huge"}, INT_MAX, INT_MIN, 0, {0, 0, INT_MAX, INT_MIN + 1, 0xFFFFFFFF}}),
     rowName);
 
 struct OpenFullScreen : FullScreen {

@@ -61,26 +61,26 @@ struct Menu {
 
   void set(int round) {
     const auto number = static_cast<std::size_t>(round) % 2;
-    const char* const words_ = kTexts.at(number).c_str();
+    const char* const shown = kTexts.at(number).c_str();
     const SKIA_Rect& area = kAreas.at(number);
-    button.setText(words_);
+    button.setText(shown);
     button.setRect(round % 12, nullptr);
-    toast.setText(words_);
-    toast.setMsg(words_);
+    toast.setText(shown);
+    toast.setMsg(shown);
     toast.setRect(2, &area);
     toast.onHideTimer(50);
     bar.setRect(0, &area);
     bar.onProgressbar(round % 8 == 0 ? 0 : 300);
-    dialog.setTitle(words_);
-    dialog.setDesc(words_);
+    dialog.setTitle(shown);
+    dialog.setDesc(shown);
     dialog.setRect(round % 40);
     round % 16 == 0 ? dialog.hide() : (dialog.setActive(1), 1);
     fill.setRect(round % 5);
     fill.lcdOn(round % 2);
     slide.setRect(round % 4, &area);
     round % 64 < 32 ? slide.Lock() : slide.unLock();
-    list.setText(round % 40, words_, static_cast<unsigned int>(kTexts.at(number).size()));
-    list.setTextOption(round % 8, words_, static_cast<int>(kTexts.at(number).size()));
+    list.setText(round % 40, shown, static_cast<unsigned int>(kTexts.at(number).size()));
+    list.setTextOption(round % 8, shown, static_cast<int>(kTexts.at(number).size()));
     round % 2 == 0 ? list.move_key_down(0) : list.move_key_up(0);
     list.lcdOn(round % 3);
     if (round % 32 == 0) button.onShowTimer(20);

@@ -43,6 +43,10 @@ inline SKIA_Text endlessText(char byte) {
 }
 
 /// A number of NULs: what a record's length covers beyond its text.
-inline std::string nuls(std::size_t count) { return std::string(count, '\0'); }
+inline std::string nuls(std::size_t count) {
+  std::string text;
+  text.resize(count);
+  return text;
+}
 
 }  // namespace brimol::test
