@@ -85,13 +85,12 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
 }
 
 void FactoryTest::keep(const Running& done, Verdict verdict, uint32_t now) {
-  const Screen screen = screenSize();
   std::string error;
   if (!book.record({.test = testEntries().at(done.entry).id,
                     .verdict = verdict,
                     .started = done.started,
                     .duration = std::chrono::milliseconds(now - done.startTicks),
-                    .screen = {screen.w, screen.h}},
+                    .screen = screenSize()},
                    error)) {
     complain(error);
   }
@@ -104,8 +103,8 @@ void FactoryTest::draw() {
   if (running) {
     running->test->draw();
   } else {
-    const Screen screen = screenSize();
-    skia_add_box_c({0, 0, screen.w, screen.h, kGroundColor});
+    const ScreenSize screen = screenSize();
+    skia_add_box_c({0, 0, screen.width, screen.height, kGroundColor});
   }
   MW::Window::show();
   skia_end_frame_c();

@@ -7,9 +7,9 @@
 
 namespace factory_test {
 
-Screen screenSize() {
-  Screen screen = {};
-  MW::Window::getwindowsize(&screen.w, &screen.h);
+ScreenSize screenSize() {
+  ScreenSize screen = {};
+  MW::Window::getwindowsize(&screen.width, &screen.height);
   return screen;
 }
 

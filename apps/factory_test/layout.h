@@ -4,15 +4,9 @@
 #include <MW/records.h>
 #include <brimol/scene.h>
 
-#include <algorithm>
+#include "results/test_result.h"
 
 namespace factory_test {
-
-/// A size in pixels.
-struct Screen {
-  int w;
-  int h;
-};
 
 inline constexpr uint32_t kGroundColor = 0xFF1E2430;
 inline constexpr uint32_t kTitleColor = 0xFF2F5D8A;
@@ -27,16 +21,16 @@ constexpr int percentOf(int length, int percent) {
 }
 
 /// The screen as the toolkit knows it.
-Screen screenSize();
+ScreenSize screenSize();
 
-constexpr int textSize(Screen screen) { return screen.h / 50; }
+constexpr int textSize(ScreenSize screen) { return screen.height / 50; }
 
 /// A row of the screen between the side margins, in per cent of the screen's height.
-constexpr SKIA_Rect rowOf(Screen screen, int topPercent, int heightPercent, uint32_t color) {
+constexpr SKIA_Rect rowOf(ScreenSize screen, int topPercent, int heightPercent, uint32_t color) {
   constexpr int kMarginPercent = 5;
-  const int margin = percentOf(screen.w, kMarginPercent);
-  return {margin, percentOf(screen.h, topPercent), screen.w - 2 * margin,
-          percentOf(screen.h, heightPercent), color};
+  const int margin = percentOf(screen.width, kMarginPercent);
+  return {margin, percentOf(screen.height, topPercent), screen.width - 2 * margin,
+          percentOf(screen.height, heightPercent), color};
 }
 
 /// The part of a row at `column` of `columns`, which gaps divide.
@@ -56,7 +50,7 @@ struct Grid {
   int columns;
 };
 
-constexpr SKIA_Rect cellOf(Screen screen, const Grid& grid, int index, uint32_t color) {
+constexpr SKIA_Rect cellOf(ScreenSize screen, const Grid& grid, int index, uint32_t color) {
   const int row = index / grid.columns;
   return cellOf(rowOf(screen, grid.top + row * grid.pitch, grid.height, color),
                 index % grid.columns, grid.columns);
@@ -79,9 +73,9 @@ struct PageLayout {
 
 inline constexpr int kContentTop = 34;
 
-constexpr PageLayout layOutPage(Screen screen) {
+constexpr PageLayout layOutPage(ScreenSize screen) {
   return {
-      .ground = {0, 0, screen.w, screen.h, kGroundColor},
+      .ground = {0, 0, screen.width, screen.height, kGroundColor},
       .title = rowOf(screen, 2, 7, kTitleColor),
       .hint = rowOf(screen, 10, 13, 0),
       .line = rowOf(screen, 25, 7, kLineColor),

@@ -30,17 +30,8 @@ constexpr auto kLooks = std::to_array<VerdictLook>({
     {Verdict::Fail, kFailColor},
 });
 
-// MainList's numbers of its status texts.
-enum Figure {
-  kBattery = 0,
-  kCharger = 1,
-  kHost = 2,
-  kAddress = 3,
-  kLoad = 4,
-  kDone = 5,
-  kRest = 6,
-  kLight = 7
-};
+// What MainList calls its status texts, by its numbers.
+enum StatusText { kBattery, kCharger, kOperator, kAddress, kSignal, kTestMode, kBle, kBrightness };
 
 }  // namespace
 
@@ -77,16 +68,16 @@ Menu::Menu(const ResultBook& book) : list("Factory test", kExtendedHeader) {
 }
 
 void Menu::addGroup(const char* name) {
-  const Screen screen = screenSize();
+  const ScreenSize screen = screenSize();
   const SKIA_Text text = textOf(name, 0, SKIA_ALIGN_LEFT, textSize(screen));
-  list.addIndex(MW::MainList::kDark, &text, percentOf(screen.h, kGroupPercent));
+  list.addIndex(MW::MainList::kDark, &text, percentOf(screen.height, kGroupPercent));
 }
 
 void Menu::addRow(const char* name) {
-  const Screen screen = screenSize();
+  const ScreenSize screen = screenSize();
   const std::string words = std::string("   ") + name;
   const SKIA_Text text = textOf(words.c_str(), 0, SKIA_ALIGN_LEFT, textSize(screen));
-  list.addIndex(MW::MainList::kSelectable, &text, percentOf(screen.h, kEntryPercent));
+  list.addIndex(MW::MainList::kSelectable, &text, percentOf(screen.height, kEntryPercent));
 }
 
 void Menu::show() {
@@ -104,22 +95,23 @@ void Menu::update(uint32_t now) {
 
 void Menu::refreshFigures() {
   const MachineFigures figures = readMachineFigures();
-  const auto put = [this](Figure figure, const std::string& words) {
-    list.setTextOption(figure, words.c_str(), static_cast<int>(words.size()));
+  const auto put = [this](StatusText place, const std::string& words) {
+    list.setTextOption(place, words.c_str(), static_cast<int>(words.size()));
   };
   put(kBattery, figures.battery);
   put(kCharger, figures.charger);
-  put(kLight, figures.brightness);
-  put(kHost, " " + figures.hostName);
+  put(kBrightness, figures.brightness);
+  put(kOperator, " " + figures.hostName);
   put(kAddress, figures.address);
-  put(kLoad, figures.load);
-  put(kDone, " Tests: " + std::to_string(testEntries().size()));
-  put(kRest, " ");
+  put(kSignal, std::to_string(verdicts.size()) + " of " + std::to_string(rowOfEntry.size()) + " ");
+  put(kTestMode, " " + figures.load);
+  put(kBle, " ");
   MW::isDisplayUpdate(1);
 }
 
 void Menu::showVerdict(std::size_t entry, Verdict verdict) {
   const auto* const look = std::ranges::find(kLooks, verdict, &VerdictLook::verdict);
+  if (verdict != Verdict::None) verdicts.insert(entry);
   list.setBGColor(rowOfEntry.at(entry), look->color);
   std::string words = std::string("   ") + testEntries().at(entry).name;
   if (verdict != Verdict::None) words.append(": ").append(verdictName(verdict));

@@ -6,6 +6,7 @@
 #include <atomic>
 #include <cstdint>
 #include <optional>
+#include <set>
 #include <vector>
 
 #include "current.h"
@@ -47,8 +48,9 @@ class Menu {
   int leaveRow = kNothing;
   std::atomic<int> chosenRow = kNothing;
   std::atomic<bool> leaveAsked = false;
-  int markedRow = kNothing;  // dispatch thread
-  uint32_t figuresRead = 0;  // GetTicks() milliseconds
+  int markedRow = kNothing;        // dispatch thread
+  std::set<std::size_t> verdicts;  // entries that have one
+  uint32_t figuresRead = 0;        // GetTicks() milliseconds
   MW::MainList list;
 };
 

@@ -15,19 +15,19 @@ struct Record {
 };
 
 Record titleRecord(const char* title) {
-  const Screen screen = screenSize();
+  const ScreenSize screen = screenSize();
   const int size = percentOf(textSize(screen), 140);
   return {layOutPage(screen).title, textOf(title, MW::kColorWhite, SKIA_ALIGN_CENTRE, size)};
 }
 
 Record hintRecord(const char* instructions) {
-  const Screen screen = screenSize();
+  const ScreenSize screen = screenSize();
   return {layOutPage(screen).hint,
           textOf(instructions, MW::kColorWhite, SKIA_ALIGN_LEFT, textSize(screen))};
 }
 
 Record lineRecord() {
-  const Screen screen = screenSize();
+  const ScreenSize screen = screenSize();
   return {layOutPage(screen).line,
           textOf("", MW::kColorBlack, SKIA_ALIGN_CENTRE, textSize(screen))};
 }
@@ -51,7 +51,13 @@ Page::Page(const char* title, const char* instructions)
       line(make<MW::Textbox>(lineRecord())) {}
 
 void Page::draw() {
-  ground.show();
+  drawGround();
+  drawTexts();
+}
+
+void Page::drawGround() { ground.show(); }
+
+void Page::drawTexts() {
   titleBar.show();
   hint.show();
   line.show();

@@ -11,8 +11,10 @@ class Page {
   /// Instructions may have several lines.
   Page(const char* title, const char* instructions);
 
-  /// On the main thread, before the window's widgets are drawn.
+  /// On the main thread, before the window's widgets are drawn: all of it, or in two steps.
   void draw();
+  void drawGround();
+  void drawTexts();
   /// Changes the line; the next frame shows it. Any thread.
   void say(const char* words);
 

@@ -66,7 +66,7 @@ class ButtonTest : public Test {
 
   // What never changes goes to the display-item table, which keeps copies.
   static void placePrimitives() {
-    const Screen screen = screenSize();
+    const ScreenSize screen = screenSize();
     const SKIA_Rect row = rowOf(screen, kContentTop, 12, kBoxColor);
     const SKIA_Rect words = cellOf(row, 0, kColumns);
     const SKIA_Rect picture = cellOf(row, 1, kColumns);
@@ -85,7 +85,7 @@ class ButtonTest : public Test {
 
   void placeButton(std::size_t number) {
     const ButtonRow& look = kButtons.at(number);
-    const Screen screen = screenSize();
+    const ScreenSize screen = screenSize();
     const SKIA_Rect area = cellOf(screen, kButtonGrid, static_cast<int>(number), kButtonColor);
     const SKIA_Text caption =
         textOf(look.caption, MW::kColorBlack, SKIA_ALIGN_CENTRE, textSize(screen));

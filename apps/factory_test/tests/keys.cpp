@@ -79,7 +79,7 @@ class KeyTest : public Test {
   }
 
   static void drawKey(int index, bool isPressed) {
-    const Screen screen = screenSize();
+    const ScreenSize screen = screenSize();
     skia_add_textbox_c(cellOf(screen, kKeyGrid, index, isPressed ? kPassColor : kButtonColor),
                        textOf(kAsked.at(static_cast<std::size_t>(index)).name, MW::kColorBlack,
                               SKIA_ALIGN_CENTRE, textSize(screen)));

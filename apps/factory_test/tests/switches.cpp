@@ -50,7 +50,7 @@ class SwitchTest : public Test {
   static void place(std::optional<Kind>& slide, int row, int state, const char* words) {
     constexpr int kPitch = 13;  // per cent of the screen's height, and so the next
     constexpr int kHeight = 9;
-    const Screen screen = screenSize();
+    const ScreenSize screen = screenSize();
     const SKIA_Rect area = rowOf(screen, kContentTop + row * kPitch, kHeight, 0);
     const SKIA_Text caption = textOf(words, MW::kColorBlack, SKIA_ALIGN_CENTRE, textSize(screen));
     slide.emplace(state, &area, &caption, nullptr);

@@ -24,7 +24,7 @@ class TimedTest : public Test {
  public:
   void enter() override {
     bar.emplace().otherKey = [](unsigned int code) { Current<TimedTest>::get().followKey(code); };
-    const Screen screen = screenSize();
+    const ScreenSize screen = screenSize();
     const SKIA_Rect row = rowOf(screen, kContentTop, 9, kButtonColor);
     placeButton(toastButton, cellOf(row, 0, 2), "Toast");
     placeButton(progressButton, cellOf(row, 1, 2), "Progress");

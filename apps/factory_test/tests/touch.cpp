@@ -1,5 +1,5 @@
-// The touch panel: where it is touched, and by how many fingers' moves.
-#include <MW/primitives.h>
+// The touch panel: where it is touched, and how.
+#include <MW/key.h>
 #include <MW/screen.h>
 
 #include <array>
@@ -17,53 +17,63 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kPassOn = 2;  // MW::Screen's variant that leaves touches to the buttons
 constexpr uint32_t kCross = 0xFFE8C040;
 constexpr int kCrossWidth = 3;  // pixels
 
-/// Shows the coordinates of every touch, with a cross through the last one, and tells a double tap.
+/// Shows the coordinates of every touch, with a cross through the last one. A double tap, or the
+/// select key, ends the look, and the verdict is asked for.
 class TouchTest : public Test {
  public:
   void enter() override {
-    bar.emplace();
     touch.emplace();
-    touch->setButtonType(kPassOn);
-    touch->pressCallback = [](MW::mouse_event* mouse) {
-      Current<TouchTest>::get().tell("Press", *mouse);
-    };
-    touch->hoverCallback = [](MW::mouse_event* mouse) {
-      Current<TouchTest>::get().tell("Move", *mouse);
-    };
-    touch->clickCallback = [](MW::mouse_event* mouse) {
-      Current<TouchTest>::get().tell("Lift", *mouse);
-    };
-    touch->longPressCallback = [](MW::mouse_event* mouse) {
-      Current<TouchTest>::get().tell("Long press", *mouse);
-    };
-    touch->doubleClickCallback = [](int) { Current<TouchTest>::get().page.say("Double tap"); };
+    touch->pressCallback = [](MW::mouse_event* mouse) { self().tell("Press", *mouse); };
+    touch->hoverCallback = [](MW::mouse_event* mouse) { self().tell("Move", *mouse); };
+    touch->clickCallback = [](MW::mouse_event* mouse) { self().tell("Lift", *mouse); };
+    touch->longPressCallback = [](MW::mouse_event* mouse) { self().tell("Long press", *mouse); };
+    touch->doubleClickCallback = [](int) { self().looked = true; };
     touch->setActive(1);
+    key.emplace().keyPressCallback = [](MW::kbd_event* event) {
+      if (event->code == MW::kKeySelect || event->code == kKeyBack) self().looked = true;
+    };
   }
 
   void leave() override {
-    touch.reset();
     bar.reset();
+    endLook();
   }
 
-  Outcome verdict() const override { return bar->outcome(); }
+  Outcome verdict() const override { return bar ? bar->outcome() : Outcome::Running; }
 
   void draw() override {
-    page.draw();
-    const Screen screen = screenSize();
-    const int atX = x;
-    const int atY = y;
-    if (atX >= 0) {
-      skia_add_line_c({atX, 0, atX, screen.h, kCross, kCrossWidth});
-      skia_add_line_c({0, atY, screen.w, atY, kCross, kCrossWidth});
-    }
-    bar->draw();
+    page.drawGround();
+    if (x >= 0) drawCross();
+    page.drawTexts();
+    if (bar) bar->draw();
+  }
+
+  void update(uint32_t) override {
+    if (!looked || bar) return;
+    endLook();
+    bar.emplace();
+    page.say("Double tap. Was every touch met?");
   }
 
  private:
+  static TouchTest& self() { return Current<TouchTest>::get(); }
+
+  void endLook() {
+    key.reset();
+    touch.reset();
+  }
+
+  void drawCross() const {
+    const ScreenSize screen = screenSize();
+    const int atX = x;
+    const int atY = y;
+    skia_add_line_c({atX, 0, atX, screen.height, kCross, kCrossWidth});
+    skia_add_line_c({0, atY, screen.width, atY, kCross, kCrossWidth});
+  }
+
   void tell(const char* what, const MW::mouse_event& mouse) {
     x = mouse.x;
     y = mouse.y;
@@ -74,11 +84,13 @@ class TouchTest : public Test {
   }
 
   Current<TouchTest> current{this};
+  std::atomic<bool> looked = false;
   std::atomic<int> x = -1;  // pixels; -1: not touched yet
   std::atomic<int> y = -1;
-  Page page{"Touch", "Touch and drag everywhere,\ntap twice in one place."};
-  std::optional<VerdictBar> bar;
+  Page page{"Touch", "Touch and drag everywhere.\nTap twice in one place to end."};
   std::optional<MW::Screen> touch;
+  std::optional<MW::Key> key;
+  std::optional<VerdictBar> bar;
 };
 
 const TestRegistration kRegistration({Group::Input, 0, "touch", "Touch panel",
