@@ -64,7 +64,7 @@ double median(std::vector<double>& values) {
 // each, in nanoseconds a call, and of their ratio.
 template <typename Pass, typename Bare>
 void compare(benchmark::State& state, int calls, Pass pass, Bare bare) {
-  const int times = std::max(1, kCallsPerSample / calls);
+  const int times = std::max(1, kCallsPerSample / std::max(1, calls));
   std::vector<double> passes;
   std::vector<double> bares;
   std::vector<double> ratios;

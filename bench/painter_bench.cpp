@@ -101,7 +101,7 @@ void paintByTurns(benchmark::State& state, const Frame& one, const Frame& other)
   std::vector<unsigned char> bytes(kFrameBytes);
   std::vector<double> paintings;
   std::vector<double> memsets;
-  for (auto _ : state) {
+  for ([[maybe_unused]] auto round : state) {
     const Frame& next = paintings.size() % 2 == 0 ? one : other;
     paintings.push_back(secondsOf([&painter, &next] { painter.paint(next); }));
     state.SetIterationTime(paintings.back());

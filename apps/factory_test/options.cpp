@@ -32,26 +32,34 @@ constexpr auto kOptions = std::to_array<OptionRow>({
 
 constexpr std::size_t kNameColumns = 22;
 
+// What is left behind one option and its value; nothing, with `error`, where it is wrong.
+std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::string& error) {
+  const std::string_view name = arguments.front();
+  const auto* const row = std::ranges::find(kOptions, name, &OptionRow::name);
+  if (row == kOptions.end()) {
+    error = "unknown option '" + std::string(name) + "', see --help";
+    return {};
+  }
+  if (row->value == nullptr) {
+    row->apply(options, nullptr);
+    return arguments.subspan(1);
+  }
+  if (arguments.size() < 2 || *arguments[1] == '\0') {
+    error = std::string(name) + " needs a value: " + row->value;
+    return {};
+  }
+  row->apply(options, arguments[1]);
+  return arguments.subspan(2);
+}
+
 }  // namespace
 
-std::optional<Options> parseOptions(std::span<const char* const> arguments, std::string& error) {
+std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
   Options options;
-  for (std::size_t i = 0; i < arguments.size(); ++i) {
-    const std::string_view name = arguments[i];
-    const auto* const row = std::ranges::find(kOptions, name, &OptionRow::name);
-    if (row == kOptions.end()) {
-      error = "unknown option '" + std::string(name) + "', see --help";
-      return {};
-    }
-    const char* value = nullptr;
-    if (row->value != nullptr) {
-      if (++i == arguments.size() || *arguments[i] == '\0') {
-        error = std::string(name) + " needs a value: " + row->value;
-        return {};
-      }
-      value = arguments[i];
-    }
-    row->apply(options, value);
+  while (!arguments.empty()) {
+    const auto rest = parseOne(arguments, options, error);
+    if (!rest) return {};
+    arguments = *rest;
   }
   return options;
 }

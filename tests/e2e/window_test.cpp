@@ -8,6 +8,7 @@
 #include <array>
 #include <cstdlib>
 #include <filesystem>
+#include <stdexcept>
 #include <string>
 #include <utility>
 
@@ -31,7 +32,9 @@ class Program {
   explicit Program(const std::string& results) {
     setenv("BRIMOL_DISPLAY", "window", 1);
     setenv("BRIMOL_SCREEN", kScreenSetting, 1);
-    std::string path = std::getenv("FACTORY_TEST");
+    const char* const named = std::getenv("FACTORY_TEST");
+    if (named == nullptr) throw std::runtime_error("FACTORY_TEST does not name the program");
+    std::string path = named;
     std::string option = "--results";
     std::string file = results;
     const std::array<char*, 4> arguments = {path.data(), option.data(), file.data(), nullptr};

@@ -15,7 +15,7 @@ struct MachineFigures {
   std::string charger;     // "Charging", "Mains", "On battery"; "Mains" without a battery
   std::string brightness;  // "Light 63%", "Light n/a"
   std::string hostName;    // "bench7", "Host n/a"
-  std::string address;     // "192.168.1.7", else an IPv6 address, "No network"
+  std::string address;     // "192.168.1.7", "No network"
   std::string load;        // over 1, 5 and 15 minutes: "Load 0.42 0.38 0.30", "Load n/a"
 };
 

@@ -7,27 +7,25 @@
 #include <string_view>
 #include <vector>
 
-#include "results/atomic_file.h"
 #include "results/test_result.h"
 
 namespace factory_test {
 
 /// The results of all tests that were done, a test's newest only, and the file that keeps them.
-/// The file's layout stands in results_json.h. One thread at a time uses a book; nothing here
-/// throws.
+/// The file's layout stands in results_json.h. One thread at a time uses a book, one book at a time
+/// a file; nothing here throws.
 class ResultBook {
  public:
-  /// Resumes the file at `path`, or starts an empty book if there is none; the file then appears
-  /// with the first record(). A symbolic link is followed. An empty `path`: the results stay in
-  /// memory. Nothing is returned for a file that cannot be read, is damaged or is another open
-  /// book's (in this program or another), or whose directory cannot be written to; `error` then
-  /// says so in one line that begins with the file's name, and the file stays as it is.
+  /// Resumes the file at `path`, or writes one without results if there is none. An empty `path`:
+  /// the results stay in memory. Nothing is returned for a file that cannot be read, is damaged or
+  /// cannot be written anew; `error` then says so in one line that begins with the file's name, and
+  /// what is there stays as it is.
   static std::optional<ResultBook> open(const std::filesystem::path& path, std::string& error);
 
-  /// Puts `result`, made storable(), in the place of the test's earlier one or at the end, and
-  /// writes the whole file. True: the result survives a crash of the machine. False: it stays in
-  /// memory and goes out with the next record(), the file holds what it held before, and `error`
-  /// says why in one line. Waits for the disk, often some milliseconds.
+  /// Puts `result`, clamped(), in the place of the test's earlier one or at the end, and writes the
+  /// whole file. False: the result stays in memory and goes out with the next record(), the file
+  /// holds what it held before, and `error` says why in one line. Waits for the disk, often some
+  /// milliseconds.
   bool record(TestResult result, std::string& error);
 
   /// The test's result, or null. Valid until the next record().
@@ -39,7 +37,11 @@ class ResultBook {
  private:
   ResultBook() = default;
 
-  std::optional<AtomicFile> file = {};  // nothing: in memory only
+  bool resume(std::string& error);
+  bool save(std::string& error) const;
+  void put(TestResult result);
+
+  std::filesystem::path file = {};  // empty: in memory only
   std::vector<TestResult> kept = {};
 };
 

@@ -1,7 +1,6 @@
 /// The results file's text.
 ///
 ///     {
-///       "format": 1,
 ///       "results": [
 ///         {
 ///           "test": "display colours",
@@ -14,10 +13,9 @@
 ///     }
 ///
 /// All of these members must be there, in any order; others are passed over. "verdict" is "PASS",
-/// "FAIL" or "none", "started" UTC; a test stands once. A later format has another number.
+/// "FAIL" or "none", "started" UTC, a figure 0 to INT_MAX.
 #pragma once
 
-#include <cstddef>
 #include <optional>
 #include <span>
 #include <string>
@@ -28,13 +26,10 @@
 
 namespace factory_test {
 
-constexpr std::size_t kLongestJson = std::size_t{1} << 20;  // bytes of a results file
-
-/// The file's text for results that are storable() and of different tests.
+/// The file's text for results that are clamped(). Bytes of a name that are no UTF-8 become U+FFFD.
 std::string resultsJson(std::span<const TestResult> results);
 
-/// The results in `text`, all of them storable(). Nothing for any other text; `reason` then says
-/// what is wrong, in one line and in words of this program only.
+/// The results in `text`. Nothing for any other text; `reason` then says what is wrong.
 std::optional<std::vector<TestResult>> parseResults(std::string_view text, std::string& reason);
 
 }  // namespace factory_test

@@ -18,21 +18,17 @@ struct ScreenSize {
   bool operator==(const ScreenSize&) const = default;
 };
 
-/// A whole year; no test takes as long.
-constexpr std::chrono::milliseconds kLongestDuration = std::chrono::hours(24 * 365);
-
 struct TestResult {
   std::string test = {};  // its name, the key; UTF-8
   Verdict verdict = Verdict::None;
-  std::chrono::sys_seconds started = {};    // UTC, years 0 to 9999
-  std::chrono::milliseconds duration = {};  // 0 to kLongestDuration
+  std::chrono::sys_seconds started = {};    // UTC, years 1970 to 9999
+  std::chrono::milliseconds duration = {};  // 0 to INT_MAX, that is 24 days
   ScreenSize screen = {};
 
   bool operator==(const TestResult&) const = default;
 };
 
-/// The nearest result that a file can hold: bytes that are no UTF-8 become U+FFFD, figures outside
-/// their range its nearest end, an unknown verdict none.
-TestResult storable(TestResult result);
+/// The nearest result whose figures are within their ranges.
+TestResult clamped(TestResult result);
 
 }  // namespace factory_test

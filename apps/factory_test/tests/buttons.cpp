@@ -6,6 +6,7 @@
 #include <array>
 #include <cstdio>
 #include <optional>
+#include <ranges>
 
 #include "current.h"
 #include "layout.h"
@@ -37,7 +38,7 @@ class ButtonTest : public Test {
   }
 
   void leave() override {
-    for (auto each = buttons.rbegin(); each != buttons.rend(); ++each) each->reset();
+    for (auto& button : std::views::reverse(buttons)) button.reset();
     MW::WidgetList::destroy();
     bar.reset();
   }
