@@ -6,7 +6,6 @@
 #include <array>
 #include <cstdio>
 #include <optional>
-#include <ranges>
 
 #include "current.h"
 #include "layout.h"
@@ -38,7 +37,7 @@ class ButtonTest : public Test {
   }
 
   void leave() override {
-    for (auto& button : std::views::reverse(buttons)) button.reset();
+    for (std::size_t i = buttons.size(); i > 0; --i) buttons.at(i - 1).reset();
     MW::WidgetList::destroy();
     bar.reset();
   }
