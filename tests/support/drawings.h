@@ -4,7 +4,7 @@
 #include <MW/window.h>
 
 #include <climits>
-#include <utility>
+#include <sstream>
 
 #include "support/widget_test.h"
 
@@ -15,20 +15,14 @@ inline void setScreen(int w, int h) {
   MW::Window::height = h;
 }
 
-inline Drawing box(SKIA_Rect rect) { return {.call = Call::Box, .rect = rect}; }
-inline Drawing roundBox(SKIA_Rect rect) { return {.call = Call::RoundBox, .rect = rect}; }
-inline Drawing line(SKIA_Point points) { return {.call = Call::Line, .line = points}; }
-inline Drawing label(SKIA_Rect rect, DrawnText text) {
-  return {.call = Call::Label, .rect = rect, .text = std::move(text)};
-}
-inline Drawing textbox(SKIA_Rect rect, DrawnText text) {
-  return {.call = Call::Textbox, .rect = rect, .text = std::move(text)};
-}
-inline Drawing roundTextbox(SKIA_Rect rect, DrawnText text) {
-  return {.call = Call::RoundTextbox, .rect = rect, .text = std::move(text)};
-}
-inline Drawing buttonBox(SKIA_Rect rect, DrawnText text) {
-  return {.call = Call::ButtonBox, .rect = rect, .text = std::move(text)};
+/// Where they stand, each as "x,y wxh|".
+inline std::string places(const std::vector<Drawing>& drawings) {
+  std::ostringstream all;
+  for (const Drawing& each : drawings) {
+    const auto& [x, y, w, h, color] = each.rect;
+    all << x << ',' << y << ' ' << w << 'x' << h << '|';
+  }
+  return all.str();
 }
 
 /// Screens that no machine has: 0 is the default size, the others are taken as they are.
@@ -38,15 +32,8 @@ inline constexpr auto kHostileSizes = {0, 1, 7, -1, -1080, INT_MIN, INT_MAX};
 inline SKIA_Text endlessText(char byte) {
   SKIA_Text record = {};
   for (char& each : record.text) each = byte;
-  record.string_len = INT_MAX;
+  record.string_len = record.size = INT_MAX;
   return record;
-}
-
-/// A number of NULs: what a record's length covers beyond its text.
-inline std::string nuls(std::size_t count) {
-  std::string text;
-  text.resize(count);
-  return text;
 }
 
 }  // namespace brimol::test
