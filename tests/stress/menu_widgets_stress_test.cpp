@@ -27,8 +27,7 @@ struct Menu {
   MW::Progressbar bar{0, kAreas.data(), &kWords};
   MW::Key key;
   MW::Dialog dialog{24};
-  MW::FullScreen fill{0};
-  std::array<MW::Widget*, 8> all = {&list, &button, &slide, &toast, &bar, &key, &dialog, &fill};
+  std::array<MW::Widget*, 7> all = {&list, &button, &slide, &toast, &bar, &key, &dialog};
 
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
@@ -44,9 +43,7 @@ struct Menu {
     }
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
-    fill.setRect(round % 5);
     list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));
-    list.setTextBattery(words.c_str(), static_cast<int>(words.size()));
     number == 0 ? list.move_key_down(0) : list.move_key_up(0);
   }
 };
@@ -72,7 +69,7 @@ TEST_F(WidgetTest, MenuWidgetsAreDrawnOfferedEventsAndSetAtOnce) {
     }
   });
   std::thread setter([&] {
-    for (int round = 0; round < 20'000; ++round) menu.set(round);
+    for (int round = 0; round < 50'000; ++round) menu.set(round);
     isOver = true;
   });
   while (!isOver) {

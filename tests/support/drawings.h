@@ -25,15 +25,4 @@ inline std::string places(const std::vector<Drawing>& drawings) {
   return all.str();
 }
 
-/// Screens that no machine has: 0 is the default size, the others are taken as they are.
-inline constexpr auto kHostileSizes = {0, 1, 7, -1, -1080, INT_MIN, INT_MAX};
-
-/// A record without a NUL.
-inline SKIA_Text endlessText(char byte) {
-  SKIA_Text record = {};
-  for (char& each : record.text) each = byte;
-  record.string_len = record.size = INT_MAX;
-  return record;
-}
-
 }  // namespace brimol::test

@@ -1,10 +1,13 @@
-// What the widgets of a test menu make of input, and what they bear: callbacks that delete them,
-// screens and records that nobody has.
+// What the widgets of a test menu make of input, what they bear (callbacks that delete them,
+// screens and records that nobody has), and what they draw as far as it depends on the screen or a
+// text.
 
 #include <MW/MW.h>
 
 #include <algorithm>
+#include <array>
 #include <cstdio>
+#include <cstring>
 #include <memory>
 
 #include "support/drawings.h"
@@ -13,7 +16,7 @@ namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 using MW::Widget;
-using MenuInputTest = WidgetTest;
+using MenuWidgetTest = WidgetTest;
 using Made = std::unique_ptr<Widget>;
 
 constexpr SKIA_Rect kArea = {10, 20, 503, 100, 0};  // a slide's knob moves from 10 to 310
@@ -42,25 +45,16 @@ void tellKey(MW::kbd_event* key) {
   told += std::to_string(key->code);
   note(letter);
 }
-template <char letter>
-void tellRow(MW::mouse_event* mouse, MW::MainList*) {
-  tellTouch<letter>(mouse);
-}
-template <char letter>
-void tellRowKey(MW::kbd_event* key, MW::MainList*) {
-  tellKey<letter>(key);
-}
-
 Made list(const char* title, int height) {
   auto made = std::make_unique<MW::MainList>(title);
   for (const int kind : {1, 1, 2}) made->addIndex(kind, &kCaption, height);
   made->initFinish();
-  made->pressCallback = tellRow<'p'>;
-  made->clickCallback = tellRow<'c'>;
-  made->releaseCallback = tellRow<'r'>;
-  made->scrollCallback = tellRow<'s'>;
-  made->keyPressCallback = tellRowKey<'k'>;
-  made->keyReleaseCallback = tellRowKey<'r'>;
+  made->pressCallback = [](auto* mouse, auto*) { tellTouch<'p'>(mouse); };
+  made->clickCallback = [](auto* mouse, auto*) { tellTouch<'c'>(mouse); };
+  made->releaseCallback = [](auto* mouse, auto*) { tellTouch<'r'>(mouse); };
+  made->scrollCallback = [](auto* mouse, auto*) { tellTouch<'s'>(mouse); };
+  made->keyPressCallback = [](auto* key, auto*) { tellKey<'k'>(key); };
+  made->keyReleaseCallback = [](auto* key, auto*) { tellKey<'r'>(key); };
   return made;
 }
 
@@ -205,10 +199,11 @@ constexpr auto kInput = std::to_array<InputCase>({
     {Dialog, 24, "p900,1500 r", "p+12c+"},
     {Dialog, 13, "k323 k274 u17 g", "H+274k+17u+[DIALOG] key onPlugKey sym = 17"},
     {Dialog, 0, "t1000 K5 t1999 K5 K5 K5 K6 t2999 K5", " 5r+ 5D5r+5T5r+5r+6r+ 5r+"},
-    {Dialog, 23, "t100 * n1 * n100 * n1 * n100 K5 n100 * n1 *", " 11125r+23"},
     {Dialog, 23,
-     "* n101 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * n101 *",
-     "12345678910123"},
+     "t100 * n101 * n100 * n1 * n100 K5 n100 * n1 * n101 * n101 * n101 * n101 * n101 * n101 * n101 "
+     "* "
+     "n101 *",
+     " 11125r+23456789101"},
     {Bar, 0,
      "* t1000 B1111 * n100 * n1 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * "
      "n101 * n1 * B0 * B9 *",
@@ -238,7 +233,7 @@ void run(const InputCase& row, int deletingCall) {
   play(row.script);
 }
 
-TEST_F(MenuInputTest, IsToldAndAnsweredAndAnyCallbackMayDeleteTheWidget) {
+TEST_F(MenuWidgetTest, IsToldAndAnsweredAndAnyCallbackMayDeleteTheWidget) {
   for (const InputCase& row : kInput) {
     SCOPED_TRACE(row.script);
     run(row, 0);
@@ -252,26 +247,14 @@ TEST_F(MenuInputTest, IsToldAndAnsweredAndAnyCallbackMayDeleteTheWidget) {
   widget.reset();
 }
 
-struct ClassCase {
-  Class which;
-  int layer;
-  std::ptrdiff_t longTexts;  // drawn
-};
-
-constexpr auto kClasses = std::to_array<ClassCase>({{Button, 1, 2},
-                                                    {Screen, 1, 0},
-                                                    {Slide, 1, 2},
-                                                    {Plain, 1, 2},
-                                                    {Key, 1, 0},
-                                                    {Dialog, 0, 0},
-                                                    {Toast, 1, 2},
-                                                    {Bar, 1, 1},
-                                                    {Fill, 0, 0},
-                                                    {List, 1, 1}});
+// Screens that no machine has: 0 is the default size, the others are taken as they are.
+constexpr auto kHostileSizes = {0, 1, 7, -1, -1080, INT_MIN, INT_MAX};
 
 // Sets, shows and touches a widget on such a screen; says how many of its texts fill their record.
 std::ptrdiff_t longTexts(Class which, int w, int h) {
-  const SKIA_Text endless = endlessText('x');
+  SKIA_Text endless = {};
+  std::ranges::fill(endless.text, 'x');
+  endless.string_len = endless.size = INT_MAX;
   const SKIA_Rect area = {w, h, w, h, 0};
   setScreen(w, h);
   widget = make(which, 24, &area, &endless);
@@ -288,11 +271,14 @@ std::ptrdiff_t longTexts(Class which, int w, int h) {
   return found;
 }
 
-TEST_F(MenuInputTest, ClassesTakeAnyScreenAndRecord) {
-  for (const auto& [which, layer, texts] : kClasses) {
+TEST_F(MenuWidgetTest, TakesAnyScreenAndRecord) {
+  using std::pair;
+  for (const auto& [which, texts] :
+       {pair(Button, 2), pair(Screen, 0), pair(Slide, 2), pair(Plain, 2), pair(Key, 0),
+        pair(Dialog, 0), pair(Toast, 2), pair(Bar, 1), pair(Fill, 0), pair(List, 1)}) {
     SCOPED_TRACE(which);
     widget = make(which, 1, &kArea, &kCaption);
-    EXPECT_EQ(layerSize(layer), 1);
+    EXPECT_EQ(layerSize(which == Dialog || which == Fill ? 0 : 1), 1);
     EXPECT_EQ(widget->isActive(), which == Key);
     EXPECT_FALSE(widget->onRecvEvent(nullptr, 0));
     for (const int w : kHostileSizes) {
@@ -302,6 +288,68 @@ TEST_F(MenuInputTest, ClassesTakeAnyScreenAndRecord) {
   }
   for (const Class each : {Slide, Plain, Toast, Bar}) {
     EXPECT_EQ(make(each, 0, nullptr, nullptr)->show(1), 1) << "nothing was given";
+  }
+}
+
+// Three columns and three rows of squares.
+struct Grid {
+  int w, h, side;
+  std::array<int, 3> left, top;
+};
+constexpr auto kGrids = std::to_array<Grid>({{1440, 2560, 441, {28, 497, 966}, {28, 1060, 2091}},
+                                             {1080, 1920, 331, {21, 373, 725}, {21, 795, 1568}},
+                                             {720, 1280, 220, {14, 248, 482}, {14, 530, 1046}},
+                                             {2560, 1440, 785, {51, 887, 1723}, {51, 328, 604}},
+                                             {1081, 1921, 331, {21, 373, 725}, {21, 795, 1569}}});
+constexpr std::array kPositions = {10, 12, 11, 7, 9, 8, 1, 5, 2};  // row by row
+
+TEST_F(MenuWidgetTest, VerdictButtonsStandByTheirPositions) {
+  for (const auto& [w, h, side, left, top] : kGrids) {
+    setScreen(w, h);
+    for (std::size_t i = 0; i < kPositions.size(); ++i) {
+      MW::Button3 button(kPositions.at(i), nullptr, 100);
+      button.setRect(6, nullptr);                        // no position: it stays
+      const int y = top.at(i / 3) - (i >= 6 ? 100 : 0);  // room below the last row alone
+      EXPECT_EQ(shown(button).front().rect, (SKIA_Rect{left.at(i % 3), y, side, side, 0xFFFFFFFF}));
+    }
+  }
+}
+
+// The new length goes to the button box's own text, which stays empty.
+TEST_F(MenuWidgetTest, VerdictButtonsKeepTheLengthOfTheirCaption) {
+  const std::string gap(3, '\0');
+  MW::Button3 button(1);
+  const auto drawn = [&button](const char* given) {
+    button.setText(given);
+    EXPECT_EQ(shown(button).at(0).text.text,
+              std::string(given == nullptr ? 0 : strlen(given), '\0'));
+    return shown(button).at(1).text.text;
+  };
+  EXPECT_EQ(shown(button).at(1).text.text, "PASS");
+  EXPECT_EQ(drawn("RETRY"), "RETR");
+  EXPECT_EQ(drawn("OK"), "OK" + gap.substr(1));
+  EXPECT_EQ(drawn("a\u00e4\u00f6"), "a\u00e4" + gap.substr(2)) << "whole characters";
+  EXPECT_EQ(drawn(nullptr), gap + '\0');
+  EXPECT_EQ(drawn("FAIL"), "FAIL");
+}
+
+// A slide's second caption has its record's length, but only as many bytes as its size says.
+TEST_F(MenuWidgetTest, SlidesCutTheirSecondCaptionByItsSize) {
+  for (const int size : {INT_MIN, 0, 3, 6, 80}) {
+    const SKIA_Text caption = textRecord("LOCKED", 0, 0, size);
+    MW::Slide slide(0, &kArea, nullptr, &caption);
+    std::string expected(6, '\0');
+    std::copy_n("LOCKED", std::clamp(size, 0, 6), expected.begin());
+    EXPECT_EQ(shown(slide).at(5).text.text, expected);
+  }
+}
+
+TEST_F(MenuWidgetTest, FilledScreensAreGreyBehindFourColors) {
+  MW::FullScreen fill(3);
+  EXPECT_EQ(shown(fill).front().rect, (SKIA_Rect{0, 0, 1441, 2561, 0xFF0000FF}));
+  for (const int number : {4, -1, INT_MIN}) {
+    fill.setRect(number);
+    EXPECT_EQ(shown(fill).front().rect.color, 0xFFBFBFBF);
   }
 }
 
