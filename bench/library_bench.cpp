@@ -1,5 +1,7 @@
 // What the toolkit adds to the platform's own calls: the passes over the layers, and registering.
 #include <MW/button.h>
+#include <MW/dialog.h>
+#include <MW/main_list.h>
 #include <MW/window.h>
 #include <android/log.h>
 #include <benchmark/benchmark.h>
@@ -17,7 +19,7 @@ namespace {
 using MW::Button;
 using MW::Window;
 
-constexpr int kCallsPerSample = 2000;  // widgets drawn between two looks at the clock
+constexpr int kCallsPerSample = 2000;  // between two looks at the clock
 constexpr unsigned int kTicks = 1000;
 
 struct Face {
@@ -59,17 +61,16 @@ double median(std::vector<double>& values) {
 }
 
 // Runs `pass` and `bare` in turn, so that both meet the same machine, and reports the median of
-// each, in nanoseconds a widget, and of their ratio.
+// each, in nanoseconds a call, and of their ratio.
 template <typename Pass, typename Bare>
-void compare(benchmark::State& state, Pass pass, Bare bare) {
-  const auto widgets = static_cast<int>(state.range(0));
-  const int times = std::max(1, kCallsPerSample / widgets);
+void compare(benchmark::State& state, int calls, Pass pass, Bare bare) {
+  const int times = std::max(1, kCallsPerSample / std::max(1, calls));
   std::vector<double> passes;
   std::vector<double> bares;
   std::vector<double> ratios;
   for ([[maybe_unused]] auto round : state) {
-    passes.push_back(nanoseconds(times, pass) / times / widgets);
-    bares.push_back(nanoseconds(times, bare) / times / widgets);
+    passes.push_back(nanoseconds(times, pass) / times / calls);
+    bares.push_back(nanoseconds(times, bare) / times / calls);
     ratios.push_back(passes.back() / bares.back());
   }
   state.counters["pass_ns"] = median(passes);
@@ -90,7 +91,7 @@ void drawingPass(benchmark::State& state) {
     skia_begin_frame_c();
     for (const Face& face : faces) skia_add_buttonbox_c(face.rect, face.text);
   };
-  compare(state, pass, bare);
+  compare(state, static_cast<int>(widgets), pass, bare);
 }
 
 // Against reading the clock and making the same virtual calls by hand.
@@ -108,7 +109,63 @@ void timerPass(benchmark::State& state) {
     const unsigned int now = GetTicks();
     for (const auto& widget : others) widget->updateTimer(now);
   };
-  compare(state, pass, bare);
+  compare(state, static_cast<int>(widgets), pass, bare);
+}
+
+// What a drawing pass of one widget calls.
+struct Calls {
+  SKIA_ItemKind kind;
+  int count;
+};
+
+void addItem(const SKIA_Item& item) {
+  switch (item.kind) {
+    case SKIA_LABEL: skia_add_label_c(item.rect, item.text); break;
+    case SKIA_TEXTBOX: skia_add_textbox_c(item.rect, item.text); break;
+    case SKIA_ROUNDTEXTBOX: skia_add_roundtextbox_c(item.rect, item.text); break;
+    case SKIA_ROUNDBOX: skia_add_roundbox_c(item.rect); break;
+    case SKIA_LINE: skia_add_line_c(item.point); break;
+    default: skia_add_box_c(item.rect); break;
+  }
+}
+
+// The drawing pass over one widget against the calls that it makes, made by hand.
+void compareWidget(benchmark::State& state, MW::Widget& widget, const std::vector<Calls>& calls) {
+  std::vector<SKIA_Item> items;
+  for (const Calls& each : calls) {
+    items.insert(items.end(), static_cast<std::size_t>(each.count), {each.kind, {}, {}, {}});
+  }
+  widget.setActive(1);
+  const auto pass = [] {
+    skia_begin_frame_c();
+    Window::show(kTicks);
+  };
+  const auto bare = [&items] {
+    skia_begin_frame_c();
+    for (const SKIA_Item& item : items) addItem(item);
+  };
+  compare(state, static_cast<int>(items.size()), pass, bare);
+}
+
+// A main menu of 64 rows. The first one begins where the list does and is not drawn.
+void mainListPass(benchmark::State& state) {
+  constexpr int kRowHeight = 20;  // pixels: all of them are in view
+  MW::MainList list("A menu", 1);
+  const Face face;
+  for (int i = 0; i < MW::MainList::kItems; ++i) {
+    list.addIndex(MW::MainList::kSelectable, &face.text, kRowHeight);
+  }
+  list.initFinish();
+  compareWidget(state, list,
+                {{SKIA_TEXTBOX, MW::MainList::kItems - 1}, {SKIA_BOX, 2}, {SKIA_LABEL, 9}});
+}
+
+// A dialog of two buttons.
+void dialogPass(benchmark::State& state) {
+  MW::Dialog dialog(0);
+  compareWidget(
+      state, dialog,
+      {{SKIA_BOX, 4}, {SKIA_LINE, 1}, {SKIA_LABEL, 2}, {SKIA_ROUNDBOX, 2}, {SKIA_ROUNDTEXTBOX, 2}});
 }
 
 // One more button beside those that the argument counts.
@@ -124,6 +181,8 @@ void registering(benchmark::State& state) {
 
 BENCHMARK(drawingPass)->RangeMultiplier(10)->Range(1, 1000)->Unit(benchmark::kMicrosecond);
 BENCHMARK(timerPass)->RangeMultiplier(10)->Range(1, 1000)->Unit(benchmark::kMicrosecond);
+BENCHMARK(mainListPass)->Unit(benchmark::kMicrosecond);
+BENCHMARK(dialogPass)->Unit(benchmark::kMicrosecond);
 BENCHMARK(registering)->Arg(0)->Arg(10)->Arg(100)->Arg(1000);
 
 }  // namespace

@@ -43,15 +43,15 @@ SKIA_Item textItem(int32_t kind, SKIA_Rect rect, const char* words, int32_t size
 
 Frame fillOf(uint32_t color) { return {box({0, 0, kScreen.w, kScreen.h, color})}; }
 
-// Fourteen rows of text over a ground of the given colour.
-Frame menuOver(uint32_t ground) {
+// Fourteen rows of text over a ground of the given colour, scrolled by so many pixels.
+Frame menuOver(uint32_t ground, int32_t scroll = 0) {
   constexpr auto kRows = std::to_array<const char*>(
       {"Touch screen", "Display colours", "Camera front", "Camera back", "Vibration", "Speaker",
        "Receiver", "Microphone", "Proximity sensor", "Light sensor", "Fingerprint", "Wireless",
        "Satellites", "Battery"});
   constexpr int32_t kRowHeight = 160;
   Frame frame = fillOf(ground);
-  int32_t y = 40;
+  int32_t y = 40 - scroll;
   for (const char* const words : kRows) {
     frame.push_back(textItem(SKIA_TEXTBOX, {40, y, kScreen.w - 80, kRowHeight, kFace}, words, 64));
     y += kRowHeight + 16;
@@ -119,6 +119,11 @@ void fullFill(benchmark::State& state) { paintByTurns(state, fillOf(kFace), fill
 
 void menu(benchmark::State& state) { paintByTurns(state, menuOver(kWhite), menuOver(kFace)); }
 
+// A finger's step: the ground stays, every row moves.
+void scrolling(benchmark::State& state) {
+  paintByTurns(state, menuOver(kWhite), menuOver(kWhite, 12));
+}
+
 void veilWithDialog(benchmark::State& state) {
   paintByTurns(state, dialogOver(kWhite), dialogOver(kFace));
 }
@@ -130,6 +135,7 @@ void oneButton(benchmark::State& state) {
 constexpr double kSeconds = 0.5;
 BENCHMARK(fullFill)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
 BENCHMARK(menu)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
+BENCHMARK(scrolling)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
 BENCHMARK(veilWithDialog)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
 BENCHMARK(oneButton)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
 

@@ -8,11 +8,10 @@
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
-#include <filesystem>
 #include <string>
-#include <system_error>
+#include <utility>
 
-#include "first_screen.h"
+#include "factory_test.h"
 
 namespace factory_test {
 
@@ -31,31 +30,20 @@ int fail(const char* why) {
   return EXIT_FAILURE;
 }
 
-// Beside the program; the build puts it there.
-std::string picturePath() {
-  std::error_code failed;
-  const auto program = std::filesystem::read_symlink("/proc/self/exe", failed);
-  return (program.parent_path() / "test_card.png").string();
-}
-
-ScreenSize takeScreenSize() {
-  brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
-  return {MW::Window::width, MW::Window::height};
-}
-
-void loop(FirstScreen& screen) {
-  while (!screen.isEnded() && brimol_host_close_requested() == 0 && interrupted == 0) {
-    if (MW::isDisplayUpdate(0) == 1) screen.draw();
+void loop(FactoryTest& test) {
+  while (!test.isEnded() && brimol_host_close_requested() == 0 && interrupted == 0) {
+    test.update(GetTicks());
+    if (MW::isDisplayUpdate(0) == 1) test.draw();
     MW::Window::updateTimer(0);
     Delay(kLoopMs);
   }
 }
 
-int showScreens(const Options& options) {
-  FirstScreen screen(takeScreenSize(), picturePath().c_str());
-  screen.draw();
+int showScreens(const Options& options, ResultBook book) {
+  FactoryTest test(std::move(book), options.junit);
+  test.draw();
   if (options.shot.empty()) {
-    loop(screen);
+    loop(test);
     return EXIT_SUCCESS;
   }
   if (brimol_host_screenshot(options.shot.c_str()) == 0) return fail(brimol_host_error());
@@ -67,10 +55,15 @@ int showScreens(const Options& options) {
 int runApplication(const Options& options) {
   __android_log_set_minimum_priority(options.verbose ? ANDROID_LOG_VERBOSE : ANDROID_LOG_SILENT);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
+  std::string error;
+  auto book = ResultBook::open(options.results, error);
+  if (!book) return fail(error.c_str());
   if (brimol_host_open() == 0) return fail(brimol_host_error());
+  brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;
-  const int result = started ? showScreens(options) : fail("no memory for the dispatch thread");
+  const int result =
+      started ? showScreens(options, std::move(*book)) : fail("no memory for the dispatch thread");
   MW::Window::destroy();
   return result;
 }

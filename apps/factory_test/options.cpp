@@ -20,34 +20,46 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char*) { options.action = Options::Action::Help; }},
     {"--headless", nullptr, "draw to memory instead of a window",
      [](Options& options, const char*) { options.headless = true; }},
-    {"--shot", "FILE.png", "draw the first screen, write it to FILE.png and end",
+    {"--results", "FILE.json", "keep the verdicts in FILE.json, and go on from what it holds",
+     [](Options& options, const char* value) { options.results = value; }},
+    {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
+     [](Options& options, const char* value) { options.junit = value; }},
+    {"--shot", "FILE.png", "draw the menu, write it to FILE.png and end",
      [](Options& options, const char* value) { options.shot = value; }},
     {"--verbose", nullptr, "write the toolkit's log to stderr",
      [](Options& options, const char*) { options.verbose = true; }},
 });
 
-constexpr std::size_t kNameColumns = 20;
+constexpr std::size_t kNameColumns = 22;
+
+// What is left behind one option and its value; nothing, with `error`, where it is wrong.
+std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::string& error) {
+  const std::string_view name = arguments.front();
+  const auto* const row = std::ranges::find(kOptions, name, &OptionRow::name);
+  if (row == kOptions.end()) {
+    error = "unknown option '" + std::string(name) + "', see --help";
+    return {};
+  }
+  if (row->value == nullptr) {
+    row->apply(options, nullptr);
+    return arguments.subspan(1);
+  }
+  if (arguments.size() < 2 || *arguments[1] == '\0') {
+    error = std::string(name) + " needs a value: " + row->value;
+    return {};
+  }
+  row->apply(options, arguments[1]);
+  return arguments.subspan(2);
+}
 
 }  // namespace
 
-std::optional<Options> parseOptions(std::span<const char* const> arguments, std::string& error) {
+std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
   Options options;
-  for (std::size_t i = 0; i < arguments.size(); ++i) {
-    const std::string_view name = arguments[i];
-    const auto* const row = std::ranges::find(kOptions, name, &OptionRow::name);
-    if (row == kOptions.end()) {
-      error = "unknown option '" + std::string(name) + "', see --help";
-      return {};
-    }
-    const char* value = nullptr;
-    if (row->value != nullptr) {
-      if (++i == arguments.size() || *arguments[i] == '\0') {
-        error = std::string(name) + " needs a value: " + row->value;
-        return {};
-      }
-      value = arguments[i];
-    }
-    row->apply(options, value);
+  while (!arguments.empty()) {
+    const auto rest = parseOne(arguments, options, error);
+    if (!rest) return {};
+    arguments = *rest;
   }
   return options;
 }
@@ -55,7 +67,7 @@ std::optional<Options> parseOptions(std::span<const char* const> arguments, std:
 std::string usage() {
   std::string text =
       "Usage: factory_test [OPTION]...\n"
-      "Shows the first screen of a factory test, built from the toolkit's widgets.\n\n"
+      "A factory test's menu, built from the toolkit's widgets: by touch or by keys.\n\n"
       "Options:\n";
   for (const OptionRow& row : kOptions) {
     std::string name(row.name);

@@ -11,14 +11,18 @@ struct Options {
   enum class Action { Run, Help };
 
   Action action = Action::Run;
-  bool headless = false;  // draw to memory, without a window
-  bool verbose = false;   // write the toolkit's log to stderr
-  std::string shot = {};  // draw once, write this PNG file and end; empty: no
+  bool headless = false;     // draw to memory, without a window
+  bool verbose = false;      // write the toolkit's log to stderr
+  std::string shot = {};     // draw once, write this PNG file and end; empty: no
+  std::string results = {};  // the JSON file that keeps the verdicts; empty: none
+  std::string junit = {};    // the same as a report for a CI system; empty: none
 };
+
+using Arguments = std::span<const char* const>;
 
 /// The options, or nothing for a wrong command line; `error` then says in one line what is wrong.
 /// `arguments` does not hold the program's name.
-std::optional<Options> parseOptions(std::span<const char* const> arguments, std::string& error);
+std::optional<Options> parseOptions(Arguments arguments, std::string& error);
 
 /// What --help prints, a line for each option, without the keys of the host.
 std::string usage();

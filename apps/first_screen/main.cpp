@@ -7,6 +7,12 @@
 
 static std::atomic<bool> done = false;
 
+static void drawFrame() {
+  skia_begin_frame_c();
+  MW::Window::show();
+  skia_end_frame_c();
+}
+
 int main() {
   if (brimol_host_open() == 0) return 1;
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
@@ -19,11 +25,7 @@ int main() {
     button.setActive(1);
     MW::isDisplayUpdate(1);
     while (!done && brimol_host_close_requested() == 0) {
-      if (MW::isDisplayUpdate(0) == 1) {
-        skia_begin_frame_c();
-        MW::Window::show();
-        skia_end_frame_c();
-      }
+      if (MW::isDisplayUpdate(0) == 1) drawFrame();
       MW::Window::updateTimer(0);
       Delay(5);
     }

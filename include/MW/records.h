@@ -20,6 +20,12 @@ enum EventCode {
   kEventUnknown = 8       ///< input that the toolkit does not know; no widget acts on it
 };
 
+/// The window's layers; what a widget's `type` says.
+enum LayerNumber {
+  kTopLayer = 0,  ///< dialogs: while one is active, nothing below gets events
+  kBaseLayer = 1
+};
+
 /// Key codes that widgets act on.
 enum KeyCode {
   kKeyUp = 273,

@@ -141,6 +141,9 @@ class MW_API Widget {
   /// Takes the widget out of its layer, by its own address and whatever its id, and waits for a
   /// handler of it that runs on another thread. Its counters and the log are not touched.
   void leaveLayers();
+  /// Window::unregisterWidget, with its log line and count, and then leaveLayers(): what removes
+  /// the widget even where another one of the same id was removed.
+  void leaveWindow();
 
   /// A field that handlers and drawing share, read and written under the lock.
   template <typename Field>
@@ -155,7 +158,7 @@ class MW_API Widget {
   }
 
   /// Guards what handlers and drawing share: `rect`, `text`, `point` and the like of each class.
-  /// Held for a few instructions and one drawing call at most, never while a callback runs.
+  /// Held for a few instructions and drawing calls, never while a callback runs.
   mutable std::mutex stateLock;
 
   int type_ = 0;

@@ -14,24 +14,22 @@ bool continuesCharacter(char byte) {
   return (static_cast<unsigned char>(byte) & kContinuationMask) == kContinuation;
 }
 
-// Where a text that goes on behind `limit` is cut: before the character that `limit` would split.
-// Bytes that are no character at all are cut where the limit is.
-std::size_t wholeCharacters(const char* text, std::size_t limit) {
+}  // namespace
+
+std::string_view cutText(std::string_view given, std::size_t limit) {
+  if (given.size() <= limit) return given;
   constexpr std::size_t kLongestTail = 3;
   std::size_t cut = limit;
-  while (cut > 0 && limit - cut <= kLongestTail && continuesCharacter(text[cut])) --cut;
-  return continuesCharacter(text[cut]) ? limit : cut;
+  while (cut > 0 && limit - cut <= kLongestTail && continuesCharacter(given[cut])) --cut;
+  // Bytes that are no character at all are cut where the limit is.
+  return given.substr(0, continuesCharacter(given[cut]) ? limit : cut);
 }
-
-}  // namespace
 
 std::string_view boundedText(const char* given) { return boundedText(given, SKIA_TEXT_BYTES); }
 
 std::string_view boundedText(const char* given, std::size_t count) {
   if (given == nullptr) return "";
-  const std::size_t length = strnlen(given, std::min<std::size_t>(count, SKIA_TEXT_BYTES));
-  if (length <= kTextMax) return {given, length};
-  return {given, wholeCharacters(given, kTextMax)};
+  return cutText({given, strnlen(given, std::min<std::size_t>(count, SKIA_TEXT_BYTES))}, kTextMax);
 }
 
 void putTextOpen(SKIA_Text& record, std::string_view bounded) {

@@ -11,6 +11,9 @@ namespace MW {
 /// Most bytes of text that a SKIA_Text takes; a NUL stands behind them.
 inline constexpr int kTextMax = SKIA_TEXT_BYTES - 1;
 
+/// At most the first `limit` bytes, and no character of several bytes cut in half.
+MW_API std::string_view cutText(std::string_view given, std::size_t limit);
+
 /// What a record can hold of a C string, or of its first `count` bytes: at most kTextMax bytes, up
 /// to the NUL if there is one, and no character of several bytes cut in half. Null is empty.
 MW_API std::string_view boundedText(const char* given);

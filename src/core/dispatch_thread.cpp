@@ -43,17 +43,17 @@ Offer offerToActive(int type, event_data* event) {
 
 // The top layer's active widgets keep the event from the base layer, whether they take it or not.
 Offer offerToTop(event_data* event) {
-  if (Layers::layer(Layers::kTop).isEmpty()) return {};
+  if (Layers::layer(kTopLayer).isEmpty()) return {};
   // A display that takes no input ends the search for this event.
   if (skia_live_widget_c() == 0) return {.taken = false, .isLast = true};
-  return offerToActive(Layers::kTop, event);
+  return offerToActive(kTopLayer, event);
 }
 
 // A selected active widget that declines is asked again among the active ones: meant so.
 bool offerToBase(event_data* event) {
-  if (Layers::layer(Layers::kBase).isEmpty()) return false;
+  if (Layers::layer(kBaseLayer).isEmpty()) return false;
   if (skia_live_widget_c() == 0) return false;
-  return offerToSelected(Layers::kBase, event) || offerToActive(Layers::kBase, event).taken;
+  return offerToSelected(kBaseLayer, event) || offerToActive(kBaseLayer, event).taken;
 }
 
 bool dispatch(event_data* event) {

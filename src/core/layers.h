@@ -1,6 +1,8 @@
 /// The window's two layers and the lock of those who change them.
 #pragma once
 
+#include <MW/records.h>
+
 #include <array>
 #include <mutex>
 
@@ -11,9 +13,6 @@ namespace MW {
 /// Static members only: there is one window.
 class Layers {
  public:
-  static constexpr int kTop = 0;   // dialogs
-  static constexpr int kBase = 1;  // everything else
-
   struct Change {
     int type;   // the layer
     int count;  // registrations minus unregistrations
@@ -31,7 +30,7 @@ class Layers {
   static const Layer& layer(int type);
 
  private:
-  static bool isLayer(int type) { return type == kTop || type == kBase; }
+  static bool isLayer(int type) { return type == kTopLayer || type == kBaseLayer; }
 
   static std::mutex lock;  // guards changes of the layers, the count, and Widget::registrations
   static std::array<Layer, 2> layers;

@@ -1,4 +1,5 @@
 #include <MW/widget.h>
+#include <MW/window.h>
 
 #include "core/layers.h"
 #include "core/life_guard.h"
@@ -19,6 +20,11 @@ Widget::~Widget() {
 }
 
 void Widget::leaveLayers() { Layers::leave(*this); }
+
+void Widget::leaveWindow() {
+  Window::unregisterWidget(this);
+  leaveLayers();
+}
 
 int Widget::show() { return 0; }
 int Widget::show(unsigned int) { return 0; }

@@ -112,16 +112,16 @@ int Window::unregisterWidget(Widget* widget) {
 
 void Window::show(unsigned int ticks) {
   const auto draw = [ticks](Widget& widget) { widget.show(ticks); };
-  visitActive(Layers::kBase, draw);
-  visitActive(Layers::kTop, draw);
+  visitActive(kBaseLayer, draw);
+  visitActive(kTopLayer, draw);
 }
 
 void Window::show() { show(GetTicks()); }
 
 void Window::updateTimer(unsigned int) {
   const auto time = [now = GetTicks()](Widget& widget) { widget.updateTimer(now); };
-  visitActive(Layers::kBase, time);
-  visitActive(Layers::kTop, time);
+  visitActive(kBaseLayer, time);
+  visitActive(kTopLayer, time);
 }
 
 int Window::getwindowsize(int* outWidth, int* outHeight) {

@@ -1,164 +1,196 @@
 // The whole application without a window: what the user does goes in where a window's input would,
 // and what the user sees is compared with the picture of what is to be seen.
-#include <brimol/host.h>
 #include <gtest/gtest.h>
+
+#include <unistd.h>
 
 #include <chrono>
 #include <cstdlib>
 #include <filesystem>
-#include <functional>
-#include <string>
+#include <fstream>
 #include <thread>
 
 #include "application.h"
-#include "e2e/eventually.h"
+#include "e2e/app_screens.h"
+#include "e2e/user.h"
 #include "layout.h"
-#include "open_platform.h"
-#include "pc/painting.h"
+#include "results/results.h"
 
 namespace factory_test {
 namespace {
 
-using brimol::pc::InputTranslator;
-using brimol::pc::kMouse;
-using brimol::pc::ScreenPoint;
-using brimol::test::eventually;
+using namespace screens;
 
-constexpr ScreenSize kScreen = {720, 1280};
-constexpr Layout kLayout = layOut(kScreen);
-constexpr const char* kScreenSetting = "720x1280";
-constexpr uint32_t kOpaque = 0xFF000000;
+/// A folder of the test's own.
+class HeadlessApplication : public testing::Test {
+ protected:
+  HeadlessApplication() { std::filesystem::create_directory(folder); }
+  ~HeadlessApplication() override { std::filesystem::remove_all(folder); }
 
-enum Place { kPress, kClick, kLongPress, kDoubleClick, kDelayedShow, kLate };
-
-ScreenPoint centreOf(const SKIA_Rect& area) { return {area.x + area.w / 2, area.y + area.h / 2}; }
-
-const SKIA_Rect& button(Place place) { return kLayout.buttons.at(place); }
-
-/// The user at the screen.
-class User {
- public:
-  static bool waitForScreen() {
-    return eventually([] { return brimol::pc::openedPlatform() != nullptr; }) &&
-           eventually([] { return screenColour(kLayout.title) == kLayout.title.color; });
-  }
-
-  static void down(const SKIA_Rect& area) {
-    act([at = centreOf(area)](InputTranslator& input, uint32_t now) {
-      input.pointerDown(kMouse, at, now);
-    });
-  }
-  static void up(const SKIA_Rect& area) {
-    act([at = centreOf(area)](InputTranslator& input, uint32_t now) {
-      input.pointerUp(kMouse, at, now);
-    });
-  }
-  static void click(const SKIA_Rect& area) {
-    down(area);
-    up(area);
-  }
-
-  /// The colour just within the area's corner, where no text stands.
-  static uint32_t screenColour(const SKIA_Rect& area) {
-    return screen().at(area.x + 1, area.y + 1) | kOpaque;
-  }
-  static bool sees(const SKIA_Rect& area, uint32_t colour) {
-    return eventually([&] { return screenColour(area) == colour; });
-  }
-  /// Whether the status line comes to say the words.
-  static bool reads(const std::string& words) {
-    const SKIA_Item line = brimol::pc::textItem(
-        SKIA_TEXTBOX, kLayout.status,
-        brimol::pc::textOf(words, kLayout.textSize, kOpaque, SKIA_ALIGN_CENTRE));
-    const auto expected = brimol::pc::painted({line}, {kScreen.w, kScreen.h});
-    return eventually([&] { return isSame(screen(), expected, kLayout.status); });
-  }
-
- private:
-  static void act(const std::function<void(InputTranslator&, uint32_t)>& action) {
-    const auto platform = brimol::pc::openedPlatform();
-    ASSERT_NE(platform, nullptr);
-    EXPECT_TRUE(platform->act(
-        [=](InputTranslator& input) { action(input, brimol::pc::inputService().now()); }));
-  }
-
-  static brimol::pc::Picture screen() {
-    const auto platform = brimol::pc::openedPlatform();
-    const auto copy = platform ? platform->copyPicture(std::chrono::seconds(30)) : nullptr;
-    if (!copy) return brimol::pc::painted({}, {kScreen.w, kScreen.h});
-    return brimol::pc::pictureOf(copy.get());
-  }
-
-  static bool isSame(const brimol::pc::Picture& one, const brimol::pc::Picture& other,
-                     const SKIA_Rect& area) {
-    for (int y = area.y; y < area.y + area.h; ++y) {
-      for (int x = area.x; x < area.x + area.w; ++x) {
-        if (one.at(x, y) != other.at(x, y)) return false;
-      }
-    }
-    return true;
-  }
+  const std::filesystem::path folder =
+      std::filesystem::path(testing::TempDir()) / ("headless_test." + std::to_string(getpid()));
+  const std::string results = folder / "results.json";
+  const std::string report = folder / "report.xml";
 };
 
-/// Runs the application on this thread, as its main function does, and the user on another.
-void runWith(const std::function<void()>& user) {
-  setenv("BRIMOL_SCREEN", kScreenSetting, 1);
-  std::thread other([&] {
-    EXPECT_TRUE(User::waitForScreen());
-    user();
-    User::click(kLayout.end);
-  });
-  EXPECT_EQ(runApplication({.headless = true}), EXIT_SUCCESS);
-  other.join();
+/// The verdicts that the file holds, in the order in which they were given.
+std::string verdictsIn(const std::string& file) {
+  std::string error;
+  const auto book = ResultBook::open(file, error);
+  if (!book) return error;
+  std::string words;
+  for (const TestResult& each : book->results()) {
+    EXPECT_EQ(each.screen.width, kScreen.width);
+    EXPECT_EQ(each.screen.height, kScreen.height);
+    words += each.test + " " + verdictName(each.verdict) + "\n";
+  }
+  return words;
 }
 
-TEST(HeadlessApplication, LightsTheButtonThatIsHeld) {
-  runWith([] {
-    const uint32_t normal = button(kPress).color;
-    User::down(button(kPress));
-    EXPECT_TRUE(User::sees(button(kPress), MW::kColorHighlight));
+TEST_F(HeadlessApplication, IsDoneByTouchAlone) {
+  const int code = runWith({"--results", results, "--junit", report}, [] {
+    User::click(areaOf(kColours));
+    for (const uint32_t colour : {0xFFFFFFFF, 0xFFFF0000, 0xFF00FF00}) {
+      EXPECT_TRUE(User::sees(kCentre, colour));
+      if (colour != 0xFF00FF00) User::click(kCentre);
+      // A tap that follows at once would be a double tap.
+      std::this_thread::sleep_for(std::chrono::milliseconds(600));
+    }
+    User::click(kCentre);
+    User::click(kCentre);
+    EXPECT_TRUE(User::reads("Was every colour even?"));
+    User::click(kPass);
+    EXPECT_TRUE(User::sees(areaOf(kColours), kPassColor));
+
+    User::click(areaOf(kTouch));
+    EXPECT_TRUE(User::reads(""));
+    User::click(kCentre);
+    EXPECT_TRUE(User::reads("Lift: finger 0 at 360, 640"));
+    User::click(kCentre);
+    User::click(kCentre);
+    EXPECT_TRUE(User::reads("Double tap. Was every touch met?"));
+    User::click(kFail);
+    EXPECT_TRUE(User::sees(areaOf(kTouch), kFailColor));
+
+    User::click(areaOf(kSwitches));
+    EXPECT_TRUE(User::sees(kPage.line, kLineColor));
+    User::dragFrom(kKnob, kScreen.width);
+    EXPECT_TRUE(User::reads("Right"));
+    User::click(kPass);
+    EXPECT_TRUE(User::sees(areaOf(kSwitches), kPassColor));
+
+    User::click(areaOf(kDialogs));
+    EXPECT_TRUE(User::sees(kDialogOk, MW::kColorWhite));
+    User::click(kCentre);
+    User::click(kDialogCancel);
+    EXPECT_TRUE(User::reads("Did all dialogs look right?"));
+    User::click(kPass);
+    EXPECT_TRUE(User::sees(areaOf(kDialogs), kPassColor));
+  });
+  EXPECT_EQ(code, EXIT_SUCCESS);
+  EXPECT_EQ(verdictsIn(results), "colours PASS\ntouch FAIL\nswitches PASS\nprompts PASS\n");
+  EXPECT_TRUE(std::filesystem::exists(report));
+}
+
+TEST_F(HeadlessApplication, IsDoneByKeysAlone) {
+  const int code = runWith({"--results", results}, [] {
+    const auto choose = [](int entry) {
+      for (int i = 0; i <= entry; ++i) User::key(SDLK_DOWN);
+      User::key(SDLK_RETURN);
+    };
+    choose(0);  // the colours
+    EXPECT_TRUE(User::sees(kCentre, MW::kColorWhite));
+    User::key(SDLK_RIGHT);
+    EXPECT_TRUE(User::sees(kCentre, 0xFFFF0000));
+    User::key(SDLK_RETURN);
+    EXPECT_TRUE(User::reads("Was every colour even?"));
+    for (const SDL_Keycode key : {SDLK_RIGHT, SDLK_RIGHT, SDLK_RIGHT, SDLK_RETURN}) User::key(key);
+    EXPECT_TRUE(User::sees(areaOf(kColours), kFailColor));
+
+    // The mark stands where it was: two entries on are the keys.
+    for (const SDL_Keycode key : {SDLK_DOWN, SDLK_DOWN, SDLK_RETURN}) User::key(key);
+    EXPECT_TRUE(User::sees(cellOf(kScreen, kKeyGrid, 0, 0), kButtonColor));
+    for (const SDL_Keycode key : {SDLK_UP, SDLK_DOWN, SDLK_LEFT, SDLK_RIGHT, SDLK_RETURN, SDLK_h,
+                                  SDLK_PAGEUP, SDLK_PAGEDOWN, SDLK_p, SDLK_HOME, SDLK_HOME}) {
+      User::key(key);
+    }
+    EXPECT_TRUE(User::reads("Twice"));
+    User::key(SDLK_HOME);
+    EXPECT_TRUE(User::seesMenu()) << "it passes by itself";
+    EXPECT_TRUE(User::sees(areaOf(kKeys), kPassColor));
+
+    for (const SDL_Keycode key : {SDLK_DOWN, SDLK_DOWN, SDLK_RETURN}) User::key(key);
+    EXPECT_TRUE(User::reads(""));
+    User::key(SDLK_UP);
+    EXPECT_TRUE(User::reads("Right"));
+    User::key(SDLK_ESCAPE);
+  });
+  EXPECT_EQ(code, EXIT_SUCCESS);
+  EXPECT_EQ(verdictsIn(results), "colours FAIL\nkeys PASS\nswitches none\n");
+}
+
+TEST_F(HeadlessApplication, RetriesATestAndResumesARun) {
+  const auto visit = [] {
+    User::click(areaOf(kKeys));
+    EXPECT_TRUE(User::sees(cellOf(kScreen, kKeyGrid, 0, 0), kButtonColor));
+    User::key(SDLK_UP);
+    EXPECT_TRUE(User::sees(cellOf(kScreen, kKeyGrid, 0, 0), kPassColor));
+    User::click(kRetry);
+    EXPECT_TRUE(User::sees(cellOf(kScreen, kKeyGrid, 0, 0), kButtonColor));
+    User::click(kPass);
+  };
+  EXPECT_EQ(runWith({"--results", results}, visit), EXIT_SUCCESS);
+  EXPECT_EQ(verdictsIn(results), "keys PASS\n");
+  const auto look = [] { EXPECT_TRUE(User::sees(areaOf(kKeys), kPassColor)); };
+  EXPECT_EQ(runWith({"--results", results}, look), EXIT_SUCCESS);
+}
+
+TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
+  std::ofstream(results) << "no JSON";
+  EXPECT_EQ(runApplication({.headless = true, .results = results}), EXIT_FAILURE);
+  EXPECT_EQ(std::filesystem::file_size(results), 7) << "a damaged file stays as it is";
+  EXPECT_EQ(runApplication({.headless = true, .shot = folder / "none" / "shot.png"}), EXIT_FAILURE);
+
+  struct WrongLine {
+    std::vector<const char*> arguments;
+    const char* word;
+  };
+  for (const auto& [arguments, word] :
+       std::vector<WrongLine>{{{"--frobnicate"}, "--frobnicate"},
+                              {{"--shot"}, "--shot needs"},
+                              {{"--results", ""}, "--results needs"},
+                              {{"file"}, "'file'"}}) {
+    std::string error;
+    EXPECT_FALSE(parseOptions(arguments, error)) << word;
+    EXPECT_NE(error.find(word), std::string::npos) << error;
+  }
+}
+
+TEST_F(HeadlessApplication, TellsWhatHappensToButtons) {
+  const int code = runWith({}, [] {
+    User::click(areaOf(kButtons));
+    EXPECT_TRUE(User::sees(areaOf(kPressButton), kButtonColor));
+    User::down(areaOf(kPressButton));
+    EXPECT_TRUE(User::sees(areaOf(kPressButton), MW::kColorHighlight));
     EXPECT_TRUE(User::reads("Press: 1"));
-    User::up(button(kPress));
-    EXPECT_TRUE(User::sees(button(kPress), normal));
-  });
-}
-
-TEST(HeadlessApplication, TellsClicksDoubleClicksAndLongPresses) {
-  runWith([] {
-    User::click(button(kClick));
+    User::up(areaOf(kPressButton));
+    EXPECT_TRUE(User::sees(areaOf(kPressButton), kButtonColor));
+    User::click(areaOf(kClickButton));
     EXPECT_TRUE(User::reads("Click: 1"));
-    User::click(button(kClick));
-    EXPECT_TRUE(User::reads("Click: 2"));
-    User::click(button(kDoubleClick));
-    User::click(button(kDoubleClick));
+    User::click(areaOf(kDoubleClickButton));
+    User::click(areaOf(kDoubleClickButton));
     EXPECT_TRUE(User::reads("Double click: 1"));
-    User::down(button(kLongPress));
+    User::down(areaOf(kLongPressButton));
     EXPECT_TRUE(User::reads("Long press: 1"));
-    User::up(button(kLongPress));
-  });
-}
-
-TEST(HeadlessApplication, ShowsAButtonLateAndHidesIt) {
-  runWith([] {
-    User::click(button(kDelayedShow));
-    EXPECT_TRUE(User::reads("Delayed show: 1"));
-    EXPECT_TRUE(User::sees(button(kLate), button(kLate).color));
-    User::click(button(kLate));
+    User::up(areaOf(kLongPressButton));
+    User::click(areaOf(kDelayedButton));
+    EXPECT_TRUE(User::sees(areaOf(kLateButton), kButtonColor));
+    User::click(areaOf(kLateButton));
     EXPECT_TRUE(User::reads("Hide me: 1"));
-    EXPECT_TRUE(User::sees(button(kLate), kLayout.ground.color));
+    EXPECT_TRUE(User::sees(areaOf(kLateButton), kGroundColor));
+    User::click(kPass);
   });
-}
-
-TEST(HeadlessApplication, WritesAPictureAndEnds) {
-  setenv("BRIMOL_SCREEN", kScreenSetting, 1);
-  const auto shot = std::filesystem::path(testing::TempDir()) / "factory_test_shot.png";
-  EXPECT_EQ(runApplication({.headless = true, .shot = shot.string()}), EXIT_SUCCESS);
-  const brimol::pc::CairoSurface picture(cairo_image_surface_create_from_png(shot.c_str()));
-  ASSERT_EQ(cairo_surface_status(picture.get()), CAIRO_STATUS_SUCCESS);
-  EXPECT_EQ(cairo_image_surface_get_width(picture.get()), kScreen.w);
-  EXPECT_EQ(cairo_image_surface_get_height(picture.get()), kScreen.h);
-  std::filesystem::remove(shot);
-  EXPECT_EQ(runApplication({.headless = true, .shot = "/nonexistent/shot.png"}), EXIT_FAILURE);
+  EXPECT_EQ(code, EXIT_SUCCESS);
 }
 
 }  // namespace

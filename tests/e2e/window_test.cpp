@@ -7,11 +7,14 @@
 
 #include <array>
 #include <cstdlib>
+#include <filesystem>
+#include <stdexcept>
 #include <string>
 #include <utility>
 
+#include "e2e/app_screens.h"
 #include "e2e/eventually.h"
-#include "layout.h"
+#include "results/results.h"
 #include "support/desktop.h"
 
 namespace factory_test {
@@ -19,18 +22,22 @@ namespace {
 
 using brimol::test::Desktop;
 using brimol::test::eventually;
+using namespace screens;
 
-constexpr Layout kLayout = layOut({540, 960});
 constexpr uint32_t kOpaque = 0xFF000000;
 
 /// The program, from its start to its end.
 class Program {
  public:
-  Program() {
+  explicit Program(const std::string& results) {
     setenv("BRIMOL_DISPLAY", "window", 1);
-    setenv("BRIMOL_SCREEN", "540x960", 1);
-    std::string path = std::getenv("FACTORY_TEST");
-    const std::array<char*, 2> arguments = {path.data(), nullptr};
+    setenv("BRIMOL_SCREEN", kScreenSetting, 1);
+    const char* const named = std::getenv("FACTORY_TEST");
+    if (named == nullptr) throw std::runtime_error("FACTORY_TEST does not name the program");
+    std::string path = named;
+    std::string option = "--results";
+    std::string file = results;
+    const std::array<char*, 4> arguments = {path.data(), option.data(), file.data(), nullptr};
     EXPECT_EQ(posix_spawn(&process, path.c_str(), nullptr, nullptr, arguments.data(), environ), 0);
   }
   ~Program() {
@@ -57,15 +64,15 @@ class WindowApplication : public testing::Test {
   WindowApplication() {
     EXPECT_TRUE(eventually([this] {
       place = desktop.findWindow();
-      return place.window != 0 && sees(kLayout.title, kLayout.title.color);
+      return place.window != 0 && sees(areaOf(kTouch), kRowColor);
     }));
   }
+  ~WindowApplication() override { std::filesystem::remove(results); }
 
-  uint32_t colourAt(int x, int y) const {
-    return desktop.colourAt(place.x + x, place.y + y) | kOpaque;
-  }
   bool sees(const SKIA_Rect& area, uint32_t colour) const {
-    return colourAt(area.x + 1, area.y + 1) == colour;
+    const int x = place.x + area.x + area.w / kInset;
+    const int y = place.y + area.y + area.h / kInset;
+    return (desktop.colourAt(x, y) | kOpaque) == colour;
   }
   bool comesToSee(const SKIA_Rect& area, uint32_t colour) const {
     return eventually([&] { return sees(area, colour); });
@@ -75,48 +82,101 @@ class WindowApplication : public testing::Test {
                                 " " + std::to_string(place.y + at.y + at.h / 2) + " " + does;
     EXPECT_EQ(std::system(command.c_str()), 0);
   }
-  /// The colours along the middle of the status line, where its words stand.
-  std::vector<uint32_t> statusLine() const {
-    return desktop.row(place.x + kLayout.status.x,
-                       place.y + kLayout.status.y + kLayout.status.h / 2, kLayout.status.w);
+  static void keys(const std::string& names) {
+    EXPECT_EQ(std::system(("xdotool key " + names).c_str()), 0);
+  }
+  /// The colours along the middle of a page's line, where its words stand.
+  std::vector<uint32_t> line() const {
+    return desktop.row(place.x + kPage.line.x, place.y + kPage.line.y + kPage.line.h / 2,
+                       kPage.line.w);
+  }
+  bool comesToReadOtherThan(const std::vector<uint32_t>& before) const {
+    return eventually([&] { return line() != before; });
   }
 
-  Program program;
+  static constexpr uint32_t kRowColor = 0xFF787878;
+  static constexpr int kInset = 8;  // a look at an area falls this part of it from its corner
+
+  const std::string results = testing::TempDir() + "window_test." + std::to_string(getpid());
+  Program program{results};
   const Desktop desktop;
   Desktop::Place place;
 };
 
-TEST_F(WindowApplication, AnswersTheMouseAndEndsByItsButton) {
-  const SKIA_Rect& press = kLayout.buttons.at(0);
-  const SKIA_Rect& click = kLayout.buttons.at(1);
-  const auto before = statusLine();
-  mouse(press, "mousedown 1");
-  EXPECT_TRUE(comesToSee(press, MW::kColorHighlight));
-  mouse(press, "mouseup 1");
-  EXPECT_TRUE(comesToSee(press, press.color));
-  const auto pressed = statusLine();
-  EXPECT_NE(pressed, before);
-  mouse(click, "click 1");
-  EXPECT_TRUE(eventually([&] { return statusLine() != pressed; }));
-  mouse(kLayout.end, "click 1");
-  EXPECT_EQ(program.waitForEnd(), EXIT_SUCCESS);
-}
+TEST_F(WindowApplication, IsUsedByMouseAndByKeyboard) {
+  mouse(areaOf(kButtons), "click 1");
+  EXPECT_TRUE(comesToSee(areaOf(kPressButton), kButtonColor));
+  auto before = line();
+  mouse(areaOf(kPressButton), "mousedown 1");
+  EXPECT_TRUE(comesToSee(areaOf(kPressButton), MW::kColorHighlight));
+  EXPECT_TRUE(comesToReadOtherThan(before));
+  before = line();
+  mouse(areaOf(kTouch), "");
+  EXPECT_TRUE(comesToSee(areaOf(kPressButton), kButtonColor)) << "the mouse moved off it";
+  mouse(areaOf(kTouch), "mouseup 1");
+  mouse(areaOf(kClickButton), "click 1");
+  EXPECT_TRUE(comesToReadOtherThan(before));
+  mouse(kPass, "click 1");
+  EXPECT_TRUE(comesToSee(areaOf(kButtons), kPassColor));
 
-TEST_F(WindowApplication, LeavesTheButtonDarkOnceTheMouseMovedOff) {
-  const SKIA_Rect& click = kLayout.buttons.at(1);
-  const auto before = statusLine();
-  mouse(click, "mousedown 1");
-  EXPECT_TRUE(comesToSee(click, MW::kColorHighlight));
-  mouse(kLayout.box, "");
-  EXPECT_TRUE(comesToSee(click, click.color));
-  mouse(kLayout.box, "mouseup 1");
-  EXPECT_EQ(statusLine(), before) << "released outside: no click";
-  program.interrupt();
+  mouse(areaOf(kSwitches), "click 1");
+  EXPECT_TRUE(comesToSee(kKnob, MW::kColorWhite));
+  before = line();
+  mouse(kKnob, "mousedown 1");
+  mouse({700, kKnob.y, 10, kKnob.h, 0}, "mouseup 1");
+  EXPECT_TRUE(comesToReadOtherThan(before));
+  mouse(kFail, "click 1");
+  EXPECT_TRUE(comesToSee(areaOf(kSwitches), kFailColor));
+
+  mouse(areaOf(kTouch), "click 1");
+  EXPECT_TRUE(comesToSee(kPage.line, kLineColor));
+  mouse(kCentre, "click --repeat 2 --delay 50 1");
+  EXPECT_TRUE(comesToSee(kPass, MW::kColorWhite));
+  mouse(kPass, "click 1");
+  EXPECT_TRUE(comesToSee(areaOf(kTouch), kPassColor));
+
+  keys("Down Return");  // the colours
+  EXPECT_TRUE(comesToSee(kCentre, MW::kColorWhite));
+  keys("Return");
+  EXPECT_TRUE(comesToSee(kPage.line, kLineColor));
+  keys("Right Return");
+  EXPECT_TRUE(comesToSee(areaOf(kColours), kPassColor));
+
+  keys("Down Down Return");  // the keys
+  EXPECT_TRUE(comesToSee(cellOf(kScreen, kKeyGrid, 0, 0), kButtonColor));
+  keys("Escape Escape Escape");
+  EXPECT_TRUE(comesToSee(areaOf(kKeys), kFailColor));
+
+  keys("Down Down Down Down Return");  // the dialogs
+  EXPECT_TRUE(comesToSee(kDialogOk, MW::kColorWhite));
+  keys("Right Escape");
+  EXPECT_TRUE(comesToSee(kPage.line, kLineColor));
+  keys("Right Return");
+  EXPECT_TRUE(comesToSee(areaOf(kDialogs), kPassColor));
+
+  mouse(areaOf(kLeave), "click 1");
+  EXPECT_TRUE(comesToSee(kDialogOk, MW::kColorWhite));
+  mouse(kDialogOk, "click 1");
   EXPECT_EQ(program.waitForEnd(), EXIT_SUCCESS);
+  std::string error;
+  const auto book = ResultBook::open(results, error);
+  ASSERT_TRUE(book) << error;
+  std::string verdicts;
+  for (const TestResult& each : book->results()) {
+    verdicts += each.test + " " + verdictName(each.verdict) + "\n";
+  }
+  EXPECT_EQ(verdicts,
+            "buttons PASS\nswitches FAIL\ntouch PASS\ncolours PASS\nkeys FAIL\n"
+            "prompts PASS\n");
 }
 
 TEST_F(WindowApplication, EndsWhenItsWindowIsClosed) {
   desktop.askToClose(place.window);
+  EXPECT_EQ(program.waitForEnd(), EXIT_SUCCESS);
+}
+
+TEST_F(WindowApplication, EndsWhenItIsInterrupted) {
+  program.interrupt();
   EXPECT_EQ(program.waitForEnd(), EXIT_SUCCESS);
 }
 

@@ -16,9 +16,14 @@ struct DestroyImage {
 
 }  // namespace
 
-void Desktop::Close::operator()(_XDisplay* display) const { XCloseDisplay(display); }
+struct Desktop::Server {
+  struct Close {
+    void operator()(Display* opened) const { XCloseDisplay(opened); }
+  };
+  std::unique_ptr<Display, Close> display{XOpenDisplay(nullptr)};
+};
 
-Desktop::Desktop() : server(XOpenDisplay(nullptr)) {}
+Desktop::Desktop() : server(std::make_unique<Server>()) {}
 Desktop::~Desktop() = default;
 
 Desktop::Place Desktop::findWindow() const {
@@ -26,10 +31,11 @@ Desktop::Place Desktop::findWindow() const {
   Window* windows = nullptr;
   unsigned int count = 0;
   Place found;
-  XQueryTree(server.get(), DefaultRootWindow(server.get()), &ignored, &ignored, &windows, &count);
+  XQueryTree(server->display.get(), DefaultRootWindow(server->display.get()), &ignored, &ignored,
+             &windows, &count);
   for (unsigned int i = 0; i < count; ++i) {
     XWindowAttributes attributes = {};
-    XGetWindowAttributes(server.get(), windows[i], &attributes);
+    XGetWindowAttributes(server->display.get(), windows[i], &attributes);
     if (attributes.map_state != IsViewable) continue;
     found = {windows[i], attributes.x, attributes.y, attributes.width, attributes.height};
   }
@@ -39,9 +45,10 @@ Desktop::Place Desktop::findWindow() const {
 
 std::vector<std::uint32_t> Desktop::row(int left, int top, int width) const {
   const std::unique_ptr<XImage, DestroyImage> image(
-      XGetImage(server.get(), DefaultRootWindow(server.get()), left, top,
+      XGetImage(server->display.get(), DefaultRootWindow(server->display.get()), left, top,
                 static_cast<unsigned int>(width), 1, AllPlanes, ZPixmap));
   std::vector<std::uint32_t> colours;
+  colours.reserve(static_cast<std::size_t>(width));
   for (int i = 0; i < width; ++i) {
     colours.push_back(static_cast<std::uint32_t>(XGetPixel(image.get(), i, 0)) & kColourBits);
   }
@@ -52,11 +59,12 @@ void Desktop::askToClose(unsigned long window) const {
   XEvent event = {};
   event.xclient.type = ClientMessage;
   event.xclient.window = window;
-  event.xclient.message_type = XInternAtom(server.get(), "WM_PROTOCOLS", False);
+  event.xclient.message_type = XInternAtom(server->display.get(), "WM_PROTOCOLS", False);
   event.xclient.format = kWordBits;
-  event.xclient.data.l[0] = static_cast<long>(XInternAtom(server.get(), "WM_DELETE_WINDOW", False));
-  XSendEvent(server.get(), window, False, NoEventMask, &event);
-  XFlush(server.get());
+  event.xclient.data.l[0] =
+      static_cast<long>(XInternAtom(server->display.get(), "WM_DELETE_WINDOW", False));
+  XSendEvent(server->display.get(), window, False, NoEventMask, &event);
+  XFlush(server->display.get());
 }
 
 }  // namespace brimol::test

@@ -5,8 +5,6 @@
 #include <memory>
 #include <vector>
 
-struct _XDisplay;  // Xlib's, whose header has macros of such names as None
-
 namespace brimol::test {
 
 class Desktop {
@@ -33,10 +31,8 @@ class Desktop {
   void askToClose(unsigned long window) const;
 
  private:
-  struct Close {
-    void operator()(_XDisplay* display) const;
-  };
-  std::unique_ptr<_XDisplay, Close> server;
+  struct Server;  // Xlib's types stay in the source, as its header has macros of such names as None
+  std::unique_ptr<Server> server;
 };
 
 }  // namespace brimol::test

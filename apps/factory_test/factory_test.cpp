@@ -1,0 +1,113 @@
+#include "factory_test.h"
+
+#include <MW/window.h>
+#include <brimol/frame.h>
+
+#include <cstdio>
+#include <utility>
+
+#include "layout.h"
+#include "results/junit.h"
+
+namespace factory_test {
+
+namespace {
+
+void complain(const std::string& error) {
+  std::fprintf(stderr, "factory_test: %s\n", error.c_str());
+}
+
+}  // namespace
+
+FactoryTest::FactoryTest(ResultBook results, std::string reportPath)
+    : book(std::move(results)), junitPath(std::move(reportPath)), menu(book) {
+  menu.show();
+}
+
+void FactoryTest::update(uint32_t now) {
+  if (prompt) {
+    updatePrompt();
+  } else if (running) {
+    updateTest(now);
+  } else {
+    updateMenu(now);
+  }
+}
+
+void FactoryTest::updateMenu(uint32_t now) {
+  menu.update(now);
+  if (menu.takeLeave()) {
+    prompt.emplace();
+  } else if (const auto chosen = menu.takeChosen()) {
+    menu.hide();
+    start(*chosen, now);
+  }
+}
+
+void FactoryTest::updateTest(uint32_t now) {
+  running->test->update(now);
+  const Outcome outcome = running->test->verdict();
+  if (outcome != Outcome::Running) finish(outcome, now);
+}
+
+void FactoryTest::updatePrompt() {
+  const LeavePrompt::Answer answer = prompt->answer();
+  if (answer == LeavePrompt::Answer::None) return;
+  ended = answer == LeavePrompt::Answer::Yes;
+  prompt.reset();
+  MW::isDisplayUpdate(1);
+}
+
+void FactoryTest::start(std::size_t entry, uint32_t now) {
+  const auto clock = std::chrono::system_clock::now();
+  running = Running{entry, testEntries().at(entry).make(),
+                    std::chrono::floor<std::chrono::seconds>(clock), now};
+  running->test->enter();
+  MW::isDisplayUpdate(1);
+}
+
+void FactoryTest::finish(Outcome outcome, uint32_t now) {
+  const std::size_t entry = running->entry;
+  running->test->leave();
+  if (outcome == Outcome::Retry) {
+    running.reset();
+    start(entry, now);
+    return;
+  }
+  if (outcome == Outcome::Pass) keep(*running, Verdict::Pass, now);
+  if (outcome == Outcome::Fail) keep(*running, Verdict::Fail, now);
+  // Who only looks at a test does not take back its verdict.
+  if (outcome == Outcome::Left && book.find(testEntries().at(entry).id) == nullptr) {
+    keep(*running, Verdict::None, now);
+  }
+  running.reset();
+  menu.show();
+}
+
+void FactoryTest::keep(const Running& done, Verdict verdict, uint32_t now) {
+  std::string error;
+  if (!book.record({.test = testEntries().at(done.entry).id,
+                    .verdict = verdict,
+                    .started = done.started,
+                    .duration = std::chrono::milliseconds(now - done.startTicks),
+                    .screen = screenSize()},
+                   error)) {
+    complain(error);
+  }
+  if (!junitPath.empty() && !writeJunit(junitPath, book.results(), error)) complain(error);
+  menu.showVerdict(done.entry, verdict);
+}
+
+void FactoryTest::draw() {
+  skia_begin_frame_c();
+  if (running) {
+    running->test->draw();
+  } else {
+    const ScreenSize screen = screenSize();
+    skia_add_box_c({0, 0, screen.width, screen.height, kGroundColor});
+  }
+  MW::Window::show();
+  skia_end_frame_c();
+}
+
+}  // namespace factory_test

@@ -1,0 +1,52 @@
+/// What goes on: the menu, the test that runs, the question before the end.
+#pragma once
+
+#include <chrono>
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+
+#include "leave_prompt.h"
+#include "menu.h"
+#include "results/results.h"
+#include "test.h"
+
+namespace factory_test {
+
+/// Used on the main thread.
+class FactoryTest {
+ public:
+  /// Takes over the results so far. `reportPath`: the report for a CI system; empty: none.
+  FactoryTest(ResultBook results, std::string reportPath);
+
+  /// One round of the main loop, at GetTicks() milliseconds.
+  void update(uint32_t now);
+  /// Draws one frame.
+  void draw();
+  bool isEnded() const { return ended; }
+
+ private:
+  struct Running {
+    std::size_t entry;
+    std::unique_ptr<Test> test;
+    std::chrono::sys_seconds started;
+    uint32_t startTicks;
+  };
+
+  void updateMenu(uint32_t now);
+  void updateTest(uint32_t now);
+  void updatePrompt();
+  void start(std::size_t entry, uint32_t now);
+  void finish(Outcome outcome, uint32_t now);
+  void keep(const Running& done, Verdict verdict, uint32_t now);
+
+  ResultBook book;
+  std::string junitPath;
+  bool ended = false;
+  Menu menu;
+  std::optional<Running> running;
+  std::optional<LeavePrompt> prompt;
+};
+
+}  // namespace factory_test

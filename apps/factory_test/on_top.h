@@ -1,0 +1,22 @@
+/// Widgets of the base layer, used in the top layer.
+#pragma once
+
+#include <MW/window.h>
+
+namespace factory_test {
+
+/// While a widget of the top layer is active, nothing below gets events: what is to be touched then
+/// must stand in the top layer, too. Make and delete it as the newest widget, so that its number in
+/// its layer is its own.
+template <typename Kind>
+class OnTop : public Kind {
+ public:
+  OnTop() {
+    MW::Window::unregisterWidget(this);
+    this->setType(MW::kTopLayer);
+    MW::Window::registerWidget(this);
+  }
+  ~OnTop() override { this->leaveLayers(); }
+};
+
+}  // namespace factory_test

@@ -1,0 +1,35 @@
+#include "results/test_result.h"
+
+#include <algorithm>
+#include <limits>
+
+namespace factory_test {
+
+namespace {
+
+using std::chrono::milliseconds;
+using std::chrono::sys_days;
+using std::chrono::sys_seconds;
+
+constexpr sys_seconds kLastSecond =
+    sys_days(std::chrono::year(9999) / 12 / 31) + std::chrono::days(1) - std::chrono::seconds(1);
+constexpr milliseconds kLongestDuration(std::numeric_limits<int>::max());
+
+}  // namespace
+
+const char* verdictName(Verdict verdict) {
+  switch (verdict) {
+    case Verdict::Pass: return "PASS";
+    case Verdict::Fail: return "FAIL";
+    default: return "none";
+  }
+}
+
+TestResult clamped(TestResult result) {
+  result.started = std::clamp(result.started, sys_seconds(), kLastSecond);
+  result.duration = std::clamp(result.duration, milliseconds(0), kLongestDuration);
+  result.screen = {std::max(result.screen.width, 0), std::max(result.screen.height, 0)};
+  return result;
+}
+
+}  // namespace factory_test

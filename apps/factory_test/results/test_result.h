@@ -1,0 +1,34 @@
+/// What a finished test leaves behind.
+#pragma once
+
+#include <chrono>
+#include <string>
+
+namespace factory_test {
+
+enum class Verdict { None, Pass, Fail };
+
+/// The word of the files for it: "PASS", "FAIL" or "none".
+const char* verdictName(Verdict verdict);
+
+struct ScreenSize {
+  int width = 0;  // pixels, 0 or more
+  int height = 0;
+
+  bool operator==(const ScreenSize&) const = default;
+};
+
+struct TestResult {
+  std::string test = {};  // its name, the key; UTF-8
+  Verdict verdict = Verdict::None;
+  std::chrono::sys_seconds started = {};    // UTC, years 1970 to 9999
+  std::chrono::milliseconds duration = {};  // 0 to INT_MAX, that is 24 days
+  ScreenSize screen = {};
+
+  bool operator==(const TestResult&) const = default;
+};
+
+/// The nearest result whose figures are within their ranges.
+TestResult clamped(TestResult result);
+
+}  // namespace factory_test

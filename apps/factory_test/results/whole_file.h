@@ -1,0 +1,21 @@
+/// Small files that are read and replaced as a whole.
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace factory_test {
+
+/// What a regular file of at most a MiB holds. Nothing for any other, which is never waited for;
+/// `error` then says why in one line that begins with the file's name.
+std::optional<std::string> readFile(const std::filesystem::path& file, std::string& error);
+
+/// Puts `bytes` in the place of what the file holds, if there is one, on the disk too: at every
+/// moment the old or the new bytes stand there whole. A symbolic link to a file is followed. False:
+/// the file is as it was, and `error` says why as above. One program at a time may write a file;
+/// what a killed one left in FILE.tmp, the next one removes.
+bool replaceFile(const std::filesystem::path& file, std::string_view bytes, std::string& error);
+
+}  // namespace factory_test

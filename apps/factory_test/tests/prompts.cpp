@@ -1,0 +1,92 @@
+// Every built-in dialog, one after another.
+#include <MW/dialog.h>
+
+#include <array>
+#include <atomic>
+#include <cstdio>
+#include <optional>
+
+#include "current.h"
+#include "page.h"
+#include "test.h"
+#include "verdict_bar.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr int kFirstKind = 0;
+constexpr int kLastKind = 39;
+
+/// A touch, the right key or select shows the next kind, the left key the one before. The right
+/// button, and back, end the look, and the verdict is asked for.
+class PromptTest : public Test {
+ public:
+  void enter() override { showDialog(); }
+
+  void leave() override {
+    bar.reset();
+    dialog.reset();
+  }
+
+  Outcome verdict() const override { return bar ? bar->outcome() : Outcome::Running; }
+
+  void draw() override {
+    page.draw();
+    if (bar) bar->draw();
+  }
+
+  void update(uint32_t) override {
+    if (bar) return;
+    if (looked || kind > kLastKind) {
+      dialog.reset();
+      bar.emplace();
+      page.say("Did all dialogs look right?");
+    } else if (kind != shown) {
+      showDialog();
+    }
+  }
+
+ private:
+  void showDialog() {
+    dialog.reset();
+    shown = kind.load();
+    MW::Dialog& made = dialog.emplace(shown.load());
+    made.clickCallback = [](MW::mouse_event*) { Current<PromptTest>::get().move(1); };
+    made.button2Callback = [](int) { Current<PromptTest>::get().looked = true; };
+    made.hookKeyCallback = [](int) { Current<PromptTest>::get().move(1); };
+    made.keyPressCallback = [](MW::kbd_event* event) {
+      Current<PromptTest>::get().followKey(event->code);
+    };
+    made.setActive(1);
+    std::array<char, SKIA_TEXT_BYTES> words{};
+    std::snprintf(words.data(), words.size(), "Dialog of kind %d", shown.load());
+    page.say(words.data());
+  }
+
+  void followKey(unsigned int code) {
+    if (code == MW::kKeyRight || code == MW::kKeyDown || code == MW::kKeySelect) move(1);
+    if (code == MW::kKeyLeft || code == MW::kKeyUp) move(-1);
+    if (code == kKeyBack) looked = true;
+  }
+
+  void move(int by) {
+    const int wanted = shown + by;
+    if (wanted >= kFirstKind) kind = wanted;
+  }
+
+  Current<PromptTest> current{this};
+  std::atomic<bool> looked = false;
+  std::atomic<int> kind = kFirstKind;   // wanted by the user
+  std::atomic<int> shown = kFirstKind;  // on the screen
+  Page page{"Prompts", "Touch for the next dialog;\nthe right button ends."};
+  std::optional<MW::Dialog> dialog;
+  std::optional<VerdictBar> bar;
+};
+
+const TestRegistration kRegistration({Group::Widgets, 3, "prompts", "Dialogs",
+                                      makeTest<PromptTest>});
+
+}  // namespace
+
+}  // namespace factory_test

@@ -1,0 +1,88 @@
+// The slide switches, one of them locked.
+#include <MW/slide.h>
+
+#include <optional>
+
+#include "current.h"
+#include "layout.h"
+#include "page.h"
+#include "test.h"
+#include "verdict_bar.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr int kFullTravel = 0;  // MW::Slide's states
+constexpr int kHalfTravel = 2;
+constexpr int kRightBit = 1;
+
+/// Tells every change. A double tap unlocks the third switch; the up key moves the others.
+class SwitchTest : public Test {
+ public:
+  void enter() override {
+    bar.emplace().otherKey = [](unsigned int code) {
+      if (code == MW::kKeyUp) Current<SwitchTest>::get().moveAll();
+    };
+    place(full, 0, kFullTravel, "Full way");
+    place(half, 1, kHalfTravel, "Half way");
+    place(locked, 2, kFullTravel, "Locked");
+    locked->Lock();
+    locked->doubleClickCallback = [](MW::mouse_event*) { Current<SwitchTest>::get().unlock(); };
+  }
+
+  void leave() override {
+    locked.reset();
+    half.reset();
+    full.reset();
+    bar.reset();
+  }
+
+  Outcome verdict() const override { return bar->outcome(); }
+
+  void draw() override {
+    page.draw();
+    bar->draw();
+  }
+
+ private:
+  template <typename Kind>
+  static void place(std::optional<Kind>& slide, int row, int state, const char* words) {
+    constexpr int kPitch = 13;  // per cent of the screen's height, and so the next
+    constexpr int kHeight = 9;
+    const ScreenSize screen = screenSize();
+    const SKIA_Rect area = rowOf(screen, kContentTop + row * kPitch, kHeight, 0);
+    const SKIA_Text caption = textOf(words, MW::kColorBlack, SKIA_ALIGN_CENTRE, textSize(screen));
+    slide.emplace(state, &area, &caption, nullptr);
+    slide->leftCallback = [](int) { Current<SwitchTest>::get().page.say("Left"); };
+    slide->rightCallback = [](int) { Current<SwitchTest>::get().page.say("Right"); };
+    slide->setActive(1);
+  }
+
+  void moveAll() {
+    full->state = full->state ^ kRightBit;
+    half->state = half->state ^ kRightBit;
+    page.say((full->state & kRightBit) != 0 ? "Right" : "Left");
+  }
+
+  void unlock() {
+    locked->unLock();
+    page.say("Unlocked");
+  }
+
+  Current<SwitchTest> current{this};
+  Page page{"Switches",
+            "Drag the switches to and fro.\nTap the locked one twice to unlock it.\n"
+            "Key up moves the first two."};
+  std::optional<VerdictBar> bar;
+  std::optional<MW::Slide> full;
+  std::optional<MW::SlideV> half;
+  std::optional<MW::Slide> locked;
+};
+
+const TestRegistration kRegistration({Group::Widgets, 1, "switches", "Slide switches",
+                                      makeTest<SwitchTest>});
+
+}  // namespace
+
+}  // namespace factory_test

@@ -1,0 +1,104 @@
+// What shows for a while and goes away by itself: a toast and a progress bar.
+#include <MW/button.h>
+#include <MW/timed.h>
+
+#include <array>
+#include <optional>
+
+#include "current.h"
+#include "layout.h"
+#include "page.h"
+#include "test.h"
+#include "verdict_bar.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr int kToastMs = 2000;
+constexpr int kProgressMs = 3000;
+constexpr uint32_t kToastColor = 0xFF505A6C;
+
+/// Two buttons, or the keys up and down, start them.
+class TimedTest : public Test {
+ public:
+  void enter() override {
+    bar.emplace().otherKey = [](unsigned int code) { Current<TimedTest>::get().followKey(code); };
+    const ScreenSize screen = screenSize();
+    const SKIA_Rect row = rowOf(screen, kContentTop, 9, kButtonColor);
+    placeButton(toastButton, cellOf(row, 0, 2), "Toast");
+    placeButton(progressButton, cellOf(row, 1, 2), "Progress");
+    toastButton->clickCallback = [](int) { Current<TimedTest>::get().startToast(); };
+    progressButton->clickCallback = [](int) { Current<TimedTest>::get().startProgress(); };
+    placeToast(rowOf(screen, 47, 9, kToastColor));
+    placeProgress(rowOf(screen, 60, 7, kTitleColor));
+  }
+
+  void leave() override {
+    progress.reset();
+    toast.reset();
+    progressButton.reset();
+    toastButton.reset();
+    bar.reset();
+  }
+
+  Outcome verdict() const override { return bar->outcome(); }
+
+  void draw() override {
+    page.draw();
+    bar->draw();
+  }
+
+ private:
+  static void placeButton(std::optional<MW::Button>& button, const SKIA_Rect& area,
+                          const char* words) {
+    const SKIA_Text caption =
+        textOf(words, MW::kColorBlack, SKIA_ALIGN_CENTRE, textSize(screenSize()));
+    button.emplace(&area, &caption).setActive(1);
+  }
+
+  void placeToast(const SKIA_Rect& area) {
+    const int size = textSize(screenSize());
+    const SKIA_Text first = textOf("A toast", MW::kColorWhite, SKIA_ALIGN_CENTRE, size);
+    const SKIA_Text second =
+        textOf("goes in two seconds", MW::kColorWhite, SKIA_ALIGN_CENTRE, size);
+    toast.emplace(&area, &first, &second);
+  }
+
+  void placeProgress(const SKIA_Rect& area) {
+    const SKIA_Text caption =
+        textOf("Three seconds of work", MW::kColorWhite, SKIA_ALIGN_CENTRE, textSize(screenSize()));
+    progress.emplace(0, &area, &caption);
+  }
+
+  void startToast() {
+    toast->onHideTimer(kToastMs);
+    page.say("Toast for two seconds");
+  }
+
+  void startProgress() {
+    progress->onProgressbar(kProgressMs);
+    page.say("Progress for three seconds");
+  }
+
+  void followKey(unsigned int code) {
+    if (code == MW::kKeyUp) startToast();
+    if (code == MW::kKeyDown) startProgress();
+  }
+
+  Current<TimedTest> current{this};
+  Page page{"Toast and progress",
+            "Each button shows something for a while.\nKey up: toast. Key down: progress."};
+  std::optional<VerdictBar> bar;
+  std::optional<MW::Button> toastButton;
+  std::optional<MW::Button> progressButton;
+  std::optional<MW::Toastbox> toast;
+  std::optional<MW::Progressbar> progress;
+};
+
+const TestRegistration kRegistration({Group::Widgets, 2, "timed", "Toast and progress",
+                                      makeTest<TimedTest>});
+
+}  // namespace
+
+}  // namespace factory_test

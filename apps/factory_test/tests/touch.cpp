@@ -1,0 +1,101 @@
+// The touch panel: where it is touched, and how.
+#include <MW/key.h>
+#include <MW/screen.h>
+
+#include <array>
+#include <atomic>
+#include <cstdio>
+#include <optional>
+
+#include "current.h"
+#include "layout.h"
+#include "page.h"
+#include "test.h"
+#include "verdict_bar.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr uint32_t kCross = 0xFFE8C040;
+constexpr int kCrossWidth = 3;  // pixels
+
+/// Shows the coordinates of every touch, with a cross through the last one. A double tap, or the
+/// select key, ends the look, and the verdict is asked for.
+class TouchTest : public Test {
+ public:
+  void enter() override {
+    touch.emplace();
+    touch->pressCallback = [](MW::mouse_event* mouse) { self().tell("Press", *mouse); };
+    touch->hoverCallback = [](MW::mouse_event* mouse) { self().tell("Move", *mouse); };
+    touch->clickCallback = [](MW::mouse_event* mouse) { self().tell("Lift", *mouse); };
+    touch->longPressCallback = [](MW::mouse_event* mouse) { self().tell("Long press", *mouse); };
+    touch->doubleClickCallback = [](int) { self().looked = true; };
+    touch->setActive(1);
+    key.emplace().keyPressCallback = [](MW::kbd_event* event) {
+      if (event->code == MW::kKeySelect || event->code == kKeyBack) self().looked = true;
+    };
+  }
+
+  void leave() override {
+    bar.reset();
+    endLook();
+  }
+
+  Outcome verdict() const override { return bar ? bar->outcome() : Outcome::Running; }
+
+  void draw() override {
+    page.drawGround();
+    if (x >= 0) drawCross();
+    page.drawTexts();
+    if (bar) bar->draw();
+  }
+
+  void update(uint32_t) override {
+    if (!looked || bar) return;
+    endLook();
+    bar.emplace();
+    page.say("Double tap. Was every touch met?");
+  }
+
+ private:
+  static TouchTest& self() { return Current<TouchTest>::get(); }
+
+  void endLook() {
+    key.reset();
+    touch.reset();
+  }
+
+  void drawCross() const {
+    const ScreenSize screen = screenSize();
+    const int atX = x;
+    const int atY = y;
+    skia_add_line_c({atX, 0, atX, screen.height, kCross, kCrossWidth});
+    skia_add_line_c({0, atY, screen.width, atY, kCross, kCrossWidth});
+  }
+
+  void tell(const char* what, const MW::mouse_event& mouse) {
+    x = mouse.x;
+    y = mouse.y;
+    std::array<char, SKIA_TEXT_BYTES> words{};
+    std::snprintf(words.data(), words.size(), "%s: finger %u at %d, %d", what, mouse.finger,
+                  mouse.x, mouse.y);
+    page.say(words.data());
+  }
+
+  Current<TouchTest> current{this};
+  std::atomic<bool> looked = false;
+  std::atomic<int> x = -1;  // pixels; -1: not touched yet
+  std::atomic<int> y = -1;
+  Page page{"Touch", "Touch and drag everywhere.\nTap twice in one place to end."};
+  std::optional<MW::Screen> touch;
+  std::optional<MW::Key> key;
+  std::optional<VerdictBar> bar;
+};
+
+const TestRegistration kRegistration({Group::Input, 0, "touch", "Touch panel",
+                                      makeTest<TouchTest>});
+
+}  // namespace
+
+}  // namespace factory_test

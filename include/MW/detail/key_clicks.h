@@ -1,0 +1,45 @@
+/// One key released several times in quick succession.
+#pragma once
+
+#include <MW/records.h>
+
+#include <cstdint>
+
+namespace MW {
+
+/// Counts the releases of one key of which each comes within 1000 ms of the one before. Times are
+/// GetTicks() milliseconds. One thread, the one that handles events.
+class KeyClicks {
+ public:
+  static constexpr uint32_t kWindowMs = 1000;
+  static constexpr uint32_t kNoKey = 65535;
+
+  /// Before a release is counted: another key than the last starts a series of its own.
+  constexpr void follow(const kbd_event& key, uint32_t now) {
+    if (key.code == lastKey.code) return;
+    lastKey = key;
+    count = 0;
+    time = now;
+  }
+  /// Counts a release of the followed key and returns how many there were in a row. Any other key
+  /// ends the series, and the answer is 0.
+  constexpr int click(uint32_t code, uint32_t now) {
+    if (code != lastKey.code) {
+      count = 0;
+      lastKey.code = kNoKey;
+      return 0;
+    }
+    count = now >= time + kWindowMs ? 1 : count + 1;
+    time = now;
+    return count;
+  }
+
+  kbd_event lastKey = {kNoKey,
+                       kNoKey};  ///< the followed key's release, as applications are given it
+
+ private:
+  int count = 0;
+  uint32_t time = 0;
+};
+
+}  // namespace MW

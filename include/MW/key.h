@@ -1,0 +1,55 @@
+/// Raw input for screens that test keys, the touch panel and plugs.
+#pragma once
+
+#include <MW/detail/key_clicks.h>
+#include <MW/widget.h>
+
+namespace MW {
+
+/// Draws nothing and reports every event that it is offered to the application.
+///
+/// It enters the base layer when it is constructed, active, and stays there until it is deleted or
+/// unregistered. Keys, long presses, user and application events are taken; touch press, release
+/// and motion go on to the other widgets.
+///
+/// Callbacks. Of one kbd_event*: `keyPressCallback`; `keyReleaseCallback`; `doubleKeyCallback` and
+/// `tripleKeyCallback`, the second and third release of one key of which each comes within 1000 ms
+/// of the one before; `plugCallback`. Of one mouse_event*: `touchPressCallback`,
+/// `touchReleaseCallback`, `longPressCallback`. The record is valid for the call. They are called
+/// on the dispatch thread, and a plug event that was held back on the thread that draws.
+///
+/// Plug events (user events) of the codes 2, 17 and 18 are held back for 100 ms, so that a plug
+/// that bounces is told once it has settled: 17 and 18 are then told as 2. Another code is told at
+/// once when the last one of these was 2 or was told as 2, and a 2 that is still held is given up
+/// for it; before the first of them, and while 17 or 18 is held, it is dropped. Nothing is held
+/// while `plugCallback` is null.
+class MW_API Key : public Widget {
+ public:
+  Key();
+  ~Key() override;
+
+  /// show(0).
+  int show() override;
+  /// Delivers the plug event that is due. Returns 1.
+  int show(unsigned int ticks) override;
+  bool onRecvEvent(event_data* event, unsigned int arg) override;
+  void onPlugKey(kbd_event key) override;
+  void onPressTouch(mouse_event mouse) override;
+  void onReleaseTouch(mouse_event mouse) override;
+
+  using Widget::onPressKey;
+  using Widget::onPressLong;
+  using Widget::onReleaseKey;
+  void onPressKey(kbd_event key);
+  void onReleaseKey(kbd_event key);
+  void onPressLong(mouse_event mouse);
+  /// Counts a release of the key that was released last; any other key ends the count.
+  void onKeyClickCount(kbd_event key);
+
+ protected:
+  KeyClicks keyClicks;       // dispatch thread
+  kbd_event plugEvent = {};  // the one held back; these two are guarded by stateLock
+  unsigned int plugDue = 0;  // GetTicks() milliseconds, 0: none is held
+};
+
+}  // namespace MW

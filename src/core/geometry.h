@@ -1,0 +1,46 @@
+/// Integer geometry that cannot overflow.
+#pragma once
+
+#include <brimol/scene.h>
+
+#include <algorithm>
+#include <cstdint>
+#include <limits>
+
+namespace MW {
+
+struct ScreenSize {
+  int w;
+  int h;
+};
+
+/// The nearest number of pixels that a record's word can hold.
+constexpr int32_t toPixels(int64_t value) {
+  constexpr int64_t kLowest = std::numeric_limits<int32_t>::min();
+  constexpr int64_t kHighest = std::numeric_limits<int32_t>::max();
+  return static_cast<int32_t>(std::clamp(value, kLowest, kHighest));
+}
+
+constexpr SKIA_Rect makeRect(int64_t x, int64_t y, int64_t w, int64_t h, uint32_t color) {
+  return {toPixels(x), toPixels(y), toPixels(w), toPixels(h), color};
+}
+
+/// Truncates toward zero.
+constexpr int64_t percentOf(int64_t length, int percent) {
+  constexpr int kWhole = 100;
+  return length * percent / kWhole;
+}
+static_assert(percentOf(199, 50) == 99 && percentOf(-199, 50) == -99);
+
+/// The rectangle that lies `by` pixels further out on every side.
+constexpr SKIA_Rect grown(const SKIA_Rect& area, int by, uint32_t color) {
+  return makeRect(int64_t{area.x} - by, int64_t{area.y} - by, int64_t{area.w} + int64_t{2} * by,
+                  int64_t{area.h} + int64_t{2} * by, color);
+}
+
+/// Everything, and one pixel more to the right and below.
+constexpr SKIA_Rect overScreen(ScreenSize screen, uint32_t color) {
+  return makeRect(0, 0, int64_t{screen.w} + 1, int64_t{screen.h} + 1, color);
+}
+
+}  // namespace MW

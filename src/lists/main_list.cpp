@@ -1,0 +1,373 @@
+#include <MW/event_service.h>
+#include <MW/main_list.h>
+#include <MW/window.h>
+
+#include <algorithm>
+#include <cstring>
+#include <utility>
+
+#include "core/bounded_text.h"
+#include "core/class_log.h"
+#include "core/geometry.h"
+#include "core/life_guard.h"
+#include "lists/main_list_tables.h"
+
+namespace MW {
+
+namespace {
+
+constexpr ClassLog kLog("MAINLIST");
+constexpr int kExtended = 1;  // mode
+constexpr int kItemGap = 3;   // pixels, and so the rest
+constexpr int kTitleHeight = 340;
+constexpr int kExtendedTitleHeight = 510;
+constexpr int kTitleSize = 70;
+constexpr int kEdgeHeight = 2;
+constexpr int kSlopPercent = 2;  // of the screen's width
+constexpr int kNoItem = -1;
+constexpr int kLongestText = kTextMax - 1;  // bytes
+
+// What a record takes of an application's counted text; nothing where the count is refused.
+std::string_view countedText(const char* given, int64_t length) {
+  if (length < 1 || length > kLongestText) return {};
+  return boundedText(given, static_cast<std::size_t>(length));
+}
+
+}  // namespace
+
+MainList::MainList(const char* listTitle, int listMode) {
+  kLog.print(LogLevel::Debug, "call registerWidget");
+  title = {{}, 0, kColorWhite, SKIA_ALIGN_LEFT, kTitleSize};
+  putText(title, boundedText(listTitle));
+  init_MainList(listMode);
+}
+
+MainList::MainList(const char* listTitle) : MainList(listTitle, 0) {}
+
+MainList::~MainList() { leaveWindow(); }
+
+void MainList::init_MainList(int listMode) {
+  setRect(listMode);
+  setActive(0);
+  setType(kBaseLayer);
+  initIndex();
+  setSelect(0);
+  {
+    const std::lock_guard guard(stateLock);
+    mode = listMode;
+    click.press(ClickSlop::kNone);
+    scroll = 0;
+    finished = 0;
+    shown = 0;
+    current = kNoItem;
+  }
+  clickCallback = pressCallback = releaseCallback = scrollCallback = nullptr;
+  keyPressCallback = keyReleaseCallback = nullptr;
+  Window::registerWidget(this);
+}
+
+void MainList::setRect(int listMode) {
+  ScreenSize screen = {};
+  Window::getwindowsize(&screen.w, &screen.h);
+  const int titleHeight = listMode == kExtended ? kExtendedTitleHeight : kTitleHeight;
+  const std::lock_guard guard(stateLock);
+  screenRect = {0, 0, screen.w, screen.h, 0};
+  titleBar = {0, 0, screen.w, titleHeight, kColorBlack};
+  titleRect = {0, 0, screen.w, kTitleHeight, kColorBlack};
+  bottomEdge = {0, screen.h, screen.w, kEdgeHeight, kColorBlack};
+  listRect = makeRect(0, titleHeight, screen.w, int64_t{screen.h} - titleHeight, 0);
+  touchSlop = toPixels(percentOf(screen.w, kSlopPercent));
+  for (std::size_t i = 0; i < option.size(); ++i) {
+    const StatusRow& row = kStatusRows.at(i);
+    option.at(i).rect = statusRect(row, screen.w);
+    option.at(i).text = {{}, 0, kStatusColor, row.align, kStatusSize};
+    putText(option.at(i).text, row.initial);
+  }
+}
+
+void MainList::initIndex() {
+  const std::lock_guard guard(stateLock);
+  items.fill({});
+  count = 0;
+}
+
+int MainList::addIndex(int kind, const SKIA_Text* item, int height) {
+  if (item == nullptr || strnlen(item->text, SKIA_TEXT_BYTES) > kLongestText) return kNoItem;
+  const std::lock_guard guard(stateLock);
+  if (count == kItems || finished != 0) return kNoItem;
+  const ItemColors& colors = colorsOf(kind);
+  Item& added = items.at(static_cast<std::size_t>(count));
+  added = {kind, height, colors.background, copyText(item)};
+  added.text.color = colors.text;
+  return count++;
+}
+
+void MainList::initFinish() {
+  int first = kNoItem;
+  {
+    const std::lock_guard guard(stateLock);
+    finished = 1;
+    first = nextSelectable(kNoItem, 1);
+    current = first;
+  }
+  kLog.print(LogLevel::Debug, "initFinish find first item #%02d ", first);
+}
+
+int MainList::Max_height() {
+  const std::lock_guard guard(stateLock);
+  return toPixels(contentHeight());
+}
+
+int64_t MainList::contentHeight() const {
+  int64_t height = -kItemGap;
+  for (const Item& item : items) {
+    if (item.kind != kEnd) height += int64_t{item.height} + kItemGap;
+  }
+  return height;
+}
+
+int MainList::show(unsigned int) {
+  const std::lock_guard guard(stateLock);
+  if (finished == 0) return 1;
+  drawItems();
+  skia_add_box_c(titleBar);
+  skia_add_label_c(titleRect, title);
+  drawStatus();
+  skia_add_box_c(bottomEdge);
+  if (shown == 0) {
+    shown = 1;
+    kLog.print(LogLevel::Debug, "SHOW->%s", title.text);
+  }
+  return 1;
+}
+
+// An item is drawn when its top lies within the list, edges excluded: one whose top stands exactly
+// at the list's is not. Meant so.
+void MainList::drawItems() const {
+  const int64_t bottom = int64_t{listRect.y} + listRect.h;
+  int64_t y = int64_t{listRect.y} + scroll;
+  for (const Item& item : items) {
+    if (item.kind == kEnd) return;
+    if (listRect.y < y && y < bottom) {
+      skia_add_textbox_c(makeRect(0, y, screenRect.w, item.height, item.bgColor), item.text);
+    }
+    y += int64_t{item.height} + kItemGap;
+  }
+}
+
+void MainList::drawStatus() const {
+  const auto draw = [this](StatusText number) {
+    const Option& shownText = option.at(number);
+    skia_add_label_c(shownText.rect, shownText.text);
+  };
+  std::ranges::for_each(kAlwaysDrawn, draw);
+  if (mode == kExtended) std::ranges::for_each(kExtendedDrawn, draw);
+}
+
+int MainList::hide() {
+  bool wasShown = false;
+  {
+    const std::lock_guard guard(stateLock);
+    wasShown = shown == 1;
+    shown = 0;
+  }
+  if (wasShown) kLog.print(LogLevel::Debug, "HIDE<-%s", title.text);
+  setActive(0);
+  setSelect(0);
+  return 0;
+}
+
+void MainList::lcdOn(int on) {
+  if (lcdState.exchange(on) != on) setSelect(0);
+}
+
+template <typename Change>
+void MainList::changeItem(int item, Change change) {
+  const std::lock_guard guard(stateLock);
+  if (item >= 0 && item < count) change(items.at(static_cast<std::size_t>(item)));
+}
+
+void MainList::setText(int item, const char* newText, unsigned int length) {
+  const std::string_view bytes = countedText(newText, length);
+  if (bytes.empty()) return;
+  changeItem(item, [&](Item& changed) { putTextOpen(changed.text, bytes); });
+}
+
+void MainList::setFontSize(int item, int pixels) {
+  changeItem(item, [&](Item& changed) { changed.text.size = pixels; });
+}
+
+void MainList::setTextColor(int item, unsigned int color) {
+  changeItem(item, [&](Item& changed) { changed.text.color = color; });
+}
+
+void MainList::setBGColor(int item, unsigned int color) {
+  changeItem(item, [&](Item& changed) { changed.bgColor = color; });
+}
+
+void MainList::setListType(int item, int kind) {
+  changeItem(item, [&](Item& changed) { changed.kind = kind; });
+}
+
+void MainList::setTextOption(int number, const char* newText, int length) {
+  const std::string_view bytes = countedText(newText, length);
+  if (bytes.empty() || number < 0 || number >= kOptions) return;
+  const std::lock_guard guard(stateLock);
+  putText(option.at(static_cast<std::size_t>(number)).text, bytes);
+}
+
+void MainList::setTextBattery(const char* newText, int length) {
+  setTextOption(kBattery, newText, length);
+}
+
+void MainList::setTextTa(const char* newText, int length) {
+  setTextOption(kCharger, newText, length);
+}
+
+void MainList::setTextBrightness(const char* newText, int length) {
+  setTextOption(kBrightness, newText, length);
+}
+
+void MainList::setTitleBGColor(int) {}
+
+bool MainList::onRecvEvent(event_data* event, unsigned int) {
+  if (event == nullptr) return false;
+  switch (event->type) {
+    case kEventKeyPress: onPressKey(event->key); return true;
+    case kEventKeyRelease: onReleaseKey(event->key); return true;
+    default: break;
+  }
+  if (!isTouched(event)) return false;
+  switch (event->type) {
+    case kEventMotion: onHover(event->mouse); return true;
+    case kEventPress: onPress(event->mouse); return true;
+    case kEventRelease: onRelease(event->mouse); return true;
+    default: return false;
+  }
+}
+
+// A finger that holds the list is followed wherever it moves, and keeps all others from it.
+bool MainList::isTouched(const event_data* event) const {
+  const bool isDrag = event->type >= kEventMotion && event->type <= kEventRelease;
+  if (isDrag && select != 0 && select != static_cast<int>(event->mouse.finger + 1)) {
+    if (event->type != kEventMotion) {
+      kLog.print(LogLevel::Debug, "onRecvEvent-> T:%d, F:%d", event->type,
+                 static_cast<int>(event->mouse.finger));
+    }
+    return false;
+  }
+  const SKIA_Rect area = read(listRect);
+  return select != 0 || EventService::isMouseEventForMe(&area, event);
+}
+
+void MainList::onPressKey(kbd_event key) {
+  kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
+  if (auto* const call = keyPressCallback) call(&key, this);
+}
+
+void MainList::onReleaseKey(kbd_event key) {
+  kLog.print(LogLevel::Debug, "key onReleaseKey sym = %d", static_cast<int>(key.code));
+  if (auto* const call = keyReleaseCallback) call(&key, this);
+}
+
+void MainList::onPress(mouse_event mouse) {
+  setSelect(static_cast<int>(mouse.finger + 1));
+  const int item = position2index(mouse);
+  {
+    const std::lock_guard guard(stateLock);
+    click.press(item);
+  }
+  if (auto* const call = pressCallback) call(&mouse, this);
+}
+
+void MainList::onRelease(mouse_event mouse) {
+  setSelect(0);
+  const int item = position2index(mouse);
+  const LifeGuard self(this);
+  if (isClicked(item)) {
+    if (auto* const call = clickCallback) call(&mouse, this);
+  }
+  if (!self.isAlive()) return;
+  if (auto* const call = releaseCallback) call(&mouse, this);
+}
+
+bool MainList::isClicked(int item) const {
+  const std::lock_guard guard(stateLock);
+  return item >= 0 && item < count && item == click.row() &&
+         items.at(static_cast<std::size_t>(item)).kind == kSelectable;
+}
+
+void MainList::onHover(mouse_event mouse) {
+  inClick(mouse.xrel, mouse.yrel);
+  {
+    const std::lock_guard guard(stateLock);
+    const int64_t content = toPixels(contentHeight());
+    if (content < int64_t{screenRect.h} - titleBar.h) return;  // all of it is in view
+    const int64_t lowest = std::min<int64_t>(listRect.h - content, 0);
+    scroll = toPixels(std::clamp(int64_t{scroll} + mouse.yrel, lowest, int64_t{0}));
+  }
+  if (auto* const call = scrollCallback) call(&mouse, this);
+}
+
+int MainList::position2index(mouse_event mouse) {
+  const auto [top, rows] = [this] {
+    const std::lock_guard guard(stateLock);
+    return std::pair(int64_t{listRect.y} + scroll, items);
+  }();
+  int64_t y = top;
+  int index = 0;
+  for (const Item& item : rows) {
+    if (item.kind == kEnd) return kNoItem;
+    const int64_t bottom = y + item.height;
+    kLog.print(LogLevel::Debug, "position2index= %04d < %04d > %04d", toPixels(y), mouse.y,
+               toPixels(bottom));
+    if (y < mouse.y && mouse.y < bottom) return index;
+    y = bottom + kItemGap;
+    ++index;
+  }
+  return ClickSlop::kNone;
+}
+
+void MainList::inClick(int dx, int dy) {
+  const std::lock_guard guard(stateLock);
+  click.move(dx, dy, touchSlop);
+}
+
+int MainList::move_key_down(int) {
+  const std::lock_guard guard(stateLock);
+  const int next = nextSelectable(current, 1);
+  if (next == kNoItem) return kNotMoved;
+  current = next;
+  const int64_t bottom = heightUpTo(next + 1);
+  if (bottom + scroll > listRect.h) scroll = toPixels(listRect.h - bottom);
+  return next;
+}
+
+int MainList::move_key_up(int) {
+  const std::lock_guard guard(stateLock);
+  const int previous = nextSelectable(current, -1);
+  if (previous == kNoItem) return kNotMoved;
+  current = previous;
+  const int64_t top = heightUpTo(previous);
+  if (top + scroll < 0) scroll = toPixels(-top);
+  return previous;
+}
+
+// The first selectable item beyond `from` in the direction of `step`, or kNoItem.
+int MainList::nextSelectable(int from, int step) const {
+  for (int i = from + step; i >= 0 && i < count; i += step) {
+    if (items.at(static_cast<std::size_t>(i)).kind == kSelectable) return i;
+  }
+  return kNoItem;
+}
+
+// Of the items before `end`, each with its gap.
+int64_t MainList::heightUpTo(int end) const {
+  int64_t sum = 0;
+  for (int i = 0; i < end; ++i) {
+    sum += int64_t{items.at(static_cast<std::size_t>(i)).height} + kItemGap;
+  }
+  return sum;
+}
+
+}  // namespace MW

@@ -1,0 +1,106 @@
+#include <MW/key.h>
+#include <MW/window.h>
+#include <brimol/input.h>
+
+#include <optional>
+
+#include "core/class_log.h"
+#include "core/life_guard.h"
+
+namespace MW {
+
+namespace {
+
+constexpr ClassLog kLog("KEY");
+constexpr unsigned int kPlugHoldMs = 100;
+constexpr uint32_t kPlugSettled = 2;
+constexpr int kDoubleKey = 2;
+constexpr int kTripleKey = 3;
+
+constexpr bool isPassing(uint32_t code) {
+  constexpr uint32_t kPassing1 = 17;
+  constexpr uint32_t kPassing2 = 18;
+  return code == kPassing1 || code == kPassing2;
+}
+
+}  // namespace
+
+Key::Key() {
+  setType(kBaseLayer);
+  kLog.print(LogLevel::Debug, "call registerWidget");
+  Window::registerWidget(this);
+  setActive(1);
+}
+
+Key::~Key() { leaveLayers(); }
+
+int Key::show() { return show(0); }
+
+int Key::show(unsigned int) {
+  if (!plugCallback) return 1;
+  std::optional<kbd_event> settled;
+  {
+    const std::lock_guard guard(stateLock);
+    if (plugDue == 0 || plugDue >= GetTicks()) return 1;
+    if (isPassing(plugEvent.code)) plugEvent.code = kPlugSettled;
+    settled = plugEvent;
+    plugDue = 0;
+  }
+  plugCallback(&*settled);
+  return 1;
+}
+
+bool Key::onRecvEvent(event_data* event, unsigned int) {
+  if (event == nullptr) return false;
+  switch (event->type) {
+    case kEventPress: onPressTouch(event->mouse); return false;
+    case kEventRelease: onReleaseTouch(event->mouse); return false;
+    case kEventLongPress: onPressLong(event->mouse); return true;
+    case kEventKeyPress: onPressKey(event->key); return true;
+    case kEventKeyRelease: onReleaseKey(event->key); return true;
+    case kEventApplication: return true;
+    case kEventUser: onPlugKey(event->key); return true;
+    default: return false;
+  }
+}
+
+void Key::onPlugKey(kbd_event key) {
+  if (!plugCallback) return;
+  bool isTold = false;
+  {
+    const std::lock_guard guard(stateLock);
+    if (key.code == kPlugSettled || isPassing(key.code)) {
+      plugEvent = key;
+      plugDue = GetTicks() + kPlugHoldMs;
+      return;
+    }
+    if (isPassing(plugEvent.code)) return;
+    isTold = plugEvent.code == kPlugSettled;
+    plugDue = 0;
+  }
+  if (isTold) plugCallback(&key);
+}
+
+void Key::onPressTouch(mouse_event mouse) { touchPressCallback(&mouse); }
+void Key::onReleaseTouch(mouse_event mouse) { touchReleaseCallback(&mouse); }
+void Key::onPressKey(kbd_event key) { keyPressCallback(&key); }
+
+void Key::onReleaseKey(kbd_event key) {
+  keyClicks.follow(key, GetTicks());
+  const LifeGuard self(this);
+  onKeyClickCount(key);
+  if (self.isAlive()) keyReleaseCallback(&key);
+}
+
+void Key::onPressLong(mouse_event mouse) {
+  kLog.print(LogLevel::Debug, "long pressed!!");
+  longPressCallback(&mouse);
+}
+
+void Key::onKeyClickCount(kbd_event key) {
+  const int count = keyClicks.click(key.code, GetTicks());
+  if (count == kDoubleKey) doubleKeyCallback(&keyClicks.lastKey);
+  if (count == kTripleKey) tripleKeyCallback(&keyClicks.lastKey);
+}
+
+}  // namespace MW

@@ -1,0 +1,121 @@
+#include <MW/c_api.h>
+#include <MW/event_service.h>
+#include <MW/push_button.h>
+#include <brimol/input.h>
+
+#include "core/class_log.h"
+#include "core/life_guard.h"
+
+namespace MW {
+
+namespace {
+constexpr int kRedraw = 1;
+constexpr int kDoubleClick = 2;
+}  // namespace
+
+PushButton::PushButton(const char* logWord) : word(logWord) { type_ = kBaseLayer; }
+
+int PushButton::show() { return show(0); }
+
+void PushButton::updateTimer(unsigned int ticks) {
+  if (read(delayedShow).isDue(ticks)) isDisplayUpdate_c(1);
+}
+
+int PushButton::hide() {
+  setActive(0);
+  restoreFace();
+  return 1;
+}
+
+bool PushButton::onRecvEvent(event_data* event, unsigned int) {
+  if (event == nullptr || read(delayedShow).isPending()) return false;
+  // A held button follows every finger, wherever it is.
+  if (select == 0 && !isInside(event)) return false;
+  switch (event->type) {
+    case kEventMotion: return moveAcross(event);
+    case kEventPress: onPress(event); return true;
+    case kEventRelease: onRelease(event); return true;
+    case kEventLongPress: onPressLong(event); return true;
+    default: return false;
+  }
+}
+
+bool PushButton::moveAcross(event_data* event) {
+  if (select == 0) return false;
+  // Still held outside, and not highlighted again when the finger comes back.
+  if (!isInside(event)) restoreFace();
+  return true;
+}
+
+unsigned int PushButton::getBgColor() { return read(rect.color); }
+SKIA_Rect* PushButton::getPositionAndSize() { return &rect; }
+
+void PushButton::onShowTimer(int ms) {
+  const unsigned int now = GetTicks();
+  {
+    const std::lock_guard guard(stateLock);
+    delayedShow.start(now, static_cast<unsigned int>(ms));
+  }
+  setActive(1);
+  EventService_AppEvent_c(kRedraw);
+}
+
+void PushButton::onPress(event_data* event) {
+  if (event == nullptr) return;
+  ClassLog(word).print(LogLevel::Debug, "pressed!!");
+  setFace(kColorHighlight);
+  select = static_cast<int>(event->mouse.finger + 1);
+  const LifeGuard self(this);
+  pressCallback(0);
+  if (self.isAlive() && doubleClickCallback) clicks.press(GetTicks());
+}
+
+void PushButton::onRelease(event_data* event) {
+  const ClassLog log(word);
+  select = 0;
+  restoreFace();
+  if (isInside(event)) {
+    const LifeGuard self(this);
+    clickCallback(0);
+    if (self.isAlive() && doubleClickCallback && clicks.isRunning()) onTouchClickCount();
+  }
+  log.print(LogLevel::Debug, "released!!");
+}
+
+void PushButton::onPressLong(event_data*) {
+  ClassLog(word).print(LogLevel::Debug, "long pressed!!");
+  // Without a callback the button stays held, and its release is still a click.
+  if (!longPressCallback) return;
+  const LifeGuard self(this);
+  longPressCallback(0);
+  if (!self.isAlive()) return;
+  select = 0;
+  restoreFace();
+}
+
+void PushButton::onTouchClickCount() {
+  const int count = clicks.tap(GetTicks());
+  if (count == 0) return;
+  ClassLog(word).print(LogLevel::Debug, "onTouchClickCount!! %d", count);
+  if (count == kDoubleClick) doubleClickCallback(0);
+}
+
+void PushButton::restoreColor() {
+  if (getBgColor() == read(normalColor)) return;
+  restoreFace();
+  EventService_AppEvent_c(kRedraw);
+}
+
+bool PushButton::isInside(const event_data* event) const {
+  const SKIA_Rect area = read(rect);
+  return EventService::isMouseEventForMe(&area, event);
+}
+
+void PushButton::setFace(unsigned int color) { write(rect.color, color); }
+
+void PushButton::restoreFace() {
+  const std::lock_guard guard(stateLock);
+  rect.color = normalColor;
+}
+
+}  // namespace MW

@@ -1,0 +1,146 @@
+#include <MW/event_service.h>
+#include <MW/screen.h>
+#include <MW/window.h>
+#include <brimol/input.h>
+
+#include <array>
+
+#include "core/class_log.h"
+#include "core/geometry.h"
+#include "core/life_guard.h"
+
+namespace MW {
+
+namespace {
+
+constexpr ClassLog kLog("BUTTON");  // the screen speaks under the button's name: meant so
+constexpr int kPassOn = 2;          // the bit of the variant
+constexpr int kEmptySquare = 1;     // setRect's mode
+constexpr int kSquareSide = 50;     // pixels, and the least distance from an edge
+constexpr int kDoubleClick = 2;
+
+constexpr uint32_t kGrey = 0xFFBFBFBF;
+constexpr auto kFills = std::to_array<uint32_t>({kColorWhite, 0xFFFF0000, kColorGreen, kColorBlue});
+
+constexpr uint32_t fillOf(int color) {
+  const auto index = static_cast<std::size_t>(color);  // a negative one becomes huge
+  return index < kFills.size() ? kFills.at(index) : kGrey;
+}
+static_assert(fillOf(-1) == kGrey && fillOf(3) == kColorBlue && fillOf(4) == kGrey);
+
+}  // namespace
+
+Screen::Screen() {
+  kLog.print(LogLevel::Debug, "call registerWidget");
+  setType(kBaseLayer);
+  Window::getwindowsize(&screenW, &screenH);
+  Window::registerWidget(this);
+}
+
+Screen::~Screen() { leaveLayers(); }
+
+int Screen::show() { return 1; }
+int Screen::show(unsigned int) { return 1; }
+
+int Screen::hide() {
+  active = false;  // not setActive: a finger that holds it goes on to be followed
+  return 1;
+}
+
+bool Screen::onRecvEvent(event_data* event, unsigned int) {
+  if (event == nullptr) return false;
+  const bool taken = (buttonType & kPassOn) == 0;
+  switch (event->type) {
+    case kEventMotion: onHover(event); return taken;
+    case kEventPress: onPress(event); return taken;
+    case kEventRelease: onRelease(event); return taken;
+    case kEventLongPress: onPressLong(event); return taken;
+    default: return false;
+  }
+}
+
+void Screen::onHover(event_data* event) {
+  if (event != nullptr) hoverCallback(&event->mouse);
+}
+
+void Screen::onPress(event_data* event) {
+  if (event == nullptr) return;
+  const mouse_event& mouse = event->mouse;
+  kLog.print(LogLevel::Debug, "pressed!!");
+  rect.color = kColorHighlight;
+  select = static_cast<int>(mouse.finger + 1);
+  const SKIA_Rect center = {mouse.x, mouse.y, 0, 0, 0};
+  setRect(0, &center);
+  const LifeGuard self(this);
+  pressCallback(&event->mouse);
+  if (self.isAlive() && doubleClickCallback) clicks.press(GetTicks());
+}
+
+void Screen::onRelease(event_data* event) {
+  if (event == nullptr) return;
+  select = 0;
+  const LifeGuard self(this);
+  clickCallback(&event->mouse);
+  if (!self.isAlive() || !doubleClickCallback || rect.w == 0 || rect.h == 0) return;
+  if (!EventService::isMouseEventForMe(&rect, event)) {
+    setRect(kEmptySquare, &rect);
+  } else if (clicks.isRunning()) {
+    onTouchClickCount();
+  }
+}
+
+void Screen::onPressLong(event_data* event) {
+  if (event != nullptr) longPressCallback(&event->mouse);
+}
+
+void Screen::setRect(int mode, const SKIA_Rect* center) {
+  if (center == nullptr) return;
+  const auto isWithin = [](int64_t at, int64_t length) {
+    return kSquareSide <= at && at <= length - kSquareSide;
+  };
+  const bool counts =
+      mode != kEmptySquare && isWithin(center->x, screenW) && isWithin(center->y, screenH);
+  if (counts) {
+    rect.x = center->x - kSquareSide / 2;
+    rect.y = center->y - kSquareSide / 2;
+  }
+  rect.w = counts ? kSquareSide : 0;
+  rect.h = rect.w;
+}
+
+void Screen::onTouchClickCount() {
+  const int count = clicks.tap(GetTicks());
+  if (count == 0) return setRect(kEmptySquare, &rect);
+  kLog.print(LogLevel::Debug, "onTouchClickCount!! %d", count);
+  if (count == kDoubleClick) doubleClickCallback(0);
+}
+
+FullScreen::FullScreen(int color) : colorIndex(color) {
+  setType(kTopLayer);
+  setRect(color);
+  Window::registerWidget(this);
+}
+
+FullScreen::~FullScreen() { leaveLayers(); }
+
+int FullScreen::show() { return show(0); }
+
+int FullScreen::show(unsigned int) {
+  skia_add_box_c(read(fillRect));
+  return 1;
+}
+
+int FullScreen::hide() {
+  active = false;
+  lcdState = 1;
+  return 1;
+}
+
+void FullScreen::lcdOn(int on) { lcdState = on; }
+
+void FullScreen::setRect(int color) {
+  Window::getwindowsize(&screenW, &screenH);
+  write(fillRect, overScreen({screenW, screenH}, fillOf(color)));
+}
+
+}  // namespace MW

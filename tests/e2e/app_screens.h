@@ -1,0 +1,65 @@
+/// Where the application's screens have what the end-to-end tests use, on a screen of 720 x 1280.
+#pragma once
+
+#include <array>
+
+#include "layout.h"
+
+namespace factory_test::screens {
+
+inline constexpr ScreenSize kScreen = {720, 1280};
+inline constexpr const char* kScreenSetting = "720x1280";
+
+/// The rows of the menu, from its top: how many groups and how many entries stand above each.
+struct MenuRow {
+  int groupsAbove;
+  int entriesAbove;
+};
+inline constexpr MenuRow kColours = {1, 0};
+inline constexpr MenuRow kTouch = {2, 1};
+inline constexpr MenuRow kKeys = {2, 2};
+inline constexpr MenuRow kButtons = {3, 3};
+inline constexpr MenuRow kSwitches = {3, 4};
+inline constexpr MenuRow kTimed = {3, 5};
+inline constexpr MenuRow kDialogs = {3, 6};
+inline constexpr MenuRow kLeave = {4, 7};
+
+constexpr SKIA_Rect areaOf(const MenuRow& row) {
+  constexpr int kListTop = 510;  // of MW::MainList with its extended header
+  constexpr int kGap = 3;
+  const int group = percentOf(kScreen.height, kGroupPercent) + kGap;
+  const int entry = percentOf(kScreen.height, kEntryPercent) + kGap;
+  return {0, kListTop + kGap + row.groupsAbove * group + row.entriesAbove * entry, kScreen.width,
+          entry - kGap, 0};
+}
+
+// The verdicts: three squares of 220 pixels, 14 from each other and from the edges.
+inline constexpr SKIA_Rect kPass = {14, 1046, 220, 220, MW::kColorWhite};
+inline constexpr SKIA_Rect kRetry = {248, 1046, 220, 220, MW::kColorWhite};
+inline constexpr SKIA_Rect kFail = {482, 1046, 220, 220, MW::kColorWhite};
+
+inline constexpr SKIA_Rect kCentre = {350, 630, 20, 20, 0};
+
+/// The knob of the first switch, at its left.
+inline constexpr SKIA_Rect kKnob = {36, 435, 258, 114, MW::kColorWhite};
+
+/// The buttons of a dialog that has two.
+inline constexpr SKIA_Rect kDialogOk = {82, 702, 273, 105, MW::kColorWhite};
+
+inline constexpr SKIA_Rect kDialogCancel = {365, 702, 273, 105, MW::kColorWhite};
+
+inline constexpr PageLayout kPage = layOutPage(kScreen);
+
+enum ButtonPlace {
+  kPressButton,
+  kClickButton,
+  kLongPressButton,
+  kDoubleClickButton,
+  kDelayedButton,
+  kLateButton
+};
+constexpr SKIA_Rect areaOf(ButtonPlace place) {
+  return cellOf(kScreen, kButtonGrid, place, kButtonColor);
+}
+
+}  // namespace factory_test::screens

@@ -1,0 +1,85 @@
+// The widgets of a test menu, drawn and timed on one thread while another offers them events and a
+// third one sets what they show. No drawing may show half of a change.
+
+#include <MW/MW.h>
+
+#include <algorithm>
+#include <array>
+#include <atomic>
+#include <random>
+#include <thread>
+
+#include "support/drawings.h"
+
+namespace {
+
+using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+
+constexpr auto kAreas = std::to_array<SKIA_Rect>({{10, 10, 200, 200, 0}, {700, 700, 90, 90, 0}});
+const std::array kTexts = {std::string(5, '#'), std::string(90, '%')};
+const SKIA_Text kWords = textRecord(kTexts[0]);
+
+struct Menu {
+  MW::MainList list{"Menu", 1};
+  MW::Button3 button{1, &kWords, &kWords, 0};
+  MW::Slide slide{2, kAreas.data(), &kWords, &kWords};
+  MW::Toastbox toast{kAreas.data(), &kWords, &kWords};
+  MW::Progressbar bar{0, kAreas.data(), &kWords};
+  MW::Key key;
+  MW::Dialog dialog{24};
+  std::array<MW::Widget*, 7> all = {&list, &button, &slide, &toast, &bar, &key, &dialog};
+
+  void set(int round) {
+    const std::size_t number = round % 2 == 0 ? 0 : 1;
+    const std::string& words = kTexts.at(number);
+    for (MW::Widget* const each : all) {
+      each->setText(words.c_str());
+      each->setMsg(words.c_str());
+      each->setRect(2, &kAreas.at(number));
+      each->onHideTimer(50);
+      each->onProgressbar(round % 8 * 40);
+      if (round % 16 == 0) each->hide();
+      each->setActive(1);
+    }
+    dialog.setDesc(words.c_str());
+    dialog.setRect(round % 40);
+    list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));
+    number == 0 ? list.move_key_down(0) : list.move_key_up(0);
+  }
+};
+
+bool isWhole(const Drawing& drawn) {
+  const std::string& text = drawn.text.text;
+  const bool isMixed = text.find('#') < text.size() && text.find('%') < text.size();
+  const bool isArea = drawn.rect.x != kAreas[1].x || drawn.rect.w <= kAreas[1].w;
+  return !isMixed && isArea && text != "length outside the record";
+}
+
+TEST_F(WidgetTest, MenuWidgetsAreDrawnOfferedEventsAndSetAtOnce) {
+  Menu menu;
+  for (int i = 0; i < 40; ++i) menu.list.addIndex(1, &kWords, 100);
+  menu.list.initFinish();
+  std::atomic<bool> isOver = false;
+  std::thread events([&] {
+    std::minstd_rand random(7);
+    while (!isOver) {
+      const auto below = [&random](unsigned int end) { return static_cast<int>(random() % end); };
+      MW::event_data event = {below(9), {{1, 0, below(1440), below(2560), below(99), below(99)}}};
+      for (MW::Widget* const each : menu.all) each->onRecvEvent(&event, 0);
+    }
+  });
+  std::thread setter([&] {
+    for (int round = 0; round < 50'000; ++round) menu.set(round);
+    isOver = true;
+  });
+  while (!isOver) {
+    platform().ticks += 7;
+    MW::Window::updateTimer(platform().ticks);
+    MW::Window::show(platform().ticks);
+    EXPECT_TRUE(std::ranges::all_of(platform().takeDrawings(), isWhole));
+  }
+  events.join();
+  setter.join();
+}
+
+}  // namespace
