@@ -11,6 +11,7 @@
 #include <fstream>
 #include <iomanip>
 
+#include "cairo_handles.h"
 #include "frame_sink.h"
 #include "input/input_service.h"
 #include "painting.h"
