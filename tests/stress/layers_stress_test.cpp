@@ -32,6 +32,15 @@ std::unique_ptr<ProbeWidget> makeWidget(int layer = 1) {
 
 std::atomic<Button*> doomedButton = nullptr;  // whoever takes it out deletes it
 
+void replaceDoomed(int round) {
+  if (round % 64 == 0) delete doomedButton.exchange(nullptr);  // it may stand in no layer
+  if (doomedButton != nullptr) return;
+  auto added = std::make_unique<Button>(&kScreen, nullptr);
+  added->clickCallback = [](int) { delete doomedButton.exchange(nullptr); };
+  added->setActive(1);
+  doomedButton = added.release();
+}
+
 // What one thread does until there were enough entries. Ids are numbers of a layer's size, and
 // so the threads unregister each other's widgets.
 void churn() {
@@ -65,13 +74,7 @@ TEST_F(WidgetTest, WidgetsComeAndGoWhileWalksRun) {
     for (int i = 0; entries < kEntries || offers < kOffers; ++i) {
       platform().feed(pointerInput(i % 2 == 0 ? BRIMOL_POINTER_DOWN : BRIMOL_POINTER_UP, {5, 5}));
       Window::show(0);
-      if (i % 64 == 0) delete doomedButton.exchange(nullptr);  // it may stand in no layer
-      if (doomedButton == nullptr) {
-        auto added = std::make_unique<Button>(&kScreen, nullptr);
-        added->clickCallback = [](int) { delete doomedButton.exchange(nullptr); };
-        added->setActive(1);
-        doomedButton = added.release();
-      }
+      replaceDoomed(i);
       Window::updateTimer(0);
     }
   }
@@ -136,25 +139,29 @@ void unregisterTwin(std::unique_ptr<ProbeWidget>& widget) {
   Window::unregisterWidget(&twin);
 }
 
+void expectWait(void (*leave)(std::unique_ptr<ProbeWidget>&), bool leftBefore) {
+  std::latch entered(1);
+  std::atomic<bool> done = false;
+  auto widget = std::make_unique<ProbeWidget>();
+  widget->onShow = [&](unsigned int) {
+    if (leftBefore) unregister(widget);
+    entered.count_down();
+    for (int i = 0; i < 2000; ++i) std::this_thread::yield();
+    done = true;
+  };
+  widget->enter();
+  const std::jthread drawing([] { Window::show(0); });
+  entered.wait();
+  leave(widget);
+  EXPECT_TRUE(done);
+}
+
 TEST_F(WidgetTest, LeavingWaitsForAHandlerOnAnotherThread) {
-  for (const auto leave : {unregister, destroy, unregisterTwin}) {
-    for (const bool leftBefore : {false, leave != unregisterTwin}) {
-      std::latch entered(1);
-      std::atomic<bool> done = false;
-      auto widget = std::make_unique<ProbeWidget>();
-      widget->onShow = [&](unsigned int) {
-        if (leftBefore) unregister(widget);
-        entered.count_down();
-        for (int i = 0; i < 2000; ++i) std::this_thread::yield();
-        done = true;
-      };
-      widget->enter();
-      const std::jthread drawing([] { Window::show(0); });
-      entered.wait();
-      leave(widget);
-      EXPECT_TRUE(done);
-    }
-  }
+  expectWait(unregister, false);
+  expectWait(unregister, true);
+  expectWait(destroy, false);
+  expectWait(destroy, true);
+  expectWait(unregisterTwin, false);
 }
 
 }  // namespace

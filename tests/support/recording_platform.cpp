@@ -49,6 +49,7 @@ void RecordingPlatform::reset() {
   __android_log_set_minimum_priority(ANDROID_LOG_VERBOSE);
   const std::lock_guard guard(lock);
   static_cast<PlatformState&>(*this) = {};
+  ticks = 0;
   testThread = std::this_thread::get_id();
 }
 
@@ -75,7 +76,9 @@ int skia_add_roundbuttonbox_c(SKIA_Rect rect, SKIA_Text text) {
 int skia_add_staticbox_c(SKIA_Rect rect, SKIA_Text text) {
   return draw(Call::StaticBox, rect, text);
 }
-int skia_add_arrow_c(SKIA_Rect rect, SKIA_Point line) { return draw(Call::Arrow, rect, {}, line); }
+int skia_add_arrow_c(SKIA_Rect rect, SKIA_Point direction) {
+  return draw(Call::Arrow, rect, {}, direction);
+}
 int skia_add_widget_c(const SKIA_Item* item) {
   if (item == nullptr) return -1;
   return draw(Call::Item, item->rect, item->text, item->point, item->kind);

@@ -18,7 +18,6 @@ namespace brimol::test {
 /// What a test sets and reads while no other thread runs or all of them are parked.
 struct PlatformState {
   bool records = true;       ///< false: drawings and log lines are dropped
-  unsigned int ticks = 0;    ///< what GetTicks() returns
   int live = 1;              ///< what skia_live_widget_c() returns
   int liveAsked = 0;         ///< how often it was asked
   int nextHandle = 0;        ///< what drawing calls return
@@ -45,6 +44,8 @@ struct RecordingPlatform : PlatformState {
     const std::lock_guard guard(lock);
     fed.push_back(event);
   }
+
+  std::atomic<unsigned int> ticks = 0;  ///< what GetTicks() returns
 
   /// Whether threads other than the test's stay in Delay, and how many are there.
   std::atomic<bool> parks = false;
