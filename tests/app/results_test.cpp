@@ -1,332 +1,227 @@
-#include "results/results.h"
-
+#include <expat.h>
 #include <gtest/gtest.h>
+#include <sys/mman.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <array>
+#include <atomic>
 #include <csignal>
+#include <fstream>
+#include <iterator>
 #include <limits>
+#include <random>
 
-#include "results/results_json.h"
-#include "scratch.h"
+#include "results/junit.h"
+#include "results/machine_figures.h"
+#include "results/results.h"
 
 namespace factory_test {
-
-// The library's search for how to print it.
-static void PrintTo(const TestResult& result, std::ostream* out) {
-  *out << resultsJson(std::span(&result, 1));
-}
-
 namespace {
 
 using std::chrono::milliseconds;
-using std::chrono::sys_days;
 using std::chrono::sys_seconds;
-using Names = std::set<std::string>;
 namespace fs = std::filesystem;
 
-constexpr sys_seconds kMorning =
-    sys_days(std::chrono::year(2026) / 11 / 21) + std::chrono::hours(7);
+constexpr int kMost = std::numeric_limits<int>::max();
+constexpr sys_seconds kMorning(std::chrono::seconds(1'795'244'400));
+constexpr sys_seconds kLast(std::chrono::seconds(253'402'300'799));  // of the year 9999
 const TestResult kColours = {"colours", Verdict::Pass, kMorning, milliseconds(4200), {1440, 2560}};
-const TestResult kKeys = {"keys", Verdict::None, kMorning, milliseconds(0), {0, 0}};
+const TestResult kAgain = {"colours", Verdict::Fail, {}, {}, {}};
+const TestResult kKeys = {"� keys", Verdict::None, kLast, milliseconds(kMost), {0, kMost}};
+// How these two come in.
+const TestResult kLow = {"colours", Verdict::Fail, sys_seconds::min(), milliseconds(-1), {-1, -2}};
+const TestResult kHigh = {"\xff keys", {}, sys_seconds::max(), milliseconds::max(), {-1, kMost}};
+
+// What a file with kColours holds, without spaces and line ends.
+constexpr auto kDocumented =
+    R"({"results":[{"test":"colours","verdict":"PASS","started":"2026-11-21T07:00:00Z",)"
+    R"("duration_ms":4200,"screen":{"width":1440,"height":2560}}]})";
+
+std::string textOf(const fs::path& file) {
+  std::ifstream stream(file, std::ios::binary);
+  return {std::istreambuf_iterator<char>(stream), {}};
+}
 
 class Results : public testing::Test {
  protected:
-  std::optional<ResultBook> open(std::string_view name = "results.json") {
-    return ResultBook::open(scratch.at(name), error);
-  }
-  std::string reasonFor(std::string_view name, std::string_view reason) const {
-    return scratch.at(name).native() + ": " + std::string(reason);
-  }
+  Results() { fs::create_directory(folder); }
+  ~Results() override { fs::remove_all(folder); }
 
-  Scratch scratch;
+  const fs::path folder = testing::TempDir() + "results_test." + std::to_string(::getpid());
+  const fs::path file = folder / "results.json";
   std::string error;
 };
 
 TEST_F(Results, AreResumedWithTheNewestOfEachTest) {
-  TestResult again = kColours;
-  again.verdict = Verdict::Fail;
-  for (const auto& result : {kColours, kKeys, again}) {
-    auto book = open();  // anew for each, as after a restart
-    ASSERT_TRUE(book) << error;
-    ASSERT_TRUE(book->record(result, error)) << error;
+  ::setenv("TZ", "EAST-5", 1);  // the files' times are UTC everywhere
+  for (const auto& result : {kLow, kColours, kHigh, kLow}) {
+    auto book = ResultBook::open(file, error);  // anew for each, as after a restart
+    ASSERT_TRUE(book && book->record(result, error)) << error;
+    std::string text = textOf(file);
+    std::erase_if(text, [](char letter) { return letter == ' ' || letter == '\n'; });
+    EXPECT_EQ(result == kColours, text == kDocumented) << text;
   }
-  const auto book = open();
+  const auto book = ResultBook::open(file, error);
   ASSERT_TRUE(book) << error;
-  EXPECT_EQ(book->results(), (std::vector{again, kKeys}));
-  ASSERT_NE(book->find("keys"), nullptr);
-  EXPECT_EQ(*book->find("keys"), kKeys);
+  EXPECT_EQ(book->results(), (std::vector{kAgain, kKeys}));
   EXPECT_EQ(book->find("Keys"), nullptr);
 }
 
-constexpr auto kDocumented = R"({
-  "format": 1,
-  "results": [
-    {
-      "test": "colours",
-      "verdict": "PASS",
-      "started": "2026-11-21T07:00:00Z",
-      "duration_ms": 4200,
-      "screen": {
-        "width": 1440,
-        "height": 2560
-      }
-    }
-  ]
-}
-)";
-
-TEST_F(Results, HaveTheDocumentedLayout) {
-  ASSERT_TRUE(open()->record(kColours, error)) << error;
-  EXPECT_EQ(scratch.read("results.json"), kDocumented);
-  EXPECT_EQ(scratch.names(), Names{"results.json"});
-}
-
-TEST_F(Results, StayInMemoryWithoutAPath) {
-  auto book = ResultBook::open("", error);
-  ASSERT_TRUE(book) << error;
-  EXPECT_TRUE(book->record(kColours, error));
-  EXPECT_EQ(book->results(), std::vector{kColours});
-  EXPECT_EQ(scratch.names(), Names{});
-}
-
-TEST_F(Results, AreMadeStorable) {
-  using Limits = std::numeric_limits<int>;
-  const auto never = static_cast<Verdict>(7);
-  auto book = open();
-  ASSERT_TRUE(book) << error;
-  for (const auto& wild : std::to_array<TestResult>({
-           {"\xff", never, sys_seconds::min(), milliseconds::min(), {Limits::min(), -1}},
-           {"\xfe", Verdict::Pass, sys_seconds::max(), milliseconds::max(), {1, Limits::max()}},
-           {std::string("a\0\n\"\xf0\x9f\x98\x80", 8), Verdict::Fail, {}, {}, {}},
+TEST_F(Results, ThatAreDamagedAreNamedAndLeftAsTheyAre) {
+  const std::string deep = std::string(500'000, '[') + std::string(500'000, ']');
+  for (const auto& [from, to, reason] : std::to_array<std::array<std::string, 3>>({
+           {kDocumented, "", "is not JSON"},
+           {"1440,", "1440", "is not JSON"},
+           {"1440", "1e999", "is not JSON"},
+           {"colours", "\xff", "is not JSON"},
+           {kDocumented, std::string(2 << 20, ' '), "is longer than a MiB"},
+           {kDocumented, "[1]", "has no list of \"results\""},
+           {"}]", "}," + deep + "]", "result 2 has no valid \"test\""},
+           {"\"colours\"", "7", "result 1 has no valid \"test\""},
+           {"PASS", "RETRY", "result 1 has no valid \"verdict\""},
+           {"11-21", "02-29", "result 1 has no valid \"started\""},
+           {"4200", "18446744073709551615", "result 1 has no valid \"duration_ms\""},
+           {"1440", "2147483648", "result 1 has no valid \"screen\""},
+           {"height", "depth", "result 1 has no valid \"screen\""},
        })) {
-    ASSERT_TRUE(book->record(wild, error)) << error;
+    std::string text = kDocumented;
+    text.replace(text.find(from), from.size(), to);
+    std::ofstream(file) << text;
+    EXPECT_FALSE(ResultBook::open(file, error));
+    EXPECT_EQ(error, file.native() + ": " + reason);
+    EXPECT_TRUE(textOf(file) == text) << reason;
   }
-  const auto kept = book->results();
-  const std::chrono::year_month_day last(std::chrono::floor<std::chrono::days>(kept[0].started));
-  EXPECT_EQ(kept.size(), 2U);  // two bytes that are no text look the same
-  EXPECT_EQ(last, std::chrono::year(9999) / 12 / 31);
-  EXPECT_EQ(kept[0].duration, kLongestDuration);
-  EXPECT_EQ(book->find("\xff"), book->find("\xef\xbf\xbd"));
-  book.reset();
-  EXPECT_EQ(open().value().results(), kept) << error;
 }
 
-TEST_F(Results, TakeNoneOfWildFiguresBelowZero) {
-  EXPECT_EQ(
-      storable({"x", static_cast<Verdict>(-1), sys_seconds::min(), milliseconds(-1), {-1, -2}}),
-      (TestResult{"x", Verdict::None, sys_days(std::chrono::year(0) / 1 / 1), {}, {}}));
-}
-
-struct Damage {
-  const char* name;
-  const char* from;  // in the documented file
-  const char* to;
-  const char* reason;
-};
-class DamagedResults : public Results, public testing::WithParamInterface<Damage> {};
-
-TEST_P(DamagedResults, AreNamedAndLeftAsTheyAre) {
-  const auto& [name, from, to, reason] = GetParam();
-  std::string text = kDocumented;
-  ASSERT_NE(text.find(from), std::string::npos);
-  text.replace(text.find(from), std::string_view(from).size(), to);
-  scratch.write("results.json", text);
-  EXPECT_FALSE(open());
-  EXPECT_EQ(error, reasonFor("results.json", reason));
-  EXPECT_EQ(scratch.read("results.json"), text);
-  EXPECT_EQ(scratch.names(), Names{"results.json"});
-}
-
-constexpr auto kNotAText = "result 1: \"test\" is not a text";
-constexpr auto kNotAVerdict = "result 1: \"verdict\" is not PASS, FAIL or none";
-constexpr auto kNotATime = "result 1: \"started\" is not a time like 2026-11-21T07:00:00Z";
-constexpr auto kNotADuration =
-    "result 1: \"duration_ms\" is not a whole number of milliseconds, at most a year";
-constexpr auto kNotASize = "result 1: \"screen\" is not a width and a height in pixels";
-constexpr auto kNotTheFormat = "has another \"format\" than 1";
-constexpr auto kDate = "2026-11-21T07:00:00Z";
-
-INSTANTIATE_TEST_SUITE_P(
-    All, DamagedResults,
-    testing::ValuesIn(std::to_array<Damage>({
-        {"Empty", kDocumented, "", "is not JSON (line 1)"},
-        {"CutShort", "1440,", "1440", "is not JSON (line 11)"},
-        {"HugeNumber", "1440", "1e999", "is not JSON"},
-        {"NoUtf8", "colours", "\xff", "is not JSON (line 5)"},
-        {"NoObject", kDocumented, "[1]", "is no results file"},
-        {"NoFormat", "format", "Format", "is no results file: \"format\" is missing"},
-        {"LaterFormat", "1,", "2,", kNotTheFormat},
-        {"FormatOfText", "1,", "\"1\",", kNotTheFormat},
-        {"FormatOfBool", "1,", "true,", kNotTheFormat},
-        {"NoResults", "results", "result", "has no list of \"results\""},
-        {"ResultsOfText", kDocumented, R"({"format":1,"results":""})",
-         "has no list of \"results\""},
-        {"NoResultObject", "[\n", "[3,\n", "result 1: is no object"},
-        {"NoTest", "test", "tost", "result 1: \"test\" is missing"},
-        {"NumberForTest", "\"colours\"", "7", kNotAText},
-        {"UnknownVerdict", "PASS", "RETRY", kNotAVerdict},
-        {"NullVerdict", "\"PASS\"", "null", kNotAVerdict},
-        {"ShortTime", kDate, "2026-11-21T07:00Z", kNotATime},
-        {"LocalTime", kDate, "2026-11-21T07:00:00+", kNotATime},
-        {"SignInTime", kDate, "2026-11-21T07:00:-1Z", kNotATime},
-        {"NoLeapDay", kDate, "2027-02-29T07:00:00Z", kNotATime},
-        {"Month13", kDate, "2026-13-01T07:00:00Z", kNotATime},
-        {"Hour24", kDate, "2026-11-21T24:00:00Z", kNotATime},
-        {"Minute60", kDate, "2026-11-21T07:60:00Z", kNotATime},
-        {"Second60", kDate, "2026-11-21T07:00:60Z", kNotATime},
-        {"NegativeDuration", "4200", "-1", kNotADuration},
-        {"FractionOfDuration", "4200", "4.2", kNotADuration},
-        {"LongerThanAYear", "4200", "31536000001", kNotADuration},
-        {"LongerThanAll", "4200", "18446744073709551615", kNotADuration},
-        {"NegativeScreen", "1440", "-1440", kNotASize},
-        {"HugeScreen", "1440", "2147483648", kNotASize},
-        {"NoHeight", "height", "depth", kNotASize},
-        {"TextForScreen", "{\n        \"width\": 1440,\n        \"height\": 2560\n      }",
-         "\"1x1\"", kNotASize},
-        {"SameTestTwice", kDocumented,
-         R"({"format":1,"results":[
-{"test":"a","verdict":"none","started":"2024-02-29T23:59:59Z","duration_ms":0,"screen":{"width":0,"height":0}},
-{"test":"a","verdict":"none","started":"2024-02-29T23:59:59Z","duration_ms":0,"screen":{"width":0,"height":0}}]})",
-         "result 2: its test stands twice"},
-    })),
-    [](const auto& row) { return row.param.name; });
-
-TEST_F(Results, NeedAFileThatTheyCanRead) {
-  scratch.write("long", std::string(kLongestJson + 1, ' '));
-  fs::create_directory(scratch.at("folder"));
-  fs::create_symlink("loop", scratch.at("loop"));
-  ASSERT_EQ(::mkfifo(scratch.at("pipe").c_str(), 0600), 0);
-  const Names before = scratch.names();
-  const auto refused = [this](std::string_view name, std::string_view reason) {
-    error.clear();
-    EXPECT_FALSE(open(name)) << name;
-    EXPECT_EQ(error, reasonFor(name, reason));
-  };
-  refused("long", "is longer than 1048576 bytes");
-  refused("folder", "is not a regular file");
-  refused("pipe", "is not a regular file");
-  refused("loop", "Too many levels of symbolic links");
-  refused("missing/results.json", "no lock can be made beside it: No such file or directory");
-  EXPECT_EQ(scratch.names(), before);
-}
-
-TEST_F(Results, GoWhereALinkLeadsAndKeepItsPermissions) {
-  fs::create_directory(scratch.at("folder"));
-  fs::create_symlink("folder/far.json", scratch.at("near"));
-  fs::create_symlink(scratch.at("near"), scratch.at("nearest"));
-  ASSERT_TRUE(open("nearest").value().record(kColours, error)) << error;
-  EXPECT_EQ(scratch.read("folder/far.json"), kDocumented);
-
-  constexpr auto kShared = fs::perms(0640);
-  fs::permissions(scratch.at("folder/far.json"), kShared);
-  ASSERT_TRUE(open("nearest").value().record(kKeys, error)) << error;
-  EXPECT_TRUE(fs::is_symlink(scratch.at("nearest")));
-  EXPECT_TRUE(fs::is_symlink(scratch.at("near")));
-  EXPECT_EQ(fs::status(scratch.at("folder/far.json")).permissions(), kShared);
-  EXPECT_EQ(open("folder/far.json").value().results(), (std::vector{kColours, kKeys}));
-}
-
-TEST_F(Results, AreForOthersToReadAsTheUserWants) {
-  const mode_t before = ::umask(027);
-  ASSERT_TRUE(open()->record(kColours, error)) << error;
-  ::umask(before);
-  EXPECT_EQ(fs::status(scratch.at("results.json")).permissions(), fs::perms(0640));
-}
-
-TEST_F(Results, HaveOneOwner) {
-  fs::create_symlink("results.json", scratch.at("link"));
-  auto book = open();
-  ASSERT_TRUE(book->record(kColours, error)) << error;
-  EXPECT_FALSE(open("link"));
-  EXPECT_EQ(error, reasonFor("results.json", "is in use already"));
-
-  const pid_t child = ::fork();
-  if (child == 0) ::_exit(open() ? 1 : 0);
-  int status = -1;
-  ASSERT_EQ(::waitpid(child, &status, 0), child);
-  EXPECT_EQ(status, 0) << "another program took it";
-  EXPECT_TRUE(book->record(kKeys, error)) << error;
-
-  book.reset();
-  EXPECT_TRUE(open("link")) << error;
-}
-
-TEST_F(Results, RemoveWhatAKilledWriterLeft) {
-  scratch.write(".results.json.tmp", "{\"format");
-  scratch.write(".results.json.lock", "");
-  scratch.write(".results.json.bak.tmp", "another's");
-  auto book = open();
-  ASSERT_TRUE(book) << error;
-  EXPECT_EQ(scratch.names(), (Names{".results.json.lock", ".results.json.bak.tmp"}));
-  EXPECT_TRUE(book->record(kColours, error)) << error;
-  EXPECT_EQ(scratch.read("results.json"), kDocumented);
-}
-
-// Files of this process end after some bytes, as on a full disk.
-class FullDisk {
- public:
-  explicit FullDisk(rlim_t bytes) : formerAction(std::signal(SIGXFSZ, SIG_IGN)) {
-    ::getrlimit(RLIMIT_FSIZE, &former);
-    const rlimit limit = {bytes, former.rlim_max};
-    ::setrlimit(RLIMIT_FSIZE, &limit);
+TEST_F(Results, GoOnlyWhereTheyCanBeKept) {
+  ASSERT_EQ(::mkfifo((folder / "pipe").c_str(), 0600), 0);
+  for (const fs::path& unfit : {folder, folder / "pipe"}) {
+    EXPECT_FALSE(ResultBook::open(unfit, error));
+    EXPECT_EQ(error, unfit.native() + ": is not a regular file");
+    EXPECT_FALSE(writeJunit(unfit, {}, error));
+    EXPECT_EQ(error, unfit.native() + ": is not a regular file");
   }
-  ~FullDisk() {
-    ::setrlimit(RLIMIT_FSIZE, &former);
-    (void)std::signal(SIGXFSZ, formerAction);
-  }
-  FullDisk(const FullDisk&) = delete;
-  FullDisk& operator=(const FullDisk&) = delete;
-  FullDisk(FullDisk&&) = delete;
-  FullDisk& operator=(FullDisk&&) = delete;
+  EXPECT_FALSE(ResultBook::open(folder / "missing" / "file", error));
+  EXPECT_TRUE(error.ends_with("/missing/file: cannot be written: No such file or directory"));
+  EXPECT_TRUE(ResultBook::open("", error)->record(kColours, error)) << "in memory";
+}
 
- private:
-  void (*formerAction)(int);
+TEST_F(Results, SurviveAFullDiskBehindALink) {
+  fs::create_symlink(folder / "far", file);
+  std::ofstream(folder / "far") << kDocumented;
+  std::ofstream(folder / "far.tmp") << "{ what a killed writer left";
+  auto book = ResultBook::open(file, error);
+  // Files of this process end after some bytes, as on a full disk.
+  (void)std::signal(SIGXFSZ, SIG_IGN);
   rlimit former = {};
-};
-
-TEST_F(Results, SurviveAFullDisk) {
-  auto book = open();
-  ASSERT_TRUE(book->record(kColours, error)) << error;
-  bool isWritten = true;
-  {
-    const FullDisk disk(std::string_view(kDocumented).size());
-    isWritten = book->record(kKeys, error);
-  }
+  ::getrlimit(RLIMIT_FSIZE, &former);
+  const rlimit little = {textOf(file).size(), former.rlim_max};
+  ::setrlimit(RLIMIT_FSIZE, &little);
+  const bool isWritten = book->record(kKeys, error);
+  ::setrlimit(RLIMIT_FSIZE, &former);
   EXPECT_FALSE(isWritten);
-  EXPECT_EQ(error, reasonFor("results.json", "cannot be written: File too large"));
-  EXPECT_EQ(scratch.read("results.json"), kDocumented);
-  EXPECT_EQ(scratch.names(), (Names{".results.json.lock", "results.json"}));
-  EXPECT_NE(book->find("keys"), nullptr);
-
-  ASSERT_TRUE(book->record(kColours, error)) << error;
-  book.reset();
-  EXPECT_EQ(open().value().results(), (std::vector{kColours, kKeys}));
+  EXPECT_EQ(error, file.native() + ": cannot be written: File too large");
+  EXPECT_EQ(textOf(file), kDocumented);
+  EXPECT_FALSE(fs::exists(folder / "far.tmp"));
+  EXPECT_TRUE(book->record(kColours, error)) << error;
+  EXPECT_EQ(ResultBook::open(folder / "far", error)->results(), (std::vector{kColours, kKeys}));
 }
 
-TEST_F(Results, SayWhatBecameOfTheirDirectory) {
-  fs::create_directory(scratch.at("folder"));
-  auto book = open("folder/results.json");
-  fs::remove_all(scratch.at("folder"));
-  EXPECT_FALSE(book->record(kColours, error));
-  EXPECT_EQ(error,
-            reasonFor("folder/results.json", "cannot be written: No such file or directory"));
-  fs::create_directories(scratch.at("folder/results.json"));
-  EXPECT_FALSE(book->record(kColours, error));
-  EXPECT_EQ(error, reasonFor("folder/results.json", "is not a regular file"));
+TEST_F(Results, MakeAWellFormedReport) {
+  std::vector<TestResult> results = {kColours, kAgain, kKeys};
+  results[1].test = "a<b>&\"'\xff\n \xd7\x90";
+  for (int byte = 0; byte < 0x100; ++byte) {
+    // Among them what is UTF-8 and yet no character.
+    for (const char* const before : {"", "\xef\xbf"}) {
+      results.push_back({before + std::string(1, static_cast<char>(byte))});
+    }
+  }
+  const std::string xml = junitXml(results);
+  for (const char* const part :
+       {R"(<testsuite name="factory_test" tests="515" failures="1" skipped="513">)",
+        R"(<testcase classname="factory_test" name="colours" time="4.200">)",
+        R"("started" value="2026-11-21T07:00:00Z"/>)", R"("screen" value="1440x2560"/>)",
+        R"(name="a&lt;b>&amp;&quot;'�� א" time="0.000">)", "<failure message=", "<skipped/>"}) {
+    EXPECT_NE(xml.find(part), std::string::npos) << part;
+  }
+  auto* const parser = XML_ParserCreate(nullptr);
+  EXPECT_EQ(XML_Parse(parser, xml.data(), static_cast<int>(xml.size()), 1), XML_STATUS_OK);
+  XML_ParserFree(parser);
 }
 
-TEST_F(Results, AreNeverLongerThanCanBeRead) {
-  auto book = open();
-  ASSERT_TRUE(book->record(kColours, error)) << error;
-  TestResult longOne = kKeys;
-  longOne.test.assign(kLongestJson, 'x');
-  EXPECT_FALSE(book->record(longOne, error));
-  EXPECT_EQ(error, reasonFor("results.json", "would be longer than 1048576 bytes"));
-  EXPECT_EQ(scratch.read("results.json"), kDocumented);
+bool isShort(const std::string& text) {
+  return !text.empty() && text.size() <= kFigureBytes &&
+         std::ranges::all_of(text, [](char letter) { return letter >= ' ' && letter <= '~'; });
+}
+
+TEST_F(Results, StandBesideShortFiguresOfTheMachine) {
+  const auto write = [this](const char* name, std::string_view text) {
+    fs::create_directories((folder / name).parent_path());
+    std::ofstream(folder / name) << text;
+  };
+  write("class/power_supply/A_mouse/scope", "Device\n");
+  write("class/power_supply/A_mouse/capacity", "3\n");
+  for (const auto& [capacity, status, level, most, battery, charger, light] :
+       std::to_array<std::array<const char*, 7>>({
+           {"57\n", "Charging\n", "1\n", "999\n", "Battery 57%", "Charging", "Light 0%"},
+           {"0\n", "Discharging", "63", "100", "Battery 0%", "On battery", "Light 63%"},
+           {"1\n", "Full", "2147483647", "2147483647", "Battery 1%", "Mains", "Light 100%"},
+           {"-1\n", "", "1", "0", "No battery", "Mains", "Light n/a"},
+           {"99999999999", "\xff", "1 ", "2", "No battery", "Mains", "Light n/a"},
+       })) {
+    write("class/power_supply/BAT0/capacity", capacity);
+    write("class/power_supply/BAT0/status", status);
+    write("class/backlight/panel/brightness", level);
+    write("class/backlight/panel/max_brightness", most);
+    const MachineFigures figures = readMachineFigures(folder);
+    EXPECT_EQ(figures.battery, battery);
+    EXPECT_EQ(figures.charger, charger);
+    EXPECT_EQ(figures.brightness, light);
+    EXPECT_TRUE(isShort(figures.hostName) && isShort(figures.address) && isShort(figures.load));
+    EXPECT_FALSE(figures.address.starts_with("127."));
+  }
+}
+
+constexpr int kTests = 20;  // recorded round and round
+
+// The number of a record stands in its start time.
+TestResult resultOf(int number) {
+  const sys_seconds started{std::chrono::seconds(number)};
+  return {"test " + std::to_string(number % kTests), Verdict::Pass, started, {}, {}};
+}
+
+TEST_F(Results, LoseAtMostTheRunningTestOfAKilledWriter) {
+  auto* const shared = ::mmap(nullptr, sizeof(std::atomic<int>), PROT_READ | PROT_WRITE,
+                              MAP_SHARED | MAP_ANONYMOUS, -1, 0);
+  // The number of the last record that was written.
+  auto* const safe = static_cast<std::atomic<int>*>(shared);
+  std::mt19937 random(20261121);
+  std::uniform_int_distribution<useconds_t> lives(0, 20'000);
+  for (int kill = 0; kill < 50; ++kill) {
+    SCOPED_TRACE(kill);
+    const int before = *safe;
+    const pid_t writer = ::fork();
+    if (writer == 0) {
+      auto book = ResultBook::open(file, error);
+      while (book && book->record(resultOf(*safe + 1), error)) ++*safe;
+      ::_exit(1);
+    }
+    for (int wait = 0; *safe == before && wait < 100'000; ++wait) ::usleep(100);
+    ASSERT_GT(*safe, before) << "the writer ended by itself";
+    ::usleep(lives(random));  // any moment of its loop
+    ::kill(writer, SIGKILL);
+    ::waitpid(writer, nullptr, 0);
+    const auto book = ResultBook::open(file, error);
+    ASSERT_TRUE(book) << error;
+    for (int number = std::max(1, *safe - kTests + 2); number <= *safe; ++number) {
+      const TestResult* const found = book->find(resultOf(number).test);
+      ASSERT_TRUE(found != nullptr && *found == resultOf(number)) << number;
+    }
+  }
 }
 
 }  // namespace
