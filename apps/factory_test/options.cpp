@@ -61,6 +61,10 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
     if (!rest) return {};
     arguments = *rest;
   }
+  if (!options.results.empty() && options.results == options.junit) {
+    error = "--results and --junit name the same file";
+    return {};
+  }
   return options;
 }
 

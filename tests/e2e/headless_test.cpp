@@ -159,7 +159,8 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
        std::vector<WrongLine>{{{"--frobnicate"}, "--frobnicate"},
                               {{"--shot"}, "--shot needs"},
                               {{"--results", ""}, "--results needs"},
-                              {{"file"}, "'file'"}}) {
+                              {{"file"}, "'file'"},
+                              {{"--results", "a", "--junit", "a"}, "same file"}}) {
     std::string error;
     EXPECT_FALSE(parseOptions(arguments, error)) << word;
     EXPECT_NE(error.find(word), std::string::npos) << error;
