@@ -18,8 +18,8 @@ namespace MW {
 /// 500 ms. A tap that starts less than 50 pixels from an edge of the screen does not count.
 ///
 /// With bit 2 set in its variant (`setButtonType(2)`) it reports events and passes them on. While a
-/// finger holds it, it is then offered, and reports, each event twice: once as a selected widget and
-/// once as an active one.
+/// finger holds it, it is then offered, and reports, each event twice: once as a selected widget
+/// and once as an active one.
 class MW_API Screen : public Widget {
  public:
   Screen();
