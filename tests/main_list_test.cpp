@@ -1,6 +1,7 @@
 #include <MW/main_list.h>
 
 #include <array>
+#include <memory>
 
 #include "support/drawings.h"
 
@@ -26,7 +27,10 @@ struct List : MW::MainList {
   using MainList::items;
   // Items 100 high, captioned by their numbers.
   explicit List(const std::vector<int>& kinds, int listMode = 0) : MainList("Menu", listMode) {
-    for (const int kind : kinds) EXPECT_EQ(add(kind), filled++);
+    for (const int kind : kinds) {
+      EXPECT_EQ(add(kind), filled < 64 ? filled : -1);
+      ++filled;
+    }
     initFinish();
   }
   int add(int kind) {
@@ -55,9 +59,7 @@ TEST_F(MainListTest, IsFullAtSixtyFourItemsAndRefusesLongTexts) {
   EXPECT_TRUE(shown(open).empty()) << "not even a title before it is finished";
   EXPECT_EQ(open.addIndex(1, &tooLong, 1), -1);
   EXPECT_EQ(open.addIndex(1, nullptr, 1), -1);
-  std::vector<int> kinds(64, 1);
-  List list(kinds);
-  EXPECT_EQ(list.add(1), -1);
+  List list(std::vector<int>(65, 1));
   EXPECT_EQ(list.Max_height(), 64 * 103 - 3);
   list.scrollBy(INT_MIN);
   EXPECT_EQ(list.at(2559), 63);
@@ -70,6 +72,7 @@ TEST_F(MainListTest, TextsAreChangedByNumber) {
     list.setText(item, "Keys and more", 4);
     list.setTextOption(item, "8 bit and more", 5);
   }
+  EXPECT_EQ(list.add(1), -1) << "it is finished";
   list.setText(1, "Led", 3);
   for (const unsigned int length : {0U, 127U, UINT_MAX}) list.setText(1, "never", length);
   list.setText(1, nullptr, 3);
@@ -88,10 +91,12 @@ TEST_F(MainListTest, ScrollsBetweenItsEnds) {
   EXPECT_EQ(shown(list).front().rect.y, 433);
   list.scrollBy(INT_MIN);
   EXPECT_EQ(shown(list).front().rect.y, 340 - 867 + 9 * 103);
-  setScreen(1440, 545);
-  List tight({1, 1});  // 203 of 205
+  setScreen(1440, 546);
+  EXPECT_EQ(shown(*std::make_unique<List>(std::vector(3, 1))).at(1).call, Call::Box) << "the foot";
+  setScreen(1440, 542);
+  List tight({1, 1});
   tight.scrollBy(-10);
-  EXPECT_EQ(tight.at(341), 0) << "nowhere to go";
+  EXPECT_EQ(tight.at(340), 0) << "a pixel too high";
 }
 
 TEST_F(MainListTest, KeysMoveOverSelectableItemsIntoView) {
@@ -104,6 +109,9 @@ TEST_F(MainListTest, KeysMoveOverSelectableItemsIntoView) {
   EXPECT_EQ(list.move_key_down(0), 21);
   EXPECT_EQ(list.at(2556), 21);
   EXPECT_EQ(list.at(2557), -1) << "its gap stands on the list's foot";
+  for (int i = 0; i < 30; ++i) list.move_key_down(0);
+  for (int i = 0; i < 30; ++i) list.move_key_up(0);
+  EXPECT_EQ(list.at(341), 1) << "the topmost selectable one";
 }
 
 }  // namespace

@@ -61,20 +61,20 @@ Made list(const char* title, int height) {
 enum Class { Button, Screen, Slide, Plain, Key, Dialog, Toast, Bar, Fill, List };
 
 // `variant`: the number that its constructor takes, or its button type.
-Made make(Class which, int variant, const SKIA_Rect* area, const SKIA_Text* text) {
+Made make(Class which, int variant, const SKIA_Rect& area, const SKIA_Text& text) {
   switch (which) {
-    case Button: return std::make_unique<MW::Button3>(variant, text, text, area->y);
+    case Button: return std::make_unique<MW::Button3>(variant, &text, &text, area.y);
     case Screen: return std::make_unique<MW::Screen>();
-    case Slide: return std::make_unique<MW::Slide>(variant, area, text, text);
-    case Plain: return std::make_unique<MW::SlideV>(variant, area, text, text);
+    case Slide: return std::make_unique<MW::Slide>(variant, &area, &text, &text);
+    case Plain: return std::make_unique<MW::SlideV>(variant, &area, &text, &text);
     case Key: return std::make_unique<MW::Key>();
     case Dialog: return std::make_unique<MW::Dialog>(variant);
-    case Toast: return std::make_unique<MW::Toastbox>(area, text, text);
-    case Bar: return std::make_unique<MW::Progressbar>(variant, area, text);
+    case Toast: return std::make_unique<MW::Toastbox>(&area, &text, &text);
+    case Bar: return std::make_unique<MW::Progressbar>(variant, &area, &text);
     case Fill: return std::make_unique<MW::FullScreen>(variant);
     case List: break;
   }
-  return list(text->text, area->h);
+  return list(text.text, area.h);
 }
 
 // But the button's, which are the push button's.
@@ -183,7 +183,7 @@ constexpr auto kInput = std::to_array<InputCase>({
      "--+--+<2/0/60>-+<0/0/10>"},
     {Slide, 1, "p315,25 m-100 h ? f1 p900,900 ? p g", "++<1/0/210>+<0/0/310>-[SLIDE] pressed!!: 0"},
     {Slide, 0, "L t1000 p15,25 m299 ? t1499 r15,25 p t1998 r p r", " ++<1/0/10> ++ d+++"},
-    {Slide, 0, "L t1000 p15,25 r999,25 p15,25 t1500 r p r p r", " +++ ++++d+"},
+    {Slide, 0, "L t1000 p15,25 r999,25 p15,25 r p t1500 r p r", " +++++ +++"},
     {Key, 0, "p1,2 m5,5 r3,4 l5,6 k10 K11 a12 u13", "p--c-l+10k+11r+++"},
     {Key, 0, "t1000 K5 t1999 K5 t2998 K5 K5 t3998 K5 K5 K6 K5",
      " 5r+ 5D5r+ 5T5r+5r+ 5r+5D5r+6r+5r+"},
@@ -225,7 +225,7 @@ void run(const InputCase& row, int deletingCall) {
   calls = 0;
   lastCall = deletingCall;
   finger = {};
-  widget = make(row.which, row.variant, &kArea, &kCaption);
+  widget = make(row.which, row.variant, kArea, kCaption);
   widget->setActive(1);
   widget->setButtonType(row.variant);
   hear(*widget);
@@ -257,7 +257,7 @@ std::ptrdiff_t longTexts(Class which, int w, int h) {
   endless.string_len = endless.size = INT_MAX;
   const SKIA_Rect area = {w, h, w, h, 0};
   setScreen(w, h);
-  widget = make(which, 24, &area, &endless);
+  widget = make(which, 24, area, endless);
   widget->onHideTimer(1);
   widget->onProgressbar(1);
   widget->setRect(2, nullptr);
@@ -277,7 +277,7 @@ TEST_F(MenuWidgetTest, TakesAnyScreenAndRecord) {
        {pair(Button, 2), pair(Screen, 0), pair(Slide, 2), pair(Plain, 2), pair(Key, 0),
         pair(Dialog, 0), pair(Toast, 2), pair(Bar, 1), pair(Fill, 0), pair(List, 1)}) {
     SCOPED_TRACE(which);
-    widget = make(which, 1, &kArea, &kCaption);
+    widget = make(which, 1, kArea, kCaption);
     EXPECT_EQ(layerSize(which == Dialog || which == Fill ? 0 : 1), 1);
     EXPECT_EQ(widget->isActive(), which == Key);
     EXPECT_FALSE(widget->onRecvEvent(nullptr, 0));
@@ -286,8 +286,14 @@ TEST_F(MenuWidgetTest, TakesAnyScreenAndRecord) {
     }
     widget.reset();
   }
-  for (const Class each : {Slide, Plain, Toast, Bar}) {
-    EXPECT_EQ(make(each, 0, nullptr, nullptr)->show(1), 1) << "nothing was given";
+  MW::Slide slide(0, nullptr, nullptr, nullptr);
+  MW::Toastbox toast(nullptr, nullptr, nullptr);
+  MW::Progressbar bar(0, nullptr, nullptr);
+  MW::Button3 button(3, nullptr, nullptr, 0);
+  for (Widget* const each : std::initializer_list<Widget*>{&slide, &toast, &bar, &button}) {
+    each->onHideTimer(1);
+    each->onProgressbar(1);
+    EXPECT_EQ(shown(*each).front().rect.w, 0) << "nothing was given";
   }
 }
 

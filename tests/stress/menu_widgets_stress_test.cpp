@@ -32,10 +32,10 @@ struct Menu {
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
     const std::string& words = kTexts.at(number);
+    for (MW::Widget* const each : all) each->setText(words.c_str());
+    for (MW::Widget* const each : all) each->setRect(2, &kAreas.at(number));
     for (MW::Widget* const each : all) {
-      each->setText(words.c_str());
       each->setMsg(words.c_str());
-      each->setRect(2, &kAreas.at(number));
       each->onHideTimer(50);
       each->onProgressbar(round % 8 * 40);
       if (round % 16 == 0) each->hide();
@@ -48,6 +48,12 @@ struct Menu {
   }
 };
 
+MW::event_data randomEvent(std::minstd_rand& random) {
+  const auto below = [&random](unsigned int end) { return static_cast<int>(random() % end); };
+  const auto finger = static_cast<unsigned int>(below(3));
+  return {below(9), {{1, finger, below(1440), below(2560), below(99), 9}}};
+}
+
 bool isWhole(const Drawing& drawn) {
   const std::string& text = drawn.text.text;
   const bool isMixed = text.find('#') < text.size() && text.find('%') < text.size();
@@ -59,25 +65,24 @@ TEST_F(WidgetTest, MenuWidgetsAreDrawnOfferedEventsAndSetAtOnce) {
   Menu menu;
   for (int i = 0; i < 40; ++i) menu.list.addIndex(1, &kWords, 100);
   menu.list.initFinish();
+  menu.key.plugCallback = [](MW::kbd_event*) {};
   std::atomic<bool> isOver = false;
   std::thread events([&] {
-    std::minstd_rand random(7);
-    while (!isOver) {
-      const auto below = [&random](unsigned int end) { return static_cast<int>(random() % end); };
-      MW::event_data event = {below(9), {{1, 0, below(1440), below(2560), below(99), below(99)}}};
+    for (std::minstd_rand random(7); !isOver;) {
+      MW::event_data event = randomEvent(random);
       for (MW::Widget* const each : menu.all) each->onRecvEvent(&event, 0);
     }
   });
   std::thread setter([&] {
-    for (int round = 0; round < 50'000; ++round) menu.set(round);
-    isOver = true;
+    for (int round = 0; !isOver; ++round) menu.set(round);
   });
-  while (!isOver) {
+  for (int frame = 0; frame < 10'000; ++frame) {
     platform().ticks += 7;
     MW::Window::updateTimer(platform().ticks);
     MW::Window::show(platform().ticks);
     EXPECT_TRUE(std::ranges::all_of(platform().takeDrawings(), isWhole));
   }
+  isOver = true;
   events.join();
   setter.join();
 }
