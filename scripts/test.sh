@@ -5,7 +5,7 @@
 #   asan     the same under the address and undefined-behaviour sanitizers
 #   tsan     the same under the thread sanitizer
 #   phone    the library alone, without the PC platform
-#   tidy     formatting and clang-tidy
+#   tidy     formatting everywhere, clang-tidy over what is shipped
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
