@@ -30,8 +30,8 @@ constexpr auto kLooks = std::to_array<VerdictLook>({
     {Verdict::Fail, kFailColor},
 });
 
-// What MainList calls its status texts, by its numbers.
-enum StatusText { kBattery, kCharger, kOperator, kAddress, kSignal, kTestMode, kBle, kBrightness };
+// What stands in an entry's row.
+std::string rowWords(const char* name) { return std::string("   ") + name; }
 
 }  // namespace
 
@@ -75,7 +75,7 @@ void Menu::addGroup(const char* name) {
 
 void Menu::addRow(const char* name) {
   const ScreenSize screen = screenSize();
-  const std::string words = std::string("   ") + name;
+  const std::string words = rowWords(name);
   const SKIA_Text text = textOf(words.c_str(), 0, SKIA_ALIGN_LEFT, textSize(screen));
   list.addIndex(MW::MainList::kSelectable, &text, percentOf(screen.height, kEntryPercent));
 }
@@ -95,17 +95,18 @@ void Menu::update(uint32_t now) {
 
 void Menu::refreshFigures() {
   const MachineFigures figures = readMachineFigures();
-  const auto put = [this](StatusText place, const std::string& words) {
+  const auto put = [this](MW::MainList::StatusText place, const std::string& words) {
     list.setTextOption(place, words.c_str(), static_cast<int>(words.size()));
   };
-  put(kBattery, figures.battery);
-  put(kCharger, figures.charger);
-  put(kBrightness, figures.brightness);
-  put(kOperator, " " + figures.hostName);
-  put(kAddress, figures.address);
-  put(kSignal, std::to_string(verdicts.size()) + " of " + std::to_string(rowOfEntry.size()) + " ");
-  put(kTestMode, " " + figures.load);
-  put(kBle, " ");
+  put(MW::MainList::kBattery, figures.battery);
+  put(MW::MainList::kCharger, figures.charger);
+  put(MW::MainList::kBrightness, figures.brightness);
+  put(MW::MainList::kOperator, " " + figures.hostName);
+  put(MW::MainList::kAddress, figures.address);
+  put(MW::MainList::kSignal,
+      std::to_string(verdicts.size()) + " of " + std::to_string(rowOfEntry.size()) + " ");
+  put(MW::MainList::kTestMode, " " + figures.load);
+  put(MW::MainList::kBle, " ");
   MW::isDisplayUpdate(1);
 }
 
@@ -113,7 +114,7 @@ void Menu::showVerdict(std::size_t entry, Verdict verdict) {
   const auto* const look = std::ranges::find(kLooks, verdict, &VerdictLook::verdict);
   if (verdict != Verdict::None) verdicts.insert(entry);
   list.setBGColor(rowOfEntry.at(entry), look->color);
-  std::string words = std::string("   ") + testEntries().at(entry).name;
+  std::string words = rowWords(testEntries().at(entry).name);
   if (verdict != Verdict::None) words.append(": ").append(verdictName(verdict));
   list.setText(rowOfEntry.at(entry), words.c_str(), static_cast<unsigned int>(words.size()));
 }

@@ -27,6 +27,18 @@ class MW_API MainList : public Widget {
   /// What an item's `kind` says; others look as kGrey with white text.
   enum ItemKind { kEnd = 0, kSelectable = 1, kGrey = 2, kDark = 3 };
 
+  /// The numbers of the status texts, for setTextOption().
+  enum StatusText {
+    kBattery,
+    kCharger,
+    kOperator,
+    kAddress,
+    kSignal,
+    kTestMode,
+    kBle,
+    kBrightness
+  };
+
   /// `listMode` 1 adds five more status texts to the title bar.
   MainList(const char* listTitle, int listMode);
   explicit MainList(const char* listTitle);

@@ -10,45 +10,45 @@
 
 namespace MW {
 
+/// What labels and text boxes have in common; not used by itself.
+class MW_API TextPrimitive : public Widget {
+ public:
+  char* getText() override;
+  unsigned int getTextColor() override;
+  int getFontSize() override;
+  SKIA_Rect* getPositionAndSize() override;
+  void setFontSize(int pixels) override;
+  void setTextAlign(int align) override;
+  /// The fill, which a label keeps though it draws none. getBgColor() stays 0.
+  void setBgColor(unsigned int color) override;
+
+ protected:
+  TextPrimitive(int primitiveType, const SKIA_Rect* area, const SKIA_Text* caption);
+};
+
 /// A text without a background.
-class MW_API Label : public Widget {
+class MW_API Label : public TextPrimitive {
  public:
   /// The text's length is taken from its NUL, not from `string_len`.
   Label(const SKIA_Rect* area, const SKIA_Text* caption);
   /// The handle that the platform gave to the item.
   int show() override;
   int show(unsigned int ticks) override;
-  char* getText() override;
-  unsigned int getTextColor() override;
-  int getFontSize() override;
-  SKIA_Rect* getPositionAndSize() override;
-  void setFontSize(int pixels) override;
   /// Replaces the text's first bytes and its length and writes no NUL behind them: the platform
   /// goes by the length.
   void setText(const char* newText) override;
-  void setTextAlign(int align) override;
-  /// Kept, though a label has no background; getBgColor() stays 0.
-  void setBgColor(unsigned int color) override;
   int add_MWWList() override;
 };
 
 /// A text on a filled rectangle.
-class MW_API Textbox : public Widget {
+class MW_API Textbox : public TextPrimitive {
  public:
   /// The text's length is taken from its NUL, not from `string_len`.
   Textbox(const SKIA_Rect* area, const SKIA_Text* caption);
   /// The handle that the platform gave to the item.
   int show() override;
   int show(unsigned int ticks) override;
-  char* getText() override;
-  unsigned int getTextColor() override;
-  int getFontSize() override;
-  SKIA_Rect* getPositionAndSize() override;
-  void setFontSize(int pixels) override;
   void setText(const char* newText) override;
-  void setTextAlign(int align) override;
-  /// The fill. getBgColor() stays 0.
-  void setBgColor(unsigned int color) override;
   int add_MWWList() override;
 };
 

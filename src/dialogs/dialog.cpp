@@ -5,6 +5,7 @@
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
+#include "core/key_clicks.h"
 #include "core/life_guard.h"
 #include "dialogs/dialog_catalogue.h"
 #include "dialogs/dialog_parts.h"
@@ -15,8 +16,6 @@ namespace {
 
 constexpr ClassLog kLog("DIALOG");
 constexpr int kHookKeyKind = 13;
-constexpr int kDoubleKey = 2;
-constexpr int kTripleKey = 3;
 constexpr uint32_t kMostStars = 10;
 constexpr int64_t kTextMargin = 10;    // pixels
 constexpr int kSmallTextPercent = 30;  // of a row, where there are two lines
@@ -260,9 +259,7 @@ void Dialog::onKeyClickCount(kbd_event key) {
     const std::lock_guard guard(stateLock);
     progress.delay(now);
   }
-  const int count = keyClicks.click(key.code, now);
-  if (count == kDoubleKey) doubleKeyCallback(&keyClicks.lastKey);
-  if (count == kTripleKey) tripleKeyCallback(&keyClicks.lastKey);
+  countKeyRelease(*this, keyClicks, key.code, now);
 }
 
 void Dialog::pressButton(DialogButton& button, const mouse_event& mouse) {

@@ -156,7 +156,7 @@ void MainList::drawItems() const {
 }
 
 void MainList::drawStatus() const {
-  const auto draw = [this](StatusText number) {
+  const auto draw = [this](MainList::StatusText number) {
     const Option& shownText = option.at(number);
     skia_add_label_c(shownText.rect, shownText.text);
   };

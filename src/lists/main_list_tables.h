@@ -31,8 +31,6 @@ constexpr const ItemColors& colorsOf(int kind) {
   return row != kItemColors.end() ? *row : kItemColors.front();
 }
 
-enum StatusText { kBattery, kCharger, kOperator, kAddress, kSignal, kTestMode, kBle, kBrightness };
-
 // The place of a status text counts columns of so many per cent of the screen's width; one that is
 // no column wide reaches to the screen's edge.
 struct StatusRow {
@@ -45,7 +43,7 @@ struct StatusRow {
   int align;
 };
 
-// By StatusText.
+// By MainList::StatusText.
 constexpr auto kStatusRows = std::to_array<StatusRow>({
     {"", 60, 1, 0, 102, 130, SKIA_ALIGN_RIGHT},
     {"", 60, 1, 0, 187, 130, SKIA_ALIGN_RIGHT},
@@ -59,8 +57,11 @@ constexpr auto kStatusRows = std::to_array<StatusRow>({
 static_assert(kStatusRows.size() == MainList::kOptions);
 
 // The order of drawing; the second group in the extended mode alone.
-constexpr auto kAlwaysDrawn = std::to_array({kBrightness, kBattery, kCharger});
-constexpr auto kExtendedDrawn = std::to_array({kOperator, kAddress, kSignal, kTestMode, kBle});
+constexpr auto kAlwaysDrawn =
+    std::to_array({MainList::kBrightness, MainList::kBattery, MainList::kCharger});
+constexpr auto kExtendedDrawn =
+    std::to_array({MainList::kOperator, MainList::kAddress, MainList::kSignal, MainList::kTestMode,
+                   MainList::kBle});
 
 constexpr SKIA_Rect statusRect(const StatusRow& row, int screenWidth) {
   const int64_t column = percentOf(screenWidth, row.columnPercent);
@@ -68,7 +69,7 @@ constexpr SKIA_Rect statusRect(const StatusRow& row, int screenWidth) {
   return makeRect(x, row.y, row.columns > 0 ? row.columns * column : screenWidth - x, row.height,
                   0);
 }
-static_assert(statusRect(kStatusRows[kSignal], 1440).x == 950);
-static_assert(statusRect(kStatusRows[kBattery], 1440).w == 576);
+static_assert(statusRect(kStatusRows[MainList::kSignal], 1440).x == 950);
+static_assert(statusRect(kStatusRows[MainList::kBattery], 1440).w == 576);
 
 }  // namespace MW

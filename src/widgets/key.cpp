@@ -5,6 +5,7 @@
 #include <optional>
 
 #include "core/class_log.h"
+#include "core/key_clicks.h"
 #include "core/life_guard.h"
 
 namespace MW {
@@ -14,8 +15,6 @@ namespace {
 constexpr ClassLog kLog("KEY");
 constexpr unsigned int kPlugHoldMs = 100;
 constexpr uint32_t kPlugSettled = 2;
-constexpr int kDoubleKey = 2;
-constexpr int kTripleKey = 3;
 
 constexpr bool isPassing(uint32_t code) {
   constexpr uint32_t kPassing1 = 17;
@@ -98,9 +97,7 @@ void Key::onPressLong(mouse_event mouse) {
 }
 
 void Key::onKeyClickCount(kbd_event key) {
-  const int count = keyClicks.click(key.code, GetTicks());
-  if (count == kDoubleKey) doubleKeyCallback(&keyClicks.lastKey);
-  if (count == kTripleKey) tripleKeyCallback(&keyClicks.lastKey);
+  countKeyRelease(*this, keyClicks, key.code, GetTicks());
 }
 
 }  // namespace MW

@@ -2,10 +2,10 @@
 #include <MW/widget_list.h>
 
 #include <algorithm>
-#include <limits>
 #include <string_view>
 
 #include "core/bounded_text.h"
+#include "core/geometry.h"
 
 namespace MW {
 
@@ -20,12 +20,6 @@ constexpr int kTypeTextbox = 8;
 
 SKIA_Rect copyRect(const SKIA_Rect* given) { return given != nullptr ? *given : SKIA_Rect{}; }
 
-// From `from` to `to`, which lies before it; cut to what a record's word can hold.
-int32_t distance(int32_t from, int32_t to) {
-  const int64_t back = int64_t{to} - from;
-  return static_cast<int32_t>(std::max<int64_t>(back, std::numeric_limits<int32_t>::min()));
-}
-
 SKIA_Text imageName(const SKIA_Text* given) {
   SKIA_Text record = {};
   if (given == nullptr) return record;
@@ -38,11 +32,22 @@ SKIA_Text imageName(const SKIA_Text* given) {
 
 }  // namespace
 
-Label::Label(const SKIA_Rect* area, const SKIA_Text* caption) {
-  type_ = kTypeLabel;
+TextPrimitive::TextPrimitive(int primitiveType, const SKIA_Rect* area, const SKIA_Text* caption) {
+  type_ = primitiveType;
   rect = copyRect(area);
   text = copyText(caption);
 }
+
+char* TextPrimitive::getText() { return text.text; }
+unsigned int TextPrimitive::getTextColor() { return read(text.color); }
+int TextPrimitive::getFontSize() { return read(text.size); }
+SKIA_Rect* TextPrimitive::getPositionAndSize() { return &rect; }
+void TextPrimitive::setFontSize(int pixels) { write(text.size, pixels); }
+void TextPrimitive::setTextAlign(int align) { write(text.align, align); }
+void TextPrimitive::setBgColor(unsigned int color) { write(rect.color, color); }
+
+Label::Label(const SKIA_Rect* area, const SKIA_Text* caption)
+    : TextPrimitive(kTypeLabel, area, caption) {}
 
 int Label::show() { return show(0); }
 
@@ -51,30 +56,18 @@ int Label::show(unsigned int) {
   return skia_add_label_c(rect, text);
 }
 
-char* Label::getText() { return text.text; }
-unsigned int Label::getTextColor() { return read(text.color); }
-int Label::getFontSize() { return read(text.size); }
-SKIA_Rect* Label::getPositionAndSize() { return &rect; }
-void Label::setFontSize(int pixels) { write(text.size, pixels); }
-
 void Label::setText(const char* newText) {
   const std::lock_guard guard(stateLock);
   putTextOpen(text, boundedText(newText));
 }
-
-void Label::setTextAlign(int align) { write(text.align, align); }
-void Label::setBgColor(unsigned int color) { write(rect.color, color); }
 
 int Label::add_MWWList() {
   const std::lock_guard guard(stateLock);
   return WidgetList::addQueue(SKIA_LABEL, &rect, nullptr, &text);
 }
 
-Textbox::Textbox(const SKIA_Rect* area, const SKIA_Text* caption) {
-  type_ = kTypeTextbox;
-  rect = copyRect(area);
-  text = copyText(caption);
-}
+Textbox::Textbox(const SKIA_Rect* area, const SKIA_Text* caption)
+    : TextPrimitive(kTypeTextbox, area, caption) {}
 
 int Textbox::show() { return show(0); }
 
@@ -83,19 +76,10 @@ int Textbox::show(unsigned int) {
   return skia_add_textbox_c(rect, text);
 }
 
-char* Textbox::getText() { return text.text; }
-unsigned int Textbox::getTextColor() { return read(text.color); }
-int Textbox::getFontSize() { return read(text.size); }
-SKIA_Rect* Textbox::getPositionAndSize() { return &rect; }
-void Textbox::setFontSize(int pixels) { write(text.size, pixels); }
-
 void Textbox::setText(const char* newText) {
   const std::lock_guard guard(stateLock);
   putText(text, boundedText(newText));
 }
-
-void Textbox::setTextAlign(int align) { write(text.align, align); }
-void Textbox::setBgColor(unsigned int color) { write(rect.color, color); }
 
 int Textbox::add_MWWList() {
   const std::lock_guard guard(stateLock);
@@ -156,8 +140,8 @@ SKIA_Rect* Line::getPositionAndSize() {
   // Anchored at the larger coordinates and reaching back from there: meant so.
   rect.x = std::max(point.x1, point.x2);
   rect.y = std::max(point.y1, point.y2);
-  rect.w = distance(rect.x, std::min(point.x1, point.x2));
-  rect.h = distance(rect.y, std::min(point.y1, point.y2));
+  rect.w = toPixels(int64_t{std::min(point.x1, point.x2)} - rect.x);
+  rect.h = toPixels(int64_t{std::min(point.y1, point.y2)} - rect.y);
   rect.color = point.color;
   return &rect;
 }

@@ -10,7 +10,6 @@ namespace MW {
 
 namespace {
 constexpr int kRedraw = 1;
-constexpr int kDoubleClick = 2;
 }  // namespace
 
 PushButton::PushButton(const char* logWord) : word(logWord) { type_ = kBaseLayer; }
@@ -97,7 +96,7 @@ void PushButton::onTouchClickCount() {
   const int count = clicks.tap(GetTicks());
   if (count == 0) return;
   ClassLog(word).print(LogLevel::Debug, "onTouchClickCount!! %d", count);
-  if (count == kDoubleClick) doubleClickCallback(0);
+  if (count == DoubleTap::kDouble) doubleClickCallback(0);
 }
 
 void PushButton::restoreColor() {

@@ -17,7 +17,6 @@ constexpr ClassLog kLog("BUTTON");  // the screen speaks under the button's name
 constexpr int kPassOn = 2;          // the bit of the variant
 constexpr int kEmptySquare = 1;     // setRect's mode
 constexpr int kSquareSide = 50;     // pixels, and the least distance from an edge
-constexpr int kDoubleClick = 2;
 
 constexpr uint32_t kGrey = 0xFFBFBFBF;
 constexpr auto kFills = std::to_array<uint32_t>({kColorWhite, 0xFFFF0000, kColorGreen, kColorBlue});
@@ -112,7 +111,7 @@ void Screen::onTouchClickCount() {
   const int count = clicks.tap(GetTicks());
   if (count == 0) return setRect(kEmptySquare, &rect);
   kLog.print(LogLevel::Debug, "onTouchClickCount!! %d", count);
-  if (count == kDoubleClick) doubleClickCallback(0);
+  if (count == DoubleTap::kDouble) doubleClickCallback(0);
 }
 
 FullScreen::FullScreen(int color) : colorIndex(color) {

@@ -19,7 +19,6 @@ constexpr int kNoFinger = -1;
 constexpr int kLegendSize = 80;  // pixels
 constexpr uint32_t kOffColor = 0xFF787878;
 constexpr int kTwoCaptions = 2;
-constexpr int kDoubleTap = 2;
 
 constexpr int kTrackUnits = 5;
 constexpr int kKnobUnits = 2;
@@ -177,7 +176,7 @@ void Slide::onTouchClickCount(mouse_event mouse) {
   const int count = clicks.tap(GetTicks());
   if (count == 0) return;
   kLog.print(LogLevel::Debug, "onTouchClickCount!! %d", count);
-  if (count != kDoubleTap) return;
+  if (count != DoubleTap::kDouble) return;
   mouse.state = static_cast<uint32_t>(locked);
   doubleClickCallback(&mouse);
 }

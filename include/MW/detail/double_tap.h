@@ -10,6 +10,7 @@ namespace MW {
 class DoubleTap {
  public:
   static constexpr uint32_t kWindowMs = 500;
+  static constexpr int kDouble = 2;  ///< what tap() answers to a double tap
 
   /// A press: forgets a tap that lies too far back, and starts the time when none runs.
   constexpr void press(uint32_t now) {
