@@ -13,6 +13,7 @@
 #include <vector>
 
 #include "input/input_service.h"
+#include "percentile.h"
 
 namespace {
 
@@ -30,16 +31,8 @@ double waitForCallback(Clock::time_point start) {
   return millisecondsTo(called.exchange(0), start);
 }
 
-double percentile(std::vector<double>& values, double share) {
-  const auto last = static_cast<double>(values.size() - 1);
-  const auto place = values.begin() + static_cast<std::ptrdiff_t>(last * share);
-  std::nth_element(values.begin(), place, values.end());
-  return *place;
-}
-
 void pressToCallback(benchmark::State& state) {
   constexpr SKIA_Rect kArea = {0, 0, 100, 100, 0};
-  constexpr double kMedian = 0.5;
   constexpr double kAlmostAll = 0.99;
   MW::Window::init();
   {
@@ -57,7 +50,7 @@ void pressToCallback(benchmark::State& state) {
       brimol::pc::inputService().post(press);
       milliseconds.push_back(waitForCallback(start));
     }
-    state.counters["median_ms"] = percentile(milliseconds, kMedian);
+    state.counters["median_ms"] = median(milliseconds);
     state.counters["p99_ms"] = percentile(milliseconds, kAlmostAll);
     state.counters["worst_ms"] = percentile(milliseconds, 1);
   }

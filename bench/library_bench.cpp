@@ -14,6 +14,8 @@
 #include <memory>
 #include <vector>
 
+#include "percentile.h"
+
 namespace {
 
 using MW::Button;
@@ -52,12 +54,6 @@ double nanoseconds(int times, Work work) {
   const auto start = std::chrono::steady_clock::now();
   for (int i = 0; i < times; ++i) work();
   return std::chrono::duration<double, std::nano>(std::chrono::steady_clock::now() - start).count();
-}
-
-double median(std::vector<double>& values) {
-  const auto middle = values.begin() + static_cast<std::ptrdiff_t>(values.size() / 2);
-  std::nth_element(values.begin(), middle, values.end());
-  return *middle;
 }
 
 // Runs `pass` and `bare` in turn, so that both meet the same machine, and reports the median of

@@ -11,6 +11,7 @@
 #include <vector>
 
 #include "painter.h"
+#include "percentile.h"
 
 namespace {
 
@@ -78,12 +79,6 @@ Frame menuWithButton(uint32_t face) {
   Frame frame = menuOver(kWhite);
   frame.push_back(textItem(SKIA_ROUNDBUTTONBOX, {420, 2300, 600, 180, face}, "Back", 64));
   return frame;
-}
-
-double median(std::vector<double>& values) {
-  const auto middle = values.begin() + static_cast<std::ptrdiff_t>(values.size() / 2);
-  std::nth_element(values.begin(), middle, values.end());
-  return *middle;
 }
 
 template <typename Work>

@@ -6,11 +6,11 @@
 #include <brimol/input.h>
 
 #include <csignal>
-#include <cstdio>
 #include <cstdlib>
 #include <string>
 #include <utility>
 
+#include "complain.h"
 #include "factory_test.h"
 
 namespace factory_test {
@@ -25,8 +25,8 @@ void endOnSignals() {
   for (const int number : {SIGINT, SIGTERM}) std::signal(number, [](int) { interrupted = 1; });
 }
 
-int fail(const char* why) {
-  std::fprintf(stderr, "factory_test: %s\n", why);
+int fail(const std::string& why) {
+  complain(why);
   return EXIT_FAILURE;
 }
 
@@ -57,7 +57,7 @@ int runApplication(const Options& options) {
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   std::string error;
   auto book = ResultBook::open(options.results, error);
-  if (!book) return fail(error.c_str());
+  if (!book) return fail(error);
   if (brimol_host_open() == 0) return fail(brimol_host_error());
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();

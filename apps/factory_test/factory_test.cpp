@@ -3,21 +3,13 @@
 #include <MW/window.h>
 #include <brimol/frame.h>
 
-#include <cstdio>
 #include <utility>
 
+#include "complain.h"
 #include "layout.h"
 #include "results/junit.h"
 
 namespace factory_test {
-
-namespace {
-
-void complain(const std::string& error) {
-  std::fprintf(stderr, "factory_test: %s\n", error.c_str());
-}
-
-}  // namespace
 
 FactoryTest::FactoryTest(ResultBook results, std::string reportPath)
     : book(std::move(results)), junitPath(std::move(reportPath)), menu(book) {

@@ -23,4 +23,8 @@ SKIA_Text textOf(const char* words, uint32_t color, int align, int size) {
   return text;
 }
 
+SKIA_Text captionOf(const char* words, uint32_t color) {
+  return textOf(words, color, SKIA_ALIGN_CENTRE, textSize(screenSize()));
+}
+
 }  // namespace factory_test

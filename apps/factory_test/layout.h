@@ -85,4 +85,7 @@ constexpr PageLayout layOutPage(ScreenSize screen) {
 /// A text record for `words`; what does not fit is cut.
 SKIA_Text textOf(const char* words, uint32_t color, int align, int size);
 
+/// The same as what stands on a button or a line: black, centred, in the screen's text size.
+SKIA_Text captionOf(const char* words, uint32_t color = MW::kColorBlack);
+
 }  // namespace factory_test

@@ -7,6 +7,7 @@
 #include <string>
 
 #include "application.h"
+#include "complain.h"
 #include "options.h"
 
 namespace {
@@ -24,7 +25,7 @@ int main(int count, char** arguments) {
   const std::span<const char* const> all(arguments, static_cast<std::size_t>(count));
   const auto options = factory_test::parseOptions(all.subspan(all.empty() ? 0 : 1), error);
   if (!options) {
-    std::fprintf(stderr, "factory_test: %s\n", error.c_str());
+    factory_test::complain(error);
     return kUsageError;
   }
   if (options->action == factory_test::Options::Action::Help) {

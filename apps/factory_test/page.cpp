@@ -26,11 +26,7 @@ Record hintRecord(const char* instructions) {
           textOf(instructions, MW::kColorWhite, SKIA_ALIGN_LEFT, textSize(screen))};
 }
 
-Record lineRecord() {
-  const ScreenSize screen = screenSize();
-  return {layOutPage(screen).line,
-          textOf("", MW::kColorBlack, SKIA_ALIGN_CENTRE, textSize(screen))};
-}
+Record lineRecord() { return {layOutPage(screenSize()).line, captionOf("")}; }
 
 MW::Box makeGround() {
   const SKIA_Rect area = layOutPage(screenSize()).ground;
@@ -52,15 +48,16 @@ Page::Page(const char* title, const char* instructions)
 
 void Page::draw() {
   drawGround();
-  drawTexts();
+  drawFront();
 }
 
 void Page::drawGround() { ground.show(); }
 
-void Page::drawTexts() {
+void Page::drawFront() {
   titleBar.show();
   hint.show();
   line.show();
+  if (bar) bar->draw();
 }
 
 void Page::say(const char* words) {

@@ -3,9 +3,14 @@
 
 #include <MW/primitives.h>
 
+#include <optional>
+
+#include "verdict_bar.h"
+
 namespace factory_test {
 
-/// A ground, a title, instructions, and a line that tells what happens.
+/// A ground, a title, instructions, a line that tells what happens, and, once they are asked for,
+/// the verdicts. Hold it before the test's own widgets: the verdicts then go after them.
 class Page {
  public:
   /// Instructions may have several lines.
@@ -14,15 +19,24 @@ class Page {
   /// On the main thread, before the window's widgets are drawn: all of it, or in two steps.
   void draw();
   void drawGround();
-  void drawTexts();
+  void drawFront();
   /// Changes the line; the next frame shows it. Any thread.
   void say(const char* words);
+
+  /// Puts the verdicts on the screen, on the main thread.
+  VerdictBar& ask(VerdictBar::Keys keys = VerdictBar::Keys::Choose) { return bar.emplace(keys); }
+  bool isAsking() const { return bar.has_value(); }
+  /// Takes them off again.
+  void endAsking() { bar.reset(); }
+  /// What was chosen; Running while nothing was, or was not asked for.
+  Outcome outcome() const { return bar ? bar->outcome() : Outcome::Running; }
 
  private:
   MW::Box ground;
   MW::Textbox titleBar;
   MW::Label hint;
   MW::Textbox line;
+  std::optional<VerdictBar> bar;
 };
 
 }  // namespace factory_test

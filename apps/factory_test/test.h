@@ -3,7 +3,6 @@
 
 #include <cstdint>
 #include <memory>
-#include <string_view>
 #include <vector>
 
 namespace factory_test {

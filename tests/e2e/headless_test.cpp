@@ -13,8 +13,8 @@
 #include "application.h"
 #include "e2e/app_screens.h"
 #include "e2e/user.h"
+#include "e2e/verdicts.h"
 #include "layout.h"
-#include "results/results.h"
 
 namespace factory_test {
 namespace {
@@ -32,20 +32,6 @@ class HeadlessApplication : public testing::Test {
   const std::string results = folder / "results.json";
   const std::string report = folder / "report.xml";
 };
-
-/// The verdicts that the file holds, in the order in which they were given.
-std::string verdictsIn(const std::string& file) {
-  std::string error;
-  const auto book = ResultBook::open(file, error);
-  if (!book) return error;
-  std::string words;
-  for (const TestResult& each : book->results()) {
-    EXPECT_EQ(each.screen.width, kScreen.width);
-    EXPECT_EQ(each.screen.height, kScreen.height);
-    words += each.test + " " + verdictName(each.verdict) + "\n";
-  }
-  return words;
-}
 
 TEST_F(HeadlessApplication, IsDoneByTouchAlone) {
   const int code = runWith({"--results", results, "--junit", report}, [] {

@@ -14,7 +14,7 @@
 
 #include "e2e/app_screens.h"
 #include "e2e/eventually.h"
-#include "results/results.h"
+#include "e2e/verdicts.h"
 #include "support/desktop.h"
 
 namespace factory_test {
@@ -158,14 +158,7 @@ TEST_F(WindowApplication, IsUsedByMouseAndByKeyboard) {
   EXPECT_TRUE(comesToSee(kDialogOk, MW::kColorWhite));
   mouse(kDialogOk, "click 1");
   EXPECT_EQ(program.waitForEnd(), EXIT_SUCCESS);
-  std::string error;
-  const auto book = ResultBook::open(results, error);
-  ASSERT_TRUE(book) << error;
-  std::string verdicts;
-  for (const TestResult& each : book->results()) {
-    verdicts += each.test + " " + verdictName(each.verdict) + "\n";
-  }
-  EXPECT_EQ(verdicts,
+  EXPECT_EQ(verdictsIn(results),
             "buttons PASS\nswitches FAIL\ntouch PASS\ncolours PASS\nkeys FAIL\n"
             "prompts PASS\n");
 }

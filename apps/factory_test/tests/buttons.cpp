@@ -12,7 +12,6 @@
 #include "page.h"
 #include "pictures.h"
 #include "test.h"
-#include "verdict_bar.h"
 
 namespace factory_test {
 
@@ -31,7 +30,7 @@ constexpr int kColumns = 3;
 class ButtonTest : public Test {
  public:
   void enter() override {
-    bar.emplace();
+    page.ask();
     placePrimitives();
     for (std::size_t i = 0; i < kButtons.size(); ++i) placeButton(i);
   }
@@ -39,15 +38,14 @@ class ButtonTest : public Test {
   void leave() override {
     for (std::size_t i = buttons.size(); i > 0; --i) buttons.at(i - 1).reset();
     MW::WidgetList::destroy();
-    bar.reset();
+    page.endAsking();
   }
 
-  Outcome verdict() const override { return bar->outcome(); }
+  Outcome verdict() const override { return page.outcome(); }
 
   void draw() override {
     page.draw();
     MW::WidgetList::show();
-    bar->draw();
   }
 
  private:
@@ -87,8 +85,7 @@ class ButtonTest : public Test {
     const ButtonRow& look = kButtons.at(number);
     const ScreenSize screen = screenSize();
     const SKIA_Rect area = cellOf(screen, kButtonGrid, static_cast<int>(number), kButtonColor);
-    const SKIA_Text caption =
-        textOf(look.caption, MW::kColorBlack, SKIA_ALIGN_CENTRE, textSize(screen));
+    const SKIA_Text caption = captionOf(look.caption);
     Button& button = buttons.at(number).emplace(&area, &caption);
     button.*look.callback = look.handler;
     if (number != kLate) button.setActive(1);
@@ -114,7 +111,6 @@ class ButtonTest : public Test {
   Current<ButtonTest> current{this};
   std::array<unsigned int, kButtonCount> counts = {};  // dispatch thread
   Page page{"Buttons", "Use every button as it says."};
-  std::optional<VerdictBar> bar;
   std::array<std::optional<Button>, kButtonCount> buttons;
 };
 

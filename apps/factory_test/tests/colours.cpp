@@ -1,11 +1,10 @@
 // The display in one colour after another, to look for dead pixels and stains.
 #include <MW/key.h>
 #include <MW/screen.h>
+#include <MW/window.h>
 
 #include <atomic>
 #include <optional>
-
-#include <MW/window.h>
 
 #include "current.h"
 #include "on_top.h"
@@ -36,21 +35,18 @@ class ColourTest : public Test {
   }
 
   void leave() override {
-    bar.reset();
+    page.endAsking();
     endLook();
   }
 
-  Outcome verdict() const override { return bar ? bar->outcome() : Outcome::Running; }
+  Outcome verdict() const override { return page.outcome(); }
 
-  void draw() override {
-    page.draw();
-    if (bar) bar->draw();
-  }
+  void draw() override { page.draw(); }
 
   void update(uint32_t) override {
-    if (!looked || bar) return;
+    if (!looked || page.isAsking()) return;
     endLook();
-    bar.emplace();
+    page.ask();
     page.say("Was every colour even?");
   }
 
@@ -76,7 +72,6 @@ class ColourTest : public Test {
   std::optional<MW::FullScreen> colour;
   std::optional<OnTop<MW::Screen>> touch;
   std::optional<OnTop<MW::Key>> key;
-  std::optional<VerdictBar> bar;
 };
 
 const TestRegistration kRegistration({Group::Display, 0, "colours", "Display colours",

@@ -44,30 +44,30 @@ constexpr auto kAsked = std::to_array<KeyName>({
 class KeyTest : public Test {
  public:
   void enter() override {
-    bar.emplace(VerdictBar::Keys::Free);
+    page.ask(VerdictBar::Keys::Free);
     key.emplace();
     key->keyPressCallback = [](MW::kbd_event* event) { Current<KeyTest>::get().mark(event->code); };
     key->doubleKeyCallback = [](MW::kbd_event*) { Current<KeyTest>::get().mark(kTwice); };
     key->tripleKeyCallback = [](MW::kbd_event* event) {
-      if (event->code == kKeyBack) Current<KeyTest>::get().bar->choose(Outcome::Fail);
+      if (event->code == kKeyBack) Current<KeyTest>::get().failed = true;
       Current<KeyTest>::get().mark(kThreeTimes);
     };
   }
 
   void leave() override {
     key.reset();
-    bar.reset();
+    page.endAsking();
   }
 
   Outcome verdict() const override {
     const bool isDone = std::ranges::all_of(pressed, [](const auto& each) { return each.load(); });
-    return isDone ? Outcome::Pass : bar->outcome();
+    if (isDone) return Outcome::Pass;
+    return failed ? Outcome::Fail : page.outcome();
   }
 
   void draw() override {
     page.draw();
     for (std::size_t i = 0; i < kAsked.size(); ++i) drawKey(static_cast<int>(i), pressed.at(i));
-    bar->draw();
   }
 
  private:
@@ -81,16 +81,15 @@ class KeyTest : public Test {
   static void drawKey(int index, bool isPressed) {
     const ScreenSize screen = screenSize();
     skia_add_textbox_c(cellOf(screen, kKeyGrid, index, isPressed ? kPassColor : kButtonColor),
-                       textOf(kAsked.at(static_cast<std::size_t>(index)).name, MW::kColorBlack,
-                              SKIA_ALIGN_CENTRE, textSize(screen)));
+                       captionOf(kAsked.at(static_cast<std::size_t>(index)).name));
   }
 
   Current<KeyTest> current{this};
+  std::atomic<bool> failed = false;
   std::array<std::atomic<bool>, kAsked.size()> pressed = {};
   Page page{"Keys",
             "Press every key once, one key twice\nand one three times in a row.\n"
             "Back three times: FAIL."};
-  std::optional<VerdictBar> bar;
   std::optional<MW::Key> key;
 };
 

@@ -25,22 +25,19 @@ class PromptTest : public Test {
   void enter() override { showDialog(); }
 
   void leave() override {
-    bar.reset();
+    page.endAsking();
     dialog.reset();
   }
 
-  Outcome verdict() const override { return bar ? bar->outcome() : Outcome::Running; }
+  Outcome verdict() const override { return page.outcome(); }
 
-  void draw() override {
-    page.draw();
-    if (bar) bar->draw();
-  }
+  void draw() override { page.draw(); }
 
   void update(uint32_t) override {
-    if (bar) return;
+    if (page.isAsking()) return;
     if (looked || kind > kLastKind) {
       dialog.reset();
-      bar.emplace();
+      page.ask();
       page.say("Did all dialogs look right?");
     } else if (kind != shown) {
       showDialog();
@@ -81,7 +78,6 @@ class PromptTest : public Test {
   std::atomic<int> shown = kFirstKind;  // on the screen
   Page page{"Prompts", "Touch for the next dialog;\nthe right button ends."};
   std::optional<MW::Dialog> dialog;
-  std::optional<VerdictBar> bar;
 };
 
 const TestRegistration kRegistration({Group::Widgets, 3, "prompts", "Dialogs",

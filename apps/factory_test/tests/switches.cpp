@@ -7,7 +7,6 @@
 #include "layout.h"
 #include "page.h"
 #include "test.h"
-#include "verdict_bar.h"
 
 namespace factory_test {
 
@@ -21,7 +20,7 @@ constexpr int kRightBit = 1;
 class SwitchTest : public Test {
  public:
   void enter() override {
-    bar.emplace().otherKey = [](unsigned int code) {
+    page.ask().otherKey = [](unsigned int code) {
       if (code == MW::kKeyUp) Current<SwitchTest>::get().moveAll();
     };
     place(full, 0, kFullTravel, "Full way");
@@ -35,15 +34,12 @@ class SwitchTest : public Test {
     locked.reset();
     half.reset();
     full.reset();
-    bar.reset();
+    page.endAsking();
   }
 
-  Outcome verdict() const override { return bar->outcome(); }
+  Outcome verdict() const override { return page.outcome(); }
 
-  void draw() override {
-    page.draw();
-    bar->draw();
-  }
+  void draw() override { page.draw(); }
 
  private:
   template <typename Kind>
@@ -52,7 +48,7 @@ class SwitchTest : public Test {
     constexpr int kHeight = 9;
     const ScreenSize screen = screenSize();
     const SKIA_Rect area = rowOf(screen, kContentTop + row * kPitch, kHeight, 0);
-    const SKIA_Text caption = textOf(words, MW::kColorBlack, SKIA_ALIGN_CENTRE, textSize(screen));
+    const SKIA_Text caption = captionOf(words);
     slide.emplace(state, &area, &caption, nullptr);
     slide->leftCallback = [](int) { Current<SwitchTest>::get().page.say("Left"); };
     slide->rightCallback = [](int) { Current<SwitchTest>::get().page.say("Right"); };
@@ -74,7 +70,6 @@ class SwitchTest : public Test {
   Page page{"Switches",
             "Drag the switches to and fro.\nTap the locked one twice to unlock it.\n"
             "Key up moves the first two."};
-  std::optional<VerdictBar> bar;
   std::optional<MW::Slide> full;
   std::optional<MW::SlideV> half;
   std::optional<MW::Slide> locked;

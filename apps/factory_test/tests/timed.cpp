@@ -9,7 +9,6 @@
 #include "layout.h"
 #include "page.h"
 #include "test.h"
-#include "verdict_bar.h"
 
 namespace factory_test {
 
@@ -23,7 +22,7 @@ constexpr uint32_t kToastColor = 0xFF505A6C;
 class TimedTest : public Test {
  public:
   void enter() override {
-    bar.emplace().otherKey = [](unsigned int code) { Current<TimedTest>::get().followKey(code); };
+    page.ask().otherKey = [](unsigned int code) { Current<TimedTest>::get().followKey(code); };
     const ScreenSize screen = screenSize();
     const SKIA_Rect row = rowOf(screen, kContentTop, 9, kButtonColor);
     placeButton(toastButton, cellOf(row, 0, 2), "Toast");
@@ -39,35 +38,28 @@ class TimedTest : public Test {
     toast.reset();
     progressButton.reset();
     toastButton.reset();
-    bar.reset();
+    page.endAsking();
   }
 
-  Outcome verdict() const override { return bar->outcome(); }
+  Outcome verdict() const override { return page.outcome(); }
 
-  void draw() override {
-    page.draw();
-    bar->draw();
-  }
+  void draw() override { page.draw(); }
 
  private:
   static void placeButton(std::optional<MW::Button>& button, const SKIA_Rect& area,
                           const char* words) {
-    const SKIA_Text caption =
-        textOf(words, MW::kColorBlack, SKIA_ALIGN_CENTRE, textSize(screenSize()));
+    const SKIA_Text caption = captionOf(words);
     button.emplace(&area, &caption).setActive(1);
   }
 
   void placeToast(const SKIA_Rect& area) {
-    const int size = textSize(screenSize());
-    const SKIA_Text first = textOf("A toast", MW::kColorWhite, SKIA_ALIGN_CENTRE, size);
-    const SKIA_Text second =
-        textOf("goes in two seconds", MW::kColorWhite, SKIA_ALIGN_CENTRE, size);
+    const SKIA_Text first = captionOf("A toast", MW::kColorWhite);
+    const SKIA_Text second = captionOf("goes in two seconds", MW::kColorWhite);
     toast.emplace(&area, &first, &second);
   }
 
   void placeProgress(const SKIA_Rect& area) {
-    const SKIA_Text caption =
-        textOf("Three seconds of work", MW::kColorWhite, SKIA_ALIGN_CENTRE, textSize(screenSize()));
+    const SKIA_Text caption = captionOf("Three seconds of work", MW::kColorWhite);
     progress.emplace(0, &area, &caption);
   }
 
@@ -89,7 +81,6 @@ class TimedTest : public Test {
   Current<TimedTest> current{this};
   Page page{"Toast and progress",
             "Each button shows something for a while.\nKey up: toast. Key down: progress."};
-  std::optional<VerdictBar> bar;
   std::optional<MW::Button> toastButton;
   std::optional<MW::Button> progressButton;
   std::optional<MW::Toastbox> toast;

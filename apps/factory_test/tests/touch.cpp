@@ -38,23 +38,22 @@ class TouchTest : public Test {
   }
 
   void leave() override {
-    bar.reset();
+    page.endAsking();
     endLook();
   }
 
-  Outcome verdict() const override { return bar ? bar->outcome() : Outcome::Running; }
+  Outcome verdict() const override { return page.outcome(); }
 
   void draw() override {
     page.drawGround();
     if (x >= 0) drawCross();
-    page.drawTexts();
-    if (bar) bar->draw();
+    page.drawFront();
   }
 
   void update(uint32_t) override {
-    if (!looked || bar) return;
+    if (!looked || page.isAsking()) return;
     endLook();
-    bar.emplace();
+    page.ask();
     page.say("Double tap. Was every touch met?");
   }
 
@@ -90,7 +89,6 @@ class TouchTest : public Test {
   Page page{"Touch", "Touch and drag everywhere.\nTap twice in one place to end."};
   std::optional<MW::Screen> touch;
   std::optional<MW::Key> key;
-  std::optional<VerdictBar> bar;
 };
 
 const TestRegistration kRegistration({Group::Input, 0, "touch", "Touch panel",
