@@ -1,12 +1,17 @@
 #include "application.h"
 
 #include <MW/window.h>
-#include <android/log.h>
 #include <brimol/host.h>
 #include <brimol/input.h>
 
+#include <algorithm>
 #include <csignal>
+#include <cstdio>
 #include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <optional>
+#include <sstream>
 #include <string>
 #include <utility>
 
@@ -39,8 +44,23 @@ void loop(FactoryTest& test) {
   }
 }
 
-int showScreens(const Options& options, ResultBook book) {
-  FactoryTest test(std::move(book), options.junit);
+// The file as a text of the toolkit, which ends at a NUL: spaces stand for these. Nothing, with the
+// reason in `error`, for one that cannot be read.
+std::optional<std::string> readText(const std::string& path, std::string& error) {
+  std::ifstream file(path, std::ios::binary);
+  std::ostringstream bytes;
+  if (!std::filesystem::is_directory(path) && file &&
+      (file.peek() == EOF || bytes << file.rdbuf())) {
+    std::string text = std::move(bytes).str();
+    std::ranges::replace(text, '\0', ' ');
+    return text;
+  }
+  error = path + ": cannot be read";
+  return {};
+}
+
+int showScreens(const Options& options, ResultBook& book, const Surroundings& surroundings) {
+  FactoryTest test(book, surroundings, options.junit);
   test.draw();
   if (options.shot.empty()) {
     loop(test);
@@ -53,17 +73,22 @@ int showScreens(const Options& options, ResultBook book) {
 }  // namespace
 
 int runApplication(const Options& options) {
-  __android_log_set_minimum_priority(options.verbose ? ANDROID_LOG_VERBOSE : ANDROID_LOG_SILENT);
+  SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   std::string error;
   auto book = ResultBook::open(options.results, error);
   if (!book) return fail(error);
+  Surroundings surroundings = {*book, log, {}, options.shell};
+  if (!options.log.empty()) {
+    surroundings.logText = readText(options.log, error);
+    if (!surroundings.logText) return fail(error);
+  }
   if (brimol_host_open() == 0) return fail(brimol_host_error());
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;
-  const int result =
-      started ? showScreens(options, std::move(*book)) : fail("no memory for the dispatch thread");
+  const int result = started ? showScreens(options, *book, surroundings)
+                             : fail("no memory for the dispatch thread");
   MW::Window::destroy();
   return result;
 }

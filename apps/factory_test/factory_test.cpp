@@ -11,8 +11,8 @@
 
 namespace factory_test {
 
-FactoryTest::FactoryTest(ResultBook results, std::string reportPath)
-    : book(std::move(results)), junitPath(std::move(reportPath)), menu(book) {
+FactoryTest::FactoryTest(ResultBook& results, const Surroundings& program, std::string reportPath)
+    : book(results), surroundings(program), junitPath(std::move(reportPath)), menu(book) {
   menu.show();
 }
 
@@ -51,8 +51,9 @@ void FactoryTest::updatePrompt() {
 }
 
 void FactoryTest::start(std::size_t entry, uint32_t now) {
+  surroundings.log.add(std::string("Test ") + testEntries().at(entry).id);
   const auto clock = std::chrono::system_clock::now();
-  running = Running{entry, testEntries().at(entry).make(),
+  running = Running{entry, testEntries().at(entry).make(surroundings),
                     std::chrono::floor<std::chrono::seconds>(clock), now};
   running->test->enter();
   MW::isDisplayUpdate(1);
@@ -77,6 +78,7 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
 }
 
 void FactoryTest::keep(const Running& done, Verdict verdict, uint32_t now) {
+  surroundings.log.add(std::string("Verdict ") + verdictName(verdict));
   std::string error;
   if (!book.record({.test = testEntries().at(done.entry).id,
                     .verdict = verdict,

@@ -17,8 +17,9 @@ namespace factory_test {
 /// Used on the main thread.
 class FactoryTest {
  public:
-  /// Takes over the results so far. `reportPath`: the report for a CI system; empty: none.
-  FactoryTest(ResultBook results, std::string reportPath);
+  /// Keeps verdicts in `results`, which outlives it, as do the surroundings. `reportPath`: the
+  /// report for a CI system; empty: none.
+  FactoryTest(ResultBook& results, const Surroundings& program, std::string reportPath);
 
   /// One round of the main loop, at GetTicks() milliseconds.
   void update(uint32_t now);
@@ -41,7 +42,8 @@ class FactoryTest {
   void finish(Outcome outcome, uint32_t now);
   void keep(const Running& done, Verdict verdict, uint32_t now);
 
-  ResultBook book;
+  ResultBook& book;
+  const Surroundings& surroundings;
   std::string junitPath;
   bool ended = false;
   Menu menu;

@@ -16,6 +16,8 @@ struct Options {
   std::string shot = {};     // draw once, write this PNG file and end; empty: no
   std::string results = {};  // the JSON file that keeps the verdicts; empty: none
   std::string junit = {};    // the same as a report for a CI system; empty: none
+  std::string log = {};      // the file that the log viewer shows; empty: the program's own log
+  std::string shell = "uname -a";  // what the shell runs, for /bin/sh
 };
 
 using Arguments = std::span<const char* const>;

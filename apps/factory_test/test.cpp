@@ -27,9 +27,11 @@ const char* nameOf(Group group) {
   switch (group) {
     case Group::Display: return "Display";
     case Group::Input: return "Input";
-    case Group::Widgets: break;
+    case Group::Widgets: return "Widgets";
+    case Group::Dialogs: return "Dialogs";
+    case Group::Reports: break;
   }
-  return "Widgets";
+  return "Reports";
 }
 
 }  // namespace factory_test

@@ -3,7 +3,10 @@
 
 #include <cstdint>
 #include <memory>
+#include <type_traits>
 #include <vector>
+
+#include "surroundings.h"
 
 namespace factory_test {
 
@@ -29,7 +32,7 @@ class Test {
   virtual void update(uint32_t now) { static_cast<void>(now); }
 };
 
-enum class Group { Display, Input, Widgets };
+enum class Group { Display, Input, Widgets, Dialogs, Reports };
 
 /// A line of the menu.
 struct TestEntry {
@@ -37,7 +40,7 @@ struct TestEntry {
   int place;         ///< within the group, from 0
   const char* id;    ///< what results call it; never changes
   const char* name;  ///< what the menu calls it
-  std::unique_ptr<Test> (*make)();
+  std::unique_ptr<Test> (*make)(const Surroundings& program);
 };
 
 /// A test's own line, in the test's file. It stands at namespace scope:
@@ -48,9 +51,14 @@ class TestRegistration {
   explicit TestRegistration(const TestEntry& entry);
 };
 
+/// Kinds that need something of the program are constructed with its Surroundings.
 template <typename Kind>
-std::unique_ptr<Test> makeTest() {
-  return std::make_unique<Kind>();
+std::unique_ptr<Test> makeTest(const Surroundings& program) {
+  if constexpr (std::is_constructible_v<Kind, const Surroundings&>) {
+    return std::make_unique<Kind>(program);
+  } else {
+    return std::make_unique<Kind>();
+  }
 }
 
 /// All of them, by group and place.

@@ -30,6 +30,11 @@ const char* brimol_host_help(void);
 /* Non-zero once the user has asked to close the window. */
 int brimol_host_close_requested(void);
 
+/* Lights the screen with so many per cent of its full light, 0 to 100 and nothing beyond, from the
+ * next frame that ends; a screen opens with 100. Screenshots show it too. Nothing happens where no
+ * screen is open. */
+void brimol_host_set_brightness(int percent);
+
 /* Waits until the newest ended frame is painted and writes it as a PNG file in full size. Returns
  * 1, or 0 when there is no open screen or the file cannot be written; brimol_host_error() says why.
  */

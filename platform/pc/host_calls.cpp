@@ -60,6 +60,10 @@ const char* brimol_host_help() {
   return text.c_str();
 }
 
+void brimol_host_set_brightness(int percent) {
+  if (const auto platform = openedPlatform()) platform->setBrightness(percent);
+}
+
 int brimol_host_close_requested() {
   const auto platform = openedPlatform();
   return platform && platform->isCloseRequested() ? 1 : 0;

@@ -1,5 +1,7 @@
 #include "platform.h"
 
+#include <cstdio>
+#include <cstdlib>
 #include <utility>
 
 #include "painter.h"
@@ -19,10 +21,33 @@ CairoSurface copyOf(cairo_surface_t* picture) {
   return copy;
 }
 
+// What takes so many per cent of a screen's light away.
+SKIA_Item veilOver(Size screen, int percent) {
+  constexpr int kOpaqueAlpha = 255;
+  constexpr int kWhole = 100;
+  constexpr int kAlphaShift = 24;
+  const auto alpha = static_cast<uint32_t>(percent * kOpaqueAlpha / kWhole);
+  return {SKIA_BOX, {0, 0, screen.w, screen.h, alpha << kAlphaShift}, {}, {}};
+}
+
+constinit thread_local bool isPlatformThread = false;
+
+// A lost X server makes its library end the process from the platform's thread, while the others
+// still run: they must not meet what the end of the process destroys. Registered as late as the
+// first screen opens, it comes before all that.
+void endAtOnceOnPlatformThread() {
+  [[maybe_unused]] static const int registered = std::atexit([] {
+    if (!isPlatformThread) return;
+    std::fflush(nullptr);
+    std::_Exit(EXIT_FAILURE);
+  });
+}
+
 }  // namespace
 
 std::shared_ptr<Platform> Platform::open(const Settings& settings, InputService& service,
                                          std::string& error) {
+  endAtOnceOnPlatformThread();
   std::shared_ptr<Platform> platform(new Platform(settings, service));
   std::promise<std::string> opened;
   std::future<std::string> outcome = opened.get_future();
@@ -35,8 +60,6 @@ std::shared_ptr<Platform> Platform::open(const Settings& settings, InputService&
 
 void Platform::close() {
   if (!thread.joinable()) return;
-  // A lost X server makes its library end the process from here.
-  if (thread.get_id() == std::this_thread::get_id()) return thread.detach();
   addWork([this](Work&) { isOver = true; });
   thread.join();
   for (auto& picture : waiting.pictures) picture.set_value(nullptr);
@@ -44,6 +67,8 @@ void Platform::close() {
 }
 
 void Platform::submit(Frame&& frame) {
+  const int light = brightness;
+  if (light < kFullLight) frame.push_back(veilOver(settings.screen, kFullLight - light));
   addWork([&frame](Work& work) {
     if (!work.frame) work.frame.emplace();
     work.frame->swap(frame);  // what is overtaken is freed by the caller, outside the lock
@@ -85,6 +110,7 @@ void Platform::setDisplay(Display* display) {
 }
 
 void Platform::run(std::promise<std::string> opened) {
+  isPlatformThread = true;
   InputTranslator input(settings.screen, service);
   const OpenedDisplay outcome = openDisplay(settings, input, service);
   if (!outcome.display) {

@@ -1,6 +1,7 @@
 /// The platform's own thread: it owns the display and the painter.
 #pragma once
 
+#include <algorithm>
 #include <atomic>
 #include <chrono>
 #include <functional>
@@ -36,14 +37,18 @@ class Platform {
   Platform(const Platform&) = delete;
   Platform& operator=(const Platform&) = delete;
 
-  /// Closes the display and ends the thread. Who waits for a picture gets none. One thread at a
-  /// time may close; a second time does nothing, and so does the platform's own thread.
+  /// Closes the display and ends the thread. Who waits for a picture gets none. One of the other
+  /// threads at a time may close; a second time does nothing.
   void close();
 
   Size screen() const { return settings.screen; }
 
   /// Has `frame` shown in place of one that still waits. Never waits itself.
   void submit(Frame&& frame);
+
+  /// Darkens the frames that are submitted from now on. Full light is 100 per cent, none is 0, and
+  /// what lies beyond is taken for the nearest.
+  void setBrightness(int percent) { brightness = std::clamp(percent, 0, kFullLight); }
 
   /// A copy of the picture as it is once the newest frame is painted and all actions are done. Null
   /// when that takes longer than `bound`, or when the platform closes.
@@ -63,6 +68,8 @@ class Platform {
     std::vector<std::promise<CairoSurface>> pictures;
   };
 
+  static constexpr int kFullLight = 100;  // per cent
+
   Platform(const Settings& wanted, InputService& target) : settings(wanted), service(target) {}
   void run(std::promise<std::string> opened);
   void serve(Display& display, InputTranslator& input);
@@ -74,6 +81,7 @@ class Platform {
   const Settings settings;
   InputService& service;
   std::atomic<bool> closeRequested = false;  // written by the platform's thread; orders nothing
+  std::atomic<int> brightness = kFullLight;  // per cent; orders nothing
 
   std::mutex mutex;  // guards the three below
   bool isOver = false;

@@ -21,8 +21,7 @@ inline constexpr MenuRow kKeys = {2, 2};
 inline constexpr MenuRow kButtons = {3, 3};
 inline constexpr MenuRow kSwitches = {3, 4};
 inline constexpr MenuRow kTimed = {3, 5};
-inline constexpr MenuRow kDialogs = {3, 6};
-inline constexpr MenuRow kLeave = {4, 7};
+inline constexpr MenuRow kDialogs = {4, 6};
 
 constexpr SKIA_Rect areaOf(const MenuRow& row) {
   constexpr int kListTop = 510;  // of MW::MainList with its extended header

@@ -65,13 +65,13 @@ TEST_F(HeadlessApplication, IsDoneByTouchAlone) {
     User::click(kPass);
     EXPECT_TRUE(User::sees(areaOf(kSwitches), kPassColor));
 
-    User::click(areaOf(kDialogs));
+    User::start("prompts");
     EXPECT_TRUE(User::sees(kDialogOk, MW::kColorWhite));
     User::click(kCentre);
     User::click(kDialogCancel);
     EXPECT_TRUE(User::reads("Did all dialogs look right?"));
     User::click(kPass);
-    EXPECT_TRUE(User::sees(areaOf(kDialogs), kPassColor));
+    EXPECT_TRUE(User::seesMenu());
   });
   EXPECT_EQ(code, EXIT_SUCCESS);
   EXPECT_EQ(verdictsIn(results), "colours PASS\ntouch FAIL\nswitches PASS\nprompts PASS\n");
@@ -80,11 +80,7 @@ TEST_F(HeadlessApplication, IsDoneByTouchAlone) {
 
 TEST_F(HeadlessApplication, IsDoneByKeysAlone) {
   const int code = runWith({"--results", results}, [] {
-    const auto choose = [](int entry) {
-      for (int i = 0; i <= entry; ++i) User::key(SDLK_DOWN);
-      User::key(SDLK_RETURN);
-    };
-    choose(0);  // the colours
+    User::start("colours");
     EXPECT_TRUE(User::sees(kCentre, MW::kColorWhite));
     User::key(SDLK_RIGHT);
     EXPECT_TRUE(User::sees(kCentre, 0xFFFF0000));
@@ -93,8 +89,7 @@ TEST_F(HeadlessApplication, IsDoneByKeysAlone) {
     for (const SDL_Keycode key : {SDLK_RIGHT, SDLK_RIGHT, SDLK_RIGHT, SDLK_RETURN}) User::key(key);
     EXPECT_TRUE(User::sees(areaOf(kColours), kFailColor));
 
-    // The mark stands where it was: two entries on are the keys.
-    for (const SDL_Keycode key : {SDLK_DOWN, SDLK_DOWN, SDLK_RETURN}) User::key(key);
+    User::start("keys");  // the mark stands where it was
     EXPECT_TRUE(User::sees(cellOf(kScreen, kKeyGrid, 0, 0), kButtonColor));
     for (const SDL_Keycode key : {SDLK_UP, SDLK_DOWN, SDLK_LEFT, SDLK_RIGHT, SDLK_RETURN, SDLK_h,
                                   SDLK_PAGEUP, SDLK_PAGEDOWN, SDLK_p, SDLK_HOME, SDLK_HOME}) {
@@ -105,7 +100,7 @@ TEST_F(HeadlessApplication, IsDoneByKeysAlone) {
     EXPECT_TRUE(User::seesMenu()) << "it passes by itself";
     EXPECT_TRUE(User::sees(areaOf(kKeys), kPassColor));
 
-    for (const SDL_Keycode key : {SDLK_DOWN, SDLK_DOWN, SDLK_RETURN}) User::key(key);
+    User::start("switches");
     EXPECT_TRUE(User::reads(""));
     User::key(SDLK_UP);
     EXPECT_TRUE(User::reads("Right"));

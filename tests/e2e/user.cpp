@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <chrono>
 #include <cstdlib>
 #include <stdexcept>
@@ -12,6 +13,7 @@
 #include "e2e/eventually.h"
 #include "open_platform.h"
 #include "options.h"
+#include "test.h"
 
 namespace factory_test {
 
@@ -49,9 +51,15 @@ bool isSame(const Picture& one, const Picture& other, const SKIA_Rect& area) {
 }  // namespace
 
 bool User::seesMenu() {
-  constexpr SKIA_Rect kHeader = {0, 0, kScreen.width, 1, 0};
+  constexpr SKIA_Rect kHeader = {0, 0, kScreen.width, 340, kOpaque};
+  constexpr SKIA_Rect kTitle = {0, 110, 370, 120, 0};
+  constexpr int kTitleSize = 70;
+  const SKIA_Item title = brimol::pc::textItem(
+      SKIA_TEXTBOX, kHeader,
+      brimol::pc::textOf("Factory test", kTitleSize, MW::kColorWhite, SKIA_ALIGN_LEFT));
+  const Picture expected = brimol::pc::painted({title}, kPixels);
   return eventually([] { return brimol::pc::openedPlatform() != nullptr; }) &&
-         sees(kHeader, MW::kColorBlack) && sees(areaOf(kLeave), 0xFF787878);
+         eventually([&] { return isSame(screen(), expected, kTitle); });
 }
 
 void User::down(const SKIA_Rect& area) {
@@ -88,6 +96,14 @@ void User::key(SDL_Keycode key) {
   });
 }
 
+void User::start(std::string_view test) {
+  const auto& entries = testEntries();
+  const auto place = std::ranges::find(entries, test, &TestEntry::id) - entries.begin();
+  for (; marked < place; ++marked) key(SDLK_DOWN);
+  for (; marked > place; --marked) key(SDLK_UP);
+  key(SDLK_RETURN);
+}
+
 bool User::sees(const SKIA_Rect& area, uint32_t colour) {
   const ScreenPoint place = {area.x + area.w / kInset, area.y + area.h / kInset};
   return eventually([&] { return (screen().at(place.x, place.y) | kOpaque) == colour; });
@@ -114,11 +130,12 @@ int runWith(const std::vector<std::string>& arguments, const std::function<void(
   std::string error;
   const auto options = parseOptions(given, error);
   if (!options) throw std::invalid_argument(error);
+  User::marked = -1;
   std::thread other([&] {
     EXPECT_TRUE(User::seesMenu());
     user();
     EXPECT_TRUE(User::seesMenu());
-    User::click(areaOf(kLeave));
+    User::key(SDLK_ESCAPE);
     EXPECT_TRUE(User::sees(kDialogOk, MW::kColorWhite));
     User::click(kDialogOk);
   });

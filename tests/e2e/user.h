@@ -7,6 +7,7 @@
 #include <cstdint>
 #include <functional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "pc/painting.h"
@@ -24,11 +25,18 @@ class User {
   static void click(const SKIA_Rect& area);
   static void dragFrom(const SKIA_Rect& area, int byX);
   static void key(SDL_Keycode key);
+  /// Starts the test of this name from the menu, by keys.
+  static void start(std::string_view test);
   /// Whether the area comes to have the colour, near its corner, where no text stands.
   static bool sees(const SKIA_Rect& area, uint32_t colour);
   /// Whether the line of a test's page comes to say the words.
   static bool reads(const std::string& words);
   static brimol::pc::Picture screen();
+
+ private:
+  friend int runWith(const std::vector<std::string>&, const std::function<void()>&);
+
+  inline static int marked = -1;  // the entry of the menu that the keys have come to; -1: none
 };
 
 /// Runs the application on this thread, as its main function does, and the user on another, who

@@ -154,7 +154,7 @@ TEST_F(WindowApplication, IsUsedByMouseAndByKeyboard) {
   keys("Right Return");
   EXPECT_TRUE(comesToSee(areaOf(kDialogs), kPassColor));
 
-  mouse(areaOf(kLeave), "click 1");
+  keys("Escape");
   EXPECT_TRUE(comesToSee(kDialogOk, MW::kColorWhite));
   mouse(kDialogOk, "click 1");
   EXPECT_EQ(program.waitForEnd(), EXIT_SUCCESS);

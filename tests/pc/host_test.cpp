@@ -171,6 +171,19 @@ TEST_F(HostTest, ShowsTheNewestFrameAndKeepsNobodyWaiting) {
   EXPECT_EQ(screen(), painted(kBlueFrame, kScreen));
 }
 
+TEST_F(HostTest, LightsTheScreenAsItIsTold) {
+  brimol_host_set_brightness(50);
+  ASSERT_EQ(brimol_host_open(), 1);
+  const auto lightAt = [](int percent) {
+    brimol_host_set_brightness(percent);
+    show({boxItem({0, 0, 200, 300, kWhite})});
+    return screen().at(100, 100) & 0xFF;
+  };
+  EXPECT_EQ(lightAt(101), 255);
+  EXPECT_NEAR(lightAt(60), 153, 1);
+  EXPECT_EQ(lightAt(-1), 0);
+}
+
 TEST_F(HostTest, AnswersWhoWaitsForAPictureAsItCloses) {
   ASSERT_EQ(brimol_host_open(), 1);
   const auto platform = openedPlatform();

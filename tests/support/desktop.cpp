@@ -3,6 +3,8 @@
 #include <X11/Xlib.h>
 #include <X11/Xutil.h>
 
+#include <stdexcept>
+
 namespace brimol::test {
 
 namespace {
@@ -23,7 +25,9 @@ struct Desktop::Server {
   std::unique_ptr<Display, Close> display{XOpenDisplay(nullptr)};
 };
 
-Desktop::Desktop() : server(std::make_unique<Server>()) {}
+Desktop::Desktop() : server(std::make_unique<Server>()) {
+  if (!server->display) throw std::runtime_error("there is no X server");
+}
 Desktop::~Desktop() = default;
 
 Desktop::Place Desktop::findWindow() const {

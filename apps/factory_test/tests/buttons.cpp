@@ -9,9 +9,8 @@
 
 #include "current.h"
 #include "layout.h"
-#include "page.h"
+#include "page_test.h"
 #include "pictures.h"
-#include "test.h"
 
 namespace factory_test {
 
@@ -27,8 +26,10 @@ constexpr uint32_t kRulerColor = 0xFF4C5870;
 constexpr int kColumns = 3;
 
 /// Press, click, long press, double click and delayed show, each counted on the line.
-class ButtonTest : public Test {
+class ButtonTest : public PageTest {
  public:
+  ButtonTest() : PageTest("Buttons", "Use every button as it says.") {}
+
   void enter() override {
     page.ask();
     placePrimitives();
@@ -40,8 +41,6 @@ class ButtonTest : public Test {
     MW::WidgetList::destroy();
     page.endAsking();
   }
-
-  Outcome verdict() const override { return page.outcome(); }
 
   void draw() override {
     page.draw();
@@ -110,7 +109,6 @@ class ButtonTest : public Test {
 
   Current<ButtonTest> current{this};
   std::array<unsigned int, kButtonCount> counts = {};  // dispatch thread
-  Page page{"Buttons", "Use every button as it says."};
   std::array<std::optional<Button>, kButtonCount> buttons;
 };
 

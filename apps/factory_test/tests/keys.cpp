@@ -9,8 +9,7 @@
 
 #include "current.h"
 #include "layout.h"
-#include "page.h"
-#include "test.h"
+#include "page_test.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -41,8 +40,13 @@ constexpr auto kAsked = std::to_array<KeyName>({
 });
 
 /// All that was asked for passes by itself. The back key three times in a row fails.
-class KeyTest : public Test {
+class KeyTest : public PageTest {
  public:
+  KeyTest()
+      : PageTest("Keys",
+                 "Press every key once, one key twice\nand one three times in a row.\n"
+                 "Back three times: FAIL.") {}
+
   void enter() override {
     page.ask(VerdictBar::Keys::Free);
     key.emplace();
@@ -87,9 +91,6 @@ class KeyTest : public Test {
   Current<KeyTest> current{this};
   std::atomic<bool> failed = false;
   std::array<std::atomic<bool>, kAsked.size()> pressed = {};
-  Page page{"Keys",
-            "Press every key once, one key twice\nand one three times in a row.\n"
-            "Back three times: FAIL."};
   std::optional<MW::Key> key;
 };
 

@@ -7,8 +7,7 @@
 #include <optional>
 
 #include "current.h"
-#include "page.h"
-#include "test.h"
+#include "page_test.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -20,25 +19,20 @@ constexpr int kLastKind = 39;
 
 /// A touch, the right key or select shows the next kind, the left key the one before. The right
 /// button, and back, end the look, and the verdict is asked for.
-class PromptTest : public Test {
+class PromptTest : public LookTest {
  public:
-  void enter() override { showDialog(); }
+  PromptTest()
+      : LookTest("Prompts", "Touch for the next dialog;\nthe right button ends.",
+                 "Did all dialogs look right?") {}
 
-  void leave() override {
-    page.endAsking();
-    dialog.reset();
-  }
+ protected:
+  void beginLook() override { showDialog(); }
 
-  Outcome verdict() const override { return page.outcome(); }
+  void endLook() override { dialog.reset(); }
 
-  void draw() override { page.draw(); }
-
-  void update(uint32_t) override {
-    if (page.isAsking()) return;
-    if (looked || kind > kLastKind) {
-      dialog.reset();
-      page.ask();
-      page.say("Did all dialogs look right?");
+  void updateLook() override {
+    if (kind > kLastKind) {
+      finishLook();
     } else if (kind != shown) {
       showDialog();
     }
@@ -50,7 +44,7 @@ class PromptTest : public Test {
     shown = kind.load();
     MW::Dialog& made = dialog.emplace(shown.load());
     made.clickCallback = [](MW::mouse_event*) { Current<PromptTest>::get().move(1); };
-    made.button2Callback = [](int) { Current<PromptTest>::get().looked = true; };
+    made.button2Callback = [](int) { Current<PromptTest>::get().finishLook(); };
     made.hookKeyCallback = [](int) { Current<PromptTest>::get().move(1); };
     made.keyPressCallback = [](MW::kbd_event* event) {
       Current<PromptTest>::get().followKey(event->code);
@@ -64,7 +58,7 @@ class PromptTest : public Test {
   void followKey(unsigned int code) {
     if (code == MW::kKeyRight || code == MW::kKeyDown || code == MW::kKeySelect) move(1);
     if (code == MW::kKeyLeft || code == MW::kKeyUp) move(-1);
-    if (code == kKeyBack) looked = true;
+    if (code == kKeyBack) finishLook();
   }
 
   void move(int by) {
@@ -73,14 +67,12 @@ class PromptTest : public Test {
   }
 
   Current<PromptTest> current{this};
-  std::atomic<bool> looked = false;
   std::atomic<int> kind = kFirstKind;   // wanted by the user
   std::atomic<int> shown = kFirstKind;  // on the screen
-  Page page{"Prompts", "Touch for the next dialog;\nthe right button ends."};
   std::optional<MW::Dialog> dialog;
 };
 
-const TestRegistration kRegistration({Group::Widgets, 3, "prompts", "Dialogs",
+const TestRegistration kRegistration({Group::Dialogs, 0, "prompts", "Built-in dialogs",
                                       makeTest<PromptTest>});
 
 }  // namespace

@@ -5,8 +5,7 @@
 
 #include "current.h"
 #include "layout.h"
-#include "page.h"
-#include "test.h"
+#include "page_test.h"
 
 namespace factory_test {
 
@@ -17,8 +16,13 @@ constexpr int kHalfTravel = 2;
 constexpr int kRightBit = 1;
 
 /// Tells every change. A double tap unlocks the third switch; the up key moves the others.
-class SwitchTest : public Test {
+class SwitchTest : public PageTest {
  public:
+  SwitchTest()
+      : PageTest("Switches",
+                 "Drag the switches to and fro.\nTap the locked one twice to unlock it.\n"
+                 "Key up moves the first two.") {}
+
   void enter() override {
     page.ask().otherKey = [](unsigned int code) {
       if (code == MW::kKeyUp) Current<SwitchTest>::get().moveAll();
@@ -36,10 +40,6 @@ class SwitchTest : public Test {
     full.reset();
     page.endAsking();
   }
-
-  Outcome verdict() const override { return page.outcome(); }
-
-  void draw() override { page.draw(); }
 
  private:
   template <typename Kind>
@@ -67,9 +67,6 @@ class SwitchTest : public Test {
   }
 
   Current<SwitchTest> current{this};
-  Page page{"Switches",
-            "Drag the switches to and fro.\nTap the locked one twice to unlock it.\n"
-            "Key up moves the first two."};
   std::optional<MW::Slide> full;
   std::optional<MW::SlideV> half;
   std::optional<MW::Slide> locked;

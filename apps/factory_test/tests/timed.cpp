@@ -7,8 +7,7 @@
 
 #include "current.h"
 #include "layout.h"
-#include "page.h"
-#include "test.h"
+#include "page_test.h"
 
 namespace factory_test {
 
@@ -19,8 +18,12 @@ constexpr int kProgressMs = 3000;
 constexpr uint32_t kToastColor = 0xFF505A6C;
 
 /// Two buttons, or the keys up and down, start them.
-class TimedTest : public Test {
+class TimedTest : public PageTest {
  public:
+  TimedTest()
+      : PageTest("Toast and progress",
+                 "Each button shows something for a while.\nKey up: toast. Key down: progress.") {}
+
   void enter() override {
     page.ask().otherKey = [](unsigned int code) { Current<TimedTest>::get().followKey(code); };
     const ScreenSize screen = screenSize();
@@ -40,10 +43,6 @@ class TimedTest : public Test {
     toastButton.reset();
     page.endAsking();
   }
-
-  Outcome verdict() const override { return page.outcome(); }
-
-  void draw() override { page.draw(); }
 
  private:
   static void placeButton(std::optional<MW::Button>& button, const SKIA_Rect& area,
@@ -79,8 +78,6 @@ class TimedTest : public Test {
   }
 
   Current<TimedTest> current{this};
-  Page page{"Toast and progress",
-            "Each button shows something for a while.\nKey up: toast. Key down: progress."};
   std::optional<MW::Button> toastButton;
   std::optional<MW::Button> progressButton;
   std::optional<MW::Toastbox> toast;

@@ -9,8 +9,7 @@
 
 #include "current.h"
 #include "layout.h"
-#include "page.h"
-#include "test.h"
+#include "page_test.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -22,27 +21,11 @@ constexpr int kCrossWidth = 3;  // pixels
 
 /// Shows the coordinates of every touch, with a cross through the last one. A double tap, or the
 /// select key, ends the look, and the verdict is asked for.
-class TouchTest : public Test {
+class TouchTest : public LookTest {
  public:
-  void enter() override {
-    touch.emplace();
-    touch->pressCallback = [](MW::mouse_event* mouse) { self().tell("Press", *mouse); };
-    touch->hoverCallback = [](MW::mouse_event* mouse) { self().tell("Move", *mouse); };
-    touch->clickCallback = [](MW::mouse_event* mouse) { self().tell("Lift", *mouse); };
-    touch->longPressCallback = [](MW::mouse_event* mouse) { self().tell("Long press", *mouse); };
-    touch->doubleClickCallback = [](int) { self().looked = true; };
-    touch->setActive(1);
-    key.emplace().keyPressCallback = [](MW::kbd_event* event) {
-      if (event->code == MW::kKeySelect || event->code == kKeyBack) self().looked = true;
-    };
-  }
-
-  void leave() override {
-    page.endAsking();
-    endLook();
-  }
-
-  Outcome verdict() const override { return page.outcome(); }
+  TouchTest()
+      : LookTest("Touch", "Touch and drag everywhere.\nTap twice in one place to end.",
+                 "Double tap. Was every touch met?") {}
 
   void draw() override {
     page.drawGround();
@@ -50,20 +33,27 @@ class TouchTest : public Test {
     page.drawFront();
   }
 
-  void update(uint32_t) override {
-    if (!looked || page.isAsking()) return;
-    endLook();
-    page.ask();
-    page.say("Double tap. Was every touch met?");
+ protected:
+  void beginLook() override {
+    touch.emplace();
+    touch->pressCallback = [](MW::mouse_event* mouse) { self().tell("Press", *mouse); };
+    touch->hoverCallback = [](MW::mouse_event* mouse) { self().tell("Move", *mouse); };
+    touch->clickCallback = [](MW::mouse_event* mouse) { self().tell("Lift", *mouse); };
+    touch->longPressCallback = [](MW::mouse_event* mouse) { self().tell("Long press", *mouse); };
+    touch->doubleClickCallback = [](int) { self().finishLook(); };
+    touch->setActive(1);
+    key.emplace().keyPressCallback = [](MW::kbd_event* event) {
+      if (event->code == MW::kKeySelect || event->code == kKeyBack) self().finishLook();
+    };
+  }
+
+  void endLook() override {
+    key.reset();
+    touch.reset();
   }
 
  private:
   static TouchTest& self() { return Current<TouchTest>::get(); }
-
-  void endLook() {
-    key.reset();
-    touch.reset();
-  }
 
   void drawCross() const {
     const ScreenSize screen = screenSize();
@@ -83,10 +73,8 @@ class TouchTest : public Test {
   }
 
   Current<TouchTest> current{this};
-  std::atomic<bool> looked = false;
   std::atomic<int> x = -1;  // pixels; -1: not touched yet
   std::atomic<int> y = -1;
-  Page page{"Touch", "Touch and drag everywhere.\nTap twice in one place to end."};
   std::optional<MW::Screen> touch;
   std::optional<MW::Key> key;
 };
