@@ -3,12 +3,16 @@
 
 #include <MW/button.h>
 #include <MW/button3.h>
+#include <MW/button8.h>
+#include <MW/button_face.h>
+#include <MW/button_s.h>
 #include <MW/c_api.h>
 #include <MW/callback.h>
 #include <MW/dialog.h>
 #include <MW/event_service.h>
 #include <MW/key.h>
 #include <MW/main_list.h>
+#include <MW/mpd_wid.h>
 #include <MW/primitives.h>
 #include <MW/push_button.h>
 #include <MW/records.h>

@@ -15,14 +15,6 @@ class MW_API Button : public PushButton {
   using PushButton::show;
   /// One button box, unless a delayed show is pending. Returns 1.
   int show(unsigned int ticks) override;
-  char* getText() override;
-  unsigned int getTextColor() override;
-  int getFontSize() override;
-  void setFontSize(int pixels) override;
-  void setText(const char* newText) override;
-  void setTextColor(unsigned int color) override;
-  /// Moves and resizes it; the colour and the first argument are not read. Null: no change.
-  void setRect(int variant, const SKIA_Rect* newRect) override;
 };
 
 }  // namespace MW

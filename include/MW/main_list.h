@@ -153,7 +153,6 @@ class MW_API MainList : public Widget {
  private:
   template <typename Change>
   void changeItem(int item, Change change);
-  bool isTouched(const event_data* event) const;
   bool isClicked(int item) const;
   int64_t contentHeight() const;
   int64_t heightUpTo(int end) const;

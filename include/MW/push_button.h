@@ -1,14 +1,15 @@
 /// What the push buttons have in common.
 #pragma once
 
+#include <MW/button_face.h>
 #include <MW/detail/delayed_show.h>
 #include <MW/detail/double_tap.h>
-#include <MW/widget.h>
 
 namespace MW {
 
-/// A face that turns kColorHighlight while a finger holds it. Button and Button3 say what stands on
-/// it and where; this class is not used by itself.
+/// A face that a finger presses, and that turns kColorHighlight meanwhile where its class does not
+/// say otherwise. Button, Button3, ButtonS and ButtonNew say what stands on it and where; this
+/// class is not used by itself.
 ///
 /// A button enters the base layer when it is constructed, inactive, and stays there until it is
 /// deleted or unregistered. A finger that presses it holds it until it lifts, wherever it moves;
@@ -17,7 +18,7 @@ namespace MW {
 /// Callbacks, each a function of one int that is called with 0 on the dispatch thread:
 /// `pressCallback`; `clickCallback`, released inside; `longPressCallback`, which also ends the
 /// hold; `doubleClickCallback`, the second of two clicks of which each step took under 500 ms.
-class MW_API PushButton : public Widget {
+class MW_API PushButton : public ButtonFace {
  public:
   using Widget::show;
   /// show(0): draws unless a delayed show is pending. Returns 1.
@@ -27,33 +28,32 @@ class MW_API PushButton : public Widget {
   /// Makes it inactive and free, in its normal colour. Asks for no redraw. Returns 1.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// The colour it has now: the highlight while it is held.
-  unsigned int getBgColor() override;
-  SKIA_Rect* getPositionAndSize() override;
   /// Makes it active now, but visible and sensitive only in `ms` milliseconds.
   void onShowTimer(int ms) override;
   void onPress(event_data* event) override;
   void onRelease(event_data* event) override;
   void onPressLong(event_data* event) override;
   void onTouchClickCount() override;
-  /// Takes the highlight away, and asks for a redraw if there was one.
-  void restoreColor() override;
 
  protected:
-  /// `logWord` speaks in the log and is a literal. The button is not registered yet.
-  explicit PushButton(const char* logWord);
+  using ButtonFace::ButtonFace;
 
-  unsigned int normalColor = 0;  // 0xAARRGGBB; guarded by stateLock
-  DelayedShow delayedShow;       // guarded by stateLock
-  DoubleTap clicks;              // dispatch thread
+  /// Whether an event is the button's at all: one inside, or any while it is held.
+  bool isReachedBy(const event_data* event) const;
+  bool isInside(const event_data* event) const;
+  /// Passes a press, release or long press to its operation. False: it is another event.
+  bool handleGesture(event_data* event);
+  /// What every press does: the finger takes the button, and the application is told.
+  void holdBy(const event_data* event);
+  /// What every release does inside: a click, and perhaps a double click. The button may be gone
+  /// afterwards.
+  void clickAt(const event_data* event);
+
+  DelayedShow delayedShow;  // guarded by stateLock
+  DoubleTap clicks;         // dispatch thread
 
  private:
   bool moveAcross(event_data* event);
-  bool isInside(const event_data* event) const;
-  void setFace(unsigned int color);
-  void restoreFace();
-
-  const char* word;
 };
 
 }  // namespace MW

@@ -166,7 +166,7 @@ class MW_API Widget {
   SKIA_Rect rect = {};
   SKIA_Text text = {};
   SKIA_Point point = {};
-  int buttonType = 0;
+  std::atomic<int> buttonType = 0;
   std::atomic<int> id_ = 0;          // Window writes it under the layer lock
   std::atomic<bool> active = false;  // publishes to a walk what was set before
   std::atomic<int> select = 0;

@@ -1,4 +1,3 @@
-#include <MW/event_service.h>
 #include <MW/main_list.h>
 #include <MW/window.h>
 
@@ -10,6 +9,7 @@
 #include "core/class_log.h"
 #include "core/geometry.h"
 #include "core/life_guard.h"
+#include "lists/list_input.h"
 #include "lists/main_list_tables.h"
 
 namespace MW {
@@ -237,7 +237,7 @@ bool MainList::onRecvEvent(event_data* event, unsigned int) {
     case kEventKeyRelease: onReleaseKey(event->key); return true;
     default: break;
   }
-  if (!isTouched(event)) return false;
+  if (!takesTouch(*event, select, read(listRect), kLog)) return false;
   switch (event->type) {
     case kEventMotion: onHover(event->mouse); return true;
     case kEventPress: onPress(event->mouse); return true;
@@ -246,27 +246,13 @@ bool MainList::onRecvEvent(event_data* event, unsigned int) {
   }
 }
 
-// A finger that holds the list is followed wherever it moves, and keeps all others from it.
-bool MainList::isTouched(const event_data* event) const {
-  const bool isDrag = event->type >= kEventMotion && event->type <= kEventRelease;
-  if (isDrag && select != 0 && select != static_cast<int>(event->mouse.finger + 1)) {
-    if (event->type != kEventMotion) {
-      kLog.print(LogLevel::Debug, "onRecvEvent-> T:%d, F:%d", event->type,
-                 static_cast<int>(event->mouse.finger));
-    }
-    return false;
-  }
-  const SKIA_Rect area = read(listRect);
-  return select != 0 || EventService::isMouseEventForMe(&area, event);
-}
-
 void MainList::onPressKey(kbd_event key) {
-  kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
+  logKeyPress(kLog, key);
   if (auto* const call = keyPressCallback) call(&key, this);
 }
 
 void MainList::onReleaseKey(kbd_event key) {
-  kLog.print(LogLevel::Debug, "key onReleaseKey sym = %d", static_cast<int>(key.code));
+  logKeyRelease(kLog, key);
   if (auto* const call = keyReleaseCallback) call(&key, this);
 }
 
@@ -319,9 +305,8 @@ int MainList::position2index(mouse_event mouse) {
   for (const Item& item : rows) {
     if (item.kind == kEnd) return kNoItem;
     const int64_t bottom = y + item.height;
-    kLog.print(LogLevel::Debug, "position2index= %04d < %04d > %04d", toPixels(y), mouse.y,
-               toPixels(bottom));
-    if (y < mouse.y && mouse.y < bottom) return index;
+    logRow(kLog, y, mouse, bottom);
+    if (isOnRow(y, mouse, bottom)) return index;
     y = bottom + kItemGap;
     ++index;
   }

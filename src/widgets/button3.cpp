@@ -97,7 +97,7 @@ Button3::Button3(int position, const SKIA_Text* first, int bottom)
     : Button3(position, first, nullptr, bottom) {}
 
 Button3::Button3(int position, const SKIA_Text* first, const SKIA_Text* second, int bottom)
-    : PushButton("BUTTON3"), bottomOffset(bottom) {
+    : PushButton("BUTTON3", nullptr, nullptr), bottomOffset(bottom) {
   text.color = kColorBlue;  // the button box's own text, which stays empty
   if (first != nullptr) captionCount = 1;
   if (second != nullptr) captionCount = 2;

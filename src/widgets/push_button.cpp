@@ -12,8 +12,6 @@ namespace {
 constexpr int kRedraw = 1;
 }  // namespace
 
-PushButton::PushButton(const char* logWord) : word(logWord) { type_ = kBaseLayer; }
-
 int PushButton::show() { return show(0); }
 
 void PushButton::updateTimer(unsigned int ticks) {
@@ -27,11 +25,22 @@ int PushButton::hide() {
 }
 
 bool PushButton::onRecvEvent(event_data* event, unsigned int) {
-  if (event == nullptr || read(delayedShow).isPending()) return false;
-  // A held button follows every finger, wherever it is.
-  if (select == 0 && !isInside(event)) return false;
+  if (!isReachedBy(event)) return false;
+  return event->type == kEventMotion ? moveAcross(event) : handleGesture(event);
+}
+
+// A held button follows every finger, wherever it is.
+bool PushButton::isReachedBy(const event_data* event) const {
+  return event != nullptr && !read(delayedShow).isPending() && (select != 0 || isInside(event));
+}
+
+bool PushButton::isInside(const event_data* event) const {
+  const SKIA_Rect area = read(rect);
+  return EventService::isMouseEventForMe(&area, event);
+}
+
+bool PushButton::handleGesture(event_data* event) {
   switch (event->type) {
-    case kEventMotion: return moveAcross(event);
     case kEventPress: onPress(event); return true;
     case kEventRelease: onRelease(event); return true;
     case kEventLongPress: onPressLong(event); return true;
@@ -46,9 +55,6 @@ bool PushButton::moveAcross(event_data* event) {
   return true;
 }
 
-unsigned int PushButton::getBgColor() { return read(rect.color); }
-SKIA_Rect* PushButton::getPositionAndSize() { return &rect; }
-
 void PushButton::onShowTimer(int ms) {
   const unsigned int now = GetTicks();
   {
@@ -62,7 +68,11 @@ void PushButton::onShowTimer(int ms) {
 void PushButton::onPress(event_data* event) {
   if (event == nullptr) return;
   ClassLog(word).print(LogLevel::Debug, "pressed!!");
-  setFace(kColorHighlight);
+  write(rect.color, kColorHighlight);
+  holdBy(event);
+}
+
+void PushButton::holdBy(const event_data* event) {
   select = static_cast<int>(event->mouse.finger + 1);
   const LifeGuard self(this);
   pressCallback(0);
@@ -73,12 +83,15 @@ void PushButton::onRelease(event_data* event) {
   const ClassLog log(word);
   select = 0;
   restoreFace();
-  if (isInside(event)) {
-    const LifeGuard self(this);
-    clickCallback(0);
-    if (self.isAlive() && doubleClickCallback && clicks.isRunning()) onTouchClickCount();
-  }
+  clickAt(event);
   log.print(LogLevel::Debug, "released!!");
+}
+
+void PushButton::clickAt(const event_data* event) {
+  if (!isInside(event)) return;
+  const LifeGuard self(this);
+  clickCallback(0);
+  if (self.isAlive() && doubleClickCallback && clicks.isRunning()) onTouchClickCount();
 }
 
 void PushButton::onPressLong(event_data*) {
@@ -97,24 +110,6 @@ void PushButton::onTouchClickCount() {
   if (count == 0) return;
   ClassLog(word).print(LogLevel::Debug, "onTouchClickCount!! %d", count);
   if (count == DoubleTap::kDouble) doubleClickCallback(0);
-}
-
-void PushButton::restoreColor() {
-  if (getBgColor() == read(normalColor)) return;
-  restoreFace();
-  EventService_AppEvent_c(kRedraw);
-}
-
-bool PushButton::isInside(const event_data* event) const {
-  const SKIA_Rect area = read(rect);
-  return EventService::isMouseEventForMe(&area, event);
-}
-
-void PushButton::setFace(unsigned int color) { write(rect.color, color); }
-
-void PushButton::restoreFace() {
-  const std::lock_guard guard(stateLock);
-  rect.color = normalColor;
 }
 
 }  // namespace MW

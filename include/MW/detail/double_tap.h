@@ -14,10 +14,12 @@ class DoubleTap {
 
   /// A press: forgets a tap that lies too far back, and starts the time when none runs.
   constexpr void press(uint32_t now) {
-    if (time != 0 && time < now - kWindowMs) reset();
+    if (isStale(now)) reset();
     if (time == 0) time = now;
   }
   constexpr bool isRunning() const { return time != 0; }
+  /// Whether the last tap lies too far back to be one of two.
+  constexpr bool isStale(uint32_t now) const { return time != 0 && time < now - kWindowMs; }
   /// A completed tap: how many there were in a row, or 0 when it came too late, which starts over.
   constexpr int tap(uint32_t now) {
     if (now >= time + kWindowMs) {

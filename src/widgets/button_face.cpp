@@ -1,0 +1,58 @@
+#include <MW/button_face.h>
+#include <MW/c_api.h>
+#include <MW/window.h>
+
+#include "core/bounded_text.h"
+#include "core/class_log.h"
+
+namespace MW {
+
+namespace {
+constexpr int kRedraw = 1;
+}  // namespace
+
+ButtonFace::ButtonFace(const char* logWord, const SKIA_Rect* area, const SKIA_Text* caption)
+    : word(logWord) {
+  type_ = kBaseLayer;
+  if (area != nullptr) rect = *area;
+  normalColor = rect.color;
+  text = copyText(caption);
+}
+
+void ButtonFace::enterWindow(int constructorNumber) {
+  ClassLog(word).print(LogLevel::Debug, "call %d registerWidget", constructorNumber);
+  Window::registerWidget(this);
+}
+
+char* ButtonFace::getText() { return text.text; }
+unsigned int ButtonFace::getBgColor() { return read(rect.color); }
+unsigned int ButtonFace::getTextColor() { return read(text.color); }
+int ButtonFace::getFontSize() { return read(text.size); }
+SKIA_Rect* ButtonFace::getPositionAndSize() { return &rect; }
+void ButtonFace::setFontSize(int pixels) { write(text.size, pixels); }
+
+void ButtonFace::setText(const char* newText) {
+  const std::lock_guard guard(stateLock);
+  putText(text, boundedText(newText));
+}
+
+void ButtonFace::setTextColor(unsigned int color) { write(text.color, color); }
+
+void ButtonFace::setRect(int, const SKIA_Rect* newRect) {
+  if (newRect == nullptr) return;
+  const std::lock_guard guard(stateLock);
+  rect = {newRect->x, newRect->y, newRect->w, newRect->h, rect.color};
+}
+
+void ButtonFace::restoreColor() {
+  if (getBgColor() == read(normalColor)) return;
+  restoreFace();
+  EventService_AppEvent_c(kRedraw);
+}
+
+void ButtonFace::restoreFace() {
+  const std::lock_guard guard(stateLock);
+  rect.color = normalColor;
+}
+
+}  // namespace MW
