@@ -6,6 +6,8 @@
 #include <MW/c_api.h>
 #include <MW/callback.h>
 #include <MW/dialog.h>
+#include <MW/dialog_select.h>
+#include <MW/dialog_warn.h>
 #include <MW/event_service.h>
 #include <MW/key.h>
 #include <MW/main_list.h>
@@ -14,7 +16,10 @@
 #include <MW/records.h>
 #include <MW/screen.h>
 #include <MW/slide.h>
+#include <MW/slide_e.h>
+#include <MW/slide_move.h>
 #include <MW/timed.h>
 #include <MW/widget.h>
 #include <MW/widget_list.h>
+#include <MW/widget_rcui.h>
 #include <MW/window.h>
