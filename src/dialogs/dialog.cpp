@@ -259,7 +259,7 @@ void Dialog::onKeyClickCount(kbd_event key) {
     const std::lock_guard guard(stateLock);
     progress.delay(now);
   }
-  countKeyRelease(*this, keyClicks, key.code, now);
+  tellKeyClicks(*this, keyClicks, keyClicks.click(key.code, now));
 }
 
 void Dialog::pressButton(DialogButton& button, const mouse_event& mouse) {
