@@ -7,9 +7,11 @@
 #include <MW/callback.h>
 #include <MW/dialog.h>
 #include <MW/event_service.h>
+#include <MW/framed_dialog.h>
 #include <MW/key.h>
 #include <MW/main_list.h>
 #include <MW/primitives.h>
+#include <MW/prompt_dialog.h>
 #include <MW/push_button.h>
 #include <MW/records.h>
 #include <MW/screen.h>
