@@ -6,6 +6,10 @@
 #include <MW/c_api.h>
 #include <MW/callback.h>
 #include <MW/dialog.h>
+#include <MW/dialog_list.h>
+#include <MW/dialog_new.h>
+#include <MW/dialog_shell.h>
+#include <MW/dialog_slide.h>
 #include <MW/event_service.h>
 #include <MW/framed_dialog.h>
 #include <MW/key.h>
