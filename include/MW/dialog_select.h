@@ -73,8 +73,6 @@ class MW_API DialogSelect : public Widget {
 
   unsigned int selectKind;
   unsigned int optionColor = kColorWhite;
-  int screenW = 0;  // pixels
-  int screenH = 0;
   std::atomic<int> enabled = 1;
   // Guarded by stateLock.
   SKIA_Rect border = {};  // the visible panel

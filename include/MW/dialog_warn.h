@@ -5,6 +5,7 @@
 #include <MW/widget.h>
 
 #include <array>
+#include <cstddef>
 
 namespace MW {
 
@@ -19,7 +20,7 @@ class MW_API ColorPage : public Widget {
  public:
   static constexpr unsigned int kTexts = 4;
   /// Bytes of text that a box takes. A longer one, or one without a NUL, is ignored.
-  static constexpr int kPageTextMax = 123;
+  static constexpr std::size_t kPageTextMax = 123;
 
   /// show(0).
   int show() override;
@@ -78,8 +79,6 @@ class MW_API ColorPage : public Widget {
   std::atomic<int> timerOn = 0;            // nothing here sets it
   std::atomic<unsigned int> lastTick = 0;  // GetTicks() milliseconds of the last key release
   std::atomic<int> lcdOnFlag = 1;
-  int screenW = 0;  // pixels
-  int screenH = 0;
   // The rest, and `rect`, the page in its drawn colour, is guarded by stateLock.
   unsigned int bgColor;
   unsigned int textCount = 0;  // boxes drawn

@@ -62,6 +62,12 @@ static_assert(layOutGrid({1440, 2560}, 3).x == 144 && layOutGrid({1440, 2560}, 3
 
 /// The frame, a title's place in it and a black body; the title and the backdrop's colour are kept.
 void layOutFrame(DialogFrame& dialog, ScreenSize screen, const DialogGrid& grid);
+/// The look of a text, which is kept.
+constexpr void style(SKIA_Text& words, uint32_t color, int align, int size) {
+  words.color = color;
+  words.align = align;
+  words.size = size;
+}
 /// The standard look of a title; its text is kept.
 void styleTitle(SKIA_Text& title, int align);
 

@@ -2,10 +2,10 @@
 #include <MW/event_service.h>
 #include <MW/window.h>
 
-#include "core/bounded_text.h"
 #include "core/class_log.h"
-#include "core/geometry.h"
 #include "core/life_guard.h"
+#include "dialogs/dialog_parts.h"
+#include "dialogs/tell.h"
 
 namespace MW {
 
@@ -41,22 +41,14 @@ static_assert(layOutFace({144, 256, 1152, 2048, 0}, 0, 0).x == 288);
 static_assert(layOutFace({144, 256, 1152, 2048, 0}, 5, 0).x == 864);
 static_assert(layOutFace({144, 256, 1152, 2048, 0}, 5, 0).y == 1648);
 
-constexpr void setLooks(SKIA_Text& text, uint32_t color) {
-  text.color = color;
-  text.align = SKIA_ALIGN_CENTRE;
-  text.size = kTextSize;
-}
-
-void tell(void (*callback)(mouse_event*), event_data* event) {
-  if (event != nullptr && callback != nullptr) callback(&event->mouse);
-}
-
 }  // namespace
 
 DialogSelect::DialogSelect(unsigned int kind) : selectKind(kind) {
   setType(kTopLayer);
-  setLooks(title, kColorHighlight);
-  for (Choice& each : choices) setLooks(each.caption, kColorBlack);
+  style(title, kColorHighlight, SKIA_ALIGN_CENTRE, kTextSize);
+  for (Choice& each : choices) {
+    style(each.caption, kColorBlack, SKIA_ALIGN_CENTRE, kTextSize);
+  }
   setRect(0, 0);
   Window::registerWidget(this);
 }
@@ -144,8 +136,7 @@ void DialogSelect::onPlugKey(kbd_event key) {
 }
 
 void DialogSelect::setRect(int, int) {
-  Window::getwindowsize(&screenW, &screenH);
-  const ScreenSize screen = {screenW, screenH};
+  const ScreenSize screen = presentScreen();
   const SKIA_Rect panel = layOutPanel(screen);
   const std::lock_guard guard(stateLock);
   backdrop = overScreen(screen, kColorShadow);
@@ -179,18 +170,18 @@ void DialogSelect::onBtnReleased(mouse_event mouse, int index) {
   kLog.print(LogLevel::Debug, "onBtnReleased!! %d ", index);
   select = 0;
   mouse.state = static_cast<uint32_t>(index + 1);
-  if (auto* const call = choiceCallback) call(&mouse);
+  tell(choiceCallback, mouse);
 }
 
 void DialogSelect::onPressKey(kbd_event key) {
   if (key.code == kKeyHook) return;
   kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
-  if (auto* const call = keyPressCallback) call(&key);
+  tell(keyPressCallback, key);
 }
 
 void DialogSelect::onReleaseKey(kbd_event key) {
   kLog.print(LogLevel::Debug, "key onReleaseKey sym = %d", static_cast<int>(key.code));
-  if (auto* const call = keyReleaseCallback) call(&key);
+  tell(keyReleaseCallback, key);
 }
 
 void DialogSelect::onHookKeyPressed() {

@@ -5,6 +5,7 @@
 #include "core/class_log.h"
 #include "core/life_guard.h"
 #include "dialogs/dialog_parts.h"
+#include "dialogs/tell.h"
 
 namespace MW {
 
@@ -18,26 +19,12 @@ constexpr int kMessageSize = 70;  // pixels, and so the rest
 constexpr int kParts = 3;         // of the slide row
 constexpr int kPartLoss = 4;      // what gaps take from each of them
 
-void tell(void (*call)(mouse_event*), event_data* event) {
-  if (call != nullptr && event != nullptr) call(&event->mouse);
-}
-
-void tell(void (*call)(kbd_event*), kbd_event key) {
-  if (call != nullptr) call(&key);
-}
-
 void answer(const char* side, void (*call)(int)) {
   kLog.print(LogLevel::Debug, "%s", side);
   if (call != nullptr) call(0);
 }
 
 int holderOf(const mouse_event& mouse) { return static_cast<int>(mouse.finger + 1); }
-
-void style(SKIA_Text& words, uint32_t color, int align, int size) {
-  words.color = color;
-  words.align = align;
-  words.size = size;
-}
 
 }  // namespace
 

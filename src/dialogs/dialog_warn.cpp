@@ -4,13 +4,10 @@
 #include <brimol/input.h>
 
 #include <algorithm>
-#include <cstring>
-#include <optional>
-
-#include "core/bounded_text.h"
-#include "core/geometry.h"
 #include "core/key_clicks.h"
 #include "core/life_guard.h"
+#include "dialogs/dialog_parts.h"
+#include "dialogs/tell.h"
 
 namespace MW {
 
@@ -19,15 +16,11 @@ namespace {
 constexpr const char* kInitialText = "ABC";
 constexpr uint32_t kTransparent = 0;
 
-// A text that a page takes, or nothing. Null is empty. Reads no further than a record's end.
+// A text that a page takes, or nothing. Null is empty.
 std::optional<std::string_view> pageText(const char* given) {
-  constexpr std::size_t kTooLong = ColorPage::kPageTextMax + 1;
-  static_assert(kTooLong <= SKIA_TEXT_BYTES);
-  if (given == nullptr) return "";
-  const std::size_t length = strnlen(given, kTooLong);
-  if (length == kTooLong) return std::nullopt;
-  return std::string_view(given, length);
+  return wholeText(given != nullptr ? given : "", ColorPage::kPageTextMax);
 }
+static_assert(ColorPage::kPageTextMax < SKIA_TEXT_BYTES, "a record is not read beyond its end");
 
 }  // namespace
 
@@ -71,18 +64,14 @@ bool ColorPage::onRecvEvent(event_data* event, unsigned int) {
 
 void ColorPage::lcdOn(int on) { lcdOnFlag = on; }
 
-void ColorPage::onPressTouch(mouse_event mouse) {
-  if (auto* const call = touchPressCallback) call(&mouse);
-}
+void ColorPage::onPressTouch(mouse_event mouse) { tell(touchPressCallback, mouse); }
 
-void ColorPage::onReleaseTouch(mouse_event mouse) {
-  if (auto* const call = touchReleaseCallback) call(&mouse);
-}
+void ColorPage::onReleaseTouch(mouse_event mouse) { tell(touchReleaseCallback, mouse); }
 
 void ColorPage::setRect(int, int) {
-  Window::getwindowsize(&screenW, &screenH);
+  const ScreenSize screen = presentScreen();
   const std::lock_guard guard(stateLock);
-  rect = overScreen({screenW, screenH}, bgColor);
+  rect = overScreen(screen, bgColor);
 }
 
 void ColorPage::setBg_title(unsigned int color) { write(bgColor, color); }
@@ -94,9 +83,7 @@ void ColorPage::setText(unsigned int index, SKIA_Rect area, SKIA_Text caption) {
   textCount = std::max(textCount, index + 1);
 }
 
-void ColorPage::onPressKey(kbd_event key) {
-  if (auto* const call = keyPressCallback) call(&key);
-}
+void ColorPage::onPressKey(kbd_event key) { tell(keyPressCallback, key); }
 
 void ColorPage::onReleaseKey(kbd_event key) {
   {
@@ -105,8 +92,7 @@ void ColorPage::onReleaseKey(kbd_event key) {
   }
   const LifeGuard self(this);
   onKeyClickCount(key);
-  if (!self.isAlive()) return;
-  if (auto* const call = keyReleaseCallback) call(&key);
+  if (self.isAlive()) tell(keyReleaseCallback, key);
 }
 
 void ColorPage::onKeyClickCount(kbd_event key) {

@@ -2,6 +2,7 @@
 #include <MW/button3.h>
 #include <MW/c_api.h>
 #include <MW/dialog.h>
+#include <MW/dialog_new.h>
 #include <MW/key.h>
 #include <MW/screen.h>
 #include <MW/slide_e.h>
@@ -23,6 +24,8 @@ namespace MW {
 namespace {
 
 constexpr ClassLog kLog("WIDGETRCUI");
+
+constexpr std::size_t kDescTexts = 5;
 
 using Made = std::unique_ptr<Widget>;
 
@@ -55,6 +58,33 @@ struct Parts {
 };
 
 Made makeDialog(const Parts& from) { return make<Dialog>(from.dialogKind); }
+
+// A copy of at most 126 bytes.
+SKIA_Text dialogText(const SKIA_Text& given) {
+  constexpr std::size_t kMost = kTextMax - 1;
+  SKIA_Text text = soundText(given);
+  putText(text, cutText({text.text, static_cast<std::size_t>(text.string_len)}, kMost));
+  return text;
+}
+
+const char* orNone(const SKIA_Text& text) { return text.string_len != 0 ? text.text : nullptr; }
+
+// The texts are the three lines and the two captions; an empty one is none.
+void describe(Widget& dialog, const SKIA_Text* desc) {
+  std::array<SKIA_Text, kDescTexts> texts;
+  std::transform(desc, desc + kDescTexts, texts.begin(), dialogText);
+  const auto& [line1, line2, line3, caption1, caption2] = texts;
+  const int align = line1.string_len != 0 ? line1.align : SKIA_ALIGN_LEFT;
+  dialog.setDesc(orNone(line1), orNone(line2), orNone(line3), align);
+  dialog.setbutton(orNone(caption1), orNone(caption2));
+}
+
+Made makeDialogNew(const Parts& from) {
+  Made made = make<DialogNew>(from.text.text, from.text.align, static_cast<int>(from.text.color));
+  if (made != nullptr && from.desc != nullptr) describe(*made, from.desc);
+  return made;
+}
+
 Made makeButton(const Parts& from) { return make<Button>(&from.rect, &from.text); }
 
 template <int position>
@@ -90,6 +120,7 @@ struct InterfaceKind {
 // Ascending by kind; the kinds between build nothing.
 constexpr auto kInterfaceKinds = std::to_array<InterfaceKind>({
     {10, makeDialog},
+    {14, makeDialogNew},
     {15, makeButton},
     {17, makeButton3<1>},
     {18, makeButton3<5>},
