@@ -2,6 +2,7 @@
 #pragma once
 
 #include <MW/detail/double_tap.h>
+#include <MW/detail/knob_hold.h>
 #include <MW/widget.h>
 
 namespace MW {
@@ -60,6 +61,7 @@ class MW_API Slide : public Widget {
 
   Look look;
   std::atomic<int> locked = 0;
+  KnobHold hold{select, ownerFinger};
   DoubleTap clicks;  // dispatch thread
   int captionCount;  // 1 or 2
   // The rest, and `rect`, the knob, is guarded by stateLock.
@@ -77,8 +79,6 @@ class MW_API Slide : public Widget {
   enum class Change { None, ToLeft, ToRight };
 
   bool isOnKnob(const event_data* event) const;
-  bool grabOrCancel(event_data* event);
-  void letGo();
   void snapKnob();
   Change drag(int by);
   void drawTrack() const;

@@ -21,6 +21,15 @@ constexpr int32_t toPixels(int64_t value) {
   return static_cast<int32_t>(std::clamp(value, kLowest, kHighest));
 }
 
+/// Truncates toward zero; what an int cannot hold becomes its limit, what is no number 0.
+constexpr int truncated(double value) {
+  constexpr double kLowest = std::numeric_limits<int>::min();
+  constexpr double kHighest = std::numeric_limits<int>::max();
+  const bool isNumber = value == value;
+  return isNumber ? static_cast<int>(std::clamp(value, kLowest, kHighest)) : 0;
+}
+static_assert(truncated(-1.9) == -1 && truncated(1e10) == std::numeric_limits<int>::max());
+
 constexpr SKIA_Rect makeRect(int64_t x, int64_t y, int64_t w, int64_t h, uint32_t color) {
   return {toPixels(x), toPixels(y), toPixels(w), toPixels(h), color};
 }

@@ -2,18 +2,17 @@
 #pragma once
 
 #include <MW/detail/key_clicks.h>
-#include <MW/widget.h>
 
 namespace MW {
 
-/// Counts the release of a key and calls the widget's callback for the second and the third of a
-/// series. The callback may delete the widget, and `clicks` with it.
-inline void countKeyRelease(const Widget& widget, KeyClicks& clicks, uint32_t code, uint32_t now) {
+/// Calls the callback of the second and of the third release of a series, `count` being what
+/// KeyClicks::click() answered. The callback may delete the owner, and `clicks` with it.
+template <typename Owner>
+void tellKeyClicks(const Owner& owner, KeyClicks& clicks, int count) {
   constexpr int kDouble = 2;
   constexpr int kTriple = 3;
-  const int count = clicks.click(code, now);
-  if (count == kDouble) widget.doubleKeyCallback(&clicks.lastKey);
-  if (count == kTriple) widget.tripleKeyCallback(&clicks.lastKey);
+  if (count == kDouble && owner.doubleKeyCallback) owner.doubleKeyCallback(&clicks.lastKey);
+  if (count == kTriple && owner.tripleKeyCallback) owner.tripleKeyCallback(&clicks.lastKey);
 }
 
 }  // namespace MW

@@ -4,15 +4,13 @@
 #include <brimol/display.h>
 #include <brimol/input.h>
 
-#include <algorithm>
 #include <atomic>
-#include <cmath>
-#include <limits>
 #include <mutex>
 #include <new>
 
 #include "core/class_log.h"
 #include "core/dispatch_thread.h"
+#include "core/geometry.h"
 #include "core/layers.h"
 #include "core/thread_start.h"
 
@@ -34,14 +32,6 @@ constinit std::atomic<EventService*> eventService = nullptr;
 
 // Null until init; init and destroy alone touch it.
 android::sp<func_dispatchEvent> event_dispatcher;
-
-// Truncates toward zero; what an int cannot hold becomes its limit, what is no number 0.
-int truncated(double value) {
-  if (std::isnan(value)) return 0;
-  constexpr double kLowest = std::numeric_limits<int>::min();
-  constexpr double kHighest = std::numeric_limits<int>::max();
-  return static_cast<int>(std::clamp(value, kLowest, kHighest));
-}
 
 template <typename Visit>
 void visitActive(int type, Visit visit) {

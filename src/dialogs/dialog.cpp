@@ -1,10 +1,8 @@
 #include <MW/dialog.h>
-#include <MW/event_service.h>
 #include <MW/window.h>
 #include <brimol/input.h>
 
 #include "core/bounded_text.h"
-#include "core/class_log.h"
 #include "core/key_clicks.h"
 #include "core/life_guard.h"
 #include "dialogs/dialog_catalogue.h"
@@ -14,10 +12,7 @@ namespace MW {
 
 namespace {
 
-constexpr ClassLog kLog("DIALOG");
 constexpr int kHookKeyKind = 13;
-constexpr uint32_t kMostStars = 10;
-constexpr int64_t kTextMargin = 10;    // pixels
 constexpr int kSmallTextPercent = 30;  // of a row, where there are two lines
 
 // The second line of the kind that was constructed last and had one. A kind without one keeps it:
@@ -32,8 +27,8 @@ void putIfGiven(SKIA_Text& record, const char* words) {
 
 }  // namespace
 
-Dialog::Dialog(int dialogKind) : kind(dialogKind) {
-  setType(kTopLayer);
+Dialog::Dialog(int dialogKind) : PromptDialog("DIALOG"), kind(dialogKind) {
+  answersHookKey = kind == kHookKeyKind;
   setRect(dialogKind);
   fillIn();
   Window::registerWidget(this);
@@ -74,105 +69,18 @@ int Dialog::show(unsigned int ticks) {
   return 1;
 }
 
-void Dialog::updateProgress(unsigned int ticks) {
-  const std::lock_guard guard(stateLock);
-  drawProgress(ticks);
-}
-
-// One to ten stars, and one again.
-void Dialog::drawProgress(unsigned int ticks) {
-  progress.step(ticks);
-  const uint32_t steps = progress.count();
-  putStars(button1.caption, steps == 0 ? 1 : (steps - 1) % kMostStars + 1);
-  skia_add_box_c(button1.border);
-  skia_add_textbox_c(button1.face, button1.caption);
-}
-
-int Dialog::hide() {
-  setActive(0);
-  lcdOnFlag = 1;
-  return 1;
-}
-
-bool Dialog::onRecvEvent(event_data* event, unsigned int) {
-  if (event == nullptr) return false;
-  switch (event->type) {
-    case kEventMotion: return hoverAt(event);
-    case kEventPress: return pressAt(event);
-    case kEventRelease: releaseAt(event); return true;
-    case kEventKeyPress: onPressKey(event->key); return true;
-    case kEventKeyRelease: onReleaseKey(event->key); return true;
-    case kEventUser: onPlugKey(event->key); return true;
-    default: return false;
+bool Dialog::onRecvEvent(event_data* event, unsigned int arg) {
+  if (event == nullptr || event->type != kEventKeyRelease) {
+    return PromptDialog::onRecvEvent(event, arg);
   }
-}
-
-bool Dialog::hoverAt(event_data* event) {
-  const LifeGuard self(this);
-  onHover(event);
-  if (!self.isAlive() || select == 0) return false;
-  for (DialogButton* const button : {&button1, &button2}) {
-    if (button->enabled != 0 && !isOn(*button, event)) restoreFace(*button);
-  }
+  onReleaseKey(event->key);
   return true;
-}
-
-// Only a button takes a press.
-bool Dialog::pressAt(event_data* event) {
-  const LifeGuard self(this);
-  onPress(event);
-  if (!self.isAlive() || lcdOnFlag == 0) return false;
-  if (button1.enabled != 0 && isOn(button1, event)) {
-    onBtn1Pressed(event->mouse);
-    return true;
-  }
-  if (button2.enabled != 0 && isOn(button2, event)) {
-    onBtn2Pressed(event->mouse);
-    return true;
-  }
-  return false;
-}
-
-// Both buttons answer where their faces overlap, which they do where one wide button hides an
-// enabled second one: meant so.
-void Dialog::releaseAt(event_data* event) {
-  const LifeGuard self(this);
-  const bool answers = lcdOnFlag != 0;
-  if (answers && button1.enabled != 0) {
-    restoreFace(button1);
-    if (isOn(button1, event)) onBtn1Released(event->mouse);
-  }
-  if (self.isAlive() && answers && button2.enabled != 0) {
-    restoreFace(button2);
-    if (isOn(button2, event)) onBtn2Released(event->mouse);
-  }
-  if (self.isAlive()) onRelease(event);
-}
-
-void Dialog::lcdOn(int on) { lcdOnFlag = on; }
-
-void Dialog::onHover(event_data* event) {
-  if (event != nullptr) hoverCallback(&event->mouse);
-}
-
-void Dialog::onPress(event_data* event) {
-  if (event != nullptr) pressCallback(&event->mouse);
-}
-
-void Dialog::onRelease(event_data* event) {
-  if (event != nullptr) clickCallback(&event->mouse);
-}
-
-void Dialog::onPlugKey(kbd_event key) {
-  kLog.print(LogLevel::Debug, "key onPlugKey sym = %d", static_cast<int>(key.code));
-  plugCallback(&key);
 }
 
 int Dialog::isType(int dialogKind) { return MW::dialogKind(dialogKind).layout; }
 
 void Dialog::setRect(int dialogKind) {
-  Window::getwindowsize(&screenW, &screenH);
-  const ScreenSize screen = {screenW, screenH};
+  const ScreenSize screen = presentScreen();
   const DialogClass& layout = classOf(dialogKind);
   const DialogGrid grid = layOutGrid(screen, layout.rows);
   const auto smallText = toPixels(percentOf(grid.row, kSmallTextPercent));
@@ -181,16 +89,14 @@ void Dialog::setRect(int dialogKind) {
 
   const std::lock_guard guard(stateLock);
   layOutFrame(frame, screen, grid);
-  frame.title.align = layout.align;
-  if (layout.backdrop == Backdrop::Alarm) frame.backdrop.color = kAlarmColor;
-  messageRect =
-      makeRect(grid.x + kTextMargin, grid.y + grid.row + kTextMargin, grid.w - 2 * kTextMargin,
-               isSmall ? smallText : grid.row - 2 * kTextMargin, 0);
+  styleTitle(frame.title, layout.align);
+  frame.backdrop.color = layout.backdrop == Backdrop::Alarm ? kAlarmColor : kColorShadow;
+  messageRect = messageArea(grid);
+  if (isSmall) messageRect.h = smallText;
   message.color = kColorWhite;
   message.align = layout.align;
   message.size = isSmall ? smallText : kDialogTextSize;
-  secondRect = makeRect(grid.x + kTextMargin, grid.y + grid.row + grid.row / 2 + kTextMargin,
-                        grid.w - 2 * kTextMargin, smallText, 0);
+  secondRect = makeRect(messageRect.x, messageRect.y + grid.row / 2, messageRect.w, smallText, 0);
   second.color = kColorWhite;
   second.align = layout.align;
   second.size = smallText;
@@ -209,48 +115,11 @@ void Dialog::setDesc(const char* newMessage) {
   putTextOpen(message, boundedText(newMessage));
 }
 
-void Dialog::onBtn1Pressed(mouse_event mouse) {
-  kLog.print(LogLevel::Debug, "btn1 pressed!!");
-  pressButton(button1, mouse);
-}
-
-void Dialog::onBtn2Pressed(mouse_event mouse) {
-  kLog.print(LogLevel::Debug, "btn2 pressed!!");
-  pressButton(button2, mouse);
-}
-
-void Dialog::onBtn1Released(mouse_event) {
-  kLog.print(LogLevel::Debug, "btn1 released!!");
-  button1Callback(0);
-}
-
-// The right button dismisses the dialog by itself, the left one does not: meant so.
-void Dialog::onBtn2Released(mouse_event) {
-  kLog.print(LogLevel::Debug, "btn2 released!!");
-  hide();
-  button2Callback(0);
-}
-
-void Dialog::onPressKey(kbd_event key) {
-  if (key.code == kKeyHook) {
-    if (kind == kHookKeyKind) onHookKeyPressed();
-    return;
-  }
-  kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
-  keyPressCallback(&key);
-}
-
 void Dialog::onReleaseKey(kbd_event key) {
   keyClicks.follow(key, GetTicks());
   const LifeGuard self(this);
   onKeyClickCount(key);
-  kLog.print(LogLevel::Debug, "key onReleaseKey sym = %d", static_cast<int>(key.code));
-  if (self.isAlive()) keyReleaseCallback(&key);
-}
-
-void Dialog::onHookKeyPressed() {
-  kLog.print(LogLevel::Debug, "Hook key pressed!!");
-  hookKeyCallback(0);
+  if (self.isAlive()) PromptDialog::onReleaseKey(key);
 }
 
 void Dialog::onKeyClickCount(kbd_event key) {
@@ -259,22 +128,7 @@ void Dialog::onKeyClickCount(kbd_event key) {
     const std::lock_guard guard(stateLock);
     progress.delay(now);
   }
-  countKeyRelease(*this, keyClicks, key.code, now);
-}
-
-void Dialog::pressButton(DialogButton& button, const mouse_event& mouse) {
-  write(button.face.color, kColorHighlight);
-  setSelect(static_cast<int>(mouse.finger + 1));
-}
-
-bool Dialog::isOn(const DialogButton& button, const event_data* event) const {
-  const SKIA_Rect face = read(button.face);
-  return EventService::isMouseEventForMe(&face, event);
-}
-
-void Dialog::restoreFace(DialogButton& button) {
-  const std::lock_guard guard(stateLock);
-  button.face.color = btnNormalColor;
+  tellKeyClicks(*this, keyClicks, keyClicks.click(key.code, now));
 }
 
 }  // namespace MW

@@ -3,6 +3,11 @@
 
 #include <MW/detail/dialog_frame.h>
 
+#include <algorithm>
+#include <optional>
+#include <string_view>
+
+#include "core/bounded_text.h"
 #include "core/geometry.h"
 
 namespace MW {
@@ -13,33 +18,66 @@ constexpr uint32_t kAlarmColor = 0xFFFF0000;
 constexpr int kDialogTitleSize = 70;  // pixels
 constexpr int kDialogTextSize = 60;   // pixels
 
+/// The present size of the window.
+ScreenSize presentScreen();
+
 /// A dialog on its screen: four fifths of the shorter side wide, a fifth of that the height of a
-/// row. Rows of that height are the title, the body of the simple dialogs, and the buttons.
+/// row. The title has a row, and so have the buttons below the body.
 struct DialogGrid {
   int64_t x;
   int64_t y;
   int64_t w;
   int64_t row;
+  int64_t body;  // its height
   int64_t height;
 };
 
-constexpr DialogGrid layOutGrid(ScreenSize screen, int rows) {
+constexpr int64_t shorterSide(ScreenSize screen) { return std::min(screen.w, screen.h); }
+
+constexpr int64_t dialogWidth(ScreenSize screen) {
   constexpr int kWidthPercent = 80;
+  return percentOf(shorterSide(screen), kWidthPercent);
+}
+
+constexpr int64_t rowHeight(ScreenSize screen) {
   constexpr int kTenths = 10;
   constexpr int kRowTenths = 50;
-  const int64_t w = percentOf(screen.w < screen.h ? screen.w : screen.h, kWidthPercent);
-  const int64_t row = w * kTenths / kRowTenths;
-  const int64_t height = row * rows;
-  return {(screen.w - w) / 2, (screen.h - height) / 2, w, row, height};
+  return dialogWidth(screen) * kTenths / kRowTenths;
+}
+
+/// With a body of that height, and so many rows above and below it.
+constexpr DialogGrid layOutAround(ScreenSize screen, int64_t body, int otherRows) {
+  const int64_t w = dialogWidth(screen);
+  const int64_t row = rowHeight(screen);
+  const int64_t height = body + row * otherRows;
+  return {(screen.w - w) / 2, (screen.h - height) / 2, w, row, body, height};
+}
+
+/// With a body of one row. `rows`: 3 with buttons, 2 without.
+constexpr DialogGrid layOutGrid(ScreenSize screen, int rows) {
+  return layOutAround(screen, rowHeight(screen), rows - 1);
 }
 static_assert(layOutGrid({1440, 2560}, 3).w == 1152 && layOutGrid({1440, 2560}, 3).row == 230);
 static_assert(layOutGrid({1440, 2560}, 3).x == 144 && layOutGrid({1440, 2560}, 3).y == 935);
 
-/// The frame with a body of one row, and its title in its standard look, its text kept.
+/// The frame, a title's place in it and a black body; the title and the backdrop's colour are kept.
 void layOutFrame(DialogFrame& dialog, ScreenSize screen, const DialogGrid& grid);
+/// The look of a text, which is kept.
+constexpr void style(SKIA_Text& words, uint32_t color, int align, int size) {
+  words.color = color;
+  words.align = align;
+  words.size = size;
+}
+/// The standard look of a title; its text is kept.
+void styleTitle(SKIA_Text& title, int align);
+
+/// Where a message stands that has the body for itself.
+SKIA_Rect messageArea(const DialogGrid& grid);
 
 /// Puts the face where it is told, in white, and the border a pixel around it.
 void placeButton(DialogButton& button, const DialogGrid& grid, const SKIA_Rect& face);
+/// The size of what stands in the lowest row.
+int captionSize(const DialogGrid& grid);
 
 /// The faces of two buttons side by side, and of one as wide as both.
 SKIA_Rect leftFace(const DialogGrid& grid);
@@ -49,5 +87,11 @@ SKIA_Rect wideFace(const DialogGrid& grid);
 /// The frame's boxes and its line, up to the title, in their order.
 void drawFrame(const DialogFrame& dialog);
 void drawButton(const DialogButton& button);
+
+/// Most bytes of a line that the dialogs take as a whole or not at all.
+inline constexpr std::size_t kLongestLine = kTextMax - 1;
+
+/// A C string of at most `limit` bytes. None: it is longer, or null. No byte beyond is read.
+std::optional<std::string_view> wholeText(const char* given, std::size_t limit);
 
 }  // namespace MW

@@ -97,7 +97,7 @@ void Key::onPressLong(mouse_event mouse) {
 }
 
 void Key::onKeyClickCount(kbd_event key) {
-  countKeyRelease(*this, keyClicks, key.code, GetTicks());
+  tellKeyClicks(*this, keyClicks, keyClicks.click(key.code, GetTicks()));
 }
 
 }  // namespace MW

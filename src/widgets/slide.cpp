@@ -15,7 +15,6 @@ namespace MW {
 namespace {
 
 constexpr ClassLog kLog("SLIDE");
-constexpr int kNoFinger = -1;
 constexpr int kLegendSize = 80;  // pixels
 constexpr uint32_t kOffColor = 0xFF787878;
 constexpr int kTwoCaptions = 2;
@@ -72,7 +71,7 @@ Slide::~Slide() { leaveLayers(); }
 int Slide::show() { return show(0); }
 
 int Slide::show(unsigned int) {
-  if (select == 0) snapKnob();
+  if (!hold.isHeld()) snapKnob();
   const std::lock_guard guard(stateLock);
   labelRect1.x = rect.x;
   labelRect2.x = rect.x;
@@ -101,37 +100,26 @@ int Slide::hide() {
 
 bool Slide::onRecvEvent(event_data* event, unsigned int) {
   if (event == nullptr) return false;
-  if (event->type == kEventPress) return grabOrCancel(event);
-  if (select == 0 || static_cast<int>(event->mouse.finger) != ownerFinger) return false;
-  switch (event->type) {
-    case kEventMotion: onHover(event->mouse); return true;
-    case kEventRelease: onRelease(event); return true;
-    default: return false;
+  switch (hold.touch(*event, read(rect))) {
+    case KnobHold::Touch::NotMine: return false;
+    case KnobHold::Touch::Grab: onPress(event); return true;
+    case KnobHold::Touch::Cancel: return true;
+    case KnobHold::Touch::Move: onHover(event->mouse); return true;
+    case KnobHold::Touch::Drop: onRelease(event); return true;
   }
-}
-
-bool Slide::grabOrCancel(event_data* event) {
-  if (isOnKnob(event)) {
-    onPress(event);
-    return true;
-  }
-  if (select == 0) return false;
-  letGo();
-  return true;
+  return false;
 }
 
 void Slide::onPress(event_data* event) {
   if (event == nullptr) return;
-  const auto finger = static_cast<int>(event->mouse.finger);
-  select = static_cast<int>(event->mouse.finger + 1);
-  ownerFinger = finger;
-  kLog.print(LogLevel::Debug, "pressed!!: %d", finger);
+  hold.grab(event->mouse);
+  kLog.print(LogLevel::Debug, "pressed!!: %d", static_cast<int>(event->mouse.finger));
   if (locked != 0 && doubleClickCallback) clicks.press(GetTicks());
 }
 
 void Slide::onRelease(event_data* event) {
   if (event == nullptr) return;
-  letGo();
+  hold.letGo();
   snapKnob();
   kLog.print(LogLevel::Debug, "released!!:%d", static_cast<int>(event->mouse.finger));
   if (locked != 0 && isOnKnob(event) && doubleClickCallback && clicks.isRunning()) {
@@ -146,7 +134,7 @@ void Slide::onHover(mouse_event mouse) {
   const LifeGuard self(this);
   (change == Change::ToLeft ? leftCallback : rightCallback)(0);
   if (!self.isAlive()) return;
-  letGo();
+  hold.letGo();
   snapKnob();
 }
 
@@ -208,11 +196,6 @@ void Slide::unLock() { locked = 0; }
 bool Slide::isOnKnob(const event_data* event) const {
   const SKIA_Rect knob = read(rect);
   return EventService::isMouseEventForMe(&knob, event);
-}
-
-void Slide::letGo() {
-  select = 0;
-  ownerFinger = kNoFinger;
 }
 
 // The track is laid out from itself and so never moves.

@@ -9,7 +9,7 @@ namespace MW {
 /// A dimmed screen, a frame on it, a black title bar, a line under it and a black body. The
 /// holder's lock guards it.
 struct DialogFrame {
-  SKIA_Rect backdrop = {};
+  SKIA_Rect backdrop = {0, 0, 0, 0, kColorShadow};
   SKIA_Rect frame = {};
   SKIA_Rect titleBar = {};
   SKIA_Rect titleArea = {};

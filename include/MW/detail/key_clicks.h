@@ -8,7 +8,7 @@
 namespace MW {
 
 /// Counts the releases of one key of which each comes within 1000 ms of the one before. Times are
-/// GetTicks() milliseconds. One thread, the one that handles events.
+/// GetTicks() milliseconds. One thread, the one that handles events, or the holder's lock.
 class KeyClicks {
  public:
   static constexpr uint32_t kWindowMs = 1000;
@@ -34,12 +34,12 @@ class KeyClicks {
     return count;
   }
 
-  kbd_event lastKey = {kNoKey,
-                       kNoKey};  ///< the followed key's release, as applications are given it
+  /// The followed key's release, as applications are given it.
+  kbd_event lastKey = {kNoKey, kNoKey};
+  uint32_t time = 0;  ///< when the series began or was last counted
 
  private:
   int count = 0;
-  uint32_t time = 0;
 };
 
 }  // namespace MW

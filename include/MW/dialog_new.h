@@ -1,0 +1,72 @@
+/// Prompts whose texts the application gives.
+#pragma once
+
+#include <MW/prompt_dialog.h>
+
+#include <array>
+
+namespace MW {
+
+/// A prompt with a title, up to three lines, and below them one or two buttons, a progress row or
+/// nothing. Callbacks as for PromptDialog; the hook key is ignored.
+///
+/// The setters may be called by any thread, at any time; the dialog is laid out anew on the present
+/// screen by those that say so. Texts are copied, and cut to 127 bytes at a whole character.
+class MW_API DialogNew : public PromptDialog {
+ public:
+  static constexpr int kLines = 3;
+
+  /// `align`: 1 left, 2 right, 5 centred. `color`: 0xAARRGGBB. `size`: pixels; 0 is 70. With a null
+  /// title there is none, and the other arguments are not used.
+  DialogNew(const char* title, int align, int color, int size);
+  DialogNew(const char* title, int align, int color);
+  ~DialogNew() override;
+
+  using Widget::show;
+  /// Draws it; a progress row grows. Returns 1.
+  int show(unsigned int ticks) override;
+  /// The lines, up to the first null one. Lays out: one line stands in larger letters than two or
+  /// three.
+  void setDesc(const char* line1, const char* line2, const char* line3, int align) override;
+  /// The captions, up to the first null one. Lays out: one button is as wide as two, and without
+  /// any there is no room for them.
+  void setbutton(const char* caption1, const char* caption2) override;
+
+  using Widget::setRect;
+  /// What the constructors do first: no title, lines, buttons or callbacks. The layout stays.
+  void DialogNew_init();
+  /// Lays it out on the present screen.
+  void setRect();
+  /// The same as the one above, to the left.
+  void setDesc(const char* line1, const char* line2, const char* line3);
+  /// A progress row instead of buttons; touches answer nothing. The row shows that something goes
+  /// on, not how much: the argument is not used. Lays out.
+  void setProgress(unsigned int amount);
+  /// The colour of the screen around the dialog, half-transparent black at first.
+  void setBackGroundColor(unsigned int color);
+  /// The colour behind the lines, from the next layout on, where it does not blink.
+  void setDescColor(unsigned int color);
+  /// 1, as at first: the body has the widget's blink colour. Else it keeps the colour that it has.
+  void setDescBlink(int on);
+
+ protected:
+  /// What stands below the lines: the number of the last button, or one of the others.
+  enum ButtonMode { kOneButton = 0, kTwoButtons = 1, kProgressRow = 3, kNoButtons = 4 };
+  static constexpr int kNoLines = 4;
+
+  // All are guarded by stateLock.
+  int buttonMode = kNoButtons;
+  int descLast = kNoLines;  // the number of the last line
+  unsigned int descBgColor = kColorBlack;
+  int descBlink = 1;
+  std::array<SKIA_Rect, kLines> descRects = {};
+  std::array<SKIA_Text, kLines> descs = {};
+
+ private:
+  void emptyButtons();
+  std::size_t lineCount() const;
+  void layOut();
+  void layOutLines();
+};
+
+}  // namespace MW

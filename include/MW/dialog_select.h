@@ -1,0 +1,92 @@
+/// The choice of one of six.
+#pragma once
+
+#include <MW/widget.h>
+
+#include <array>
+
+namespace MW {
+
+/// A modal panel with a title and six large square buttons in three rows of two. A touch released
+/// on the button that it pressed is the answer; one that slides off gives the button up.
+///
+/// It enters the top layer when it is constructed, inactive, and leaves it when it is deleted.
+/// While it is active nothing below gets events. It never hides itself. Handlers run on the
+/// dispatch thread.
+///
+/// Callbacks besides its own: `hoverCallback`, of one mouse_event*; `plugCallback`, of one
+/// kbd_event*; `hookKeyCallback`, of one int, which onHookKeyPressed() alone calls. Records are
+/// valid for the call.
+class MW_API DialogSelect : public Widget {
+ public:
+  static constexpr unsigned int kChoices = 6;
+
+  /// `kind` is kept for the application, and has no meaning here.
+  explicit DialogSelect(unsigned int kind);
+  ~DialogSelect() override;
+
+  using Widget::show;
+  /// Draws all six choices, those without a caption, too. Returns 1.
+  int show(unsigned int ticks) override;
+  /// Makes it inactive. Returns 1.
+  int hide() override;
+  bool onRecvEvent(event_data* event, unsigned int arg) override;
+  /// 0: touches are told but choose nothing, until it is called with another value.
+  void lcdOn(int on) override;
+  void onHover(event_data* event) override;
+  void onPress(event_data* event) override;
+  void onRelease(event_data* event) override;
+  void onPlugKey(kbd_event key) override;
+
+  using Widget::onPressKey;
+  using Widget::onReleaseKey;
+  using Widget::setRect;
+  /// Lays it out on the present screen, nothing highlighted. The arguments are not read.
+  void setRect(int unused1, int unused2);
+  /// Texts of at most 127 bytes; null is the empty text.
+  void setTitle(const char* newTitle);
+  /// The caption of choice `index`, 0 to 5 row by row; any other: nothing.
+  void setText_str(unsigned int index, const char* caption);
+  /// Choice `index` as above; any other index: nothing.
+  void onBtnPressed(mouse_event mouse, int index);
+  void onBtnReleased(mouse_event mouse, int index);
+  /// The hook key is ignored.
+  void onPressKey(kbd_event key);
+  void onReleaseKey(kbd_event key);
+  void onHookKeyPressed();
+
+  // The application's own callbacks; they hide the base's of the same names. Null: not wanted.
+
+  /// The answer: the release, its `state` the number of the choice, 1 to 6 row by row.
+  void (*choiceCallback)(mouse_event*) = nullptr;
+  void (*keyPressCallback)(kbd_event*) = nullptr;
+  void (*keyReleaseCallback)(kbd_event*) = nullptr;
+  /// Any touch, any place.
+  void (*touchPressCallback)(mouse_event*) = nullptr;
+  void (*touchReleaseCallback)(mouse_event*) = nullptr;
+
+ protected:
+  struct Choice {
+    SKIA_Rect face = {};
+    SKIA_Text caption = {};
+  };
+
+  unsigned int selectKind;
+  unsigned int optionColor = kColorWhite;
+  std::atomic<int> enabled = 1;
+  // Guarded by stateLock.
+  SKIA_Rect border = {};  // the visible panel
+  SKIA_Rect backdrop = {};
+  SKIA_Rect titleStrip = {};
+  SKIA_Text title = {};
+  std::array<Choice, kChoices> choices = {};
+
+ private:
+  bool hoverAt(event_data* event);
+  bool pressAt(event_data* event);
+  void releaseAt(event_data* event);
+  bool isOn(int index, const event_data* event) const;
+  void restoreFaces();
+};
+
+}  // namespace MW

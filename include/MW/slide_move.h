@@ -1,0 +1,81 @@
+/// The value slider.
+#pragma once
+
+#include <MW/detail/knob_hold.h>
+#include <MW/widget.h>
+
+namespace MW {
+
+/// A bar whose knob a finger drags to choose a number; what lies left of the knob is red. It has no
+/// callbacks: the application asks getValue().
+///
+/// It is a control for percentages: from 99.9 on the knob's place reads as 100, whatever the range.
+///
+/// It enters the base layer when it is constructed, inactive, and stays there until it is deleted
+/// or unregistered; setActive() alone shows and hides it. A finger that presses the knob drags it,
+/// and where it lifts, or another finger presses elsewhere, the knob stays. Handlers run on the
+/// dispatch thread, getValue() and setValue() on any.
+class MW_API SlideMove : public Widget {
+ public:
+  /// Copies `area`; null is all zero. `percent`: the knob's width in hundredths of the bar's, at
+  /// most 50; 0 is 20, with the value written on the knob. `a` and `b` bound the value, in either
+  /// order; equal ones stand for 0 to 1. `initial` becomes `b` unless it is less than `b`, and else
+  /// `a` unless it is more than `a`: give the lower bound first, and two different ones, or the
+  /// knob may start beside the bar.
+  SlideMove(const SKIA_Rect* area, int percent, int a, int b, int initial);
+  ~SlideMove() override;
+
+  using Widget::show;
+  /// Draws it. Returns 1.
+  int show(unsigned int ticks) override;
+  bool onRecvEvent(event_data* event, unsigned int arg) override;
+  void onPress(event_data* event) override;
+  void onRelease(event_data* event) override;
+  /// Are kept, but dragging goes on.
+  void Lock() override;
+  void unLock() override;
+
+  using Widget::onHover;
+  using Widget::setRect;
+  /// Drags the knob by the event's relative motion.
+  void onHover(mouse_event mouse);
+  /// Lays it out in `area`, its knob where the value says. Null: nothing.
+  void setRect(const SKIA_Rect* area);
+  /// Draws the fill up to that rectangle's left edge, and the knob's frame there. Null: nothing.
+  void setRect_Slide(const SKIA_Rect* knob);
+  int getValue() const;
+  /// Takes any number, read as an int, and moves the knob there: beside the bar for one out of
+  /// range, and to its start while the bar leaves the knob no room to move.
+  void setValue(unsigned int newValue);
+  /// Sets the value that belongs to the knob's distance from the bar's left end, in pixels. The
+  /// value stays while the bar leaves the knob no room to move.
+  void setMove2Value(unsigned int position);
+  /// The distance that belongs to a value, read as an int; 0 while there is no room to move, and
+  /// cut to the range of an int.
+  int setValue2Move(unsigned int ofValue);
+
+ protected:
+  std::atomic<int> locked = 0;
+  KnobHold hold{select, ownerFinger};
+  int minValue;  // these four stay after construction
+  int maxValue;
+  int knobPercent;
+  int showValue;  // 1: the value stands on the knob
+  // The rest, and `rect`, the knob, is guarded by stateLock.
+  int value;
+  int travel = 0;  // pixels that the knob can move
+  SKIA_Rect track = {};
+  SKIA_Rect groove = {};
+  SKIA_Rect fill = {};
+  SKIA_Rect frameInner = {};
+  SKIA_Rect frameOuter = {};
+  SKIA_Text valueText = {};
+
+ private:
+  void layOut(const SKIA_Rect& area);
+  void fillUpTo(int32_t knobX);
+  int distanceOf(int ofValue) const;
+  void takeValueAt(unsigned int position);
+};
+
+}  // namespace MW

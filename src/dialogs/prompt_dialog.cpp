@@ -1,0 +1,54 @@
+#include <MW/prompt_dialog.h>
+
+#include "core/class_log.h"
+
+namespace MW {
+
+namespace {
+constexpr uint32_t kMostStars = 10;
+}
+
+PromptDialog::PromptDialog(const char* logWord) : FramedDialog(logWord) {}
+
+bool PromptDialog::onRecvEvent(event_data* event, unsigned int arg) {
+  if (event == nullptr) return false;
+  switch (event->type) {
+    case kEventKeyPress: onPressKey(event->key); return true;
+    case kEventUser: onPlugKey(event->key); return true;
+    default: return FramedDialog::onRecvEvent(event, arg);
+  }
+}
+
+void PromptDialog::onPlugKey(kbd_event key) {
+  ClassLog(word).print(LogLevel::Debug, "key onPlugKey sym = %d", static_cast<int>(key.code));
+  plugCallback(&key);
+}
+
+void PromptDialog::onPressKey(kbd_event key) {
+  if (key.code != kKeyHook) {
+    FramedDialog::onPressKey(key);
+  } else if (answersHookKey) {
+    onHookKeyPressed();
+  }
+}
+
+void PromptDialog::onHookKeyPressed() {
+  ClassLog(word).print(LogLevel::Debug, "Hook key pressed!!");
+  hookKeyCallback(0);
+}
+
+void PromptDialog::updateProgress(unsigned int ticks) {
+  const std::lock_guard guard(stateLock);
+  drawProgress(ticks);
+}
+
+// One to ten stars, and one again.
+void PromptDialog::drawProgress(unsigned int ticks) {
+  progress.step(ticks);
+  const uint32_t steps = progress.count();
+  putStars(button1.caption, steps == 0 ? 1 : (steps - 1) % kMostStars + 1);
+  skia_add_box_c(button1.border);
+  skia_add_textbox_c(button1.face, button1.caption);
+}
+
+}  // namespace MW

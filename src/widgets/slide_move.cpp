@@ -1,0 +1,201 @@
+#include <MW/slide_move.h>
+#include <MW/window.h>
+
+#include <algorithm>
+#include <cstdio>
+
+#include "core/class_log.h"
+#include "core/geometry.h"
+
+namespace MW {
+
+namespace {
+
+constexpr ClassLog kLog("SLIDE");
+constexpr uint32_t kKnobColor = 0xFF4F4F4F;
+constexpr uint32_t kGrooveColor = 0xFFBFBFBF;
+constexpr uint32_t kFillColor = 0xFFFF0000;
+constexpr int kDefaultKnobPercent = 20;
+constexpr int kMostKnobPercent = 50;
+constexpr int kInnerFrame = 1;  // pixels around the knob
+constexpr int kOuterFrame = 2;
+constexpr int kFillOverlap = 3;  // pixels that the fill reaches under the knob
+constexpr int kTenths = 10;
+constexpr int kValueTextPart = 3;  // of the knob's height
+
+// What the value is from here on, a maximum above it or not: meant so.
+constexpr double kNearlyFull = 99.9;
+constexpr int kFull = 100;
+
+struct ValueRange {
+  int lowest;
+  int highest;
+};
+
+constexpr ValueRange rangeOf(int a, int b) {
+  if (a == b) return {0, 1};
+  return {std::min(a, b), std::max(a, b)};
+}
+
+// Goes by the bounds as they were given, not by their order: meant so.
+constexpr int startOf(int a, int b, int initial) {
+  if (initial >= b) return b;
+  return initial <= a ? a : initial;
+}
+
+// Pixels for each step of the value; 0 where the knob cannot move.
+constexpr float pixelsPerStep(int travel, ValueRange range) {
+  const int64_t steps = int64_t{range.highest} - range.lowest;
+  if (travel <= 0 || steps <= 0) return 0;
+  return static_cast<float>(travel) / static_cast<float>(steps);
+}
+static_assert(pixelsPerStep(400, {0, 100}) == 4 && pixelsPerStep(0, {0, 100}) == 0);
+
+constexpr int valueAt(unsigned int position, float perStep, int lowest) {
+  const float steps = static_cast<float>(position) / perStep;
+  if (double{steps + static_cast<float>(lowest)} > kNearlyFull) return kFull;
+  return toPixels(int64_t{truncated(steps)} + lowest);
+}
+static_assert(valueAt(399, 4, 0) == 99 && valueAt(400, 4, 0) == 100 && valueAt(40, 4, -5) == 5);
+
+constexpr int shownKnobPercent(int percent) {
+  return percent == 0 ? kDefaultKnobPercent : std::min(percent, kMostKnobPercent);
+}
+
+}  // namespace
+
+SlideMove::SlideMove(const SKIA_Rect* area, int percent, int a, int b, int initial)
+    : minValue(rangeOf(a, b).lowest),
+      maxValue(rangeOf(a, b).highest),
+      knobPercent(shownKnobPercent(percent)),
+      showValue(percent == 0 ? 1 : 0),
+      value(startOf(a, b, initial)) {
+  kLog.print(LogLevel::Debug, "call registerWidget");
+  setType(kBaseLayer);
+  setRect(area);
+  Window::registerWidget(this);
+}
+
+SlideMove::~SlideMove() { leaveLayers(); }
+
+int SlideMove::show(unsigned int) {
+  const std::lock_guard guard(stateLock);
+  if (showValue == 1) {
+    valueText.string_len = std::snprintf(valueText.text, sizeof valueText.text, "%3d %%", value);
+  }
+  fillUpTo(rect.x);
+  skia_add_box_c(track);
+  skia_add_box_c(groove);
+  skia_add_box_c(fill);
+  skia_add_box_c(frameOuter);
+  skia_add_box_c(frameInner);
+  if (showValue == 1) {
+    skia_add_textbox_c(rect, valueText);
+  } else {
+    skia_add_box_c(rect);
+  }
+  return 1;
+}
+
+bool SlideMove::onRecvEvent(event_data* event, unsigned int) {
+  if (event == nullptr) return false;
+  switch (hold.touch(*event, read(rect))) {
+    case KnobHold::Touch::NotMine: return false;
+    case KnobHold::Touch::Grab: onPress(event); return true;
+    case KnobHold::Touch::Cancel: return true;
+    case KnobHold::Touch::Move: onHover(event->mouse); return true;
+    case KnobHold::Touch::Drop: onRelease(event); return true;
+  }
+  return false;
+}
+
+void SlideMove::onPress(event_data* event) {
+  if (event == nullptr) return;
+  kLog.print(LogLevel::Debug, "pressed!!: %d", static_cast<int>(event->mouse.finger));
+  hold.grab(event->mouse);
+}
+
+void SlideMove::onRelease(event_data* event) {
+  if (event == nullptr) return;
+  kLog.print(LogLevel::Debug, "released!!:%d", static_cast<int>(event->mouse.finger));
+  hold.letGo();
+}
+
+void SlideMove::Lock() { locked = 1; }
+void SlideMove::unLock() { locked = 0; }
+
+void SlideMove::onHover(mouse_event mouse) {
+  const std::lock_guard guard(stateLock);
+  const int64_t left = track.x;
+  const int64_t wanted = int64_t{rect.x} + mouse.xrel;
+  rect.x = toPixels(wanted > left ? std::min(wanted, left + travel) : left);
+  takeValueAt(static_cast<unsigned int>(rect.x - left));
+}
+
+void SlideMove::setRect(const SKIA_Rect* area) {
+  if (area == nullptr) return;
+  const SKIA_Rect to = *area;
+  const std::lock_guard guard(stateLock);
+  layOut(to);
+}
+
+void SlideMove::layOut(const SKIA_Rect& area) {
+  track = area;
+  const int64_t width = percentOf(track.w, knobPercent);
+  travel = toPixels(track.w - width);
+  const int64_t knobX = int64_t{track.x} + distanceOf(value);
+  rect = makeRect(knobX, track.y, width, track.h, kKnobColor);
+  frameInner = grown(rect, kInnerFrame, kColorWhite);
+  frameOuter = grown(rect, kOuterFrame, kColorBlack);
+  fillUpTo(rect.x);
+  groove = {track.x, fill.y, track.w, fill.h, kGrooveColor};
+  valueText.align = SKIA_ALIGN_CENTRE;
+  valueText.size = rect.h / kValueTextPart;
+  valueText.color = kColorWhite;
+}
+
+void SlideMove::setRect_Slide(const SKIA_Rect* knob) {
+  if (knob == nullptr) return;
+  const int32_t knobX = knob->x;
+  const std::lock_guard guard(stateLock);
+  fillUpTo(knobX);
+}
+
+// The frame's height and width stay.
+void SlideMove::fillUpTo(int32_t knobX) {
+  const int margin = track.h / kTenths;
+  fill = makeRect(track.x, int64_t{track.y} + margin, int64_t{knobX} - track.x + kFillOverlap,
+                  int64_t{track.h} - 2 * margin, kFillColor);
+  frameInner.x = toPixels(int64_t{knobX} - kInnerFrame);
+  frameOuter.x = toPixels(int64_t{knobX} - kOuterFrame);
+}
+
+int SlideMove::getValue() const { return read(value); }
+
+void SlideMove::setValue(unsigned int newValue) {
+  const std::lock_guard guard(stateLock);
+  value = static_cast<int>(newValue);
+  layOut(track);
+}
+
+void SlideMove::setMove2Value(unsigned int position) {
+  const std::lock_guard guard(stateLock);
+  takeValueAt(position);
+}
+
+void SlideMove::takeValueAt(unsigned int position) {
+  const float perStep = pixelsPerStep(travel, {minValue, maxValue});
+  if (perStep > 0) value = valueAt(position, perStep, minValue);
+}
+
+int SlideMove::setValue2Move(unsigned int ofValue) {
+  const std::lock_guard guard(stateLock);
+  return distanceOf(static_cast<int>(ofValue));
+}
+
+int SlideMove::distanceOf(int ofValue) const {
+  const int64_t steps = int64_t{ofValue} - minValue;
+  return truncated(static_cast<float>(steps) * pixelsPerStep(travel, {minValue, maxValue}));
+}
+
+}  // namespace MW
