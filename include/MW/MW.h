@@ -14,6 +14,8 @@
 #include <MW/records.h>
 #include <MW/screen.h>
 #include <MW/slide.h>
+#include <MW/static_text.h>
+#include <MW/text_panel.h>
 #include <MW/timed.h>
 #include <MW/widget.h>
 #include <MW/widget_list.h>
