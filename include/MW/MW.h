@@ -28,6 +28,8 @@
 #include <MW/slide.h>
 #include <MW/slide_e.h>
 #include <MW/slide_move.h>
+#include <MW/static_text.h>
+#include <MW/text_panel.h>
 #include <MW/timed.h>
 #include <MW/widget.h>
 #include <MW/widget_list.h>

@@ -2,6 +2,7 @@
 
 #include <android/log.h>
 #include <brimol/display.h>
+#include <brimol/properties.h>
 
 #include <chrono>
 #include <new>
@@ -122,4 +123,20 @@ void Delay(unsigned int ms) {
 void getDpi(float* xdpi, float* ydpi) {
   *xdpi = platform().xdpi;
   *ydpi = platform().ydpi;
+}
+
+// NOLINTNEXTLINE(readability-identifier-naming): the parameters are named as in the contract
+int property_get(const char* key, char* value, const char* default_value) {
+  const std::lock_guard guard(platform().lock);
+  const auto found = platform().properties.find(key);
+  const std::string text = found != platform().properties.end() ? found->second : default_value;
+  const std::size_t length = text.copy(value, BRIMOL_PROPERTY_BYTES - 1);
+  value[length] = '\0';
+  return static_cast<int>(length);
+}
+
+int property_set(const char* key, const char* value) {
+  const std::lock_guard guard(platform().lock);
+  platform().properties.insert_or_assign(key, value);
+  return 0;
 }

@@ -6,7 +6,9 @@
 
 #include <atomic>
 #include <deque>
+#include <map>
 #include <mutex>
+#include <string>
 #include <thread>
 #include <utility>
 #include <vector>
@@ -28,6 +30,7 @@ struct PlatformState {
   std::vector<Drawing> drawings;
   std::vector<LogLine> lines;
   std::deque<Event> fed;
+  std::map<std::string, std::string> properties;
 };
 
 /// The one platform. The platform's calls may come from any thread, and so may these.
@@ -52,7 +55,7 @@ struct RecordingPlatform : PlatformState {
   std::atomic<int> parked = 0;
 
   std::thread::id testThread;
-  std::mutex lock;  // guards `records` and the lists
+  std::mutex lock;  // guards `records`, the lists and the properties
 
  private:
   template <typename List>
