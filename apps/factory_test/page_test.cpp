@@ -1,5 +1,7 @@
 #include "page_test.h"
 
+#include <algorithm>
+
 namespace factory_test {
 
 void LookTest::leave() {
@@ -15,7 +17,32 @@ void LookTest::update(uint32_t) {
   }
   endLook();
   page.ask();
-  page.say(question);
+  page.say(question().c_str());
+}
+
+void StepTest::updateLook() {
+  const int step = wanted;
+  if (step == shown) return;
+  if (step > lastStep()) {
+    finishLook();
+    return;
+  }
+  shown = step;
+  showStep(step);
+}
+
+void StepTest::move(int by) { wanted = std::max(shown + by, 0); }
+
+void StepTest::followKey(unsigned int code) {
+  switch (code) {
+    case MW::kKeyRight:
+    case MW::kKeyDown:
+    case MW::kKeySelect: move(1); break;
+    case MW::kKeyLeft:
+    case MW::kKeyUp: move(-1); break;
+    case kKeyBack: finishLook(); break;
+    default: break;
+  }
 }
 
 }  // namespace factory_test

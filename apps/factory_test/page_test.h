@@ -2,6 +2,7 @@
 #pragma once
 
 #include <atomic>
+#include <string>
 
 #include "page.h"
 #include "test.h"
@@ -30,22 +31,43 @@ class LookTest : public PageTest {
   void update(uint32_t now) final;
 
  protected:
-  /// `wanted`: what the verdict is asked with.
-  LookTest(const char* title, const char* instructions, const char* wanted)
-      : PageTest(title, instructions), question(wanted) {}
+  using PageTest::PageTest;
 
   /// Puts the test's own widgets on the screen, and takes them off again; also when they are off.
   virtual void beginLook() = 0;
   virtual void endLook() = 0;
   /// A round of the main loop while it is looked at.
   virtual void updateLook() {}
+  /// What the verdict is asked with.
+  virtual std::string question() const = 0;
 
   /// Ends the look with the next round. Any thread.
   void finishLook() { looked = true; }
 
  private:
-  const char* question;
   std::atomic<bool> looked = false;
+};
+
+/// A look at one thing after another. The right, down and select keys show the next one, the left
+/// and up keys the one before, the back key ends the look; so does the step after the last one.
+class StepTest : public LookTest {
+ protected:
+  using LookTest::LookTest;
+
+  void beginLook() final { showStep(shown); }
+  void updateLook() final;
+
+  virtual int lastStep() const = 0;
+  /// Puts what belongs to a step, from 0, in the place of what is there.
+  virtual void showStep(int step) = 0;
+
+  /// Moves with the next round. Any thread.
+  void move(int by);
+  void followKey(unsigned int code);
+
+ private:
+  std::atomic<int> shown = 0;   // on the screen
+  std::atomic<int> wanted = 0;  // by the user
 };
 
 }  // namespace factory_test

@@ -38,22 +38,22 @@ static_assert(sizeof(ref_t) == 204 + sizeof(void*), "nothing stands behind the p
 /// The application's callbacks. Each is copied into the words of Widget that stand beside it,
 /// whether the widget calls them or not; what they are called with stands at the widget's class.
 struct ref_cb_t {
-  Callback cbPress;         ///< pressCallback
-  Callback cbClick;         ///< clickCallback
-  Callback cbLongPress;     ///< longPressCallback
-  Callback cbDoubleClick;   ///< doubleClickCallback
-  Callback cbTouchPress;    ///< touchPressCallback, callbackWord5, rowPressCallback
-  Callback cbTouchRelease;  ///< touchReleaseCallback, leftCallback, exitCallback, button1Callback,
-                            ///< callbackWord17
-  Callback cbRight;         ///< rightCallback, button2Callback, callbackWord18
-  Callback cbKeyPress;      ///< keyPressCallback
-  Callback cbKeyRelease;    ///< keyReleaseCallback
-  Callback unread9;
-  Callback cbDoubleKey;  ///< doubleKeyCallback
-  Callback cbTripleKey;  ///< tripleKeyCallback
-  Callback cbExtra;      ///< hookKeyCallback
-  Callback cbPlug;       ///< plugCallback
-  Callback cbHover;      ///< hoverCallback
+  Callback cbPress = {};         ///< pressCallback
+  Callback cbClick = {};         ///< clickCallback
+  Callback cbLongPress = {};     ///< longPressCallback
+  Callback cbDoubleClick = {};   ///< doubleClickCallback
+  Callback cbTouchPress = {};    ///< touchPressCallback, callbackWord5, rowPressCallback
+  Callback cbTouchRelease = {};  ///< touchReleaseCallback, leftCallback, exitCallback,
+                                 ///< button1Callback, callbackWord17
+  Callback cbRight = {};       ///< rightCallback, button2Callback, callbackWord18
+  Callback cbKeyPress = {};    ///< keyPressCallback
+  Callback cbKeyRelease = {};  ///< keyReleaseCallback
+  Callback unread9 = {};
+  Callback cbDoubleKey = {};  ///< doubleKeyCallback
+  Callback cbTripleKey = {};  ///< tripleKeyCallback
+  Callback cbExtra = {};      ///< hookKeyCallback
+  Callback cbPlug = {};       ///< plugCallback
+  Callback cbHover = {};      ///< hoverCallback
 };
 static_assert(sizeof(ref_cb_t) == 15 * sizeof(Callback));
 static_assert(offsetof(ref_cb_t, cbTouchRelease) == 5 * sizeof(Callback));

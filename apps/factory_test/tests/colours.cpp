@@ -20,8 +20,7 @@ constexpr int kColours = 5;  // of MW::FullScreen
 /// and the verdict is asked for.
 class ColourTest : public LookTest {
  public:
-  ColourTest()
-      : LookTest("Colours", "Look for pixels and places that differ.", "Was every colour even?") {}
+  ColourTest() : LookTest("Colours", "Look for pixels and places that differ.") {}
 
  protected:
   void beginLook() override {
@@ -35,6 +34,8 @@ class ColourTest : public LookTest {
       Current<ColourTest>::get().followKey(event->code);
     };
   }
+
+  std::string question() const override { return "Was every colour even?"; }
 
   void endLook() override {
     key.reset();

@@ -1,48 +1,30 @@
 // Every built-in dialog, one after another.
 #include <MW/dialog.h>
 
-#include <array>
-#include <atomic>
-#include <cstdio>
 #include <optional>
+#include <string>
 
 #include "current.h"
 #include "page_test.h"
-#include "verdict_bar.h"
 
 namespace factory_test {
 
 namespace {
 
-constexpr int kFirstKind = 0;
 constexpr int kLastKind = 39;
 
-/// A touch, the right key or select shows the next kind, the left key the one before. The right
-/// button, and back, end the look, and the verdict is asked for.
-class PromptTest : public LookTest {
+/// A touch, too, shows the next kind, and the right button ends the look.
+class PromptTest : public StepTest {
  public:
-  PromptTest()
-      : LookTest("Prompts", "Touch for the next dialog;\nthe right button ends.",
-                 "Did all dialogs look right?") {}
+  PromptTest() : StepTest("Prompts", "Touch for the next dialog;\nthe right button ends.") {}
 
  protected:
-  void beginLook() override { showDialog(); }
+  std::string question() const override { return "Did all dialogs look right?"; }
+  int lastStep() const override { return kLastKind; }
 
-  void endLook() override { dialog.reset(); }
-
-  void updateLook() override {
-    if (kind > kLastKind) {
-      finishLook();
-    } else if (kind != shown) {
-      showDialog();
-    }
-  }
-
- private:
-  void showDialog() {
+  void showStep(int kind) override {
     dialog.reset();
-    shown = kind.load();
-    MW::Dialog& made = dialog.emplace(shown.load());
+    MW::Dialog& made = dialog.emplace(kind);
     made.clickCallback = [](MW::mouse_event*) { Current<PromptTest>::get().move(1); };
     made.button2Callback = [](int) { Current<PromptTest>::get().finishLook(); };
     made.hookKeyCallback = [](int) { Current<PromptTest>::get().move(1); };
@@ -50,25 +32,13 @@ class PromptTest : public LookTest {
       Current<PromptTest>::get().followKey(event->code);
     };
     made.setActive(1);
-    std::array<char, SKIA_TEXT_BYTES> words{};
-    std::snprintf(words.data(), words.size(), "Dialog of kind %d", shown.load());
-    page.say(words.data());
+    page.say(("Dialog of kind " + std::to_string(kind)).c_str());
   }
 
-  void followKey(unsigned int code) {
-    if (code == MW::kKeyRight || code == MW::kKeyDown || code == MW::kKeySelect) move(1);
-    if (code == MW::kKeyLeft || code == MW::kKeyUp) move(-1);
-    if (code == kKeyBack) finishLook();
-  }
+  void endLook() override { dialog.reset(); }
 
-  void move(int by) {
-    const int wanted = shown + by;
-    if (wanted >= kFirstKind) kind = wanted;
-  }
-
+ private:
   Current<PromptTest> current{this};
-  std::atomic<int> kind = kFirstKind;   // wanted by the user
-  std::atomic<int> shown = kFirstKind;  // on the screen
   std::optional<MW::Dialog> dialog;
 };
 

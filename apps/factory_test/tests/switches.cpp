@@ -72,7 +72,7 @@ class SwitchTest : public PageTest {
   std::optional<MW::Slide> locked;
 };
 
-const TestRegistration kRegistration({Group::Widgets, 1, "switches", "Slide switches",
+const TestRegistration kRegistration({Group::Widgets, 2, "switches", "Slide switches",
                                       makeTest<SwitchTest>});
 
 }  // namespace

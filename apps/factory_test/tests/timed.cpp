@@ -84,7 +84,7 @@ class TimedTest : public PageTest {
   std::optional<MW::Progressbar> progress;
 };
 
-const TestRegistration kRegistration({Group::Widgets, 2, "timed", "Toast and progress",
+const TestRegistration kRegistration({Group::Widgets, 3, "timed", "Toast and progress",
                                       makeTest<TimedTest>});
 
 }  // namespace

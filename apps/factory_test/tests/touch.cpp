@@ -23,9 +23,7 @@ constexpr int kCrossWidth = 3;  // pixels
 /// select key, ends the look, and the verdict is asked for.
 class TouchTest : public LookTest {
  public:
-  TouchTest()
-      : LookTest("Touch", "Touch and drag everywhere.\nTap twice in one place to end.",
-                 "Double tap. Was every touch met?") {}
+  TouchTest() : LookTest("Touch", "Touch and drag everywhere.\nTap twice in one place to end.") {}
 
   void draw() override {
     page.drawGround();
@@ -46,6 +44,8 @@ class TouchTest : public LookTest {
       if (event->code == MW::kKeySelect || event->code == kKeyBack) self().finishLook();
     };
   }
+
+  std::string question() const override { return "Double tap. Was every touch met?"; }
 
   void endLook() override {
     key.reset();

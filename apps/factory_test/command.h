@@ -1,0 +1,33 @@
+/// A command of the system's shell that runs while the application goes on.
+#pragma once
+
+#include <sys/types.h>
+
+#include <optional>
+#include <string>
+
+namespace factory_test {
+
+/// Runs from construction; destruction ends the command and all that it started. One thread.
+class Command {
+ public:
+  /// `line` is for /bin/sh. The command reads nothing, and writes all to one place.
+  explicit Command(const std::string& line);
+  ~Command();
+  Command(const Command&) = delete;
+  Command& operator=(const Command&) = delete;
+
+  /// What it has written since the last call, at most a few thousand bytes, and less than that only
+  /// when there is no more yet. Never waits.
+  std::string read();
+  /// How it ended, once it has and all that it wrote is read: "exit code 0", "signal 9", or why it
+  /// could not be started.
+  std::optional<std::string> outcome();
+
+ private:
+  pid_t process = 0;  // the leader of a group of its own; 0: none runs
+  int output = -1;    // the end of a pipe that is read from; -1: closed
+  std::string ended;  // empty: it has not
+};
+
+}  // namespace factory_test

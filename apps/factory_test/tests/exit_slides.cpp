@@ -1,0 +1,63 @@
+// Slides that end something once their knob has come to the other end.
+#include <MW/slide_e.h>
+
+#include <optional>
+
+#include "current.h"
+#include "layout.h"
+#include "page_test.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr int kFromLeft = 0;  // MW::SlideE's states
+constexpr int kFromRight = 1;
+constexpr uint32_t kBarColor = 0xFFC8D2E0;
+
+/// One slide passes the test, the other leaves it.
+class ExitSlideTest : public PageTest {
+ public:
+  ExitSlideTest()
+      : PageTest("Exit slides",
+                 "Drag a knob to the other end:\nthe upper one passes, the lower leaves.") {}
+
+  void enter() override {
+    page.ask();
+    place(passing, 38, kFromLeft, "Slide to pass");
+    place(leaving, 56, kFromRight, "Slide to leave");
+    passing->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Pass; };
+    leaving->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Left; };
+  }
+
+  void leave() override {
+    leaving.reset();
+    passing.reset();
+    page.endAsking();
+  }
+
+  Outcome verdict() const override {
+    const Outcome slid = ended;
+    return slid != Outcome::Running ? slid : PageTest::verdict();
+  }
+
+ private:
+  static void place(std::optional<MW::SlideE>& slide, int top, int state, const char* words) {
+    const SKIA_Rect area = rowOf(screenSize(), top, 10, kBarColor);
+    const SKIA_Text caption = captionOf(words);
+    slide.emplace(state, &area, &caption, "");
+    slide->setActive(1);
+  }
+
+  Current<ExitSlideTest> current{this};
+  std::atomic<Outcome> ended = Outcome::Running;
+  std::optional<MW::SlideE> passing;
+  std::optional<MW::SlideE> leaving;
+};
+
+const TestRegistration kRegistration({Group::Widgets, 4, "exit_slides", "Exit slides",
+                                      makeTest<ExitSlideTest>});
+
+}  // namespace
+
+}  // namespace factory_test

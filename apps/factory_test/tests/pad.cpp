@@ -1,0 +1,85 @@
+// The multi-touch pad: every cell can be held by a finger of its own.
+#include <MW/button8.h>
+#include <MW/button_s.h>
+
+#include <atomic>
+#include <bitset>
+#include <optional>
+#include <string>
+
+#include "current.h"
+#include "layout.h"
+#include "page_test.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr int kLayouts = 6;  // of MW::Button8
+constexpr int kFramed = 2;   // MW::ButtonNew's style
+constexpr uint32_t kPadColor = 0xFF3C4A60;
+
+/// Tells which cells are held. The button, or the up key, changes the layout.
+class PadTest : public PageTest {
+ public:
+  PadTest()
+      : PageTest("Multi-touch pad",
+                 "Hold the cells with several fingers at once.\n"
+                 "The button, or key up: the next layout.") {}
+
+  void enter() override {
+    page.ask().otherKey = [](unsigned int code) {
+      if (code == MW::kKeyUp) self().nextLayout();
+    };
+    const SKIA_Rect area = padArea();
+    const SKIA_Text unused = {};
+    pad.emplace(layout.load(), &area, &unused);
+    pad->pressCallback = [](MW::mouse_event* mouse) { self().tell(mouse->state); };
+    pad->clickCallback = [](MW::mouse_event* mouse) { self().tell(mouse->state); };
+    pad->setActive(1);
+    const SKIA_Rect row = rowOf(screenSize(), kContentTop, 6, kButtonColor);
+    const SKIA_Text caption = captionOf("Next layout");
+    changer.emplace(kFramed, &row, &caption);
+    changer->setBdColor(MW::kColorWhite);
+    changer->clickCallback = [](int) { self().nextLayout(); };
+    changer->setActive(1);
+  }
+
+  void leave() override {
+    changer.reset();
+    pad.reset();
+    page.endAsking();
+  }
+
+ private:
+  static PadTest& self() { return Current<PadTest>::get(); }
+
+  static SKIA_Rect padArea() { return rowOf(screenSize(), 42, 38, kPadColor); }
+
+  void nextLayout() {
+    layout = (layout + 1) % kLayouts;
+    const SKIA_Rect area = padArea();
+    pad->hide();  // frees the cells
+    pad->setRect(layout, &area);
+    pad->setActive(1);
+    tell(0);
+  }
+
+  void tell(uint32_t mask) {
+    constexpr int kCells = 8;
+    const std::string cells = std::bitset<kCells>(mask).to_string();
+    page.say(("Layout " + std::to_string(layout) + ", held " + cells).c_str());
+  }
+
+  Current<PadTest> current{this};
+  std::atomic<int> layout = 0;
+  std::optional<MW::Button8> pad;
+  std::optional<MW::ButtonNew> changer;
+};
+
+const TestRegistration kRegistration({Group::Input, 2, "pad", "Multi-touch pad",
+                                      makeTest<PadTest>});
+
+}  // namespace
+
+}  // namespace factory_test

@@ -1,0 +1,104 @@
+// Push buttons without a highlight, in all their styles.
+#include <MW/button.h>
+#include <MW/button_s.h>
+
+#include <array>
+#include <memory>
+#include <string>
+#include <utility>
+
+#include "current.h"
+#include "layout.h"
+#include "page_test.h"
+
+namespace factory_test {
+
+namespace {
+
+using MakeButton = std::unique_ptr<MW::Widget> (*)(const SKIA_Rect& area, const SKIA_Text& caption);
+
+template <typename Kind, int style>
+std::unique_ptr<MW::Widget> makeStyled(const SKIA_Rect& area, const SKIA_Text& caption) {
+  return std::make_unique<Kind>(style, &area, &caption);
+}
+
+std::unique_ptr<MW::Widget> makePlain(const SKIA_Rect& area, const SKIA_Text& caption) {
+  return std::make_unique<MW::Button>(&area, &caption);
+}
+
+struct StyleRow {
+  const char* name;
+  int top;  // per cent of the screen's height, and so the next
+  int height;
+  int column;
+  int columns;
+  MakeButton make;
+};
+
+// Events come to the last but one first, and it lets the last one have them, too.
+constexpr auto kStyles = std::to_array<StyleRow>({
+    {"Button box", 36, 9, 0, 2, makeStyled<MW::ButtonS, 0>},
+    {"Text box", 36, 9, 1, 2, makeStyled<MW::ButtonS, 1>},
+    {"Box", 49, 9, 0, 3, makeStyled<MW::ButtonNew, 0>},
+    {"Text", 49, 9, 1, 3, makeStyled<MW::ButtonNew, 1>},
+    {"Framed", 49, 9, 2, 3, makeStyled<MW::ButtonNew, 2>},
+    {"Both", 62, 17, 0, 1, makeStyled<MW::ButtonS, 2>},
+    {"One", 72, 6, 1, 3, makePlain},
+});
+
+/// Counts the clicks of each.
+class StyleTest : public PageTest {
+ public:
+  StyleTest()
+      : PageTest("Button styles",
+                 "Every button counts its clicks;\na click on the lowest counts twice.") {}
+
+  void enter() override {
+    page.ask();
+    placeAll(std::make_index_sequence<kStyles.size()>());
+  }
+
+  void leave() override {
+    for (std::size_t i = buttons.size(); i > 0; --i) buttons.at(i - 1).reset();
+    page.endAsking();
+  }
+
+ private:
+  template <std::size_t... index>
+  void placeAll(std::index_sequence<index...>) {
+    (place(index, [](int) { Current<StyleTest>::get().count(index); }), ...);
+  }
+
+  void place(std::size_t index, void (*clicked)(int)) {
+    const StyleRow& row = kStyles.at(index);
+    const SKIA_Rect area =
+        cellOf(rowOf(screenSize(), row.top, row.height, kButtonColor), row.column, row.columns);
+    buttons.at(index) = row.make(area, captionOf(row.name));
+    buttons.at(index)->clickCallback = clicked;
+    buttons.at(index)->setActive(1);
+  }
+
+  void count(std::size_t index) {
+    ++counts.at(index);
+    std::string words;
+    for (std::size_t i = 0; i < counts.size(); ++i) {
+      if (counts.at(i) == 0) continue;
+      words.append(kStyles.at(i).name)
+          .append(" ")
+          .append(std::to_string(counts.at(i)))
+          .append("  ");
+    }
+    page.say(words.c_str());
+  }
+
+  Current<StyleTest> current{this};
+  std::array<int, kStyles.size()> counts = {};  // dispatch thread
+  std::array<std::unique_ptr<MW::Widget>, kStyles.size()> buttons;
+};
+
+const TestRegistration kRegistration({Group::Widgets, 1, "styles", "Button styles",
+                                      makeTest<StyleTest>});
+
+}  // namespace
+
+}  // namespace factory_test
