@@ -19,7 +19,7 @@ template <typename... Self>
 class MW_API TextPanel : public Widget {
  public:
   /// A function of the application, called on the dispatch thread. Null: not wanted.
-  using Call = void (*)(int zero, Self*... panel);
+  using PanelCallback = void (*)(int zero, Self*... panel);
 
   using Widget::show;
   /// show(0).
@@ -47,10 +47,11 @@ class MW_API TextPanel : public Widget {
   /// Back to the background of its construction, and asks for a redraw if it had another.
   void restoreColor() override;
 
-  Call press_cb = nullptr;
-  Call release_cb = nullptr;  ///< released inside
-  Call long_press_cb = nullptr;
-  Call double_tap_cb = nullptr;  ///< the second of two taps of which each step took under 500 ms
+  PanelCallback press_cb = nullptr;
+  PanelCallback release_cb = nullptr;  ///< released inside
+  PanelCallback long_press_cb = nullptr;
+  PanelCallback double_tap_cb =
+      nullptr;  ///< the second of two taps of which each step took under 500 ms
 
  protected:
   /// `logWord` speaks in the log and is a literal. The panel is not registered yet.
@@ -68,7 +69,7 @@ class MW_API TextPanel : public Widget {
   DoubleTap taps;                   // dispatch thread
 
  private:
-  void call(Call callback);
+  void call(PanelCallback callback);
   bool isInside(const event_data* event) const;
 
   const char* word;

@@ -18,28 +18,28 @@ TextLines::TextLines(std::string_view source, std::size_t rowBytes, std::size_t 
   bytes.erase(std::remove_copy_if(source.begin(), source.end(), bytes.begin(), isDropped),
               bytes.end());
   rows.reserve(expectedRows);
-  const std::string_view all = bytes;
-  std::size_t begin = 0;
-  std::size_t end = 0;
-  for (int lineNumber = 1; end != std::string_view::npos; ++lineNumber) {
-    end = all.find('\n', begin);
-    addLine(begin, all.substr(begin, end - begin), rowBytes, lineNumber);
+  auto begin = bytes.cbegin();
+  for (int lineNumber = 1;; ++lineNumber) {
+    const auto end = std::find(begin, bytes.cend(), '\n');
+    addLine({begin, end}, rowBytes, lineNumber);
+    if (end == bytes.cend()) break;
     begin = end + 1;
   }
 }
 
-void TextLines::addLine(std::size_t begin, std::string_view line, std::size_t rowBytes,
-                        int lineNumber) {
+void TextLines::addLine(std::string_view line, std::size_t rowBytes, int lineNumber) {
   int number = lineNumber;
   while (line.size() >= rowBytes) {
     const std::size_t whole = cutText(line, rowBytes).size();
-    const std::size_t taken = whole != 0 ? whole : rowBytes;
-    rows.push_back({static_cast<int>(begin), number});
+    addRow(line, number);
     number = kContinued;
-    begin += taken;
-    line.remove_prefix(taken);
+    line.remove_prefix(whole != 0 ? whole : rowBytes);
   }
-  rows.push_back({static_cast<int>(begin), number});
+  addRow(line, number);
+}
+
+void TextLines::addRow(std::string_view rest, int number) {
+  rows.push_back({static_cast<int>(rest.data() - bytes.data()), number});
 }
 
 std::string_view TextLines::text(int64_t row) const {

@@ -150,7 +150,7 @@ void TextPanel<Self...>::restoreColor() {
 }
 
 template <typename... Self>
-void TextPanel<Self...>::call(Call callback) {
+void TextPanel<Self...>::call(PanelCallback callback) {
   if (callback != nullptr) callback(0, static_cast<Self*>(this)...);
 }
 

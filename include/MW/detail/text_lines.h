@@ -36,7 +36,8 @@ class TextLines {
     int number;
   };
 
-  void addLine(std::size_t begin, std::string_view line, std::size_t rowBytes, int lineNumber);
+  void addLine(std::string_view line, std::size_t rowBytes, int lineNumber);
+  void addRow(std::string_view rest, int number);
   bool isRow(int64_t row) const { return row >= 0 && row < count(); }
 
   std::string bytes;  // what is not dropped, with the "\n"s between the lines
