@@ -76,7 +76,7 @@ inline constexpr int kContentTop = 34;
 constexpr PageLayout layOutPage(ScreenSize screen) {
   return {
       .ground = {0, 0, screen.width, screen.height, kGroundColor},
-      .title = rowOf(screen, 2, 7, kTitleColor),
+      .title = rowOf(screen, 1, 6, kTitleColor),
       .hint = rowOf(screen, 10, 13, 0),
       .line = rowOf(screen, 25, 7, kLineColor),
   };

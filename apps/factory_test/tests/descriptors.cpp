@@ -46,6 +46,7 @@ constexpr int kWhiteMs = 700;
 constexpr int kLineWidth = 4;  // pixels
 constexpr uint32_t kBarColor = 0xFFC8D2E0;
 constexpr std::size_t kTexts = 5;
+constexpr SKIA_Rect kNoPlace = {0, 0, 0, 0, kBarColor};  // of what places itself
 
 /// PASS, RETRY and FAIL are squares of the page itself; the select key passes, the back key leaves.
 class DescriptorTest : public Test {
@@ -158,8 +159,8 @@ const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
     {kLabel, true, {0, 2, 10, 7, 0}, "Built from descriptors"},
     {kLine, true, {1, 10, 9, 10, kBarColor}, ""},
     {kFirstInColumn, true, {1, 11, 8, 4, kBarColor}, "A column of text boxes:"},
-    {kNextInColumn, true, {}, "each stands below the one before,"},
-    {kNextInColumn, true, {}, "wherever its own rectangle is."},
+    {kNextInColumn, true, kNoPlace, "each stands below the one before,"},
+    {kNextInColumn, true, kNoPlace, "wherever its own rectangle is."},
     {kButton, true, {1, 25, 3, 7, kBarColor}, "Toast", {.cbClick = showTimed}},
     {kButton, true, {6, 25, 3, 7, kBarColor}, "White", {.cbClick = whiten}},
     {kButton, true, {1, 34, 3, 7, kBarColor}, "Dialog", {.cbClick = [](int) { open(kDialog); }}},
@@ -174,9 +175,9 @@ const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
      {1, 52, 8, 6, kBarColor},
      "Slide to leave",
      {.cbTouchRelease = choose<Outcome::Left>}},
-    {kLeftSquare, true, {}, "PASS", {.cbClick = choose<Outcome::Pass>}},
-    {kCentreSquare, true, {}, "RETRY", {.cbClick = choose<Outcome::Retry>}},
-    {kRightSquare, true, {}, "FAIL", {.cbClick = choose<Outcome::Fail>}},
+    {kLeftSquare, true, kNoPlace, "PASS", {.cbClick = choose<Outcome::Pass>}},
+    {kCentreSquare, true, kNoPlace, "RETRY", {.cbClick = choose<Outcome::Retry>}},
+    {kRightSquare, true, kNoPlace, "FAIL", {.cbClick = choose<Outcome::Fail>}},
     {kToast, false, {1, 60, 8, 8, kTitleColor}, "A toast", {}, {"with a second line"}},
     {kProgress, false, {1, 70, 8, 5, kTitleColor}, "Two seconds"},
     {kKey, true, {}, "", {.cbKeyPress = followKey}},

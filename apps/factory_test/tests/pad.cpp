@@ -2,6 +2,7 @@
 #include <MW/button8.h>
 #include <MW/button_s.h>
 
+#include <algorithm>
 #include <atomic>
 #include <bitset>
 #include <optional>
@@ -54,7 +55,12 @@ class PadTest : public PageTest {
  private:
   static PadTest& self() { return Current<PadTest>::get(); }
 
-  static SKIA_Rect padArea() { return rowOf(screenSize(), 42, 38, kPadColor); }
+  // Not wider than high: a single row of cells is as high as its width says.
+  static SKIA_Rect padArea() {
+    const SKIA_Rect row = rowOf(screenSize(), 42, 38, kPadColor);
+    const int side = std::min(row.w, row.h);
+    return {row.x + (row.w - side) / 2, row.y, side, row.h, row.color};
+  }
 
   void nextLayout() {
     layout = (layout + 1) % kLayouts;

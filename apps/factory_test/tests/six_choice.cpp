@@ -13,7 +13,7 @@ namespace factory_test {
 
 namespace {
 
-constexpr auto kChoices = std::to_array<const char*>({"2G", "3G", "4G", "5G", "WLAN", "NFC"});
+constexpr auto kChoices = std::to_array<const char*>({"2G", "3G", "4G", "5G", "BT", "NFC"});
 
 /// A choice, and the keys select and back, end the look.
 class SixChoiceTest : public LookTest {

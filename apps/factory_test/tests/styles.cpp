@@ -32,18 +32,19 @@ struct StyleRow {
   int height;
   int column;
   int columns;
+  uint32_t color;
   MakeButton make;
 };
 
 // Events come to the last but one first, and it lets the last one have them, too.
 constexpr auto kStyles = std::to_array<StyleRow>({
-    {"Button box", 36, 9, 0, 2, makeStyled<MW::ButtonS, 0>},
-    {"Text box", 36, 9, 1, 2, makeStyled<MW::ButtonS, 1>},
-    {"Box", 49, 9, 0, 3, makeStyled<MW::ButtonNew, 0>},
-    {"Text", 49, 9, 1, 3, makeStyled<MW::ButtonNew, 1>},
-    {"Framed", 49, 9, 2, 3, makeStyled<MW::ButtonNew, 2>},
-    {"Both", 62, 17, 0, 1, makeStyled<MW::ButtonS, 2>},
-    {"One", 72, 6, 1, 3, makePlain},
+    {"Button box", 36, 9, 0, 2, kButtonColor, makeStyled<MW::ButtonS, 0>},
+    {"Text box", 36, 9, 1, 2, kButtonColor, makeStyled<MW::ButtonS, 1>},
+    {"Box", 49, 9, 0, 3, kButtonColor, makeStyled<MW::ButtonNew, 0>},
+    {"Text", 49, 9, 1, 3, kButtonColor, makeStyled<MW::ButtonNew, 1>},
+    {"Framed", 49, 9, 2, 3, kButtonColor, makeStyled<MW::ButtonNew, 2>},
+    {"Both", 62, 17, 0, 1, kButtonColor, makeStyled<MW::ButtonS, 2>},
+    {"One", 72, 6, 1, 3, MW::kColorWhite, makePlain},
 });
 
 /// Counts the clicks of each.
@@ -72,8 +73,9 @@ class StyleTest : public PageTest {
   void place(std::size_t index, void (*clicked)(int)) {
     const StyleRow& row = kStyles.at(index);
     const SKIA_Rect area =
-        cellOf(rowOf(screenSize(), row.top, row.height, kButtonColor), row.column, row.columns);
+        cellOf(rowOf(screenSize(), row.top, row.height, row.color), row.column, row.columns);
     buttons.at(index) = row.make(area, captionOf(row.name));
+    buttons.at(index)->setBdColor(MW::kColorBlack);  // of the framed one
     buttons.at(index)->clickCallback = clicked;
     buttons.at(index)->setActive(1);
   }

@@ -1,0 +1,161 @@
+// A long text to scroll and to search: a file, or what the program itself has logged.
+#include <MW/button_s.h>
+#include <MW/ime.h>
+#include <MW/static_text.h>
+#include <MW/window.h>
+
+#include <array>
+#include <mutex>
+#include <optional>
+#include <string>
+#include <utility>
+
+#include "current.h"
+#include "layout.h"
+#include "page_test.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr uint32_t kPaper = 0xFFF4F4EC;
+constexpr uint32_t kKeyboardColor = 0xFF3C4A60;
+constexpr int kFramed = 2;         // MW::ButtonNew's style
+constexpr int kTopPercent = 34;    // of the screen's height, and so the next
+constexpr int kViewPercent = 38;   // of the viewer by itself
+constexpr int kAbovePercent = 16;  // of the viewer above the keyboard
+constexpr int kKeyboardPercent = 29;
+
+/// The viewer with what the page tells of a search.
+class Viewer : public MW::StaticText {
+ public:
+  Viewer(const SKIA_Rect* area, const SKIA_Text* looks)
+      : StaticText(area, looks, true, true, true) {}
+  ~Viewer() override { leaveLayers(); }
+  std::size_t matches() const {
+    const std::lock_guard guard(stateLock);
+    return found_lines.size();
+  }
+};
+
+/// Drag it, or hold the scroll bar, to scroll. The buttons open the keyboard and go from match to
+/// match, as the keys up and down do; the fold key closes the keyboard.
+class LogTest : public PageTest {
+ public:
+  explicit LogTest(const Surroundings& program)
+      : PageTest("Log",
+                 "Drag to scroll. Search, then Previous\nand Next, or the keys up and down."),
+        text(program.logText ? *program.logText : program.log.text()) {}
+
+  void enter() override {
+    page.ask().otherKey = [](unsigned int code) {
+      if (code == MW::kKeyUp) self().jump(kPrevious);
+      if (code == MW::kKeyDown) self().jump(kNext);
+    };
+    placeViewer();
+    placeKeyboard();
+    placeButtons(std::make_index_sequence<kButtons.size()>());
+  }
+
+  void leave() override {
+    for (std::size_t i = buttons.size(); i > 0; --i) buttons.at(i - 1).reset();
+    keyboard.reset();
+    viewer.reset();
+    page.endAsking();
+  }
+
+ private:
+  enum Direction { kPrevious = 0, kNext = 1 };  // as the viewer counts them
+  struct ButtonRow {
+    const char* caption;
+    void (*clicked)(int);
+  };
+
+  static LogTest& self() { return Current<LogTest>::get(); }
+
+  static constexpr std::array<ButtonRow, 3> kButtons = {{
+      {"Search", [](int) { self().openKeyboard(); }},
+      {"Previous", [](int) { self().jump(kPrevious); }},
+      {"Next", [](int) { self().jump(kNext); }},
+  }};
+
+  void placeViewer() {
+    const ScreenSize screen = screenSize();
+    const SKIA_Rect area = rowOf(screen, kTopPercent, kViewPercent, kPaper);
+    const SKIA_Text looks = textOf("", MW::kColorBlack, SKIA_ALIGN_LEFT, textSize(screen));
+    viewer.emplace(&area, &looks);
+    viewer->setRect(0, &area);  // room for the line numbers
+    viewer->setText(text.c_str());
+    viewer->setActive(1);
+  }
+
+  void placeKeyboard() {
+    const SKIA_Rect area =
+        rowOf(screenSize(), kTopPercent + kAbovePercent + 1, kKeyboardPercent, kKeyboardColor);
+    const SKIA_Text looks = captionOf("");
+    keyboard.emplace(&area, &looks);
+    keyboard->release_cb = [](int, MW::Ime* from) { self().follow(*from); };
+  }
+
+  template <std::size_t... number>
+  void placeButtons(std::index_sequence<number...>) {
+    (placeButton(number), ...);
+  }
+
+  void placeButton(std::size_t number) {
+    const SKIA_Rect area = cellOf(rowOf(screenSize(), 74, 6, kButtonColor),
+                                  static_cast<int>(number), static_cast<int>(kButtons.size()));
+    const SKIA_Text caption = captionOf(kButtons.at(number).caption);
+    MW::ButtonNew& button = buttons.at(number).emplace(kFramed, &area, &caption);
+    button.clickCallback = kButtons.at(number).clicked;
+    button.setActive(1);
+  }
+
+  // The keyboard takes the place of the viewer's lower part and of the buttons.
+  void showKeyboard(bool isShown) {
+    const SKIA_Rect area =
+        rowOf(screenSize(), kTopPercent, isShown ? kAbovePercent : kViewPercent, kPaper);
+    viewer->setRect(0, &area);
+    keyboard->setActive(isShown ? 1 : 0);
+    for (auto& button : buttons) button->setActive(isShown ? 0 : 1);
+    MW::isDisplayUpdate(1);
+  }
+
+  void openKeyboard() {
+    keyboard->typing_reset();
+    keyboard->set_fold_status(false);
+    showKeyboard(true);
+  }
+
+  void follow(MW::Ime& from) {
+    const std::string wanted = from.getResultString();
+    if (!wanted.empty()) {
+      from.typing_reset();
+      search(wanted);
+    }
+    if (!wanted.empty() || from.get_fold_status()) showKeyboard(false);
+  }
+
+  void search(const std::string& wanted) {
+    viewer->get_ime_result(wanted.c_str());
+    viewer->line_search(text.c_str());
+    page.say((std::to_string(viewer->matches()) + " x " + wanted).c_str());
+  }
+
+  void jump(Direction direction) {
+    viewer->line_search_point(direction);
+    MW::isDisplayUpdate(1);
+  }
+
+  Current<LogTest> current{this};
+  const std::string text;
+  std::optional<Viewer> viewer;
+  std::optional<MW::Ime> keyboard;
+  std::array<std::optional<MW::ButtonNew>, kButtons.size()> buttons;
+};
+
+const TestRegistration kRegistration({Group::Reports, 0, "log", "Log", makeTest<LogTest>});
+
+}  // namespace
+
+}  // namespace factory_test
