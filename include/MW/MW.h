@@ -7,6 +7,7 @@
 #include <MW/callback.h>
 #include <MW/dialog.h>
 #include <MW/event_service.h>
+#include <MW/ime.h>
 #include <MW/key.h>
 #include <MW/main_list.h>
 #include <MW/primitives.h>
