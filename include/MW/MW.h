@@ -17,6 +17,7 @@
 #include <MW/dialog_warn.h>
 #include <MW/event_service.h>
 #include <MW/framed_dialog.h>
+#include <MW/ime.h>
 #include <MW/key.h>
 #include <MW/main_list.h>
 #include <MW/mpd_wid.h>

@@ -10,7 +10,7 @@
 #include "core/class_log.h"
 #include "core/geometry.h"
 #include "core/life_guard.h"
-#include "text/static_text_parts.h"
+#include "text/text_parts.h"
 
 namespace MW {
 
@@ -69,7 +69,7 @@ void StaticText::init(const SKIA_Rect* area, const SKIA_Text* looks) {
   info_type.fill('\0');
   property_get(kInfoProperty, info_type.data(), "");
   const bool isCpu = info_type.data() == kCpu;
-  if (isCpu) kStaticTextLog.print(LogLevel::Debug, "w_count = 80 (only cpu clock)");
+  if (isCpu) kViewerLog.print(LogLevel::Debug, "w_count = 80 (only cpu clock)");
   hover_count = 0;
   const std::lock_guard guard(stateLock);
   showTimer = {};
@@ -131,8 +131,8 @@ void StaticText::logRows(std::size_t needed) const {
     fitting = h_count;
     if (isRefreshed(info_type.data())) rows = std::max(rows, int64_t{top_index} + h_count);
   }
-  kStaticTextLog.print(LogLevel::Debug, "max_num_of_lines : %d", toPixels(rows));
-  kStaticTextLog.print(LogLevel::Debug, "h_count: %d", fitting);
+  kViewerLog.print(LogLevel::Debug, "max_num_of_lines : %d", toPixels(rows));
+  kViewerLog.print(LogLevel::Debug, "h_count: %d", fitting);
 }
 
 bool StaticText::onRecvEvent(event_data* event, unsigned int) {
@@ -151,7 +151,7 @@ bool StaticText::onRecvEvent(event_data* event, unsigned int) {
 }
 
 void StaticText::onHover(mouse_event mouse) {
-  kStaticTextLog.print(LogLevel::Debug, "onHover!!");
+  kViewerLog.print(LogLevel::Debug, "onHover!!");
   if (hover_count++ < kMotionsPassedOver) return;
   hover_count = 0;
   const std::lock_guard guard(stateLock);
@@ -166,7 +166,7 @@ void StaticText::onPressLong(event_data* event) {
   const LifeGuard self(this);
   TextPanel::onPressLong(event);
   if (!self.isAlive() || event == nullptr || jumpTo(event->mouse)) return;
-  kStaticTextLog.print(LogLevel::Debug, "onPressLong is not correct!!");
+  kViewerLog.print(LogLevel::Debug, "onPressLong is not correct!!");
 }
 
 // False where the area is too low for the bar that was drawn last.

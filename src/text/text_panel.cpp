@@ -1,5 +1,6 @@
 #include <MW/c_api.h>
 #include <MW/event_service.h>
+#include <MW/ime.h>
 #include <MW/static_text.h>
 #include <brimol/input.h>
 
@@ -161,5 +162,6 @@ bool TextPanel<Self...>::isInside(const event_data* event) const {
 }
 
 template class TextPanel<>;
+template class TextPanel<Ime>;
 
 }  // namespace MW

@@ -6,7 +6,7 @@
 
 #include "core/bounded_text.h"
 #include "core/geometry.h"
-#include "text/static_text_parts.h"
+#include "text/text_parts.h"
 
 namespace MW {
 
@@ -40,19 +40,18 @@ std::vector<int> findLines(std::string_view source, std::string_view wanted) {
 
 void StaticText::get_ime_result(const char* wanted) {
   const std::string_view given = wholeText(wanted);
-  kStaticTextLog.print(LogLevel::Debug, "str : %s (get_ime_result)", given.data());
-  kStaticTextLog.print(LogLevel::Debug, "strlen(str) : %d (get_ime_result)",
-                       static_cast<int>(given.size()));
-  decltype(str_searched) kept = {};
-  std::ranges::copy(cutText(given, kept.size() - 1), kept.begin());
+  kViewerLog.print(LogLevel::Debug, "str : %s (get_ime_result)", given.data());
+  kViewerLog.print(LogLevel::Debug, "strlen(str) : %d (get_ime_result)",
+                   static_cast<int>(given.size()));
+  const auto kept = shortText(wanted);
   write(str_searched, kept);
-  kStaticTextLog.print(LogLevel::Debug, "str_searched : %s (get_ime_result)", kept.data());
+  kViewerLog.print(LogLevel::Debug, "str_searched : %s (get_ime_result)", kept.data());
 }
 
 void StaticText::line_search(const char* source) {
-  kStaticTextLog.print(LogLevel::Debug, "line_search start");
+  kViewerLog.print(LogLevel::Debug, "line_search start");
   const auto wanted = read(str_searched);
-  kStaticTextLog.print(LogLevel::Debug, "str_searched : %s (line_search)", wanted.data());
+  kViewerLog.print(LogLevel::Debug, "str_searched : %s (line_search)", wanted.data());
   std::vector<int> numbers;
   std::vector<int> rows;
   try {
@@ -63,7 +62,7 @@ void StaticText::line_search(const char* source) {
     rows.clear();
   }
   takeMatches(numbers, rows);
-  kStaticTextLog.print(LogLevel::Debug, "line_search end");
+  kViewerLog.print(LogLevel::Debug, "line_search end");
 }
 
 // One walk over the rows: matches and rows both ascend. The last row is not looked at, and a line
@@ -100,12 +99,12 @@ void StaticText::line_search_point(unsigned int direction) {
       top_index = toPixels(std::min<int64_t>(next, last));
     }
   }
-  kStaticTextLog.printClose(LogLevel::Debug, "prev_index : %d", previous);
-  kStaticTextLog.printClose(LogLevel::Debug, "next_index : %d", next);
+  kViewerLog.printClose(LogLevel::Debug, "prev_index : %d", previous);
+  kViewerLog.printClose(LogLevel::Debug, "next_index : %d", next);
 }
 
 int StaticText::find_real_num(int real) {
-  kStaticTextLog.printClose(LogLevel::Debug, "find_real_num");
+  kViewerLog.printClose(LogLevel::Debug, "find_real_num");
   const std::lock_guard guard(stateLock);
   const int row = lines.find(real, 0, last_index);
   if (row == last_index) return top_index;

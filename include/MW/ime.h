@@ -1,0 +1,98 @@
+/// The on-screen keyboard.
+#pragma once
+
+#include <MW/text_panel.h>
+
+#include <array>
+
+namespace MW {
+
+class Ime;
+struct ImeKey;
+extern template class TextPanel<Ime>;
+
+/// A bar with what was typed and five rows of keys below it, in one of four layouts. See TextPanel
+/// for its life and its callbacks, which are functions of an int and the keyboard.
+///
+/// A press types at once and calls nothing; so `press_cb` is called by onPress() alone, which no
+/// event reaches. A press on the border of a key hits no key. `release_cb` follows every key, and
+/// is the place to read what enter left in getResultString(): it runs on the thread that types.
+///
+/// The "fold" key clears the typed text and sets the fold status, which the application asks for;
+/// the keyboard itself stays. In the layout of digits alone, "fold" first sets the property
+/// "brimol.info_1.ime_flag" to "true".
+class MW_API Ime : public TextPanel<Ime> {
+ public:
+  /// What `key_type` says. "shift" leads from each of the first three to the next.
+  enum KeyType { kSmall = 0, kCapitals = 1, kSpecial = 2, kOnlyDigits = 3 };
+
+  /// Copies the records; null ones are all zero. The keys stand where `area` says now, a tenth of
+  /// its width and a sixth of its height each, and take the colour and size of `looks`, whose text
+  /// is not shown.
+  Ime(const SKIA_Rect* area, const SKIA_Text* looks);
+  ~Ime() override;
+
+  using TextPanel::onHover;
+  using TextPanel::show;
+  /// The background, and then 42 button boxes. Returns 1.
+  int show(unsigned int ticks) override;
+  bool onRecvEvent(event_data* event, unsigned int arg) override;
+  /// Moves and resizes the background; the keys, the colour and the first argument stay. Null: no
+  /// change.
+  void setRect(int variant, const SKIA_Rect* newRect) override;
+
+  /// The text of the last enter, of at most 99 bytes; the keyboard's own buffer. An enter
+  /// overwrites its beginning only: the tail of a longer text stays until setResultString or
+  /// typing_reset.
+  char* getResultString();
+  /// Cut to 99 bytes at a whole character. Null is the empty text.
+  void setResultString(const char* result);
+  /// Clears the typed text, the result and the bar's bytes, but not the bar's length.
+  void typing_reset();
+
+  /// The layout that presses are read by. It relabels nothing; another number than 0 to 3: nothing.
+  void presskey_set(unsigned int type);
+  /// Relabels the keys, 0 to 2, or greys all but the digits and "back", "fold" and "enter", 3. Only
+  /// 0 takes the grey away. Another number: nothing. Presses are read as before.
+  void keyboard_change(unsigned int type);
+  bool get_fold_status();
+  void set_fold_status(bool folded);
+
+  // A press, read by the layout that the name says. Null: nothing. Up to 15 bytes are typed; "back"
+  // takes one away.
+
+  void onPressKey_small(event_data* event);
+  void onPressKey_big(event_data* event);
+  void onPressKey_special(event_data* event);
+  void onPressKey_only_num(event_data* event);
+  /// Writes a log line.
+  void onHover(mouse_event mouse);
+
+ protected:
+  static constexpr std::size_t kTypedBytes = 100;
+  static constexpr std::size_t kKeys = 42;  // with the bar
+
+  // All guarded by stateLock. Index 0 is the bar. The fold key's rectangle stands apart, so that
+  // from there on a label's index is one ahead of its rectangle's.
+  std::array<SKIA_Rect, kKeys - 1> key_rect = {};
+  std::array<SKIA_Text, kKeys> key_text = {};
+  SKIA_Rect fold_rect = {};
+  std::array<char, kTypedBytes> temp_searched = {};  // the typed text
+  std::array<char, kTypedBytes> result_string = {};
+  int key_type = kSmall;
+  bool fold_status = false;
+
+ private:
+  SKIA_Rect& rectOf(std::size_t key);
+  void layOutKeys();
+  void pressKey(int layout, const event_data* event);
+  int measureTyped();
+  int showTyped();
+  std::size_t keyAt(const mouse_event& mouse);
+  void act(const ImeKey& key, int layout, std::size_t length);
+  void fold(int layout);
+  void enter();
+  void shift(int layout);
+};
+
+}  // namespace MW

@@ -1,0 +1,32 @@
+/// What the sources of the text widgets share.
+#pragma once
+
+#include <algorithm>
+#include <array>
+#include <climits>
+#include <cstring>
+#include <string_view>
+
+#include "core/bounded_text.h"
+#include "core/class_log.h"
+
+namespace MW {
+
+inline constexpr ClassLog kViewerLog("STATICTEXT");
+
+/// An application's text of any length, cut where ints no longer count its lines. Null is empty.
+inline std::string_view wholeText(const char* given) {
+  if (given == nullptr) return "";
+  return {given, strnlen(given, INT_MAX - 1)};
+}
+
+inline constexpr std::size_t kShortBytes = 100;
+
+/// An application's text cut to what is kept of typed and wanted texts; NULs behind it.
+inline std::array<char, kShortBytes> shortText(const char* given) {
+  std::array<char, kShortBytes> kept = {};
+  std::ranges::copy(cutText(wholeText(given), kShortBytes - 1), kept.begin());
+  return kept;
+}
+
+}  // namespace MW
