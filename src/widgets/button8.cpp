@@ -58,6 +58,7 @@ static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[0].x == 20);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[1].x == 210);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[2].y == 218);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[2].w == 170);
+static_assert(layOutCells({0, 0, 400, 800, 0}, {3, 2})[0].x == -22);  // too narrow: they overlap
 
 constexpr bool isWithin(const SKIA_Rect& cell, const mouse_event& mouse) {
   return cell.x < mouse.x && mouse.x < int64_t{cell.x} + cell.w && cell.y < mouse.y &&
