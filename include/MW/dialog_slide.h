@@ -54,8 +54,8 @@ class MW_API DialogSlide : public Widget {
   void onSlidePressed(mouse_event mouse);
   void onSlideHover(mouse_event mouse);
   void onSlideReleased(mouse_event mouse);
-  void onPressKey(kbd_event key);
-  void onReleaseKey(kbd_event key);
+  void onPressKey(kbd_event key) const;
+  void onReleaseKey(kbd_event key) const;
 
   // Called on the dispatch thread. Null: not wanted. Records are valid for the call.
 

@@ -170,6 +170,7 @@ bool DialogList::releaseAt(event_data* event) {
   if (self.isAlive() && answers && liftFrom(button2, event)) onBtn2Released(event->mouse);
   if (!self.isAlive()) return true;
   enable(1, 1, 1);
+  setSelect(0);
   onRelease(event);
   return true;
 }

@@ -67,7 +67,7 @@ int DialogShell::takeSlot() {
   const auto places = std::span(order).first(static_cast<std::size_t>(maxLines));
   const auto free = std::ranges::find(places, kNoLine);
   if (free != places.end()) return *free = static_cast<int>(free - places.begin());
-  std::ranges::rotate(places, places.begin() + 1);
+  std::rotate(places.begin(), places.begin() + 1, places.end());
   return places.back();
 }
 

@@ -184,12 +184,12 @@ void DialogSlide::onSlideReleased(mouse_event mouse) {
   }
 }
 
-void DialogSlide::onPressKey(kbd_event key) {
+void DialogSlide::onPressKey(kbd_event key) const {
   kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
   tell(keyPressCallback, key);
 }
 
-void DialogSlide::onReleaseKey(kbd_event key) {
+void DialogSlide::onReleaseKey(kbd_event key) const {
   kLog.print(LogLevel::Debug, "key onReleaseKey sym = %d", static_cast<int>(key.code));
   tell(keyReleaseCallback, key);
 }

@@ -25,4 +25,11 @@ inline std::string places(const std::vector<Drawing>& drawings) {
   return all.str();
 }
 
+/// The texts of those that have a size, each with "|" behind it.
+inline std::string words(const std::vector<Drawing>& drawings) {
+  std::string all;
+  for (const Drawing& each : drawings) all += each.text.size == 0 ? "" : each.text.text + '|';
+  return all;
+}
+
 }  // namespace brimol::test
