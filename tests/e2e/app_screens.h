@@ -10,18 +10,15 @@ namespace factory_test::screens {
 inline constexpr ScreenSize kScreen = {720, 1280};
 inline constexpr const char* kScreenSetting = "720x1280";
 
-/// The rows of the menu, from its top: how many groups and how many entries stand above each.
+/// The first rows of the menu that is not scrolled: how many groups and entries stand above each.
 struct MenuRow {
   int groupsAbove;
   int entriesAbove;
 };
 inline constexpr MenuRow kColours = {1, 0};
-inline constexpr MenuRow kTouch = {2, 1};
-inline constexpr MenuRow kKeys = {2, 2};
-inline constexpr MenuRow kButtons = {3, 3};
-inline constexpr MenuRow kSwitches = {3, 4};
-inline constexpr MenuRow kTimed = {3, 5};
-inline constexpr MenuRow kDialogs = {4, 6};
+inline constexpr MenuRow kTouch = {2, 2};
+inline constexpr MenuRow kKeys = {2, 3};
+inline constexpr MenuRow kButtons = {3, 6};
 
 constexpr SKIA_Rect areaOf(const MenuRow& row) {
   constexpr int kListTop = 510;  // of MW::MainList with its extended header
@@ -31,6 +28,9 @@ constexpr SKIA_Rect areaOf(const MenuRow& row) {
   return {0, kListTop + kGap + row.groupsAbove * group + row.entriesAbove * entry, kScreen.width,
           entry - kGap, 0};
 }
+
+/// Black on the menu alone, wherever its list is scrolled.
+inline constexpr SKIA_Rect kMenuHeader = {0, 0, kScreen.width, 340, MW::kColorBlack};
 
 // The verdicts: three squares of 220 pixels, 14 from each other and from the edges.
 inline constexpr SKIA_Rect kPass = {14, 1046, 220, 220, MW::kColorWhite};

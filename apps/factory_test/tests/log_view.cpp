@@ -8,7 +8,6 @@
 #include <mutex>
 #include <optional>
 #include <string>
-#include <utility>
 
 #include "current.h"
 #include "layout.h"
@@ -54,7 +53,7 @@ class LogTest : public PageTest {
     };
     placeViewer();
     placeKeyboard();
-    placeButtons(std::make_index_sequence<kButtons.size()>());
+    for (std::size_t i = 0; i < kButtonCount; ++i) placeButton(i);
   }
 
   void leave() override {
@@ -73,11 +72,8 @@ class LogTest : public PageTest {
 
   static LogTest& self() { return Current<LogTest>::get(); }
 
-  static constexpr std::array<ButtonRow, 3> kButtons = {{
-      {"Search", [](int) { self().openKeyboard(); }},
-      {"Previous", [](int) { self().jump(kPrevious); }},
-      {"Next", [](int) { self().jump(kNext); }},
-  }};
+  static constexpr std::size_t kButtonCount = 3;
+  static const std::array<ButtonRow, kButtonCount> kButtons;
 
   void placeViewer() {
     const ScreenSize screen = screenSize();
@@ -97,14 +93,9 @@ class LogTest : public PageTest {
     keyboard->release_cb = [](int, MW::Ime* from) { self().follow(*from); };
   }
 
-  template <std::size_t... number>
-  void placeButtons(std::index_sequence<number...>) {
-    (placeButton(number), ...);
-  }
-
   void placeButton(std::size_t number) {
     const SKIA_Rect area = cellOf(rowOf(screenSize(), 74, 6, kButtonColor),
-                                  static_cast<int>(number), static_cast<int>(kButtons.size()));
+                                  static_cast<int>(number), static_cast<int>(kButtonCount));
     const SKIA_Text caption = captionOf(kButtons.at(number).caption);
     MW::ButtonNew& button = buttons.at(number).emplace(kFramed, &area, &caption);
     button.clickCallback = kButtons.at(number).clicked;
@@ -151,8 +142,14 @@ class LogTest : public PageTest {
   const std::string text;
   std::optional<Viewer> viewer;
   std::optional<MW::Ime> keyboard;
-  std::array<std::optional<MW::ButtonNew>, kButtons.size()> buttons;
+  std::array<std::optional<MW::ButtonNew>, kButtonCount> buttons;
 };
+
+const std::array<LogTest::ButtonRow, LogTest::kButtonCount> LogTest::kButtons = {{
+    {"Search", [](int) { self().openKeyboard(); }},
+    {"Previous", [](int) { self().jump(kPrevious); }},
+    {"Next", [](int) { self().jump(kNext); }},
+}};
 
 const TestRegistration kRegistration({Group::Reports, 0, "log", "Log", makeTest<LogTest>});
 
