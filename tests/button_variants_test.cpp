@@ -77,6 +77,7 @@ TEST_F(ButtonVariantsTest, GoByTheStepsOfAGestureAndMayBeDeleted) {
 TEST_F(ButtonVariantsTest, FramesEndBelowAndRightOfTheFace) {
   MW::ButtonNew framed(2, &kArea, nullptr);
   EXPECT_EQ(shown(framed).at(4).line, (SKIA_Point{110, 20, 110, 70, 0, 1}));
+  EXPECT_EQ(shown(*std::make_unique<MW::ButtonNew>(3, &kArea, nullptr)).size(), 1U);
 }
 
 TEST_F(ButtonVariantsTest, PadsLayOutTheirCellsInAnyRectangle) {
