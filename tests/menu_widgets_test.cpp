@@ -6,45 +6,20 @@
 
 #include <algorithm>
 #include <array>
-#include <cstdio>
 #include <cstring>
 #include <memory>
 
-#include "support/drawings.h"
+#include "support/play.h"
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 using MW::Widget;
 using MenuWidgetTest = WidgetTest;
-using Made = std::unique_ptr<Widget>;
 
 constexpr SKIA_Rect kArea = {10, 20, 503, 100, 0};  // a slide's knob moves from 10 to 310
 const SKIA_Text kCaption = textRecord("Wi-Fi");
 
-Made widget;
-std::string told;
-int calls;
-int lastCall;  // the call that deletes the widget
-MW::mouse_event finger;
-
-void note(char letter) {
-  told += letter;
-  if (++calls == lastCall) widget.reset();
-}
-template <char letter>
-void tell(int value) {
-  note(value == 0 ? letter : '!');
-}
-template <char letter>
-void tellTouch(MW::mouse_event* mouse) {
-  note(mouse->x == finger.x && mouse->finger == finger.finger ? letter : '!');
-}
-template <char letter>
-void tellKey(MW::kbd_event* key) {
-  told += std::to_string(key->code);
-  note(letter);
-}
 Made list(const char* title, int height) {
   auto made = std::make_unique<MW::MainList>(title);
   for (const int kind : {1, 1, 2}) made->addIndex(kind, &kCaption, height);
@@ -75,85 +50,6 @@ Made make(Class which, int variant, const SKIA_Rect& area, const SKIA_Text& text
     case List: break;
   }
   return list(text.text, area.h);
-}
-
-// But the button's, which are the push button's.
-void hear(Widget& made) {
-  made.pressCallback = made.touchPressCallback = tellTouch<'p'>;
-  made.clickCallback = made.touchReleaseCallback = tellTouch<'c'>;
-  made.longPressCallback = tellTouch<'l'>;
-  made.hoverCallback = tellTouch<'h'>;
-  made.doubleClickCallback = tell<'d'>;
-  made.leftCallback = tell<'L'>;
-  made.rightCallback = tell<'R'>;
-  made.button1Callback = tell<'1'>;
-  made.button2Callback = [](int) { note(widget->isActive() ? '!' : '2'); };
-  made.hookKeyCallback = tell<'H'>;
-  made.keyPressCallback = tellKey<'k'>;
-  made.keyReleaseCallback = tellKey<'r'>;
-  made.doubleKeyCallback = tellKey<'D'>;
-  made.tripleKeyCallback = tellKey<'T'>;
-  made.plugCallback = tellKey<'u'>;
-}
-
-// Which finger holds the widget, how many faces are highlighted, where the last thing stands.
-std::string look() {
-  const std::vector<Drawing> all = shown(*widget);
-  const auto isHeld = [](const Drawing& each) { return each.rect.color == MW::kColorHighlight; };
-  return '<' + std::to_string(widget->isSelect()) + '/' +
-         std::to_string(std::ranges::count_if(all, isHeld)) + '/' +
-         std::to_string(all.back().rect.x) + '>';
-}
-
-// Whether it asks to be drawn (!), and then the length of its last text; -: it has gone.
-std::string length() {
-  widget->updateTimer(platform().ticks);
-  const std::string asked = MW::isDisplayUpdate(0) == 1 ? "!" : "";
-  const std::vector<Drawing> all = shown(*widget);
-  if (all.empty()) return asked + (widget->isActive() ? '?' : '-');
-  return asked + std::to_string(all.back().text.text.size());
-}
-
-// t: the time, a negative one before the wrap; n: later. f: the finger. ?: a look, *: a length, d:
-// a drawing pass, g: the last log line. H, B, h, L, o: operations. The rest are events: keys and
-// plugs by their code; p, r and l where it is said, or where the finger was; m by so much, and to
-// the place of that name.
-void step(char what, int x, int y) {
-  constexpr std::string_view kEvents = "mprlkKau";  // by their codes
-  switch (what) {
-    case 't':
-      platform().ticks = static_cast<unsigned int>(x);
-      told += ' ';
-      return;
-    case 'n': platform().ticks += static_cast<unsigned int>(x); return;
-    case 'f': finger.finger = static_cast<unsigned int>(x); return;
-    case '?': told += look(); return;
-    case '*': told += length(); return;
-    case 'd': widget->show(platform().ticks); return;
-    case 'H': widget->onHideTimer(x); return;
-    case 'B': widget->onProgressbar(x); return;
-    case 'g': told += platform().takeLog().back().message; return;
-    case 'h': widget->hide(); return;
-    case 'L': widget->Lock(); return;
-    case 'o': widget->lcdOn(x); return;
-    default: break;
-  }
-  finger = {7, finger.finger, x, y, x, y};
-  const auto code = static_cast<int>(kEvents.find(what));
-  MW::event_data event = {.type = code, .mouse = finger};
-  if (code >= MW::kEventKeyPress) event.key = {1, static_cast<unsigned int>(x)};
-  const bool isTaken = offer(*widget, event);
-  told += isTaken ? '+' : '-';
-}
-
-void play(const std::string& script) {
-  std::istringstream steps(script);
-  for (std::string each; widget != nullptr && steps >> each;) {
-    int x = finger.x;
-    int y = finger.y;
-    std::sscanf(each.c_str() + 1, "%d,%d", &x, &y);
-    step(each.front(), x, y);
-  }
 }
 
 struct InputCase {
@@ -220,31 +116,16 @@ constexpr auto kInput = std::to_array<InputCase>({
      "p+[MAINLIST] position2index= 0340 < 0400 > 0440<1/0/0><0/0/0>"},
 });
 
-void run(const InputCase& row, int deletingCall) {
-  told.clear();
-  calls = 0;
-  lastCall = deletingCall;
-  finger = {};
-  widget = make(row.which, row.variant, kArea, kCaption);
-  widget->setActive(1);
-  widget->setButtonType(row.variant);
-  hear(*widget);
-  if (row.which == Slide) widget->doubleClickCallback = tellTouch<'d'>;
-  play(row.script);
-}
-
 TEST_F(MenuWidgetTest, IsToldAndAnsweredAndAnyCallbackMayDeleteTheWidget) {
   for (const InputCase& row : kInput) {
-    SCOPED_TRACE(row.script);
-    run(row, 0);
-    EXPECT_EQ(told, row.told);
-    for (int call = calls; call > 0; --call) {
-      run(row, call);
-      EXPECT_EQ(widget, nullptr);
-      EXPECT_EQ(calls, call) << "it tells no more";
-    }
+    const auto makeIt = [&row] {
+      Made made = heard(make(row.which, row.variant, kArea, kCaption));
+      made->setButtonType(row.variant);
+      if (row.which == Slide) made->doubleClickCallback = tellTouch<'d'>;
+      return made;
+    };
+    expectTold(makeIt, row.script, row.told);
   }
-  widget.reset();
 }
 
 // Screens that no machine has: 0 is the default size, the others are taken as they are.
