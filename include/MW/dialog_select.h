@@ -51,8 +51,8 @@ class MW_API DialogSelect : public Widget {
   void onBtnPressed(mouse_event mouse, int index);
   void onBtnReleased(mouse_event mouse, int index);
   /// The hook key is ignored.
-  void onPressKey(kbd_event key);
-  void onReleaseKey(kbd_event key);
+  void onPressKey(kbd_event key) const;
+  void onReleaseKey(kbd_event key) const;
   void onHookKeyPressed();
 
   // The application's own callbacks; they hide the base's of the same names. Null: not wanted.

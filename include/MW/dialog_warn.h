@@ -47,7 +47,7 @@ class MW_API ColorPage : public Widget {
   void setBg_title(unsigned int color);
   /// Text box `index`, 0 to 3: its place and colour, and its text; any other index: nothing.
   void setText(unsigned int index, SKIA_Rect area, SKIA_Text caption);
-  void onPressKey(kbd_event key);
+  void onPressKey(kbd_event key) const;
   void onReleaseKey(kbd_event key);
   /// Counts a release of the key that was released last; any other key ends the count.
   void onKeyClickCount(kbd_event key);

@@ -173,13 +173,13 @@ void DialogSelect::onBtnReleased(mouse_event mouse, int index) {
   tell(choiceCallback, mouse);
 }
 
-void DialogSelect::onPressKey(kbd_event key) {
+void DialogSelect::onPressKey(kbd_event key) const {
   if (key.code == kKeyHook) return;
   kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
   tell(keyPressCallback, key);
 }
 
-void DialogSelect::onReleaseKey(kbd_event key) {
+void DialogSelect::onReleaseKey(kbd_event key) const {
   kLog.print(LogLevel::Debug, "key onReleaseKey sym = %d", static_cast<int>(key.code));
   tell(keyReleaseCallback, key);
 }

@@ -83,7 +83,7 @@ void ColorPage::setText(unsigned int index, SKIA_Rect area, SKIA_Text caption) {
   textCount = std::max(textCount, index + 1);
 }
 
-void ColorPage::onPressKey(kbd_event key) { tell(keyPressCallback, key); }
+void ColorPage::onPressKey(kbd_event key) const { tell(keyPressCallback, key); }
 
 void ColorPage::onReleaseKey(kbd_event key) {
   {

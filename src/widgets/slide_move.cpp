@@ -163,7 +163,7 @@ void SlideMove::setRect_Slide(const SKIA_Rect* knob) {
 
 // The frame's height and width stay.
 void SlideMove::fillUpTo(int32_t knobX) {
-  const int margin = track.h / kTenths;
+  const int64_t margin = track.h / kTenths;
   fill = makeRect(track.x, int64_t{track.y} + margin, int64_t{knobX} - track.x + kFillOverlap,
                   int64_t{track.h} - 2 * margin, kFillColor);
   frameInner.x = toPixels(int64_t{knobX} - kInnerFrame);

@@ -44,6 +44,7 @@ void hear(Hearable& made) {
   made.doubleClickCallback = tell<'d'>;
   made.leftCallback = tell<'L'>;
   made.rightCallback = tell<'R'>;
+  made.exitCallback = tell<'E'>;
   made.button1Callback = tell<'1'>;
   made.button2Callback = [](int) { note(widget->isActive() ? '!' : '2'); };
   made.hookKeyCallback = tell<'H'>;
@@ -137,31 +138,45 @@ inline void run(const std::string& script, const std::function<void()>& makeWidg
   play(script);
 }
 
+struct Script {
+  const char* steps;
+  const char* told;  ///< the callbacks, and whether an event was taken
+};
 struct ScriptCase {
   int which;
   int variant;
   const char* script;
-  const char* told;  ///< the callbacks, and whether an event was taken
+  const char* told;
+};
+struct MadeCase {
+  void (*make)();
+  const char* script;
+  const char* told;
 };
 
 /// Plays the script; once more for each of its calls, which then deletes the widget; and on screens
 /// that no machine has.
-inline void expectTold(const ScriptCase& row, const std::function<void()>& makeWidget) {
-  SCOPED_TRACE(row.script);
-  run(row.script, makeWidget);
-  EXPECT_EQ(told, row.told);
+inline void expectTold(const Script& script, const std::function<void()>& makeWidget) {
+  SCOPED_TRACE(script.steps);
+  run(script.steps, makeWidget);
+  EXPECT_EQ(told, script.told);
   for (int call = calls; call > 0; --call) {
-    run(row.script, makeWidget, call);
+    run(script.steps, makeWidget, call);
     EXPECT_EQ(widget, nullptr);
     EXPECT_EQ(calls, call) << "it tells no more";
   }
   for (const auto& [w, h] : {Spot{1, 1}, {6, 7}, {-5, 9}, {INT_MAX, INT_MAX}, {INT_MIN, 1}}) {
     setScreen(w, h);
-    run(row.script, makeWidget);
+    run(script.steps, makeWidget);
     EXPECT_FALSE(widget->onRecvEvent(nullptr, 0));
   }
   setScreen(0, 0);
   widget.reset();
 }
+
+inline void expectTold(const ScriptCase& row, const std::function<void()>& makeWidget) {
+  expectTold(Script{row.script, row.told}, makeWidget);
+}
+inline void expectTold(const MadeCase& row) { expectTold(Script{row.script, row.told}, row.make); }
 
 }  // namespace brimol::test
