@@ -4,6 +4,7 @@
 #include <MW/button.h>
 #include <MW/event_service.h>
 #include <MW/primitives.h>
+#include <MW/static_text.h>
 
 #include "support/failing_malloc.h"
 #include "support/widget_test.h"
@@ -64,6 +65,17 @@ TEST_F(WidgetTest, AWidgetThatFindsNoMemoryStaysOutside) {
   buttons.clear();
   Window::show(1);
   EXPECT_FALSE(FailingAllocation::hasFailed());
+}
+
+TEST_F(WidgetTest, ATextThatFindsNoMemoryIsNotShown) {
+  MW::StaticText viewer(nullptr, nullptr);
+  for (const int nth : {1, 2}) {
+    platform().records = false;
+    const FailingAllocation failure(nth);
+    viewer.setText("a text that is longer than what a string holds without memory");
+    platform().records = true;
+    EXPECT_EQ(shown(viewer).back().text.text, "no log");
+  }
 }
 
 // Every single allocation of a start fails in turn; the threads' own classes allocate as well.

@@ -78,9 +78,8 @@ TEST_F(MainListTest, TextsAreChangedByNumber) {
   list.setText(1, nullptr, 3);
   list.setTextBattery("80 %", 4);
   EXPECT_STREQ(list.items[1].text.text, "Leds") << "the old tail";
-  std::string words;
-  for (const Drawing& each : shown(list)) words += each.text.text + '|';
-  EXPECT_EQ(words, "Led||Menu||80 %|8 bit|8 bit|192.168.100.1|-120 dbm|Testmode: |BLE: ||");
+  EXPECT_EQ(words(shown(list)),
+            "Led|Menu||80 %|8 bit|8 bit|192.168.100.1|-120 dbm|Testmode: |BLE: |");
 }
 
 TEST_F(MainListTest, ScrollsBetweenItsEnds) {

@@ -4,6 +4,7 @@
 #include <MW/text_panel.h>
 
 #include <array>
+#include <string_view>
 
 namespace MW {
 
@@ -89,7 +90,10 @@ class MW_API Ime : public TextPanel<Ime> {
   int measureTyped();
   int showTyped();
   std::size_t keyAt(const mouse_event& mouse);
-  void act(const ImeKey& key, int layout, std::size_t length);
+  void act(const ImeKey& key, int layout);
+  std::size_t typedLength() const;
+  void append(std::string_view typed);
+  void eraseLast();
   void fold(int layout);
   void enter();
   void shift(int layout);

@@ -141,7 +141,7 @@ void Ime::pressKey(int layout, const event_data* event) {
   const int length = measureTyped();
   kLog.print(LogLevel::Debug, "t_search_bar.string_len0 : %d", length);
   const std::size_t key = keyAt(event->mouse);
-  if (key != kNoKey) act(kImeKeys.at(key), layout, static_cast<std::size_t>(length));
+  if (key != kNoKey) act(kImeKeys.at(key), layout);
   kLog.print(LogLevel::Debug, "t_search_bar.string_len1 : %d", length);
   kLog.print(LogLevel::Debug, "t_search_bar.string_len2 : %d", showTyped());
 }
@@ -149,8 +149,12 @@ void Ime::pressKey(int layout, const event_data* event) {
 int Ime::measureTyped() {
   const std::lock_guard guard(stateLock);
   int32_t& length = key_text.at(kBar).string_len;
-  length = static_cast<int32_t>(strnlen(temp_searched.data(), temp_searched.size()));
+  length = static_cast<int32_t>(typedLength());
   return length;
+}
+
+std::size_t Ime::typedLength() const {
+  return strnlen(temp_searched.data(), temp_searched.size() - 1);
 }
 
 int Ime::showTyped() {
@@ -167,20 +171,27 @@ std::size_t Ime::keyAt(const mouse_event& mouse) {
   return key;
 }
 
-void Ime::act(const ImeKey& key, int layout, std::size_t length) {
+void Ime::act(const ImeKey& key, int layout) {
   if (layout == kOnlyDigits && isGreyed(key.role)) return;
   switch (key.role) {
-    case KeyRole::Back:
-      if (length > 0) write(temp_searched.at(length - 1), '\0');
-      break;
-    case KeyRole::Fold: fold(layout); break;
-    case KeyRole::Enter: enter(); break;
-    case KeyRole::Shift: shift(layout); break;
-    default: {
-      const std::string_view typed = typedBy(key, layout);
-      if (length < kMostTyped && !typed.empty()) write(temp_searched.at(length), typed.front());
-    }
+    case KeyRole::Back: return eraseLast();
+    case KeyRole::Fold: return fold(layout);
+    case KeyRole::Enter: return enter();
+    case KeyRole::Shift: return shift(layout);
+    default: return append(typedBy(key, layout));
   }
+}
+
+void Ime::append(std::string_view typed) {
+  const std::lock_guard guard(stateLock);
+  const std::size_t length = typedLength();
+  if (length < kMostTyped) std::ranges::copy(typed, &temp_searched.at(length));
+}
+
+void Ime::eraseLast() {
+  const std::lock_guard guard(stateLock);
+  const std::size_t length = typedLength();
+  if (length > 0) temp_searched.at(length - 1) = '\0';
 }
 
 void Ime::fold(int layout) {

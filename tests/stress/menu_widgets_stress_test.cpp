@@ -27,7 +27,8 @@ struct Menu {
   MW::Progressbar bar{0, kAreas.data(), &kWords};
   MW::Key key;
   MW::Dialog dialog{24};
-  std::array<MW::Widget*, 7> all = {&list, &button, &slide, &toast, &bar, &key, &dialog};
+  MW::StaticText log{kAreas.data(), &kWords, true, true, true};
+  std::array<MW::Widget*, 8> all = {&list, &button, &slide, &toast, &bar, &key, &dialog, &log};
 
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
@@ -41,6 +42,9 @@ struct Menu {
       if (round % 16 == 0) each->hide();
       each->setActive(1);
     }
+    log.setText(std::string(round * 37 % 5000, words[0]).c_str());
+    log.get_ime_result(words.c_str());
+    log.line_search(std::string(round % 3000, words[0]).c_str());
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
     list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));

@@ -3,6 +3,7 @@
 
 #include <MW/window.h>
 
+#include <algorithm>
 #include <climits>
 #include <sstream>
 
@@ -25,11 +26,21 @@ inline std::string places(const std::vector<Drawing>& drawings) {
   return all.str();
 }
 
-/// The texts of those that have a size, each with "|" behind it.
+/// The texts of those that have a size, each with a "|" behind it and a red one with a "!" before
+/// it.
 inline std::string words(const std::vector<Drawing>& drawings) {
+  constexpr uint32_t kRed = 0xFFFF0000;
   std::string all;
-  for (const Drawing& each : drawings) all += each.text.size == 0 ? "" : each.text.text + '|';
+  for (const Drawing& each : drawings) {
+    if (each.text.size != 0) all += (each.text.color == kRed ? "!" : "") + each.text.text + '|';
+  }
   return all;
+}
+
+/// Where the last one stands that says `text`. There is one.
+inline SKIA_Rect placeOf(const std::vector<Drawing>& drawings, const std::string& text) {
+  const auto saysIt = [&](const Drawing& each) { return each.text.text == text; };
+  return std::find_if(drawings.rbegin(), drawings.rend(), saysIt)->rect;
 }
 
 }  // namespace brimol::test
