@@ -4,6 +4,7 @@
 #include <MW/window.h>
 
 #include <algorithm>
+#include <array>
 #include <climits>
 #include <sstream>
 
@@ -26,13 +27,14 @@ inline std::string places(const std::vector<Drawing>& drawings) {
   return all.str();
 }
 
-/// The texts of those that have a size, each with a "|" behind it and a red one with a "!" before
-/// it.
+/// What those say that take a text, each with a "|" behind it and a red one with a "!" before it.
 inline std::string words(const std::vector<Drawing>& drawings) {
   constexpr uint32_t kRed = 0xFFFF0000;
+  constexpr std::array kWordless = {Call::Box, Call::RoundBox, Call::Line, Call::Arrow};
   std::string all;
   for (const Drawing& each : drawings) {
-    if (each.text.size != 0) all += (each.text.color == kRed ? "!" : "") + each.text.text + '|';
+    if (std::ranges::count(kWordless, each.call) == 0)
+      all += (each.text.color == kRed ? "!" : "") + each.text.text + '|';
   }
   return all;
 }
