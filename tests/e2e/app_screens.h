@@ -2,6 +2,7 @@
 #pragma once
 
 #include <array>
+#include <string_view>
 
 #include "layout.h"
 
@@ -48,6 +49,34 @@ inline constexpr SKIA_Rect kDialogOk = {82, 702, 273, 105, MW::kColorWhite};
 inline constexpr SKIA_Rect kDialogCancel = {365, 702, 273, 105, MW::kColorWhite};
 
 inline constexpr PageLayout kPage = layOutPage(kScreen);
+
+// The log viewer's page.
+inline constexpr SKIA_Rect kLogView = rowOf(kScreen, 34, 38, 0);
+inline constexpr SKIA_Rect kSearchButton = cellOf(rowOf(kScreen, 74, 6, kButtonColor), 0, 3);
+inline constexpr SKIA_Rect kKeyboard = rowOf(kScreen, 51, 29, 0);
+
+/// Keys of the keyboard: in rows of so many half keys' indent, each key two half keys wide.
+constexpr SKIA_Rect keyOf(char letter) {
+  struct KeyRow {
+    std::string_view letters;
+    int row;
+    int indent;
+  };
+  constexpr auto kRows = std::to_array<KeyRow>(
+      {{"1234567890", 1, 0}, {"qwertyuiop", 2, 0}, {"asdfghjkl", 3, 1}, {"zxcvbnm", 4, 3}});
+  constexpr int kHalf = kKeyboard.w / 20;
+  constexpr int kHeight = kKeyboard.h / 6;
+  for (const KeyRow& row : kRows) {
+    const auto column = row.letters.find(letter);
+    if (column == std::string_view::npos) continue;
+    return {kKeyboard.x + (row.indent + 2 * static_cast<int>(column)) * kHalf,
+            kKeyboard.y + row.row * kHeight, 2 * kHalf, kHeight, 0};
+  }
+  return {};
+}
+inline constexpr SKIA_Rect kEnterKey = {kKeyboard.x + kKeyboard.w * 3 / 4,
+                                        kKeyboard.y + kKeyboard.h * 5 / 6, kKeyboard.w / 5,
+                                        kKeyboard.h / 6, 0};
 
 enum ButtonPlace {
   kPressButton,

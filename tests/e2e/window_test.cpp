@@ -5,9 +5,10 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
-#include <array>
+#include <algorithm>
 #include <cstdlib>
 #include <filesystem>
+#include <fstream>
 #include <stdexcept>
 #include <string>
 #include <utility>
@@ -29,16 +30,16 @@ constexpr uint32_t kOpaque = 0xFF000000;
 /// The program, from its start to its end.
 class Program {
  public:
-  explicit Program(const std::string& results) {
+  explicit Program(std::vector<std::string> options) {
     setenv("BRIMOL_DISPLAY", "window", 1);
     setenv("BRIMOL_SCREEN", kScreenSetting, 1);
-    const char* const named = std::getenv("FACTORY_TEST");
-    if (named == nullptr) throw std::runtime_error("FACTORY_TEST does not name the program");
-    std::string path = named;
-    std::string option = "--results";
-    std::string file = results;
-    const std::array<char*, 4> arguments = {path.data(), option.data(), file.data(), nullptr};
-    EXPECT_EQ(posix_spawn(&process, path.c_str(), nullptr, nullptr, arguments.data(), environ), 0);
+    const char* const path = std::getenv("FACTORY_TEST");
+    if (path == nullptr) throw std::runtime_error("FACTORY_TEST does not name the program");
+    options.emplace(options.begin(), path);
+    std::vector<char*> arguments;
+    for (std::string& option : options) arguments.push_back(option.data());
+    arguments.push_back(nullptr);
+    EXPECT_EQ(posix_spawn(&process, path, nullptr, nullptr, arguments.data(), environ), 0);
   }
   ~Program() {
     if (process > 0) kill(process, SIGKILL);
@@ -67,7 +68,10 @@ class WindowApplication : public testing::Test {
       return place.window != 0 && sees(areaOf(kTouch), kRowColor);
     }));
   }
-  ~WindowApplication() override { std::filesystem::remove(results); }
+  ~WindowApplication() override {
+    std::filesystem::remove(results);
+    std::filesystem::remove(log);
+  }
 
   bool sees(const SKIA_Rect& area, uint32_t colour) const {
     const int x = place.x + area.x + area.w / kInset;
@@ -97,8 +101,27 @@ class WindowApplication : public testing::Test {
   static constexpr uint32_t kRowColor = 0xFF787878;
   static constexpr int kInset = 8;  // a look at an area falls this part of it from its corner
 
+  /// A log of 400 lines, of which line 300 says where the needle is.
+  static std::string writeLog() {
+    const std::string file = testing::TempDir() + "window_test.log." + std::to_string(getpid());
+    std::ofstream out(file);
+    for (int line = 1; line <= 400; ++line) out << (line == 300 ? "a needle" : "hay") << '\n';
+    return file;
+  }
+  bool seesRedWords() const {
+    const auto isRed = [](uint32_t colour) {
+      return (colour >> 16 & 0xFF) > 0xC0 && (colour & 0xFFFF) == 0;
+    };
+    for (int y = 0; y < kLogView.h; ++y) {
+      const auto row = desktop.row(place.x + kLogView.x, place.y + kLogView.y + y, kLogView.w);
+      if (std::ranges::any_of(row, isRed)) return true;
+    }
+    return false;
+  }
+
   const std::string results = testing::TempDir() + "window_test." + std::to_string(getpid());
-  Program program{results};
+  const std::string log = writeLog();
+  Program program{{"--results", results, "--log", log}};
   const Desktop desktop;
   Desktop::Place place;
 };
@@ -161,6 +184,20 @@ TEST_F(WindowApplication, IsUsedByMouseAndByKeyboard) {
   EXPECT_EQ(verdictsIn(results),
             "buttons PASS\ntouch PASS\ncolours PASS\nkeys FAIL\nswitches FAIL\n"
             "prompts PASS\n");
+}
+
+TEST_F(WindowApplication, SearchesALogByMouse) {
+  std::string downs;
+  for (int entry = 0; entry <= 18; ++entry) downs += "Down ";
+  keys(downs + "Return");
+  EXPECT_TRUE(comesToSee(kSearchButton, kButtonColor));
+  EXPECT_FALSE(seesRedWords());
+  mouse(kSearchButton, "click 1");
+  EXPECT_TRUE(comesToSee(keyOf('5'), MW::kColorWhite));
+  for (const char letter : std::string("needle")) mouse(keyOf(letter), "click 1");
+  mouse(kEnterKey, "click 1");
+  EXPECT_TRUE(comesToSee(kSearchButton, kButtonColor)) << "the keyboard goes away";
+  EXPECT_TRUE(eventually([this] { return seesRedWords(); }));
 }
 
 TEST_F(WindowApplication, EndsWhenItsWindowIsClosed) {
