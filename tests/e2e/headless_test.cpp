@@ -100,6 +100,13 @@ TEST_F(HeadlessApplication, IsDoneByKeysAlone) {
     EXPECT_TRUE(User::seesMenu()) << "it passes by itself";
     EXPECT_TRUE(User::sees(areaOf(kKeys), kPassColor));
 
+    User::start("brightness");
+    EXPECT_TRUE(User::reads(""));
+    for (int i = 0; i < 5; ++i) User::key(SDLK_DOWN);
+    EXPECT_TRUE(User::sees(kPage.line, 0xFF747679)) << "half of its light";
+    User::key(SDLK_ESCAPE);
+    EXPECT_TRUE(User::seesMenu());
+
     User::start("switches");
     EXPECT_TRUE(User::reads(""));
     User::key(SDLK_UP);
@@ -107,7 +114,7 @@ TEST_F(HeadlessApplication, IsDoneByKeysAlone) {
     User::key(SDLK_ESCAPE);
   });
   EXPECT_EQ(code, EXIT_SUCCESS);
-  EXPECT_EQ(verdictsIn(results), "colours FAIL\nkeys PASS\nswitches none\n");
+  EXPECT_EQ(verdictsIn(results), "colours FAIL\nkeys PASS\nbrightness none\nswitches none\n");
 }
 
 TEST_F(HeadlessApplication, RetriesATestAndResumesARun) {
@@ -131,6 +138,8 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
   EXPECT_EQ(runApplication({.headless = true, .results = results}), EXIT_FAILURE);
   EXPECT_EQ(std::filesystem::file_size(results), 7) << "a damaged file stays as it is";
   EXPECT_EQ(runApplication({.headless = true, .shot = folder / "none" / "shot.png"}), EXIT_FAILURE);
+  EXPECT_EQ(runApplication({.headless = true, .log = folder / "none"}), EXIT_FAILURE);
+  EXPECT_EQ(runApplication({.headless = true, .log = folder}), EXIT_FAILURE);
 
   struct WrongLine {
     std::vector<const char*> arguments;

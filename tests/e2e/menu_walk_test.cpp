@@ -83,6 +83,12 @@ int MW::WidgetList::addQueue(int kind, const SKIA_Rect* rect, const SKIA_Point* 
   return own(kind, rect, point, text);
 }
 
+int MW::DialogShell::addShell(const char* line) {
+  sightings.add(std::string("line ") + line);
+  static const auto own = libraryOwn("_ZN2MW11DialogShell8addShellEPKc", &DialogShell::addShell);
+  return (this->*own)(line);
+}
+
 namespace factory_test {
 namespace {
 
@@ -128,7 +134,7 @@ const std::vector<Visit> kVisits = {
      Leave::Look,
      {"MW::DialogNew"},
      {"MW::DialogNew", "MW::DialogNew", "MW::DialogNew", "MW::DialogSlide"}},
-    {"shell", Leave::Look, {"MW::DialogShell"}},
+    {"shell", Leave::Look, {"MW::DialogShell", "line two  words", "line [exit code 3]"}},
     {"warnings", Leave::Look, {"MW::DialogWarn"}, {"MW::AutoCapScreen"}},
     {"log", Leave::Page, {"MW::StaticText", "MW::Ime"}},
     {"result_list", Leave::Look, {"MW::MpdWid"}},
@@ -154,7 +160,7 @@ void leave(Leave how) {
 
 TEST(MenuWalk, ShowsEveryWidgetClassAndDialogKind) {
   ASSERT_EQ(kVisits.size(), testEntries().size());
-  const int code = runWith({}, [] {
+  const int code = runWith({"--shell", "printf 'two\\t words' >&2; sleep 9 & exit 3"}, [] {
     for (std::size_t i = 0; i < kVisits.size(); ++i) {
       const auto& [id, how, shows, next] = kVisits.at(i);
       SCOPED_TRACE(id);
