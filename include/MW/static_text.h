@@ -25,9 +25,9 @@ extern template class TextPanel<>;
 class MW_API StaticText : public TextPanel<> {
  public:
   /// Copies the records; null ones are all zero. `looks`' text, of at most 127 bytes, is the first
-  /// text. `line_num`: with line numbers. `scroll`: with a scroll bar; without it all events are
+  /// text. `numbers`: with line numbers. `scroll`: with a scroll bar; without it all events are
   /// taken and nothing happens. `mark`: with found lines in red.
-  StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool line_num, bool scroll, bool mark);
+  StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool numbers, bool scroll, bool mark);
   /// With a scroll bar only.
   StaticText(const SKIA_Rect* area, const SKIA_Text* looks);
   ~StaticText() override;

@@ -45,9 +45,9 @@ struct ref_cb_t {
   Callback cbTouchPress = {};    ///< touchPressCallback, callbackWord5, rowPressCallback
   Callback cbTouchRelease = {};  ///< touchReleaseCallback, leftCallback, exitCallback,
                                  ///< button1Callback, callbackWord17
-  Callback cbRight = {};       ///< rightCallback, button2Callback, callbackWord18
-  Callback cbKeyPress = {};    ///< keyPressCallback
-  Callback cbKeyRelease = {};  ///< keyReleaseCallback
+  Callback cbRight = {};         ///< rightCallback, button2Callback, callbackWord18
+  Callback cbKeyPress = {};      ///< keyPressCallback
+  Callback cbKeyRelease = {};    ///< keyReleaseCallback
   Callback unread9 = {};
   Callback cbDoubleKey = {};  ///< doubleKeyCallback
   Callback cbTripleKey = {};  ///< tripleKeyCallback

@@ -44,11 +44,11 @@ bool isRefreshed(std::string_view info) { return info == kCpu || info == "gpu" |
 
 }  // namespace
 
-StaticText::StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool line_num, bool scroll,
+StaticText::StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool numbers, bool scroll,
                        bool mark)
     : TextPanel("STATICTEXT") {
   init(area, looks);
-  is_line_num = line_num;
+  is_line_num = numbers;
   is_scroll = scroll;
   is_search_mark = mark;
   StaticText::setText(text.text);
@@ -124,7 +124,7 @@ void StaticText::setText(const char* newText) {
 }
 
 void StaticText::logRows(std::size_t needed) const {
-  int64_t rows = static_cast<int64_t>(needed);
+  auto rows = static_cast<int64_t>(needed);
   int fitting = 0;
   {
     const std::lock_guard guard(stateLock);

@@ -42,9 +42,9 @@ struct Menu {
       if (round % 16 == 0) each->hide();
       each->setActive(1);
     }
-    log.setText(std::string(round * 37 % 5000, words[0]).c_str());
+    log.setText(std::string(words.size() * words.size(), words[0]).c_str());
     log.get_ime_result(words.c_str());
-    log.line_search(std::string(round % 3000, words[0]).c_str());
+    log.line_search(words.c_str());
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
     list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));
