@@ -157,7 +157,7 @@ void Button3::init(int position, const SKIA_Text* first, const SKIA_Text* second
     caption2 = copyText(second);
     delayedShow = DelayedShow();
   }
-  setRect(position, nullptr);
+  Button3::setRect(position, nullptr);
   pressCallback = clickCallback = longPressCallback = doubleClickCallback = nullptr;
   clicks.reset();
   Window::registerWidget(this);
