@@ -28,7 +28,14 @@ struct Menu {
   MW::Key key;
   MW::Dialog dialog{24};
   MW::StaticText log{kAreas.data(), &kWords, true, true, true};
-  std::array<MW::Widget*, 8> all = {&list, &button, &slide, &toast, &bar, &key, &dialog, &log};
+  MW::ButtonNew framed{2, kAreas.data(), &kWords};
+  MW::Button8 pad{3, kAreas.data(), &kWords};
+  MW::SlideE exit{0, kAreas.data(), &kWords, "unread"};
+  MW::SlideMove value{kAreas.data(), 0, 0, 100, 50};
+  MW::DialogSelect choice{1};
+  MW::AutoCapScreen page{0};
+  std::array<MW::Widget*, 14> all = {&list, &button, &slide, &toast, &bar,   &key,    &dialog,
+                                     &log,  &framed, &pad,   &exit,  &value, &choice, &page};
 
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
@@ -47,6 +54,11 @@ struct Menu {
     log.line_search(words.c_str());
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
+    choice.setTitle(words.c_str());
+    choice.setText_str(0, words.c_str());
+    page.setText(0, kAreas.at(number), textRecord(words));
+    page.setText_str(1, words.c_str());
+    value.setRect(&kAreas.at(number));
     list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));
     number == 0 ? list.move_key_down(0) : list.move_key_up(0);
   }
