@@ -11,6 +11,7 @@ namespace {
 
 constexpr SKIA_Rect kScreen = {0, 0, 1440, 2560, 0xFFE0E0E0};
 constexpr std::size_t kTextBytes = 10'000'000;
+constexpr std::size_t kLineBytes = 64;
 constexpr const char* kNeedle = "needle";
 
 class Viewer : public MW::StaticText {
@@ -26,31 +27,28 @@ class Viewer : public MW::StaticText {
       .text = {}, .string_len = 0, .color = 0, .align = 1, .size = 40};
 };
 
-// The needle stands once, in a line of its own behind so many others.
-std::string linesAround(std::size_t before, std::size_t behind) {
-  constexpr const char* kLine = "12:00:00 sensor 12345 reads 0.5, as it should be\n";
+// So many lines of so many bytes, with their ends. The needle stands once, in the line of its
+// number.
+std::string linesOf(std::size_t count, std::size_t bytes, std::size_t needleLine) {
+  std::string line = "12:00:00 sensor 12345 reads 0.5, as it should be";
+  line.resize(bytes - 1, '.');
   std::string text;
-  for (std::size_t i = 0; i < before; ++i) text += kLine;
-  (text += kNeedle) += '\n';
-  for (std::size_t i = 0; i < behind; ++i) text += kLine;
+  text.reserve(count * bytes);
+  for (std::size_t i = 1; i <= count; ++i) (text += i == needleLine ? kNeedle : line) += '\n';
   return text;
 }
 
-std::string longText() {
-  constexpr std::size_t kLineBytes = 49;
-  return linesAround(kTextBytes / kLineBytes, 0);
-}
-
 void settingText(benchmark::State& state) {
-  const std::string text = longText();
+  const auto lineBytes = static_cast<std::size_t>(state.range(0));
+  const std::string text = linesOf(kTextBytes / lineBytes, lineBytes, 0);
   Viewer viewer;
   for ([[maybe_unused]] auto round : state) viewer.setText(text.c_str());
   state.SetBytesProcessed(state.iterations() * static_cast<int64_t>(text.size()));
 }
 
-// With one match at the end, or one in every line.
 void searching(benchmark::State& state, const char* wanted) {
-  const std::string text = longText();
+  constexpr std::size_t kLines = kTextBytes / kLineBytes;
+  const std::string text = linesOf(kLines, kLineBytes, kLines);
   Viewer viewer;
   viewer.setText(text.c_str());
   for ([[maybe_unused]] auto round : state) viewer.search(text, wanted);
@@ -64,8 +62,8 @@ void showingLongText(benchmark::State& state) {
   };
   Viewer viewerOfMany;
   Viewer viewerOfFew;
-  fill(viewerOfMany, linesAround(500'000, 499'999));
-  fill(viewerOfFew, linesAround(20, 79));
+  fill(viewerOfMany, linesOf(1'000'000, kLineBytes, 500'000));
+  fill(viewerOfFew, linesOf(100, kLineBytes, 20));
   const auto drawing = [](Viewer& viewer) {
     return [&viewer] {
       skia_begin_frame_c();
@@ -76,9 +74,9 @@ void showingLongText(benchmark::State& state) {
   compare(state, kCalls, drawing(viewerOfMany), drawing(viewerOfFew));
 }
 
-BENCHMARK(settingText)->Unit(benchmark::kMillisecond);
-BENCHMARK_CAPTURE(searching, one_match, kNeedle)->Unit(benchmark::kMillisecond);
-BENCHMARK_CAPTURE(searching, a_match_a_line, "sensor")->Unit(benchmark::kMillisecond);
+BENCHMARK(settingText)->Arg(kLineBytes)->Arg(kTextBytes)->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(searching, at_the_end, kNeedle)->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(searching, in_every_line, "reads")->Unit(benchmark::kMillisecond);
 BENCHMARK(showingLongText)->Unit(benchmark::kMicrosecond);
 
 }  // namespace

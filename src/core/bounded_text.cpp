@@ -1,6 +1,8 @@
 #include "core/bounded_text.h"
 
 #include <algorithm>
+#include <array>
+#include <charconv>
 #include <cstring>
 
 namespace MW {
@@ -40,6 +42,18 @@ void putTextOpen(SKIA_Text& record, std::string_view bounded) {
 void putText(SKIA_Text& record, std::string_view bounded) {
   putTextOpen(record, bounded);
   record.text[bounded.size()] = '\0';
+}
+
+void putNumber(SKIA_Text& record, int number, Padding padding, std::string_view behind) {
+  constexpr std::size_t kMostDigits = 11;  // with the sign
+  std::array<char, kMostDigits> digits = {};
+  char* const end = std::to_chars(digits.begin(), digits.end(), number).ptr;
+  const auto missing = std::max<std::ptrdiff_t>(padding.width - (end - digits.begin()), 0);
+  char* next = std::fill_n(record.text, missing, padding.fill);
+  next = std::copy(digits.begin(), end, next);
+  next = std::ranges::copy(behind, next).out;
+  *next = '\0';
+  record.string_len = static_cast<int32_t>(next - record.text);
 }
 
 SKIA_Text copyText(const SKIA_Text* given) {

@@ -1,8 +1,6 @@
 #include <MW/static_text.h>
 
 #include <algorithm>
-#include <array>
-#include <cstdio>
 
 #include "core/bounded_text.h"
 #include "core/geometry.h"
@@ -18,7 +16,7 @@ constexpr int kNumberWidth = 4;      // font sizes
 constexpr int kBarWidthParts = 25;   // of the width
 constexpr int kBarHeightParts = 50;  // of the height, at least
 constexpr int kHighestNumber = 99999;
-constexpr std::size_t kNumberBytes = 16;
+constexpr Padding kNumberPadding = {'0', 5};
 
 void drawText(const SKIA_Rect& place, SKIA_Text record, std::string_view words) {
   putText(record, words);
@@ -55,6 +53,7 @@ void StaticText::drawPlaceholder() const {
 void StaticText::drawRows() {
   const int64_t end = std::min(int64_t{top_index} + h_count, int64_t{last_index} + 1);
   int64_t down = 0;
+  SKIA_Text words = text;
   for (int64_t row = std::max(top_index, 0); row < end; ++row) {
     const int number = lines.number(row);
     if (is_line_num && number != TextLines::kContinued) {
@@ -63,17 +62,17 @@ void StaticText::drawRows() {
     }
     // Only a line number ends the red: without numbers it goes on, in later frames too. Meant so.
     if (is_search_mark && std::ranges::binary_search(found_lines, number)) highlight = 1;
-    SKIA_Text words = text;
-    if (is_search_mark && highlight == 1) words.color = kMatchColor;
-    drawText(rowPlace(Column::Words, down), words, lines.text(row));
+    words.color = is_search_mark && highlight == 1 ? kMatchColor : text.color;
+    putText(words, lines.text(row));
+    skia_add_label_c(rowPlace(Column::Words, down), words);
     down += text.size;
   }
 }
 
 void StaticText::drawNumber(int lineNumber, int64_t down) const {
-  std::array<char, kNumberBytes> digits = {};
-  std::snprintf(digits.data(), digits.size(), "%05d:", std::min(lineNumber, kHighestNumber));
-  drawText(rowPlace(Column::Number, down), num_text, digits.data());
+  SKIA_Text record = num_text;
+  putNumber(record, std::min(lineNumber, kHighestNumber), kNumberPadding, ":");
+  skia_add_label_c(rowPlace(Column::Number, down), record);
 }
 
 void StaticText::drawScrollBar() {

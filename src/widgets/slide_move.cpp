@@ -2,8 +2,8 @@
 #include <MW/window.h>
 
 #include <algorithm>
-#include <cstdio>
 
+#include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/geometry.h"
 
@@ -22,6 +22,8 @@ constexpr int kOuterFrame = 2;
 constexpr int kFillOverlap = 3;  // pixels that the fill reaches under the knob
 constexpr int kTenths = 10;
 constexpr int kValueTextPart = 3;  // of the knob's height
+
+constexpr Padding kValuePadding = {' ', 3};
 
 // What the value is from here on, a maximum above it or not: meant so.
 constexpr double kNearlyFull = 99.9;
@@ -80,9 +82,7 @@ SlideMove::~SlideMove() { leaveLayers(); }
 
 int SlideMove::show(unsigned int) {
   const std::lock_guard guard(stateLock);
-  if (showValue == 1) {
-    valueText.string_len = std::snprintf(valueText.text, sizeof valueText.text, "%3d %%", value);
-  }
+  if (showValue == 1) putNumber(valueText, value, kValuePadding, " %");
   fillUpTo(rect.x);
   skia_add_box_c(track);
   skia_add_box_c(groove);
