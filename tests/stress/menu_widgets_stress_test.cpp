@@ -15,7 +15,7 @@ namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 
-constexpr auto kAreas = std::to_array<SKIA_Rect>({{10, 10, 200, 200, 0}, {700, 700, 90, 90, 0}});
+constexpr auto kAreas = std::to_array<SKIA_Rect>({{10, 10, 200, 200, 0}, {1300, 700, 90, 90, 0}});
 const std::array kTexts = {std::string(5, '#'), std::string(90, '%')};
 const SKIA_Text kWords = textRecord(kTexts[0]);
 
@@ -28,7 +28,12 @@ struct Menu {
   MW::Key key;
   MW::Dialog dialog{24};
   MW::StaticText log{kAreas.data(), &kWords, true, true, true};
-  std::array<MW::Widget*, 8> all = {&list, &button, &slide, &toast, &bar, &key, &dialog, &log};
+  MW::DialogSlide answer{3};
+  MW::DialogList choice{"Choice"};
+  MW::DialogShell shell{"Shell", 9};
+  MW::DialogNew prompt{"Prompt", 5, 7};
+  std::array<MW::Widget*, 12> all = {&list,   &button, &slide,  &toast,  &bar,   &key,
+                                     &dialog, &log,    &answer, &choice, &shell, &prompt};
 
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
@@ -39,6 +44,9 @@ struct Menu {
       each->setMsg(words.c_str());
       each->onHideTimer(50);
       each->onProgressbar(round % 8 * 40);
+      each->setDesc(words.c_str(), words.c_str(), nullptr, 1);
+      each->setbutton(words.c_str(), round % 3 == 0 ? words.c_str() : nullptr);
+      each->lcdOn(round % 5);
       if (round % 16 == 0) each->hide();
       each->setActive(1);
     }
@@ -47,8 +55,25 @@ struct Menu {
     log.line_search(words.c_str());
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
+    fillDialogs(round, words.c_str());
     list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));
     number == 0 ? list.move_key_down(0) : list.move_key_up(0);
+  }
+
+  void fillDialogs(int round, const char* words) {
+    answer.setTitle(words);
+    answer.setSlide(words, 300 + round % 90);
+    answer.setRect_init(round);
+    choice.initIndex();
+    while (choice.addIndex(words) < round % 8) continue;
+    choice.initFinish(round % 9);
+    choice.setText(round % 10, words);
+    if (round % 64 == 0) shell.initShell();
+    shell.addShell(words);
+    shell.setRect_static();
+    if (round % 4 == 0) prompt.setProgress(0);
+    prompt.setDescBlink(round % 2);
+    prompt.setDescColor(7);
   }
 };
 
