@@ -28,12 +28,19 @@ struct Menu {
   MW::Key key;
   MW::Dialog dialog{24};
   MW::StaticText log{kAreas.data(), &kWords, true, true, true};
+  MW::ButtonNew framed{2, kAreas.data(), &kWords};
+  MW::Button8 pad{3, kAreas.data(), &kWords};
+  MW::SlideE exit{0, kAreas.data(), &kWords, "unread"};
+  MW::SlideMove value{kAreas.data(), 0, 0, 100, 50};
+  MW::DialogSelect choice{1};
+  MW::AutoCapScreen page{0};
   MW::DialogSlide answer{3};
-  MW::DialogList choice{"Choice"};
+  MW::DialogList rows{"Rows"};
   MW::DialogShell shell{"Shell", 9};
   MW::DialogNew prompt{"Prompt", 5, 7};
-  std::array<MW::Widget*, 12> all = {&list,   &button, &slide,  &toast,  &bar,   &key,
-                                     &dialog, &log,    &answer, &choice, &shell, &prompt};
+  std::array<MW::Widget*, 18> all = {&list,   &button, &slide,  &toast, &bar,   &key,
+                                     &dialog, &log,    &framed, &pad,   &exit,  &value,
+                                     &choice, &page,   &answer, &rows,  &shell, &prompt};
 
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
@@ -55,6 +62,11 @@ struct Menu {
     log.line_search(words.c_str());
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
+    choice.setTitle(words.c_str());
+    choice.setText_str(0, words.c_str());
+    page.setText(0, kAreas.at(number), textRecord(words));
+    page.setText_str(1, words.c_str());
+    value.setRect(&kAreas.at(number));
     fillDialogs(round, words.c_str());
     list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));
     number == 0 ? list.move_key_down(0) : list.move_key_up(0);
@@ -64,10 +76,10 @@ struct Menu {
     answer.setTitle(words);
     answer.setSlide(words, 300 + round % 90);
     answer.setRect_init(round);
-    choice.initIndex();
-    while (choice.addIndex(words) < round % 8) continue;
-    choice.initFinish(round % 9);
-    choice.setText(round % 10, words);
+    rows.initIndex();
+    while (rows.addIndex(words) < round % 8) continue;
+    rows.initFinish(round % 9);
+    rows.setText(round % 10, words);
     if (round % 64 == 0) shell.initShell();
     shell.addShell(words);
     shell.setRect_static();
