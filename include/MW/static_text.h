@@ -25,9 +25,10 @@ extern template class TextPanel<>;
 class MW_API StaticText : public TextPanel<> {
  public:
   /// Copies the records; null ones are all zero. `looks`' text, of at most 127 bytes, is the first
-  /// text. `line_num`: with line numbers. `scroll`: with a scroll bar; without it all events are
+  /// text. `lineNumbers`: with line numbers. `scroll`: with a scroll bar; without it all events are
   /// taken and nothing happens. `mark`: with found lines in red.
-  StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool line_num, bool scroll, bool mark);
+  StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool lineNumbers, bool scroll,
+             bool mark);
   /// With a scroll bar only.
   StaticText(const SKIA_Rect* area, const SKIA_Text* looks);
   ~StaticText() override;
@@ -46,7 +47,8 @@ class MW_API StaticText : public TextPanel<> {
   /// the next setText only. Null: no change.
   void setRect(int variant, const SKIA_Rect* newRect) override;
 
-  /// What the constructors do first: an empty viewer without callbacks, registered.
+  /// What the constructors do first: an empty viewer without callbacks, registered. Not while
+  /// it handles events.
   void init(const SKIA_Rect* area, const SKIA_Text* looks);
   /// Every fourth motion scrolls by a row.
   void onHover(mouse_event mouse);
@@ -65,7 +67,6 @@ class MW_API StaticText : public TextPanel<> {
 
  protected:
   static constexpr int kInfoBytes = 100;
-  static constexpr int kWantedBytes = 100;
 
   // Set before the first event.
   bool is_line_num = false;
@@ -84,7 +85,7 @@ class MW_API StaticText : public TextPanel<> {
   SKIA_Text num_text = {};
   SKIA_Rect scroll_bar = {};  // as last drawn
   TextLines lines;
-  std::array<char, kWantedBytes> str_searched = {};
+  ShortText str_searched = {};
   std::vector<int> found_lines;  // line numbers, ascending, one for each match
   std::vector<int> found_index;  // the first row of each
 

@@ -3,7 +3,7 @@
 #include <brimol/properties.h>
 
 #include <algorithm>
-#include <new>
+#include <exception>
 #include <utility>
 
 #include "core/bounded_text.h"
@@ -44,11 +44,11 @@ bool isRefreshed(std::string_view info) { return info == kCpu || info == "gpu" |
 
 }  // namespace
 
-StaticText::StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool line_num, bool scroll,
+StaticText::StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool lineNumbers, bool scroll,
                        bool mark)
     : TextPanel("STATICTEXT") {
   init(area, looks);
-  is_line_num = line_num;
+  is_line_num = lineNumbers;
   is_scroll = scroll;
   is_search_mark = mark;
   StaticText::setText(text.text);
@@ -118,13 +118,13 @@ void StaticText::setText(const char* newText) {
     line_count = lines.count();
     last_index = line_count == 1 ? 0 : line_count;
     is_setting = 0;
-  } catch (const std::bad_alloc&) {
+  } catch (const std::exception&) {
     return;  // "no log" stays
   }
 }
 
 void StaticText::logRows(std::size_t needed) const {
-  int64_t rows = static_cast<int64_t>(needed);
+  auto rows = static_cast<int64_t>(needed);
   int fitting = 0;
   {
     const std::lock_guard guard(stateLock);
