@@ -28,7 +28,10 @@ struct Menu {
   MW::Key key;
   MW::Dialog dialog{24};
   MW::StaticText log{kAreas.data(), &kWords, true, true, true};
-  std::array<MW::Widget*, 8> all = {&list, &button, &slide, &toast, &bar, &key, &dialog, &log};
+  MW::Ime keyboard{kAreas.data(), &kWords};
+  MW::MpdWid results{"Results"};
+  std::array<MW::Widget*, 10> all = {&list, &button, &slide, &toast,    &bar,
+                                     &key,  &dialog, &log,   &keyboard, &results};
 
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
@@ -45,6 +48,9 @@ struct Menu {
     log.setText(std::string(round * 37 % 5000, words[0]).c_str());
     log.get_ime_result(words.c_str());
     log.line_search(std::string(round % 3000, words[0]).c_str());
+    keyboard.keyboard_change(number == 0 ? MW::Ime::kSmall : MW::Ime::kSpecial);
+    keyboard.typing_reset();
+    results.cal_line(("[1]\n[2]\n[MPDIA] " + words + "]\n").c_str(), round % 99);
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
     list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));
@@ -69,6 +75,7 @@ TEST_F(WidgetTest, MenuWidgetsAreDrawnOfferedEventsAndSetAtOnce) {
   Menu menu;
   for (int i = 0; i < 40; ++i) menu.list.addIndex(1, &kWords, 100);
   menu.list.initFinish();
+  menu.keyboard.presskey_set(MW::Ime::kOnlyDigits);
   menu.key.plugCallback = [](MW::kbd_event*) {};
   std::atomic<bool> isOver = false;
   std::thread events([&] {
