@@ -8,7 +8,7 @@
 
 namespace MW {
 
-class Ime;
+class MW_API Ime;  // else its TextPanel would not be exported
 struct ImeKey;
 extern template class TextPanel<Ime>;
 
