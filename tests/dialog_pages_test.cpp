@@ -16,6 +16,10 @@ void make() {
     page.choiceCallback = [](auto* mouse) { note(static_cast<char>('0' + mouse->state)); };
   }
 }
+void makeHooked() {
+  make<MW::DialogSelect>();
+  widget->setButtonType(13);
+}
 // clang-format off
 constexpr auto kPages = std::to_array<MadeCase>({
     {make<MW::DialogSelect>, "p288,624 ? r g ?", "p+<1/1/864>1c-[BUTTON] onBtnReleased!! 0 <0/0/864>"},
@@ -24,6 +28,7 @@ constexpr auto kPages = std::to_array<MadeCase>({
     {make<MW::DialogSelect>, "p864,624 r288,1136 ? p863,624", "p+c-<0/0/864>p-"},
     {make<MW::DialogSelect>, "o0 p288,624 m1 r o1 l p288,624 r", "p-h-c--p+1c-"},
     {make<MW::DialogSelect>, "k5 K6 u7 a1 k323 g", "5k+6r+7u+-+[BUTTON] key onPlugKey sym = 7"},
+    {makeHooked, "k323 k5", "H+5k+"},
     {make<MW::DialogWarn>, "p1,1 m1 r1,1 l k323 u7 a1 o0 p", "p--c--323k+--p-"},
     {make<MW::AutoCapScreen>, "t1000 K5 t1999 K5 t2998 K5 K5 K6 *", " 5r+ 5D5r+ 5T5r+5r+6r+0"},
 });

@@ -210,6 +210,7 @@ TEST_F(MenuWidgetTest, VerdictButtonsKeepTheLengthOfTheirCaption) {
   EXPECT_EQ(drawn("a\u00e4\u00f6"), "a\u00e4" + gap.substr(2)) << "whole characters";
   EXPECT_EQ(drawn(nullptr), gap + '\0');
   EXPECT_EQ(drawn("FAIL"), "FAIL");
+  EXPECT_EQ(drawn(button.getText()), "FAIL");
 }
 
 // A slide's second caption has its record's length, but only as many bytes as its size says.

@@ -83,6 +83,10 @@ TEST_F(WidgetRcuiTest, RefusesBadDescriptors) {
                               "[WIDGETRCUI] WidgetRcui -> w is NULL : 3 ", copies + "4 ",
                               "[WIDGETRCUI] WidgetRcui -> ref_cb is NULL : 4 ",
                               "[WIDGETRCUI] getPointer -> w is null."}));
+  ref.kind = 0;
+  std::ranges::fill(ref.text.text, 'x');
+  none.makeRcuiWidget(&ref, 0);
+  EXPECT_EQ(platform().takeLog().back().message, "[WIDGETRCUI] WidgetRcui -> text has no NUL");
 }
 
 }  // namespace

@@ -41,10 +41,14 @@ class MW_API Button3 : public PushButton {
   /// Places it anew on the present screen, in its normal colour. The rectangle is not read.
   void setRect(int position, const SKIA_Rect* unused) override;
 
+  /// What the constructors do: lays it out inactive, clears its callbacks, and registers it.
+  void init(int position, const SKIA_Text* first, const SKIA_Text* second, int bottom);
+
  protected:
-  int bottomOffset;         // pixels
-  int captionCount = 0;     // 1 first caption, 2 both, each in half of the face
-  SKIA_Text caption1 = {};  // these four are guarded by stateLock
+  // Guarded by stateLock.
+  int bottomOffset = 0;  // pixels
+  int captionCount = 0;  // 1 first caption, 2 both, each in half of the face
+  SKIA_Text caption1 = {};
   SKIA_Text caption2 = {};
   SKIA_Rect labelRect1 = {};
   SKIA_Rect labelRect2 = {};

@@ -39,7 +39,7 @@ class MW_API ButtonS : public StyledButton {
 
   bool onRecvEvent(event_data* event, unsigned int arg) override;
   void onRelease(event_data* event) override;
-  /// The click of a finger that slides off.
+  /// The click of a finger that slides off: nothing but for an event in the 20 pixels around.
   void onGetOutOfArea(event_data* event);
 };
 

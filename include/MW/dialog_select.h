@@ -15,8 +15,8 @@ namespace MW {
 /// dispatch thread.
 ///
 /// Callbacks besides its own: `hoverCallback`, of one mouse_event*; `plugCallback`, of one
-/// kbd_event*; `hookKeyCallback`, of one int, which onHookKeyPressed() alone calls. Records are
-/// valid for the call.
+/// kbd_event*; `hookKeyCallback`, of one int that is called with 0: the hook key, where
+/// setButtonType(13) asked for it. Records are valid for the call.
 class MW_API DialogSelect : public Widget {
  public:
   static constexpr unsigned int kChoices = 6;
@@ -50,8 +50,8 @@ class MW_API DialogSelect : public Widget {
   /// Choice `index` as above; any other index: nothing.
   void onBtnPressed(mouse_event mouse, int index);
   void onBtnReleased(mouse_event mouse, int index);
-  /// The hook key is ignored.
-  void onPressKey(kbd_event key) const;
+  /// The hook key is ignored, or goes to onHookKeyPressed() where it is asked for.
+  void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key) const;
   void onHookKeyPressed();
 

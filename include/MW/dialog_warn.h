@@ -93,8 +93,9 @@ class MW_API DialogWarn : public ColorPage {
   explicit DialogWarn(unsigned int color);
   ~DialogWarn() override;
 
-  /// Replaces a box's text, but a longer one is cut by a NUL where the old one ended, though its
-  /// length counts. Null is the empty text. An index over 3: nothing.
+  /// Replaces a box's text and its length, but puts the NUL where the old text ended: it cuts a
+  /// longer one, and behind a shorter one the old one's rest stays in the record. Null is the empty
+  /// text. An index over 3: nothing.
   void setText_str(unsigned int index, const char* newText);
 };
 

@@ -25,10 +25,9 @@ extern template class TextPanel<>;
 class MW_API StaticText : public TextPanel<> {
  public:
   /// Copies the records; null ones are all zero. `looks`' text, of at most 127 bytes, is the first
-  /// text. `lineNumbers`: with line numbers. `scroll`: with a scroll bar; without it all events are
+  /// text. `numbers`: with line numbers. `scroll`: with a scroll bar; without it all events are
   /// taken and nothing happens. `mark`: with found lines in red.
-  StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool lineNumbers, bool scroll,
-             bool mark);
+  StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool numbers, bool scroll, bool mark);
   /// With a scroll bar only.
   StaticText(const SKIA_Rect* area, const SKIA_Text* looks);
   ~StaticText() override;
@@ -47,8 +46,8 @@ class MW_API StaticText : public TextPanel<> {
   /// the next setText only. Null: no change.
   void setRect(int variant, const SKIA_Rect* newRect) override;
 
-  /// What the constructors do first: an empty viewer without callbacks, registered. Not while
-  /// it handles events.
+  /// What the constructors do first: an empty viewer without callbacks, registered. Not while it
+  /// handles events.
   void init(const SKIA_Rect* area, const SKIA_Text* looks);
   /// Every fourth motion scrolls by a row.
   void onHover(mouse_event mouse);

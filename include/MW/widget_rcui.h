@@ -45,9 +45,9 @@ struct ref_cb_t {
   Callback cbTouchPress = {};    ///< touchPressCallback, callbackWord5, rowPressCallback
   Callback cbTouchRelease = {};  ///< touchReleaseCallback, leftCallback, exitCallback,
                                  ///< button1Callback, callbackWord17
-  Callback cbRight = {};       ///< rightCallback, button2Callback, callbackWord18
-  Callback cbKeyPress = {};    ///< keyPressCallback
-  Callback cbKeyRelease = {};  ///< keyReleaseCallback
+  Callback cbRight = {};         ///< rightCallback, button2Callback, callbackWord18
+  Callback cbKeyPress = {};      ///< keyPressCallback
+  Callback cbKeyRelease = {};    ///< keyReleaseCallback
   Callback unread9 = {};
   Callback cbDoubleKey = {};  ///< doubleKeyCallback
   Callback cbTripleKey = {};  ///< tripleKeyCallback
@@ -62,10 +62,14 @@ static_assert(offsetof(ref_cb_t, cbHover) == 14 * sizeof(Callback));
 
 /// Builds one item or widget from a descriptor.
 ///
-/// Kinds 0 to 9 copy a still picture to the display-item table (WidgetList) and have no widget.
-/// Kinds 7 and 8 that are visible stand in a column: 8 begins one at its own rectangle, 7 stands
-/// directly below the one before, as wide, high and coloured as it. All objects of the process
-/// share the column, and one thread makes them, as it uses WidgetList.
+/// Kinds 0 to 9 copy a still picture to the display-item table (WidgetList) and have no widget. The
+/// item is a text box of kind 0, a box of 2, a line of 4, a picture of 5 and a label of 9; items of
+/// 1, 3 and 6 have the number 14, whose look is the platform's.
+///
+/// Kinds 7 and 8 that are visible are text boxes in a column: 8 begins one at its own rectangle, 7
+/// stands directly below the one before, as wide, high and coloured as it. All objects of the
+/// process share the column, and one thread makes them, as it uses WidgetList. Those that are not
+/// visible are items of the number 14.
 ///
 /// Kinds that build a widget, which registers itself:
 ///
@@ -80,10 +84,12 @@ static_assert(offsetof(ref_cb_t, cbHover) == 14 * sizeof(Callback));
 /// Of a Button3, `rect.y` is the number of pixels that stay free below it. Any other kind builds
 /// nothing; one that is not 0 to 42 is logged.
 ///
-/// Texts are copied, and cut at their NUL or the end of their record; a length that is negative or
-/// beyond the text's end is logged and counts as the text's. It owns the widget and deletes it with
-/// itself: the application must not delete it, neither from a callback, but may delete the
-/// WidgetRcui there. It is in no layer and draws nothing itself.
+/// Texts are copied, and cut at their NUL or the end of their record. One without a NUL is logged,
+/// and so is a length that is negative or beyond the text's end, which counts as the text's.
+///
+/// The object owns its widget and deletes it with itself: the application must not delete it,
+/// neither from a callback, but may delete the WidgetRcui there. The object itself is in no layer
+/// and draws nothing.
 class MW_API WidgetRcui : public Widget {
  public:
   /// Nulls build nothing or copy nothing, and are logged. The last argument is not read.

@@ -1,8 +1,6 @@
 /// The toolkit's log lines.
 #pragma once
 
-#include <cstdarg>
-
 namespace MW {
 
 enum class LogLevel { Debug = 3, Warning = 5, Error = 6 };
@@ -15,14 +13,17 @@ class ClassLog {
 
   /// One line, "[WORD] " and the message, cut to 255 bytes.
   [[gnu::format(printf, 3, 4)]] void print(LogLevel level, const char* format, ...) const;
-  /// The same without the blank, "[WORD]" and the message.
-  [[gnu::format(printf, 3, 4)]] void printClose(LogLevel level, const char* format, ...) const;
+  /// The same log without the blank: "[WORD]" and the message.
+  constexpr ClassLog withoutGap() const {
+    ClassLog log = *this;
+    log.gap = "";
+    return log;
+  }
 
  private:
-  void write(LogLevel level, const char* head, const char* format, std::va_list arguments) const;
-
   const char* word;
   const char* tag;
+  const char* gap = " ";
 };
 
 }  // namespace MW

@@ -20,6 +20,7 @@ constexpr int kTitlePart = 10;  // of the panel's height
 constexpr int kRowPart = 4;     // of the panel's height
 constexpr int kFacePart = 4;    // of the panel's width
 constexpr int kColumns = 2;
+constexpr int kHooked = 13;  // the variant that answers the hook key
 
 constexpr SKIA_Rect layOutPanel(ScreenSize screen) {
   return makeRect(screen.w - percentOf(screen.w, kInsetPercent),
@@ -173,8 +174,11 @@ void DialogSelect::onBtnReleased(mouse_event mouse, int index) {
   tell(choiceCallback, mouse);
 }
 
-void DialogSelect::onPressKey(kbd_event key) const {
-  if (key.code == kKeyHook) return;
+void DialogSelect::onPressKey(kbd_event key) {
+  if (key.code == kKeyHook) {
+    if (buttonType == kHooked) onHookKeyPressed();
+    return;
+  }
   kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
   tell(keyPressCallback, key);
 }

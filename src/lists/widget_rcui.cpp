@@ -34,6 +34,8 @@ Made make(Arguments... arguments) {
   return Made(new (std::nothrow) Class(arguments...));
 }
 
+void complain(const char* what) { kLog.print(LogLevel::Error, "WidgetRcui -> %s", what); }
+
 bool isSound(const SKIA_Text& given, int length) {
   return given.string_len >= 0 && given.string_len <= length;
 }
@@ -41,6 +43,7 @@ bool isSound(const SKIA_Text& given, int length) {
 // A copy that holds what its length says, whatever the descriptor says.
 SKIA_Text soundText(const SKIA_Text& given) {
   SKIA_Text text = copyText(&given);
+  if (std::ranges::count(given.text, '\0') == 0) complain("text has no NUL");
   if (isSound(given, text.string_len)) {
     text.string_len = given.string_len;
   } else {
@@ -204,8 +207,6 @@ constexpr auto kCallbackCopies = std::to_array<CallbackCopy>({
     {&Widget::exitCallback, &ref_cb_t::cbTouchRelease},
 });
 static_assert(kCallbackCopies.size() == 22, "every callback word of the base");
-
-void complain(const char* what) { kLog.print(LogLevel::Error, "WidgetRcui -> %s", what); }
 
 }  // namespace
 

@@ -128,7 +128,7 @@ bool Ime::onRecvEvent(event_data* event, unsigned int) {
   }
 }
 
-// NOLINTNEXTLINE(readability-convert-member-functions-to-static): an operation of each keyboard
+// NOLINTNEXTLINE(readability-convert-member-functions-to-static): an operation of the keyboard
 void Ime::onHover(mouse_event) { kLog.print(LogLevel::Debug, "onHover!!"); }
 
 void Ime::onPressKey_small(event_data* event) { pressKey(kSmall, event); }

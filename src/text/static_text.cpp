@@ -44,11 +44,11 @@ bool isRefreshed(std::string_view info) { return info == kCpu || info == "gpu" |
 
 }  // namespace
 
-StaticText::StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool lineNumbers, bool scroll,
+StaticText::StaticText(const SKIA_Rect* area, const SKIA_Text* looks, bool numbers, bool scroll,
                        bool mark)
     : TextPanel("STATICTEXT") {
   init(area, looks);
-  is_line_num = lineNumbers;
+  is_line_num = numbers;
   is_scroll = scroll;
   is_search_mark = mark;
   StaticText::setText(text.text);

@@ -43,7 +43,7 @@ void TextLines::addRow(std::string_view rest, int number) {
 }
 
 std::string_view TextLines::text(int64_t row) const {
-  if (!isRow(row)) return {};
+  if (!isRow(row)) return "";
   const auto index = static_cast<std::size_t>(row);
   const auto begin = static_cast<std::size_t>(rows[index].begin);
   const std::size_t end =

@@ -99,12 +99,12 @@ void StaticText::line_search_point(unsigned int direction) {
       top_index = toPixels(std::min<int64_t>(next, last));
     }
   }
-  kViewerLog.printClose(LogLevel::Debug, "prev_index : %d", previous);
-  kViewerLog.printClose(LogLevel::Debug, "next_index : %d", next);
+  kViewerLog.withoutGap().print(LogLevel::Debug, "prev_index : %d", previous);
+  kViewerLog.withoutGap().print(LogLevel::Debug, "next_index : %d", next);
 }
 
 int StaticText::find_real_num(int real) {
-  kViewerLog.printClose(LogLevel::Debug, "find_real_num");
+  kViewerLog.withoutGap().print(LogLevel::Debug, "find_real_num");
   const std::lock_guard guard(stateLock);
   const int row = lines.find(real, 0, last_index);
   if (row == last_index) return top_index;

@@ -97,14 +97,8 @@ Button3::Button3(int position, const SKIA_Text* first, int bottom)
     : Button3(position, first, nullptr, bottom) {}
 
 Button3::Button3(int position, const SKIA_Text* first, const SKIA_Text* second, int bottom)
-    : PushButton("BUTTON3", nullptr, nullptr), bottomOffset(bottom) {
-  text.color = kColorBlue;  // the button box's own text, which stays empty
-  if (first != nullptr) captionCount = 1;
-  if (second != nullptr) captionCount = 2;
-  caption1 = copyText(first);
-  caption2 = copyText(second);
-  Button3::setRect(position, nullptr);
-  Window::registerWidget(this);
+    : PushButton("BUTTON3", nullptr, nullptr) {
+  init(position, first, second, bottom);
 }
 
 Button3::~Button3() { leaveLayers(); }
@@ -132,8 +126,8 @@ void Button3::setText(const char* newText) {
   text.string_len = static_cast<int32_t>(given.size());
   const auto length = static_cast<std::size_t>(caption1.string_len);
   const std::string_view kept = cutText(given, length);
-  std::memset(caption1.text, 0, length + 1);
-  std::memmove(caption1.text, kept.data(), kept.size());
+  std::memmove(caption1.text, kept.data(), kept.size());  // which may be the caption itself
+  std::memset(caption1.text + kept.size(), 0, length + 1 - kept.size());
 }
 
 void Button3::setRect(int position, const SKIA_Rect*) {
@@ -149,6 +143,24 @@ void Button3::setRect(int position, const SKIA_Rect*) {
   placeLabels();
   normalColor = kColorWhite;
   rect.color = kColorWhite;
+}
+
+void Button3::init(int position, const SKIA_Text* first, const SKIA_Text* second, int bottom) {
+  setActive(0);
+  setType(kBaseLayer);
+  {
+    const std::lock_guard guard(stateLock);
+    bottomOffset = bottom;
+    captionCount = second != nullptr ? 2 : first != nullptr ? 1 : 0;
+    text = {{}, 0, kColorBlue, 0, 0};  // the button box's own text, which stays empty
+    caption1 = copyText(first);
+    caption2 = copyText(second);
+    delayedShow = DelayedShow();
+  }
+  Button3::setRect(position, nullptr);
+  pressCallback = clickCallback = longPressCallback = doubleClickCallback = nullptr;
+  clicks.reset();
+  Window::registerWidget(this);
 }
 
 void Button3::placeLabels() {

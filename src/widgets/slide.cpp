@@ -171,9 +171,9 @@ void Slide::onTouchClickCount(mouse_event mouse) {
 
 void Slide::setRect(int newState, const SKIA_Rect* area) {
   if (area == nullptr) return;
+  const std::lock_guard guard(stateLock);
   const SKIA_Rect to = *area;
   const int height = to.h / 2 * 2;
-  const std::lock_guard guard(stateLock);
   unit = to.w / kTrackUnits;
   track = {to.x, to.y, kTrackUnits * unit, height, kColorBlack};
   lockRect = {to.x, to.y, kTrackUnits * unit, height, kColorShadow};
@@ -198,11 +198,8 @@ bool Slide::isOnKnob(const event_data* event) const {
   return EventService::isMouseEventForMe(&knob, event);
 }
 
-// The track is laid out from itself and so never moves.
-void Slide::snapKnob() {
-  const SKIA_Rect area = read(track);
-  setRect(state, &area);
-}
+// The track is laid out from itself and so never moves; setRect reads it under the lock.
+void Slide::snapKnob() { setRect(state, &track); }
 
 SlideV::SlideV(int startState, const SKIA_Rect* area, const SKIA_Text* first,
                const SKIA_Text* second)

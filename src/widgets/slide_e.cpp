@@ -104,11 +104,11 @@ bool SlideE::drag(int by) {
 
 void SlideE::setRect(int newState, const SKIA_Rect* area) {
   if (area == nullptr) return;
-  const SKIA_Rect to = *area;
   const bool isAtLeft = startsAtLeft(newState);
+  const std::lock_guard guard(stateLock);
+  const SKIA_Rect to = *area;
   const int64_t behindKnob = int64_t{to.x} + to.h;
   const int64_t knobAtRight = int64_t{to.x} + to.w - to.h;
-  const std::lock_guard guard(stateLock);
   unit = to.h;
   track = to;
   labelRect1 = makeRect(isAtLeft ? behindKnob : to.x, to.y, int64_t{to.w} - to.h, to.h, to.color);
@@ -117,10 +117,7 @@ void SlideE::setRect(int newState, const SKIA_Rect* area) {
   point.width = isAtLeft ? kArrowRight : kArrowLeft;
 }
 
-// The bar is laid out from itself and so never moves.
-void SlideE::snapKnob() {
-  const SKIA_Rect area = read(track);
-  setRect(state, &area);
-}
+// The bar is laid out from itself and so never moves; setRect reads it under the lock.
+void SlideE::snapKnob() { setRect(state, &track); }
 
 }  // namespace MW

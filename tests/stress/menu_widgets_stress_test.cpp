@@ -28,10 +28,17 @@ struct Menu {
   MW::Key key;
   MW::Dialog dialog{24};
   MW::StaticText log{kAreas.data(), &kWords, true, true, true};
+  MW::ButtonNew framed{2, kAreas.data(), &kWords};
+  MW::Button8 pad{3, kAreas.data(), &kWords};
+  MW::SlideE exit{0, kAreas.data(), &kWords, "unread"};
+  MW::SlideMove value{kAreas.data(), 0, 0, 100, 50};
+  MW::DialogSelect choice{1};
+  MW::AutoCapScreen page{0};
   MW::Ime keyboard{kAreas.data(), &kWords};
   MW::MpdWid results{"Results"};
-  std::array<MW::Widget*, 10> all = {&list, &button, &slide, &toast,    &bar,
-                                     &key,  &dialog, &log,   &keyboard, &results};
+  std::array<MW::Widget*, 16> all = {&keyboard, &results, &list,   &button, &slide,  &toast,
+                                     &bar,      &key,     &dialog, &log,    &framed, &pad,
+                                     &exit,     &value,   &choice, &page};
 
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
@@ -45,14 +52,19 @@ struct Menu {
       if (round % 16 == 0) each->hide();
       each->setActive(1);
     }
-    log.setText(std::string(round * 37 % 5000, words[0]).c_str());
+    log.setText(std::string(words.size() * words.size(), words[0]).c_str());
     log.get_ime_result(words.c_str());
-    log.line_search(std::string(round % 3000, words[0]).c_str());
+    log.line_search(words.c_str());
     keyboard.keyboard_change(number == 0 ? MW::Ime::kSmall : MW::Ime::kSpecial);
     keyboard.typing_reset();
     results.cal_line(("[1]\n[2]\n[MPDIA] " + words + "]\n").c_str(), round % 99);
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
+    choice.setTitle(words.c_str());
+    choice.setText_str(0, words.c_str());
+    page.setText(0, kAreas.at(number), textRecord(words));
+    page.setText_str(1, words.c_str());
+    value.setRect(&kAreas.at(number));
     list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));
     number == 0 ? list.move_key_down(0) : list.move_key_up(0);
   }

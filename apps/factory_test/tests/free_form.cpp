@@ -24,7 +24,7 @@ class FreeFormTest : public StepTest {
 
   void showStep(int step) override {
     dialog.reset();
-    kSteps.at(static_cast<std::size_t>(step))(*this);
+    (this->*kSteps.at(static_cast<std::size_t>(step)))();
     dialog->setActive(1);
     page.say(("Dialog " + std::to_string(step + 1)).c_str());
   }
@@ -75,13 +75,10 @@ class FreeFormTest : public StepTest {
     dialog = std::move(made);
   }
 
-  using Put = void (*)(FreeFormTest& test);
+  using Put = void (FreeFormTest::*)();
   static constexpr std::array<Put, 5> kSteps = {
-      [](FreeFormTest& test) { test.putWords(); },
-      [](FreeFormTest& test) { test.putOneButton(); },
-      [](FreeFormTest& test) { test.putTwoButtons(); },
-      [](FreeFormTest& test) { test.putProgress(); },
-      [](FreeFormTest& test) { test.putSlide(); },
+      &FreeFormTest::putWords,    &FreeFormTest::putOneButton, &FreeFormTest::putTwoButtons,
+      &FreeFormTest::putProgress, &FreeFormTest::putSlide,
   };
 
   Current<FreeFormTest> current{this};

@@ -30,7 +30,7 @@ class KeyboardTest : public PageTest {
 
   void enter() override {
     page.ask().otherKey = [](unsigned int code) {
-      if (code == MW::kKeyUp) self().change(static_cast<std::size_t>(self().layout + 1));
+      if (code == MW::kKeyUp) self().change(self().layout + 1);
     };
     const SKIA_Rect area = rowOf(screenSize(), kContentTop, 38, kKeyboardColor);
     const SKIA_Text looks = captionOf("");
@@ -66,8 +66,8 @@ class KeyboardTest : public PageTest {
   }
 
   void change(std::size_t number) {
-    const auto type = static_cast<unsigned int>(number % kLayouts.size());
-    layout = static_cast<int>(type);
+    layout = number % kLayouts.size();
+    const auto type = static_cast<unsigned int>(layout);
     keyboard->keyboard_change(0);  // takes the grey of the digits away
     keyboard->keyboard_change(type);
     keyboard->presskey_set(type);
@@ -84,7 +84,7 @@ class KeyboardTest : public PageTest {
 
   Current<KeyboardTest> current{this};
   std::atomic<bool> folded = false;
-  std::atomic<int> layout = 0;
+  std::atomic<std::size_t> layout = 0;
   std::optional<MW::Ime> keyboard;
   std::array<std::optional<MW::ButtonNew>, kLayouts.size()> buttons;
 };

@@ -26,9 +26,11 @@ class ListTest : public LookTest {
     list.emplace("Which part?");
     for (const char* const row : kRows) list->addIndex(row);
     list->initFinish(chosen);
+    // NOLINTBEGIN(readability-non-const-parameter): the callbacks' type
     list->rowPressCallback = [](int* row) { self().mark(*row); };
     list->button1Callback = [](int* row) { self().choose(*row); };
     list->button2Callback = [](int* row) { self().choose(*row); };
+    // NOLINTEND(readability-non-const-parameter)
     list->keyPressCallback = [](MW::kbd_event* event) {
       if (event->code == MW::kKeySelect || event->code == kKeyBack) self().finishLook();
     };

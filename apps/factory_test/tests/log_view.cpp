@@ -24,6 +24,7 @@ constexpr int kTopPercent = 34;    // of the screen's height, and so the next
 constexpr int kViewPercent = 38;   // of the viewer by itself
 constexpr int kAbovePercent = 16;  // of the viewer above the keyboard
 constexpr int kKeyboardPercent = 29;
+constexpr int kTextPercent = 70;  // of the other texts
 
 /// The viewer with what the page tells of a search.
 class Viewer : public MW::StaticText {
@@ -78,7 +79,8 @@ class LogTest : public PageTest {
   void placeViewer() {
     const ScreenSize screen = screenSize();
     const SKIA_Rect area = rowOf(screen, kTopPercent, kViewPercent, kPaper);
-    const SKIA_Text looks = textOf("", MW::kColorBlack, SKIA_ALIGN_LEFT, textSize(screen));
+    const SKIA_Text looks =
+        textOf("", MW::kColorBlack, SKIA_ALIGN_LEFT, percentOf(textSize(screen), kTextPercent));
     viewer.emplace(&area, &looks);
     viewer->setRect(0, &area);  // room for the line numbers
     viewer->setText(text.c_str());
