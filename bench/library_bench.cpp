@@ -1,7 +1,9 @@
-// What the toolkit adds to the platform's own calls: the passes over the layers, and registering.
+// What the toolkit adds to the platform's own calls: the passes over the layers, registering, and
+// long texts.
 #include <MW/button.h>
 #include <MW/dialog.h>
 #include <MW/main_list.h>
+#include <MW/static_text.h>
 #include <MW/window.h>
 #include <android/log.h>
 #include <benchmark/benchmark.h>
@@ -12,6 +14,7 @@
 #include <chrono>
 #include <cstring>
 #include <memory>
+#include <string>
 #include <vector>
 
 #include "percentile.h"
@@ -175,11 +178,66 @@ void registering(benchmark::State& state) {
   }
 }
 
+// A whole screen of a log, with line numbers and all.
+struct LogView : MW::StaticText {
+  static constexpr SKIA_Rect kArea = {0, 0, 1440, 2560, 0};
+  static constexpr SKIA_Text kLooks = {{}, 0, 0, SKIA_ALIGN_LEFT, 40};
+  LogView() : StaticText(&kArea, &kLooks, true, true, true) {}
+  void showEnd() { top_index = last_index - h_count; }
+};
+
+// So many lines of so many bytes, which run through the alphabet.
+std::string textOf(const benchmark::State& state) {
+  constexpr int64_t kLetters = 26;
+  std::string line;
+  for (int64_t i = 1; i < state.range(1); ++i) line += static_cast<char>('a' + i % kLetters);
+  std::string text;
+  for (int64_t i = 0; i < state.range(0); ++i) text += line + '\n';
+  return text;
+}
+
+void countBytes(benchmark::State& state, const std::string& text) {
+  state.SetBytesProcessed(state.iterations() * static_cast<int64_t>(text.size()));
+}
+
+void settingText(benchmark::State& state) {
+  const std::string text = textOf(state);
+  LogView view;
+  for ([[maybe_unused]] auto round : state) view.setText(text.c_str());
+  countBytes(state, text);
+}
+
+void searchingText(benchmark::State& state, const char* wanted) {
+  const std::string text = textOf(state);
+  LogView view;
+  view.setText(text.c_str());
+  view.get_ime_result(wanted);
+  for ([[maybe_unused]] auto round : state) view.line_search(text.c_str());
+  countBytes(state, text);
+}
+
+// The end of the text.
+void drawingText(benchmark::State& state) {
+  LogView view;
+  view.setText(textOf(state).c_str());
+  view.showEnd();
+  for ([[maybe_unused]] auto round : state) {
+    skia_begin_frame_c();
+    view.show();
+  }
+}
+
 BENCHMARK(drawingPass)->RangeMultiplier(10)->Range(1, 1000)->Unit(benchmark::kMicrosecond);
 BENCHMARK(timerPass)->RangeMultiplier(10)->Range(1, 1000)->Unit(benchmark::kMicrosecond);
 BENCHMARK(mainListPass)->Unit(benchmark::kMicrosecond);
 BENCHMARK(dialogPass)->Unit(benchmark::kMicrosecond);
 BENCHMARK(registering)->Arg(0)->Arg(10)->Arg(100)->Arg(1000);
+BENCHMARK(settingText)->Args({156'250, 64})->Args({1, 10'000'000})->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(searchingText, inNoLine, "xz")
+    ->Args({156'250, 64})
+    ->Unit(benchmark::kMillisecond);
+BENCHMARK_CAPTURE(searchingText, inAll, "xy")->Args({156'250, 64})->Unit(benchmark::kMillisecond);
+BENCHMARK(drawingText)->Args({100, 64})->Args({1'000'000, 64})->Unit(benchmark::kMicrosecond);
 
 }  // namespace
 

@@ -11,8 +11,6 @@
 
 namespace MW {
 
-namespace {}  // namespace
-
 template <typename... Self>
 TextPanel<Self...>::TextPanel(const char* logWord) : word(logWord) {
   type_ = kBaseLayer;

@@ -38,9 +38,11 @@ struct Menu {
   MW::DialogList rows{"Rows"};
   MW::DialogShell shell{"Shell", 9};
   MW::DialogNew prompt{"Prompt", 5, 7};
-  std::array<MW::Widget*, 18> all = {&list,   &button, &slide,  &toast, &bar,   &key,
-                                     &dialog, &log,    &framed, &pad,   &exit,  &value,
-                                     &choice, &page,   &answer, &rows,  &shell, &prompt};
+  MW::Ime keyboard{kAreas.data(), &kWords};
+  MW::MpdWid results{"Results"};
+  std::array<MW::Widget*, 20> all = {&list,   &button, &slide, &toast,  &bar,      &key,    &dialog,
+                                     &log,    &framed, &pad,   &exit,   &value,    &choice, &page,
+                                     &answer, &rows,   &shell, &prompt, &keyboard, &results};
 
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
@@ -60,6 +62,9 @@ struct Menu {
     log.setText(std::string(words.size() * words.size(), words[0]).c_str());
     log.get_ime_result(words.c_str());
     log.line_search(words.c_str());
+    keyboard.keyboard_change(number == 0 ? MW::Ime::kSmall : MW::Ime::kSpecial);
+    keyboard.typing_reset();
+    results.cal_line(("[1]\n[2]\n[MPDIA] " + words + "]\n").c_str(), round % 99);
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
     choice.setTitle(words.c_str());
@@ -106,6 +111,7 @@ TEST_F(WidgetTest, MenuWidgetsAreDrawnOfferedEventsAndSetAtOnce) {
   Menu menu;
   for (int i = 0; i < 40; ++i) menu.list.addIndex(1, &kWords, 100);
   menu.list.initFinish();
+  menu.keyboard.presskey_set(MW::Ime::kOnlyDigits);
   menu.key.plugCallback = [](MW::kbd_event*) {};
   std::atomic<bool> isOver = false;
   std::thread events([&] {
