@@ -3,8 +3,10 @@
 
 #include <brimol/scene.h>
 
+#include <algorithm>
 #include <array>
 #include <bit>
+#include <iomanip>
 #include <ostream>
 #include <string>
 
@@ -28,6 +30,13 @@ inline std::ostream& operator<<(std::ostream& out, const SKIA_Rect& rect) {
 inline std::ostream& operator<<(std::ostream& out, const SKIA_Point& line) {
   return out << '(' << line.x1 << ", " << line.y1 << ") to (" << line.x2 << ", " << line.y2
              << ") 0x" << std::hex << line.color << std::dec << " width " << line.width;
+}
+
+inline std::ostream& operator<<(std::ostream& out, const SKIA_Text& text) {
+  const auto length = std::clamp<int32_t>(text.string_len, 0, SKIA_TEXT_BYTES);
+  return out << std::quoted(std::string(text.text, static_cast<std::size_t>(length))) << " length "
+             << text.string_len << " 0x" << std::hex << text.color << std::dec << " align "
+             << text.align << " size " << text.size;
 }
 
 namespace brimol::test {
