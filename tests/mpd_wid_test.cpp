@@ -31,6 +31,7 @@ const std::vector<pair<std::string, std::string>> kTexts = {
     {"12 [2] [MPDIA] Wi-Fi]ok]\nend", "[*]|0 12 [2] [MPDIA] Wi-|[2]|Wi-Fi|ok]|"},
     {"[1]" + kWide + "\u00e4[MPDIA]:v\n", "[*]|0 [1]" + kWide + "|[1]|no name|:v|"},
     {"\n[ -5][MPDIA]]]x\n", "[*]|0 \n[ -5][MPDIA]]]x|[-5]||x|"},
+    {"[+-7][MPDIA]\n", "[*]|0 [+-7][MPDIA]|[1]|no name||"},
     {"]2\n[2147483648][MPDIA]\n\n[MPDIA]", "[>]|0 ]2|[1]|no name|]2|[*]|142 |[1]|no name||"},
     {"[0] [MPDIA] " + kLong + ']' + kLong + '\n',
      "[*]|0 [0] [MPDIA] xxxxxx|[1]|" + kLong.substr(173) + '|' + kLong.substr(173) + '|'},
@@ -94,6 +95,8 @@ TEST_F(MpdWidTest, TellsClicksFromDragsAndMayBeDeleted) {
     EXPECT_FALSE(press(*list, {30, 560}));
     press(*list, {30, 561});
     for (const int by : {slip, -slip}) list->inClick(0, by);
+    offer(*list, {MW::kEventLongPress, {{0, 1, 30, 561, 0, 0}}});
+    EXPECT_EQ(platform().takeLog().back().message, "[MPDWID] onRecvEvent-> T:3, F:1");
     release(*list, {30, 0});
     EXPECT_EQ(std::exchange(told, ""), expected);
   }

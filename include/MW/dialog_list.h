@@ -71,6 +71,7 @@ class MW_API DialogList : public FramedDialog {
   int committedIndex = kNoRow;
 
  private:
+  void layOut(int rowCount, int index);
   bool hoverAt(event_data* event);
   bool pressTarget(event_data* event);
   bool releaseAt(event_data* event);

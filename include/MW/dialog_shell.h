@@ -8,8 +8,10 @@
 namespace MW {
 
 /// A title, lines of text of which the oldest go when there is no room, and the button "OK", which
-/// leaves the dialog up. Callbacks as for FramedDialog. While a finger holds the dialog, others
-/// press and move nothing.
+/// leaves the dialog up. Callbacks as for FramedDialog.
+///
+/// The finger that pressed a button holds the dialog until it is hidden: others press and move
+/// nothing meanwhile, though one that lifts on the button makes it answer.
 class MW_API DialogShell : public FramedDialog {
  public:
   static constexpr int kLines = 25;

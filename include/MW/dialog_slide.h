@@ -8,7 +8,8 @@ namespace MW {
 
 /// A title, a message, and below them a thumb between two captions. A finger drags the thumb by its
 /// relative motion; lifted with the thumb at an end, it answers with that side. The thumb then goes
-/// back to the middle, and the dialog stays up.
+/// back to the middle, and the dialog stays up. A finger that is lifted without having moved
+/// answers as the drag before it did. A second finger that presses the thumb takes it over.
 ///
 /// It enters the top layer when it is constructed, inactive, and leaves it when it is deleted.
 /// While it is active nothing below gets events. Handlers run on the dispatch thread. The texts may
@@ -38,9 +39,9 @@ class MW_API DialogSlide : public Widget {
   using Widget::setRect;
   /// The number of the layout class: 0, for any kind.
   static int isType(int dialogKind);
-  /// Lays it out on the present screen; the thumb stays until setRect().
+  /// Lays it out on the present screen, the same for any kind; the thumb stays until setRect().
   void setRect_init(int dialogKind);
-  /// Puts the thumb back to the middle.
+  /// Puts the thumb back to the middle, for any kind.
   void setRect(int dialogKind);
   void setTitle(const char* newTitle);
   void setDesc(const char* newMessage);

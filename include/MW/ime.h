@@ -8,7 +8,7 @@
 
 namespace MW {
 
-class MW_API Ime;
+class MW_API Ime;  // else its TextPanel would not be exported
 struct ImeKey;
 extern template class TextPanel<Ime>;
 
@@ -70,7 +70,6 @@ class MW_API Ime : public TextPanel<Ime> {
   void onHover(mouse_event mouse);
 
  protected:
-  static constexpr std::size_t kTypedBytes = 100;
   static constexpr std::size_t kKeys = 42;  // with the bar
 
   // All guarded by stateLock. Index 0 is the bar. The fold key's rectangle stands apart, so that
@@ -78,8 +77,8 @@ class MW_API Ime : public TextPanel<Ime> {
   std::array<SKIA_Rect, kKeys - 1> key_rect = {};
   std::array<SKIA_Text, kKeys> key_text = {};
   SKIA_Rect fold_rect = {};
-  std::array<char, kTypedBytes> temp_searched = {};  // the typed text
-  std::array<char, kTypedBytes> result_string = {};
+  ShortText temp_searched = {};  // the typed text
+  ShortText result_string = {};
   int key_type = kSmall;
   bool fold_status = false;
 

@@ -62,7 +62,8 @@ class MW_API MpdWid : public Widget {
   using Widget::setText;
   using Widget::setTextColor;
 
-  /// What the constructor does: an empty list, laid out, active and registered.
+  /// What the constructor does: an empty list, laid out, active and registered. Not while it
+  /// handles events.
   void init_MpdWid();
   /// Lays it out on the present screen.
   void setRect();

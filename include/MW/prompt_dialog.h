@@ -20,7 +20,8 @@ class MW_API PromptDialog : public FramedDialog {
   using Widget::onPressKey;
   void onPressKey(kbd_event key);
   void onHookKeyPressed();
-  /// Draws the progress row in the place of button 1: one to ten asterisks, one more every 100 ms.
+  /// Draws the progress row in the place of button 1, be the dialog active or not: one to ten
+  /// asterisks, one more every 100 ms. `ticks`: GetTicks() milliseconds.
   void updateProgress(unsigned int ticks);
 
  protected:

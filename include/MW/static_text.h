@@ -46,7 +46,8 @@ class MW_API StaticText : public TextPanel<> {
   /// the next setText only. Null: no change.
   void setRect(int variant, const SKIA_Rect* newRect) override;
 
-  /// What the constructors do first: an empty viewer without callbacks, registered.
+  /// What the constructors do first: an empty viewer without callbacks, registered. Not while it
+  /// handles events.
   void init(const SKIA_Rect* area, const SKIA_Text* looks);
   /// Every fourth motion scrolls by a row.
   void onHover(mouse_event mouse);
@@ -65,7 +66,6 @@ class MW_API StaticText : public TextPanel<> {
 
  protected:
   static constexpr int kInfoBytes = 100;
-  static constexpr int kWantedBytes = 100;
 
   // Set before the first event.
   bool is_line_num = false;
@@ -84,7 +84,7 @@ class MW_API StaticText : public TextPanel<> {
   SKIA_Text num_text = {};
   SKIA_Rect scroll_bar = {};  // as last drawn
   TextLines lines;
-  std::array<char, kWantedBytes> str_searched = {};
+  ShortText str_searched = {};
   std::vector<int> found_lines;  // line numbers, ascending, one for each match
   std::vector<int> found_index;  // the first row of each
 

@@ -5,7 +5,12 @@
 #include <MW/detail/double_tap.h>
 #include <MW/widget.h>
 
+#include <array>
+
 namespace MW {
+
+/// What is typed, entered or searched: at most 99 bytes, and NULs behind them.
+using ShortText = std::array<char, 100>;
 
 /// A rectangle with a text record that a finger presses, holds and taps. StaticText and Ime say
 /// what stands in it; this class is not used by itself.

@@ -35,7 +35,8 @@ std::string_view boundedText(const char* given, std::size_t count) {
 }
 
 void putTextOpen(SKIA_Text& record, std::string_view bounded) {
-  std::memmove(record.text, bounded.data(), bounded.size());
+  // An empty view may point nowhere.
+  if (!bounded.empty()) std::memmove(record.text, bounded.data(), bounded.size());
   record.string_len = static_cast<int32_t>(bounded.size());
 }
 

@@ -15,7 +15,7 @@ namespace {
 constexpr int kHookKeyKind = 13;
 constexpr int kSmallTextPercent = 30;  // of a row, where there are two lines
 
-// The second line of the kind that was constructed last and had one. A kind without one keeps it:
+// The second line of the kind that was constructed last and had one. A kind without one takes it:
 // meant so.
 constinit std::atomic<const char*> lastSecondLine = nullptr;
 
@@ -45,7 +45,7 @@ void Dialog::fillIn() {
   if (row.second != nullptr) lastSecondLine = row.second;
   putIfGiven(frame.title, row.title);
   putIfGiven(message, row.message);
-  putIfGiven(second, lastSecondLine);
+  putIfGiven(second, row.second != nullptr ? row.second : lastSecondLine.load());
   putIfGiven(button1.caption, row.button1);
   putIfGiven(button2.caption, row.button2);
 }

@@ -82,10 +82,10 @@ void DialogList::setText(int index, const char* rowText) {
 }
 
 int DialogList::initFinish(int index) {
-  setRect_static(read(count), index);
   int total = 0;
   {
     const std::lock_guard guard(stateLock);
+    layOut(count, index);
     initFinished = 1;
     total = count;
   }
@@ -94,10 +94,14 @@ int DialogList::initFinish(int index) {
 }
 
 void DialogList::setRect_static(int rowCount, int index) {
+  const std::lock_guard guard(stateLock);
+  layOut(rowCount, index);
+}
+
+void DialogList::layOut(int rowCount, int index) {
   const ScreenSize screen = presentScreen();
   const int64_t pitch = rowPitch(screen);
   const DialogGrid grid = layOutAround(screen, pitch * rowCount, 2);
-  const std::lock_guard guard(stateLock);
   selectedIndex = index;
   committedIndex = index;
   if (rowCount < kFewestRows || rowCount > kRows) return;

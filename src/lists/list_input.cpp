@@ -6,9 +6,10 @@
 
 namespace MW {
 
-bool takesTouch(const event_data& event, int holder, const SKIA_Rect& area, const ClassLog& log) {
-  const bool isDrag = event.type >= kEventMotion && event.type <= kEventRelease;
-  if (isDrag && holder != 0 && holder != static_cast<int>(event.mouse.finger + 1)) {
+bool takesTouch(const event_data& event, int holder, const SKIA_Rect& area, EventCode last,
+                const ClassLog& log) {
+  const bool isTouch = event.type >= kEventMotion && event.type <= last;
+  if (isTouch && holder != 0 && holder != static_cast<int>(event.mouse.finger + 1)) {
     if (event.type != kEventMotion) {
       log.print(LogLevel::Debug, "onRecvEvent-> T:%d, F:%d", event.type,
                 static_cast<int>(event.mouse.finger));

@@ -11,7 +11,9 @@ namespace MW {
 
 /// Whether a pointer event is the list's: one in its area, or any while a finger holds it, which is
 /// followed wherever it moves and keeps all others from the list. `holder`: that finger + 1, or 0.
-bool takesTouch(const event_data& event, int holder, const SKIA_Rect& area, const ClassLog& log);
+/// `last`: codes up to it are kept away.
+bool takesTouch(const event_data& event, int holder, const SKIA_Rect& area, EventCode last,
+                const ClassLog& log);
 
 void logKeyPress(const ClassLog& log, kbd_event key);
 void logKeyRelease(const ClassLog& log, kbd_event key);

@@ -237,7 +237,7 @@ bool MainList::onRecvEvent(event_data* event, unsigned int) {
     case kEventKeyRelease: onReleaseKey(event->key); return true;
     default: break;
   }
-  if (!takesTouch(*event, select, read(listRect), kLog)) return false;
+  if (!takesTouch(*event, select, read(listRect), kEventRelease, kLog)) return false;
   switch (event->type) {
     case kEventMotion: onHover(event->mouse); return true;
     case kEventPress: onPress(event->mouse); return true;

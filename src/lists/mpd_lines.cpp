@@ -26,7 +26,7 @@ int levelOf(std::string_view line) {
   if (bracket == std::string_view::npos) return kTopLevel;
   const std::string_view inside = tailOf(line, bracket + 1);
   std::string_view number = tailOf(inside, inside.find_first_not_of(" \t\v\f\r"));
-  if (number.starts_with('+')) number.remove_prefix(1);
+  if (number.starts_with('+') && !number.starts_with("+-")) number.remove_prefix(1);
   int level = 0;
   const auto result = std::from_chars(number.data(), number.data() + number.size(), level);
   if (result.ec == std::errc::result_out_of_range) {

@@ -255,7 +255,7 @@ bool MpdWid::onRecvEvent(event_data* event, unsigned int) {
     case kEventKeyRelease: onReleaseKey(event->key); return true;
     default: break;
   }
-  if (!takesTouch(*event, select, read(list_rect), kLog)) return false;
+  if (!takesTouch(*event, select, read(list_rect), kEventLongPress, kLog)) return false;
   const LifeGuard self(this);
   switch (event->type) {
     case kEventMotion: onHover(event->mouse); return true;

@@ -3,7 +3,7 @@
 #include <brimol/properties.h>
 
 #include <algorithm>
-#include <new>
+#include <exception>
 #include <utility>
 
 #include "core/bounded_text.h"
@@ -118,7 +118,7 @@ void StaticText::setText(const char* newText) {
     line_count = lines.count();
     last_index = line_count == 1 ? 0 : line_count;
     is_setting = 0;
-  } catch (const std::bad_alloc&) {
+  } catch (const std::exception&) {
     return;  // "no log" stays
   }
 }

@@ -7,12 +7,9 @@
 #include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/life_guard.h"
+#include "core/redraw.h"
 
 namespace MW {
-
-namespace {
-constexpr int kRedraw = 1;
-}  // namespace
 
 template <typename... Self>
 TextPanel<Self...>::TextPanel(const char* logWord) : word(logWord) {
@@ -101,7 +98,7 @@ void TextPanel<Self...>::onShowTimer(int ms) {
     const std::lock_guard guard(stateLock);
     showTimer.start(now, static_cast<unsigned int>(ms));
   }
-  EventService_AppEvent_c(kRedraw);
+  askForRedraw();
 }
 
 template <typename... Self>
@@ -147,7 +144,7 @@ void TextPanel<Self...>::restoreColor() {
     if (rect.color == saved_bg_color) return;
     rect.color = saved_bg_color;
   }
-  EventService_AppEvent_c(kRedraw);
+  askForRedraw();
 }
 
 template <typename... Self>

@@ -1,8 +1,9 @@
 /// What the sources of the text widgets share.
 #pragma once
 
+#include <MW/text_panel.h>
+
 #include <algorithm>
-#include <array>
 #include <climits>
 #include <cstring>
 #include <string_view>
@@ -20,12 +21,10 @@ inline std::string_view wholeText(const char* given) {
   return {given, strnlen(given, INT_MAX - 1)};
 }
 
-inline constexpr std::size_t kShortBytes = 100;
-
 /// An application's text cut to what is kept of typed and wanted texts; NULs behind it.
-inline std::array<char, kShortBytes> shortText(const char* given) {
-  std::array<char, kShortBytes> kept = {};
-  std::ranges::copy(cutText(wholeText(given), kShortBytes - 1), kept.begin());
+inline ShortText shortText(const char* given) {
+  ShortText kept = {};
+  std::ranges::copy(cutText(wholeText(given), kept.size() - 1), kept.begin());
   return kept;
 }
 

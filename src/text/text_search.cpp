@@ -1,7 +1,7 @@
 #include <MW/static_text.h>
 
 #include <algorithm>
-#include <new>
+#include <exception>
 #include <utility>
 
 #include "core/bounded_text.h"
@@ -57,7 +57,7 @@ void StaticText::line_search(const char* source) {
   try {
     numbers = findLines(wholeText(source), wanted.data());
     rows.resize(numbers.size());
-  } catch (const std::bad_alloc&) {
+  } catch (const std::exception&) {
     numbers.clear();
     rows.clear();
   }

@@ -1,15 +1,13 @@
 #include <MW/button_face.h>
-#include <MW/c_api.h>
 #include <MW/window.h>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
+#include "core/redraw.h"
 
 namespace MW {
 
-namespace {
-constexpr int kRedraw = 1;
-}  // namespace
+namespace {}  // namespace
 
 ButtonFace::ButtonFace(const char* logWord, const SKIA_Rect* area, const SKIA_Text* caption)
     : word(logWord) {
@@ -47,7 +45,7 @@ void ButtonFace::setRect(int, const SKIA_Rect* newRect) {
 void ButtonFace::restoreColor() {
   if (getBgColor() == read(normalColor)) return;
   restoreFace();
-  EventService_AppEvent_c(kRedraw);
+  askForRedraw();
 }
 
 void ButtonFace::restoreFace() {

@@ -5,12 +5,11 @@
 
 #include "core/class_log.h"
 #include "core/life_guard.h"
+#include "core/redraw.h"
 
 namespace MW {
 
-namespace {
-constexpr int kRedraw = 1;
-}  // namespace
+namespace {}  // namespace
 
 int PushButton::show() { return show(0); }
 
@@ -62,7 +61,7 @@ void PushButton::onShowTimer(int ms) {
     delayedShow.start(now, static_cast<unsigned int>(ms));
   }
   setActive(1);
-  EventService_AppEvent_c(kRedraw);
+  askForRedraw();
 }
 
 void PushButton::onPress(event_data* event) {

@@ -6,13 +6,13 @@
 #include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/geometry.h"
+#include "core/redraw.h"
 
 namespace MW {
 
 namespace {
 constexpr ClassLog kToastLog("TOASTBOX");
 constexpr ClassLog kBarLog("PROGRESSBAR");
-constexpr int kRedraw = 1;
 constexpr int kTwoLines = 2;
 constexpr uint32_t kBarFrameColor = 0xFF4F4F4F;
 constexpr int64_t kBarMargin = 2;  // pixels
@@ -84,7 +84,7 @@ void Toastbox::onHideTimer(int ms) {
     hideAt = GetTicks() + static_cast<unsigned int>(ms);
     setActive(1);
   }
-  EventService_AppEvent_c(kRedraw);
+  askForRedraw();
 }
 
 void Toastbox::setRect(int lineCount, const SKIA_Rect* newRect) {

@@ -15,7 +15,7 @@ namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 
-constexpr auto kAreas = std::to_array<SKIA_Rect>({{10, 10, 200, 200, 0}, {700, 700, 90, 90, 0}});
+constexpr auto kAreas = std::to_array<SKIA_Rect>({{10, 10, 200, 200, 0}, {1300, 700, 90, 90, 0}});
 const std::array kTexts = {std::string(5, '#'), std::string(90, '%')};
 const SKIA_Text kWords = textRecord(kTexts[0]);
 
@@ -34,8 +34,15 @@ struct Menu {
   MW::SlideMove value{kAreas.data(), 0, 0, 100, 50};
   MW::DialogSelect choice{1};
   MW::AutoCapScreen page{0};
-  std::array<MW::Widget*, 14> all = {&list, &button, &slide, &toast, &bar,   &key,    &dialog,
-                                     &log,  &framed, &pad,   &exit,  &value, &choice, &page};
+  MW::DialogSlide answer{3};
+  MW::DialogList rows{"Rows"};
+  MW::DialogShell shell{"Shell", 9};
+  MW::DialogNew prompt{"Prompt", 5, 7};
+  MW::Ime keyboard{kAreas.data(), &kWords};
+  MW::MpdWid results{"Results"};
+  std::array<MW::Widget*, 20> all = {&list,   &button, &slide, &toast,  &bar,      &key,    &dialog,
+                                     &log,    &framed, &pad,   &exit,   &value,    &choice, &page,
+                                     &answer, &rows,   &shell, &prompt, &keyboard, &results};
 
   void set(int round) {
     const std::size_t number = round % 2 == 0 ? 0 : 1;
@@ -46,12 +53,18 @@ struct Menu {
       each->setMsg(words.c_str());
       each->onHideTimer(50);
       each->onProgressbar(round % 8 * 40);
+      each->setDesc(words.c_str(), words.c_str(), nullptr, 1);
+      each->setbutton(words.c_str(), round % 3 == 0 ? words.c_str() : nullptr);
+      each->lcdOn(round % 5);
       if (round % 16 == 0) each->hide();
       each->setActive(1);
     }
     log.setText(std::string(words.size() * words.size(), words[0]).c_str());
     log.get_ime_result(words.c_str());
     log.line_search(words.c_str());
+    keyboard.keyboard_change(number == 0 ? MW::Ime::kSmall : MW::Ime::kSpecial);
+    keyboard.typing_reset();
+    results.cal_line(("[1]\n[2]\n[MPDIA] " + words + "]\n").c_str(), round % 99);
     dialog.setDesc(words.c_str());
     dialog.setRect(round % 40);
     choice.setTitle(words.c_str());
@@ -59,8 +72,25 @@ struct Menu {
     page.setText(0, kAreas.at(number), textRecord(words));
     page.setText_str(1, words.c_str());
     value.setRect(&kAreas.at(number));
+    fillDialogs(round, words.c_str());
     list.setText(round % 40, words.c_str(), static_cast<unsigned int>(words.size()));
     number == 0 ? list.move_key_down(0) : list.move_key_up(0);
+  }
+
+  void fillDialogs(int round, const char* words) {
+    answer.setTitle(words);
+    answer.setSlide(words, 300 + round % 90);
+    answer.setRect_init(round);
+    rows.initIndex();
+    while (rows.addIndex(words) < round % 8) continue;
+    rows.initFinish(round % 9);
+    rows.setText(round % 10, words);
+    if (round % 64 == 0) shell.initShell();
+    shell.addShell(words);
+    shell.setRect_static();
+    if (round % 4 == 0) prompt.setProgress(0);
+    prompt.setDescBlink(round % 2);
+    prompt.setDescColor(7);
   }
 };
 
@@ -81,6 +111,7 @@ TEST_F(WidgetTest, MenuWidgetsAreDrawnOfferedEventsAndSetAtOnce) {
   Menu menu;
   for (int i = 0; i < 40; ++i) menu.list.addIndex(1, &kWords, 100);
   menu.list.initFinish();
+  menu.keyboard.presskey_set(MW::Ime::kOnlyDigits);
   menu.key.plugCallback = [](MW::kbd_event*) {};
   std::atomic<bool> isOver = false;
   std::thread events([&] {

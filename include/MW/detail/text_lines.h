@@ -1,6 +1,8 @@
 /// A long text, cut into rows.
 #pragma once
 
+#include <MW/api.h>
+
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -10,7 +12,7 @@ namespace MW {
 
 /// The rows of a fixed width that a text's lines fill, one buffer for all. The holder's lock guards
 /// it.
-class TextLines {
+class MW_API TextLines {
  public:
   static constexpr int kContinued = -1;  ///< a row that goes on with the line of the one before
 
@@ -18,7 +20,8 @@ class TextLines {
   /// Rows of `rowBytes`, at least 1. A row ends before a character of several bytes that it cannot
   /// take whole, unless the row is shorter than that. A line that fills its last row is followed by
   /// an empty one. 0x02, 0x03 and "\r" are dropped, and a "\n" at the end begins no line. Room for
-  /// `expectedRows` is put aside at once. Throws std::bad_alloc.
+  /// `expectedRows` is put aside at once. Throws where there is no memory, and where a vector does
+  /// not take as many.
   TextLines(std::string_view source, std::size_t rowBytes, std::size_t expectedRows);
 
   /// 0 only without a text.
