@@ -20,7 +20,7 @@ run_suite() {
     release | asan | tsan)
       build "$1"
       echo "== Testing $1"
-      ctest --preset "$1"
+      ctest --preset "$1" --parallel "$(nproc)"
       ;;
     phone) build phone ;;
     tidy) scripts/tidy.sh ;;
