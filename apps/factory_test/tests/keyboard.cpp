@@ -1,13 +1,12 @@
 // The keyboard on the screen, in all its layouts.
-#include <MW/button_s.h>
 #include <MW/ime.h>
 
 #include <array>
 #include <atomic>
 #include <optional>
 #include <string>
-#include <utility>
 
+#include "button_row.h"
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
@@ -16,9 +15,6 @@ namespace factory_test {
 
 namespace {
 
-// By the numbers of MW::Ime.
-constexpr auto kLayouts = std::to_array<const char*>({"abc", "ABC", "#+=", "123"});
-constexpr int kFramed = 2;  // MW::ButtonNew's style
 constexpr uint32_t kKeyboardColor = 0xFF3C4A60;
 
 /// Tells what was entered. A button for each layout, and the up key for the next one.
@@ -37,11 +33,11 @@ class KeyboardTest : public PageTest {
     keyboard.emplace(&area, &looks);
     keyboard->release_cb = [](int, MW::Ime* from) { self().follow(*from); };
     keyboard->setActive(1);
-    placeButtons(std::make_index_sequence<kLayouts.size()>());
+    layouts.emplace(rowOf(screenSize(), 74, 6, kButtonColor), kFaces);
   }
 
   void leave() override {
-    for (std::size_t i = buttons.size(); i > 0; --i) buttons.at(i - 1).reset();
+    layouts.reset();
     keyboard.reset();
     page.endAsking();
   }
@@ -49,29 +45,19 @@ class KeyboardTest : public PageTest {
   Outcome verdict() const override { return folded ? Outcome::Left : PageTest::verdict(); }
 
  private:
+  // By the numbers of MW::Ime's layouts.
+  static constexpr std::size_t kLayoutCount = 4;
+  static const std::array<ButtonRow::Face, kLayoutCount> kFaces;
+
   static KeyboardTest& self() { return Current<KeyboardTest>::get(); }
 
-  template <std::size_t... number>
-  void placeButtons(std::index_sequence<number...>) {
-    (placeButton(number, [](int) { self().change(number); }), ...);
-  }
-
-  void placeButton(std::size_t number, void (*clicked)(int)) {
-    const SKIA_Rect area = cellOf(rowOf(screenSize(), 74, 6, kButtonColor),
-                                  static_cast<int>(number), static_cast<int>(kLayouts.size()));
-    const SKIA_Text caption = captionOf(kLayouts.at(number));
-    MW::ButtonNew& button = buttons.at(number).emplace(kFramed, &area, &caption);
-    button.clickCallback = clicked;
-    button.setActive(1);
-  }
-
   void change(std::size_t number) {
-    layout = number % kLayouts.size();
+    layout = number % kLayoutCount;
     const auto type = static_cast<unsigned int>(layout);
     keyboard->keyboard_change(0);  // takes the grey of the digits away
     keyboard->keyboard_change(type);
     keyboard->presskey_set(type);
-    page.say(kLayouts.at(type));
+    page.say(kFaces.at(type).caption);
   }
 
   void follow(MW::Ime& from) {
@@ -86,8 +72,15 @@ class KeyboardTest : public PageTest {
   std::atomic<bool> folded = false;
   std::atomic<std::size_t> layout = 0;
   std::optional<MW::Ime> keyboard;
-  std::array<std::optional<MW::ButtonNew>, kLayouts.size()> buttons;
+  std::optional<ButtonRow> layouts;
 };
+
+const std::array<ButtonRow::Face, KeyboardTest::kLayoutCount> KeyboardTest::kFaces = {{
+    {"abc", [](int) { self().change(0); }},
+    {"ABC", [](int) { self().change(1); }},
+    {"#+=", [](int) { self().change(2); }},
+    {"123", [](int) { self().change(3); }},
+}};
 
 const TestRegistration kRegistration({Group::Input, 3, "keyboard", "Keyboard",
                                       makeTest<KeyboardTest>});

@@ -1,5 +1,4 @@
 // A long text to scroll and to search: a file, or what the program itself has logged.
-#include <MW/button_s.h>
 #include <MW/ime.h>
 #include <MW/static_text.h>
 #include <MW/window.h>
@@ -9,6 +8,7 @@
 #include <optional>
 #include <string>
 
+#include "button_row.h"
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
@@ -19,7 +19,6 @@ namespace {
 
 constexpr uint32_t kPaper = 0xFFF4F4EC;
 constexpr uint32_t kKeyboardColor = 0xFF3C4A60;
-constexpr int kFramed = 2;         // MW::ButtonNew's style
 constexpr int kTopPercent = 34;    // of the screen's height, and so the next
 constexpr int kViewPercent = 38;   // of the viewer by itself
 constexpr int kAbovePercent = 16;  // of the viewer above the keyboard
@@ -54,11 +53,11 @@ class LogTest : public PageTest {
     };
     placeViewer();
     placeKeyboard();
-    for (std::size_t i = 0; i < kButtonCount; ++i) placeButton(i);
+    buttons.emplace(rowOf(screenSize(), 74, 6, kButtonColor), kFaces);
   }
 
   void leave() override {
-    for (std::size_t i = buttons.size(); i > 0; --i) buttons.at(i - 1).reset();
+    buttons.reset();
     keyboard.reset();
     viewer.reset();
     page.endAsking();
@@ -66,15 +65,10 @@ class LogTest : public PageTest {
 
  private:
   enum Direction { kPrevious = 0, kNext = 1 };  // as the viewer counts them
-  struct ButtonRow {
-    const char* caption;
-    void (*clicked)(int);
-  };
 
   static LogTest& self() { return Current<LogTest>::get(); }
 
-  static constexpr std::size_t kButtonCount = 3;
-  static const std::array<ButtonRow, kButtonCount> kButtons;
+  static const std::array<ButtonRow::Face, 3> kFaces;
 
   void placeViewer() {
     const ScreenSize screen = screenSize();
@@ -95,22 +89,13 @@ class LogTest : public PageTest {
     keyboard->release_cb = [](int, MW::Ime* from) { self().follow(*from); };
   }
 
-  void placeButton(std::size_t number) {
-    const SKIA_Rect area = cellOf(rowOf(screenSize(), 74, 6, kButtonColor),
-                                  static_cast<int>(number), static_cast<int>(kButtonCount));
-    const SKIA_Text caption = captionOf(kButtons.at(number).caption);
-    MW::ButtonNew& button = buttons.at(number).emplace(kFramed, &area, &caption);
-    button.clickCallback = kButtons.at(number).clicked;
-    button.setActive(1);
-  }
-
   // The keyboard takes the place of the viewer's lower part and of the buttons.
   void showKeyboard(bool isShown) {
     const SKIA_Rect area =
         rowOf(screenSize(), kTopPercent, isShown ? kAbovePercent : kViewPercent, kPaper);
     viewer->setRect(0, &area);
     keyboard->setActive(isShown ? 1 : 0);
-    for (auto& button : buttons) button->setActive(isShown ? 0 : 1);
+    buttons->setActive(!isShown);
     MW::isDisplayUpdate(1);
   }
 
@@ -144,10 +129,10 @@ class LogTest : public PageTest {
   const std::string text;
   std::optional<Viewer> viewer;
   std::optional<MW::Ime> keyboard;
-  std::array<std::optional<MW::ButtonNew>, kButtonCount> buttons;
+  std::optional<ButtonRow> buttons;
 };
 
-const std::array<LogTest::ButtonRow, LogTest::kButtonCount> LogTest::kButtons = {{
+const std::array<ButtonRow::Face, 3> LogTest::kFaces = {{
     {"Search", [](int) { self().openKeyboard(); }},
     {"Previous", [](int) { self().jump(kPrevious); }},
     {"Next", [](int) { self().jump(kNext); }},

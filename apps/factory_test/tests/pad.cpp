@@ -1,13 +1,14 @@
 // The multi-touch pad: every cell can be held by a finger of its own.
 #include <MW/button8.h>
-#include <MW/button_s.h>
 
 #include <algorithm>
+#include <array>
 #include <atomic>
 #include <bitset>
 #include <optional>
 #include <string>
 
+#include "button_row.h"
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
@@ -17,7 +18,6 @@ namespace factory_test {
 namespace {
 
 constexpr int kLayouts = 6;  // of MW::Button8
-constexpr int kFramed = 2;   // MW::ButtonNew's style
 constexpr uint32_t kPadColor = 0xFF3C4A60;
 
 /// Tells which cells are held. The button, or the up key, changes the layout.
@@ -38,12 +38,7 @@ class PadTest : public PageTest {
     pad->pressCallback = [](MW::mouse_event* mouse) { self().tell(mouse->state); };
     pad->clickCallback = [](MW::mouse_event* mouse) { self().tell(mouse->state); };
     pad->setActive(1);
-    const SKIA_Rect row = rowOf(screenSize(), kContentTop, 6, kButtonColor);
-    const SKIA_Text caption = captionOf("Next layout");
-    changer.emplace(kFramed, &row, &caption);
-    changer->setBdColor(MW::kColorWhite);
-    changer->clickCallback = [](int) { self().nextLayout(); };
-    changer->setActive(1);
+    changer.emplace(rowOf(screenSize(), kContentTop, 6, kButtonColor), kFaces);
   }
 
   void leave() override {
@@ -53,6 +48,8 @@ class PadTest : public PageTest {
   }
 
  private:
+  static const std::array<ButtonRow::Face, 1> kFaces;
+
   static PadTest& self() { return Current<PadTest>::get(); }
 
   // Not wider than high: a single row of cells is as high as its width says.
@@ -80,8 +77,12 @@ class PadTest : public PageTest {
   Current<PadTest> current{this};
   std::atomic<int> layout = 0;
   std::optional<MW::Button8> pad;
-  std::optional<MW::ButtonNew> changer;
+  std::optional<ButtonRow> changer;
 };
+
+const std::array<ButtonRow::Face, 1> PadTest::kFaces = {{
+    {"Next layout", [](int) { self().nextLayout(); }},
+}};
 
 const TestRegistration kRegistration({Group::Input, 2, "pad", "Multi-touch pad",
                                       makeTest<PadTest>});

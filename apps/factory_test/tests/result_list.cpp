@@ -2,9 +2,11 @@
 #include <MW/button_s.h>
 #include <MW/mpd_wid.h>
 
+#include <array>
 #include <optional>
 #include <string>
 
+#include "button_row.h"
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
@@ -14,8 +16,7 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kPlain = 1;   // MW::ButtonS's style
-constexpr int kFramed = 2;  // MW::ButtonNew's
+constexpr int kPlain = 1;  // MW::ButtonS's style
 
 enum Level { kGroup = 1, kTest = 2, kDetail = 3 };
 
@@ -79,13 +80,9 @@ class ResultListTest : public LookTest {
     };
     const SKIA_Rect header = rowOf(screenSize(), 10, 10, MW::kColorWhite);
     const SKIA_Rect left = cellOf(header, 0, 2);
-    const SKIA_Rect right = cellOf(header, 1, 2);
     const SKIA_Text hint = captionOf("Tap a line twice");
-    const SKIA_Text end = captionOf("Done");
     heading.emplace(kPlain, &left, &hint).setActive(1);
-    done.emplace(kFramed, &right, &end);
-    done->clickCallback = [](int) { self().finishLook(); };
-    done->setActive(1);
+    done.emplace(cellOf(header, 1, 2), kFaces);
   }
 
   void endLook() override {
@@ -97,14 +94,20 @@ class ResultListTest : public LookTest {
   std::string question() const override { return "Were all results there?"; }
 
  private:
+  static const std::array<ButtonRow::Face, 1> kFaces;
+
   static ResultListTest& self() { return Current<ResultListTest>::get(); }
 
   Current<ResultListTest> current{this};
   const std::string words;
   std::optional<MW::MpdWid> list;
   std::optional<MW::ButtonS> heading;
-  std::optional<MW::ButtonNew> done;
+  std::optional<ButtonRow> done;
 };
+
+const std::array<ButtonRow::Face, 1> ResultListTest::kFaces = {{
+    {"Done", [](int) { self().finishLook(); }},
+}};
 
 const TestRegistration kRegistration({Group::Reports, 1, "result_list", "Results",
                                       makeTest<ResultListTest>});
