@@ -1,5 +1,7 @@
 #include "page_test.h"
 
+#include <MW/window.h>
+
 #include <algorithm>
 
 namespace factory_test {
@@ -29,6 +31,7 @@ void StepTest::updateLook() {
   }
   shown = step;
   showStep(step);
+  MW::isDisplayUpdate(1);
 }
 
 void StepTest::move(int by) { wanted = std::max(shown + by, 0); }

@@ -37,6 +37,7 @@ class Program {
     if (path == nullptr) throw std::runtime_error("FACTORY_TEST does not name the program");
     options.emplace(options.begin(), path);
     std::vector<char*> arguments;
+    arguments.reserve(options.size() + 1);
     for (std::string& option : options) arguments.push_back(option.data());
     arguments.push_back(nullptr);
     EXPECT_EQ(posix_spawn(&process, path, nullptr, nullptr, arguments.data(), environ), 0);
@@ -103,7 +104,7 @@ class WindowApplication : public testing::Test {
 
   /// A log of 400 lines, of which line 300 says where the needle is.
   static std::string writeLog() {
-    const std::string file = testing::TempDir() + "window_test.log." + std::to_string(getpid());
+    std::string file = testing::TempDir() + "window_test.log." + std::to_string(getpid());
     std::ofstream out(file);
     for (int line = 1; line <= 400; ++line) out << (line == 300 ? "a needle" : "hay") << '\n';
     return file;
