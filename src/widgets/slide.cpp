@@ -9,6 +9,7 @@
 #include "core/class_log.h"
 #include "core/geometry.h"
 #include "core/life_guard.h"
+#include "widgets/knob_route.h"
 
 namespace MW {
 
@@ -100,14 +101,7 @@ int Slide::hide() {
 
 bool Slide::onRecvEvent(event_data* event, unsigned int) {
   if (event == nullptr) return false;
-  switch (hold.touch(*event, read(rect))) {
-    case KnobHold::Touch::NotMine: return false;
-    case KnobHold::Touch::Grab: onPress(event); return true;
-    case KnobHold::Touch::Cancel: return true;
-    case KnobHold::Touch::Move: onHover(event->mouse); return true;
-    case KnobHold::Touch::Drop: onRelease(event); return true;
-  }
-  return false;
+  return routeKnobTouch(*this, hold.touch(*event, read(rect)), event);
 }
 
 void Slide::onPress(event_data* event) {

@@ -6,6 +6,7 @@
 #include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/geometry.h"
+#include "widgets/knob_route.h"
 
 namespace MW {
 
@@ -99,14 +100,7 @@ int SlideMove::show(unsigned int) {
 
 bool SlideMove::onRecvEvent(event_data* event, unsigned int) {
   if (event == nullptr) return false;
-  switch (hold.touch(*event, read(rect))) {
-    case KnobHold::Touch::NotMine: return false;
-    case KnobHold::Touch::Grab: onPress(event); return true;
-    case KnobHold::Touch::Cancel: return true;
-    case KnobHold::Touch::Move: onHover(event->mouse); return true;
-    case KnobHold::Touch::Drop: onRelease(event); return true;
-  }
-  return false;
+  return routeKnobTouch(*this, hold.touch(*event, read(rect)), event);
 }
 
 void SlideMove::onPress(event_data* event) {
