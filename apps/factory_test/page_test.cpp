@@ -22,6 +22,10 @@ void LookTest::update(uint32_t) {
   page.say(question().c_str());
 }
 
+void LookTest::finishLookOn(unsigned int code) {
+  if (code == MW::kKeySelect || code == kKeyBack) finishLook();
+}
+
 void StepTest::updateLook() {
   const int step = wanted;
   if (step == shown) return;

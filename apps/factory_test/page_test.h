@@ -43,6 +43,8 @@ class LookTest : public PageTest {
 
   /// Ends the look with the next round. Any thread.
   void finishLook() { looked = true; }
+  /// The same for the select and the back key, where keys do nothing else.
+  void finishLookOn(unsigned int code);
 
  private:
   std::atomic<bool> looked = false;

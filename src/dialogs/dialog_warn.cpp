@@ -4,6 +4,7 @@
 #include <brimol/input.h>
 
 #include <algorithm>
+
 #include "core/key_clicks.h"
 #include "core/life_guard.h"
 #include "dialogs/dialog_parts.h"

@@ -7,8 +7,6 @@
 
 namespace MW {
 
-namespace {}  // namespace
-
 ButtonFace::ButtonFace(const char* logWord, const SKIA_Rect* area, const SKIA_Text* caption)
     : word(logWord) {
   type_ = kBaseLayer;

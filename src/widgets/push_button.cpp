@@ -9,8 +9,6 @@
 
 namespace MW {
 
-namespace {}  // namespace
-
 int PushButton::show() { return show(0); }
 
 void PushButton::updateTimer(unsigned int ticks) {

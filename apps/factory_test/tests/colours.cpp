@@ -48,7 +48,7 @@ class ColourTest : public LookTest {
 
   void followKey(unsigned int code) {
     if (code == MW::kKeyRight) next();
-    if (code == MW::kKeySelect || code == kKeyBack) finishLook();
+    finishLookOn(code);
     MW::isDisplayUpdate(1);
   }
 

@@ -31,9 +31,7 @@ class ListTest : public LookTest {
     list->button1Callback = [](int* row) { self().choose(*row); };
     list->button2Callback = [](int* row) { self().choose(*row); };
     // NOLINTEND(readability-non-const-parameter)
-    list->keyPressCallback = [](MW::kbd_event* event) {
-      if (event->code == MW::kKeySelect || event->code == kKeyBack) self().finishLook();
-    };
+    list->keyPressCallback = [](MW::kbd_event* event) { self().finishLookOn(event->code); };
     list->setActive(1);
   }
 

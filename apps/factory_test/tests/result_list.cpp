@@ -76,7 +76,7 @@ class ResultListTest : public LookTest {
   void beginLook() override {
     list.emplace("Results").cal_line(words.c_str(), static_cast<int>(words.size()));
     list->key_press_cb = [](MW::kbd_event* event, MW::MpdWid*) {
-      if (event->code == MW::kKeySelect || event->code == kKeyBack) self().finishLook();
+      self().finishLookOn(event->code);
     };
     const SKIA_Rect header = rowOf(screenSize(), 10, 10, MW::kColorWhite);
     const SKIA_Rect left = cellOf(header, 0, 2);

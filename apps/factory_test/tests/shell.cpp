@@ -28,9 +28,7 @@ class ShellTest : public LookTest {
     shell.emplace(line.c_str());
     shell->button1Callback = [](int) { Current<ShellTest>::get().finishLook(); };
     shell->keyPressCallback = [](MW::kbd_event* event) {
-      if (event->code == MW::kKeySelect || event->code == kKeyBack) {
-        Current<ShellTest>::get().finishLook();
-      }
+      Current<ShellTest>::get().finishLookOn(event->code);
     };
     shell->setActive(1);
     command.emplace(line);

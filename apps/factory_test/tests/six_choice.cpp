@@ -27,9 +27,7 @@ class SixChoiceTest : public LookTest {
       dialog->setText_str(static_cast<unsigned int>(i), kChoices.at(i));
     }
     dialog->choiceCallback = [](MW::mouse_event* mouse) { self().choose(mouse->state); };
-    dialog->keyPressCallback = [](MW::kbd_event* event) {
-      if (event->code == MW::kKeySelect || event->code == kKeyBack) self().finishLook();
-    };
+    dialog->keyPressCallback = [](MW::kbd_event* event) { self().finishLookOn(event->code); };
     dialog->setActive(1);
   }
 

@@ -40,9 +40,7 @@ class TouchTest : public LookTest {
     touch->longPressCallback = [](MW::mouse_event* mouse) { self().tell("Long press", *mouse); };
     touch->doubleClickCallback = [](int) { self().finishLook(); };
     touch->setActive(1);
-    key.emplace().keyPressCallback = [](MW::kbd_event* event) {
-      if (event->code == MW::kKeySelect || event->code == kKeyBack) self().finishLook();
-    };
+    key.emplace().keyPressCallback = [](MW::kbd_event* event) { self().finishLookOn(event->code); };
   }
 
   std::string question() const override { return "Double tap. Was every touch met?"; }
