@@ -3,6 +3,7 @@
 
 #include <MW/api.h>
 #include <MW/callback.h>
+#include <MW/detail/finger_hold.h>
 #include <MW/records.h>
 #include <brimol/scene.h>
 
@@ -145,6 +146,10 @@ class MW_API Widget {
   /// the widget even where another one of the same id was removed.
   void leaveWindow();
 
+  /// Whether a pointer event lies in the rectangle, left and top edges in, the others out. `field`
+  /// is one of the widget's, read under its lock; a null event lies nowhere.
+  bool isUnder(const SKIA_Rect& field, const event_data* event) const;
+
   /// A field that handlers and drawing share, read and written under the lock.
   template <typename Field>
   Field read(const Field& field) const {
@@ -171,6 +176,7 @@ class MW_API Widget {
   std::atomic<bool> active = false;  // publishes to a walk what was set before
   std::atomic<int> select = 0;
   std::atomic<int> ownerFinger = -1;
+  FingerHold hold{select};
   unsigned int blinkColor = 0;
   unsigned int blinkNext = 0;   // GetTicks() milliseconds, 0: not started
   unsigned int blinkCount = 0;  // toggles so far

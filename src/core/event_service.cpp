@@ -39,10 +39,6 @@ EventBlock allocateEvent() {
   return block;
 }
 
-bool isPointerEvent(const event_data& event) {
-  return event.type >= kEventMotion && event.type <= kEventLongPress;
-}
-
 void parsePointer(EventCode code, const BrimolPointerEvent& event, event_data& data) {
   data.type = code;
   data.mouse = {event.state, event.finger, event.x, event.y, 0, 0};
@@ -155,7 +151,7 @@ event_data* EventService::recvEvent() {
 bool EventService::isMouseEventForMe(const SKIA_Rect* area, const event_data* event) {
   if (area == nullptr || event == nullptr) return false;
   const std::lock_guard guard(EvtQL);
-  return isPointerEvent(*event) && contains(*area, {event->mouse.x, event->mouse.y});
+  return isPointerEvent(*event) && contains(*area, positionOf(*event));
 }
 
 bool EventService::isMouseEventAroundMe(const SKIA_Rect* area, const event_data* event) {

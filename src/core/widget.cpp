@@ -1,6 +1,7 @@
 #include <MW/widget.h>
 #include <MW/window.h>
 
+#include "core/hit_test.h"
 #include "core/layers.h"
 #include "core/life_guard.h"
 
@@ -24,6 +25,10 @@ void Widget::leaveLayers() { Layers::leave(*this); }
 void Widget::leaveWindow() {
   Window::unregisterWidget(this);
   leaveLayers();
+}
+
+bool Widget::isUnder(const SKIA_Rect& field, const event_data* event) const {
+  return event != nullptr && isPointerEvent(*event) && contains(read(field), positionOf(*event));
 }
 
 int Widget::show() { return 0; }
