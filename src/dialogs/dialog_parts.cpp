@@ -16,12 +16,6 @@ constexpr int kCaptionPercent = 35;
 constexpr int64_t kTextMargin = 10;
 }  // namespace
 
-ScreenSize presentScreen() {
-  ScreenSize screen = {};
-  Window::getwindowsize(&screen.w, &screen.h);
-  return screen;
-}
-
 void layOutFrame(DialogFrame& dialog, ScreenSize screen, const DialogGrid& grid) {
   const auto [x, y, w, row, body, height] = grid;
   dialog.backdrop = overScreen(screen, dialog.backdrop.color);

@@ -9,17 +9,15 @@
 
 #include "core/bounded_text.h"
 #include "core/geometry.h"
+#include "core/present_screen.h"
 
 namespace MW {
 
-constexpr uint32_t kDialogFrameColor = 0xFFBFBFBF;
+constexpr uint32_t kDialogFrameColor = kColorGrey;
 constexpr uint32_t kDialogTitleColor = kColorHighlight;
-constexpr uint32_t kAlarmColor = 0xFFFF0000;
+constexpr uint32_t kAlarmColor = kColorRed;
 constexpr int kDialogTitleSize = 70;  // pixels
 constexpr int kDialogTextSize = 60;   // pixels
-
-/// The present size of the window.
-ScreenSize presentScreen();
 
 /// A dialog on its screen: four fifths of the shorter side wide, a fifth of that the height of a
 /// row. The title has a row, and so have the buttons below the body.

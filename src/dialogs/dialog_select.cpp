@@ -12,7 +12,7 @@ namespace MW {
 namespace {
 
 constexpr ClassLog kLog("BUTTON");  // meant so, though it is a dialog
-constexpr uint32_t kPanelColor = 0xFFBFBFBF;
+constexpr uint32_t kPanelColor = kColorGrey;
 constexpr int kTextSize = 70;  // pixels
 constexpr int kInsetPercent = 90;
 constexpr int kPanelPercent = 80;

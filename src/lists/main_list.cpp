@@ -8,6 +8,7 @@
 #include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/geometry.h"
+#include "core/present_screen.h"
 #include "core/life_guard.h"
 #include "lists/list_input.h"
 #include "lists/main_list_tables.h"
@@ -67,8 +68,7 @@ void MainList::init_MainList(int listMode) {
 }
 
 void MainList::setRect(int listMode) {
-  ScreenSize screen = {};
-  Window::getwindowsize(&screen.w, &screen.h);
+  const ScreenSize screen = presentScreen();
   const int titleHeight = listMode == kExtended ? kExtendedTitleHeight : kTitleHeight;
   const std::lock_guard guard(stateLock);
   screenRect = {0, 0, screen.w, screen.h, 0};

@@ -10,6 +10,7 @@
 #include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/geometry.h"
+#include "core/present_screen.h"
 #include "core/life_guard.h"
 #include "lists/list_input.h"
 #include "lists/mpd_lines.h"
@@ -77,8 +78,7 @@ void MpdWid::init_MpdWid() {
 
 void MpdWid::setRect() {
   kLog.print(LogLevel::Debug, "setRect");
-  ScreenSize screen = {};
-  Window::getwindowsize(&screen.w, &screen.h);
+  const ScreenSize screen = presentScreen();
   const int64_t width = int64_t{screen.w} - int64_t{2} * kMargin;
   const int headerTop = screen.h / kAboveHeader;
   const int headerHeight = screen.h / kHeader;

@@ -27,7 +27,7 @@ struct LevelColor {
 
 // A level that is not here leaves the colour as it was.
 constexpr auto kLevelColors = std::to_array<LevelColor>({
-    {1, 0xFFBFBFBF},
+    {1, kColorGrey},
     {2, 0xFFFFA873},
     {3, 0xFFFF6600},
 });

@@ -9,7 +9,7 @@ namespace MW {
 
 namespace {
 
-constexpr uint32_t kMatchColor = 0xFFFF0000;
+constexpr uint32_t kMatchColor = kColorRed;
 constexpr uint32_t kBarColor = 0xFF7F7F7F;
 constexpr int kMarginParts = 35;     // of the width and the height
 constexpr int kNumberWidth = 4;      // font sizes

@@ -7,6 +7,7 @@
 
 #include "core/bounded_text.h"
 #include "core/geometry.h"
+#include "core/present_screen.h"
 
 namespace MW {
 
@@ -131,8 +132,7 @@ void Button3::setText(const char* newText) {
 }
 
 void Button3::setRect(int position, const SKIA_Rect*) {
-  ScreenSize screen = {};
-  Window::getwindowsize(&screen.w, &screen.h);
+  const ScreenSize screen = presentScreen();
   const Grid grid = layOutGrid(screen.w);
   const auto* const cell = std::ranges::find(kCells, position, &Cell::position);
   const std::lock_guard guard(stateLock);

@@ -11,7 +11,7 @@ namespace MW {
 
 namespace {
 
-constexpr uint32_t kHeldColor = 0xFFFF0000;
+constexpr uint32_t kHeldColor = kColorRed;
 constexpr int kMarkSize = 60;   // pixels
 constexpr int kFrameWidth = 1;  // pixels
 constexpr double kGapPercent = 3.0;

@@ -18,14 +18,13 @@ constexpr int kPassOn = 2;          // the bit of the variant
 constexpr int kEmptySquare = 1;     // setRect's mode
 constexpr int kSquareSide = 50;     // pixels, and the least distance from an edge
 
-constexpr uint32_t kGrey = 0xFFBFBFBF;
-constexpr auto kFills = std::to_array<uint32_t>({kColorWhite, 0xFFFF0000, kColorGreen, kColorBlue});
+constexpr auto kFills = std::to_array<uint32_t>({kColorWhite, kColorRed, kColorGreen, kColorBlue});
 
 constexpr uint32_t fillOf(int color) {
   const auto index = static_cast<std::size_t>(color);  // a negative one becomes huge
-  return index < kFills.size() ? kFills.at(index) : kGrey;
+  return index < kFills.size() ? kFills.at(index) : kColorGrey;
 }
-static_assert(fillOf(-1) == kGrey && fillOf(3) == kColorBlue && fillOf(4) == kGrey);
+static_assert(fillOf(-1) == kColorGrey && fillOf(3) == kColorBlue && fillOf(4) == kColorGrey);
 
 }  // namespace
 

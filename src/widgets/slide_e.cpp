@@ -14,8 +14,8 @@ namespace {
 constexpr ClassLog kLog("SLIDE_EXIT");
 constexpr const char* kMark = "EXIT";
 constexpr int kMarkPercent = 25;  // of the bar's height
-constexpr uint32_t kKnobColor = 0xFFBFBFBF;
-constexpr uint32_t kArrowColor = 0xFFFF0000;
+constexpr uint32_t kKnobColor = kColorGrey;
+constexpr uint32_t kArrowColor = kColorRed;
 constexpr int kArrowRight = 0;  // the arrow's direction words
 constexpr int kArrowLeft = 1;
 

@@ -14,8 +14,8 @@ namespace {
 
 constexpr ClassLog kLog("SLIDE");
 constexpr uint32_t kKnobColor = 0xFF4F4F4F;
-constexpr uint32_t kGrooveColor = 0xFFBFBFBF;
-constexpr uint32_t kFillColor = 0xFFFF0000;
+constexpr uint32_t kGrooveColor = kColorGrey;
+constexpr uint32_t kFillColor = kColorRed;
 constexpr int kDefaultKnobPercent = 20;
 constexpr int kMostKnobPercent = 50;
 constexpr int kInnerFrame = 1;  // pixels around the knob
