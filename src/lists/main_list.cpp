@@ -8,8 +8,8 @@
 #include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/geometry.h"
-#include "core/present_screen.h"
 #include "core/life_guard.h"
+#include "core/present_screen.h"
 #include "lists/list_input.h"
 #include "lists/main_list_tables.h"
 
