@@ -16,6 +16,7 @@ struct TurnClock::Participant {
   bool isOutside = false;  // away, and named as one that blocks outside
   int calls = 0;           // since its pause; the thread's own
   std::atomic<bool> waitsInside = false;
+  std::atomic<bool> arrives = false;  // waits for the clock's lock, or is about to
   std::chrono::steady_clock::time_point runsSince;  // away, and seen running
   std::condition_variable go;
 };

@@ -84,8 +84,16 @@ void TurnClock::takePart() {
     if (++me.calls >= kMostCalls) delay(1);
     return;
   }
-  Lock lock(mutex);
+  Lock lock = lockFor(me);
   waitForTurn(lock, me, time);
+}
+
+// A thread that is away and waits for the lock looks blocked, and yet is on its way.
+TurnClock::Lock TurnClock::lockFor(Participant& me) {
+  me.arrives = true;
+  Lock lock(mutex);
+  me.arrives = false;
+  return lock;
 }
 
 void TurnClock::takePartAsPoller() {
@@ -103,7 +111,7 @@ uint32_t TurnClock::ticks() {
 
 void TurnClock::delay(uint32_t ms) {
   Participant& me = self();
-  Lock lock(mutex);
+  Lock lock = lockFor(me);
   waitForTurn(lock, me, time + std::max(ms, 1U));
 }
 
@@ -112,15 +120,12 @@ void TurnClock::setWaitsInside(bool waits) { self().waitsInside = waits; }
 void TurnClock::wakePoller() {
   const std::lock_guard lock(mutex);
   for (Participant& each : participants) {
-    if (each.isPoller && each.state == Participant::State::Waiting) {
-      const uint64_t soonest = pace.isStarted() ? std::max(time + 1, pace.reached()) : time.load();
-      each.wake = std::min(each.wake, soonest);
-    }
+    if (each.isPoller) each.wake = std::min(each.wake, time.load());
   }
-  if (holder == nullptr) keeperWakes.notify_one();
 }
 
 TurnClock::Participant& TurnClock::announce(const char* name) {
+  takePart();
   const std::lock_guard lock(mutex);
   return add(name == nullptr ? "" : name);
 }
@@ -139,7 +144,7 @@ void TurnClock::begin(Participant& announced) {
 void TurnClock::leave() {
   if (seat.id != id) return;
   Participant& me = *std::exchange(seat, {}).place;
-  const std::lock_guard lock(mutex);
+  const Lock lock = lockFor(me);
   me.state = Participant::State::Left;
   if (holder == &me) holder = nullptr;
   keeperWakes.notify_one();
@@ -178,7 +183,7 @@ TurnClock::Participant* TurnClock::choose(Lock& lock) {
     settle(lock);
     const std::optional<uint64_t> moment = nextMoment();
     if (!moment || !pace.isReached(*moment)) return nullptr;
-    const std::optional<uint64_t> due = agent.due ? agent.due(time) : std::nullopt;
+    const std::optional<uint64_t> due = agentDue();
     Participant* const next = earliest();
     if (!due || *due > next->wake) return next;
     actAsAgent(lock, *due);
@@ -195,11 +200,16 @@ TurnClock::Participant* TurnClock::earliest() {
   return found;
 }
 
+std::optional<uint64_t> TurnClock::agentDue() {
+  if (!agent.due) return std::nullopt;
+  return agent.due(pace.isStarted() ? std::max(time + 1, pace.reached()) : time + 1);
+}
+
 // None: every thread is away, and time stands still.
 std::optional<uint64_t> TurnClock::nextMoment() {
   const Participant* const next = earliest();
   if (next == nullptr) return std::nullopt;
-  const std::optional<uint64_t> due = agent.due ? agent.due(time) : std::nullopt;
+  const std::optional<uint64_t> due = agentDue();
   return due ? std::min(*due, next->wake) : next->wake;
 }
 

@@ -37,8 +37,9 @@ class TurnClock {
  public:
   /// Works at times of its own, while nobody has the turn: before the turns of the same moment.
   struct Agent {
-    /// When, in milliseconds since the start; none: not by itself. Called with the clock's lock.
-    std::function<std::optional<uint64_t>(uint64_t now)> due;
+    /// When, in milliseconds since the start; none: not by itself. What came from outside is due at
+    /// `soonest`, a moment at which nobody had the turn yet. Called with the clock's lock.
+    std::function<std::optional<uint64_t>(uint64_t soonest)> due;
     /// Called without it, on the thread that had the turn before.
     std::function<void(uint64_t now)> act;
   };
@@ -75,8 +76,10 @@ class TurnClock {
   uint64_t now() const { return time; }  ///< milliseconds since the start
   uint32_t ticksNow() const { return firstTick + static_cast<uint32_t>(time); }
   uint32_t ticksAtStart() const { return firstTick; }
-  /// The pause of the polling thread ends at the present time, or the next one of a real speed.
+  /// Ends the pause of the polling thread now. By the agent.
   void wakePoller();
+  /// The agent may be due earlier than it said.
+  void lookAtAgent() { keeperWakes.notify_one(); }
   /// The calling thread does not take part and may run on any processor.
   void stayOutside() const { cpus.leave(); }
 
@@ -92,6 +95,7 @@ class TurnClock {
  private:
   using Lock = std::unique_lock<std::mutex>;
 
+  Lock lockFor(Participant& me);
   Participant& self();
   Participant& add(const std::string& name);
   void sitDown(Participant& me);
@@ -99,6 +103,7 @@ class TurnClock {
   void passOn(Lock& lock);
   Participant* choose(Lock& lock);
   Participant* earliest();
+  std::optional<uint64_t> agentDue();
   std::optional<uint64_t> nextMoment();
   void actAsAgent(Lock& lock, uint64_t due);
   void settle(Lock& lock);

@@ -37,6 +37,7 @@ bool TurnClock::isUnsettled(Participant& away) {
   if (away.state == Participant::State::Left) return true;
   if (away.state != Participant::State::Away) return false;
   if (lookAt(away.thread) != ThreadState::Running) {
+    if (away.arrives) return true;
     away.runsSince = {};
     return false;
   }
