@@ -9,10 +9,10 @@
 #include <filesystem>
 #include <fstream>
 
-#include "frame_sink.h"
-#include "golden_cases.h"
+#include "golden/golden_cases.h"
 #include "input/input_service.h"
-#include "recorder.h"
+#include "scene/frame_sink.h"
+#include "scene/recorder.h"
 #include "support/records.h"
 
 // What the library asks of a platform only when it opens a window or takes input.

@@ -1,6 +1,6 @@
-#include "item_painter.h"
+#include "painter/item_painter.h"
 
-#include "shapes.h"
+#include "painter/shapes.h"
 
 namespace brimol::pc {
 

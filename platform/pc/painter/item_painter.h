@@ -1,10 +1,10 @@
 /// The drawing of every kind of display item.
 #pragma once
 
-#include "canvas.h"
-#include "item.h"
-#include "picture_cache.h"
-#include "text_painter.h"
+#include "painter/canvas.h"
+#include "painter/picture_cache.h"
+#include "painter/text_painter.h"
+#include "scene/item.h"
 
 namespace brimol::pc {
 

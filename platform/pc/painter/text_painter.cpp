@@ -1,10 +1,10 @@
-#include "text_painter.h"
+#include "painter/text_painter.h"
 
 #include <pango/pangocairo.h>
 
 #include <algorithm>
 
-#include "item.h"
+#include "scene/item.h"
 
 namespace brimol::pc {
 

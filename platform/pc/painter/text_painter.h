@@ -6,9 +6,9 @@
 #include <string>
 #include <tuple>
 
-#include "canvas.h"
-#include "fonts.h"
-#include "lru_cache.h"
+#include "painter/canvas.h"
+#include "painter/fonts.h"
+#include "painter/lru_cache.h"
 
 namespace brimol::pc {
 
