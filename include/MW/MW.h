@@ -1,6 +1,7 @@
 /// Every public header of the toolkit.
 #pragma once
 
+#include <MW/auto_cap_screen.h>
 #include <MW/button.h>
 #include <MW/button3.h>
 #include <MW/button8.h>
@@ -8,6 +9,7 @@
 #include <MW/button_s.h>
 #include <MW/c_api.h>
 #include <MW/callback.h>
+#include <MW/color_page.h>
 #include <MW/dialog.h>
 #include <MW/dialog_list.h>
 #include <MW/dialog_new.h>
