@@ -10,7 +10,7 @@
 #include <cstring>
 #include <vector>
 
-#include "painter.h"
+#include "painter/painter.h"
 #include "percentile.h"
 
 namespace {

@@ -23,6 +23,14 @@ class MW_API MainList : public Widget {
   static constexpr int kItems = 64;
   static constexpr int kOptions = 8;
   static constexpr int kNotMoved = -100;
+  static constexpr int kTitleHeight = 340;  ///< pixels, of the title bar: the list begins below it
+  static constexpr int kExtendedTitleHeight = 510;
+
+  /// What stands in the title bar.
+  enum Mode {
+    kPlain = 0,    ///< the title, brightness, battery and charger
+    kExtended = 1  ///< the other five status texts, too
+  };
 
   /// What an item's `kind` says; others look as kGrey with white text.
   enum ItemKind { kEnd = 0, kSelectable = 1, kGrey = 2, kDark = 3 };
@@ -44,7 +52,8 @@ class MW_API MainList : public Widget {
   explicit MainList(const char* listTitle);
   ~MainList() override;
 
-  using Widget::show;
+  /// show(0).
+  int show() override;
   /// Draws it. Returns 1.
   int show(unsigned int ticks) override;
   /// Makes it inactive. Returns 0.

@@ -42,7 +42,8 @@ class MW_API MpdWid : public Widget {
   explicit MpdWid(const char* listTitle);
   ~MpdWid() override;
 
-  using Widget::show;
+  /// show(0).
+  int show() override;
   /// Draws it. Returns 1.
   int show(unsigned int ticks) override;
   /// Makes it inactive. Returns 1.

@@ -18,6 +18,8 @@ std::string_view cutText(std::string_view given, std::size_t limit);
 /// to the NUL if there is one, and no character of several bytes cut in half. Null is empty.
 std::string_view boundedText(const char* given);
 std::string_view boundedText(const char* given, std::size_t count);
+/// The first `count` bytes, NULs among them, cut to kTextMax at a whole character. Null is empty.
+std::string_view countedText(const char* given, std::size_t count);
 
 /// Puts the text and a NUL into the record and sets its length; the rest of the record stays.
 void putText(SKIA_Text& record, std::string_view bounded);

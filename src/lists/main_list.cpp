@@ -18,20 +18,15 @@ namespace MW {
 namespace {
 
 constexpr ClassLog kLog("MAINLIST");
-constexpr int kExtended = 1;  // mode
-constexpr int kItemGap = 3;   // pixels, and so the rest
-constexpr int kTitleHeight = 340;
-constexpr int kExtendedTitleHeight = 510;
+constexpr int kItemGap = 3;  // pixels, and so the rest
 constexpr int kTitleSize = 70;
 constexpr int kEdgeHeight = 2;
 constexpr int kSlopPercent = 2;  // of the screen's width
 constexpr int kNoItem = -1;
 constexpr int kLongestText = kTextMax - 1;  // bytes
 
-// What a record takes of an application's counted text; nothing where the count is refused.
-std::string_view countedText(const char* given, int64_t length) {
-  if (length < 1 || length > kLongestText) return {};
-  return boundedText(given, static_cast<std::size_t>(length));
+bool isText(const char* given, int64_t length) {
+  return given != nullptr && length >= 1 && length <= kLongestText;
 }
 
 }  // namespace
@@ -126,6 +121,8 @@ int64_t MainList::contentHeight() const {
   return height;
 }
 
+int MainList::show() { return show(0); }
+
 int MainList::show(unsigned int) {
   const std::lock_guard guard(stateLock);
   if (finished == 0) return 1;
@@ -165,15 +162,10 @@ void MainList::drawStatus() const {
 }
 
 int MainList::hide() {
-  bool wasShown = false;
-  {
-    const std::lock_guard guard(stateLock);
-    wasShown = shown == 1;
-    shown = 0;
-  }
-  if (wasShown) kLog.print(LogLevel::Debug, "HIDE<-%s", title.text);
-  setActive(0);
+  if (read(shown) == 1) kLog.print(LogLevel::Debug, "HIDE<-%s", title.text);
+  setActive(0);  // first: a drawing pass that still met it active would set `shown` again
   setSelect(0);
+  write(shown, 0);
   return 0;
 }
 
@@ -188,9 +180,8 @@ void MainList::changeItem(int item, Change change) {
 }
 
 void MainList::setText(int item, const char* newText, unsigned int length) {
-  const std::string_view bytes = countedText(newText, length);
-  if (bytes.empty()) return;
-  changeItem(item, [&](Item& changed) { putTextOpen(changed.text, bytes); });
+  if (!isText(newText, length)) return;
+  changeItem(item, [&](Item& changed) { putTextOpen(changed.text, boundedText(newText, length)); });
 }
 
 void MainList::setFontSize(int item, int pixels) {
@@ -210,10 +201,10 @@ void MainList::setListType(int item, int kind) {
 }
 
 void MainList::setTextOption(int number, const char* newText, int length) {
-  const std::string_view bytes = countedText(newText, length);
-  if (bytes.empty() || number < 0 || number >= kOptions) return;
+  if (!isText(newText, length) || number < 0 || number >= kOptions) return;
   const std::lock_guard guard(stateLock);
-  putText(option.at(static_cast<std::size_t>(number)).text, bytes);
+  putText(option.at(static_cast<std::size_t>(number)).text,
+          boundedText(newText, static_cast<std::size_t>(length)));
 }
 
 void MainList::setTextBattery(const char* newText, int length) {

@@ -159,6 +159,8 @@ void MpdWid::setListType(int index, int listType) {
   if (index >= 0 && index < mpd_line) item.at(static_cast<std::size_t>(index)).listType = listType;
 }
 
+int MpdWid::show() { return show(0); }
+
 int MpdWid::show(unsigned int) {
   const std::lock_guard guard(stateLock);
   drawRows();

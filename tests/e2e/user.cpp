@@ -11,7 +11,7 @@
 #include "application.h"
 #include "e2e/app_screens.h"
 #include "e2e/eventually.h"
-#include "open_platform.h"
+#include "host/open_platform.h"
 #include "options.h"
 #include "test.h"
 

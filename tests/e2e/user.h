@@ -10,7 +10,7 @@
 #include <string_view>
 #include <vector>
 
-#include "pc/painting.h"
+#include "pc/support/painting.h"
 
 namespace factory_test {
 

@@ -1,6 +1,6 @@
-#include "golden_cases.h"
+#include "golden/golden_cases.h"
 
-#include "recorder.h"
+#include "scene/recorder.h"
 #include "support/widget_test.h"
 
 namespace brimol::pc {

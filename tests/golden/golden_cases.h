@@ -5,7 +5,7 @@
 
 #include <span>
 
-#include "painting.h"
+#include "pc/support/painting.h"
 
 namespace brimol::pc {
 

@@ -1,14 +1,16 @@
 /// Steps of input that a test plays on one widget, and the journal of what the widget told.
 ///
 ///     const Steps kTap = {press(10, 20), release()};
-///     EXPECT_EQ(played(makeButton, kTap), "press+ click+");
+///     EXPECT_EQ(played(makes<MW::Screen>(), kTap), "press+ click+");
 ///
 /// The journal has a word for each step of input: the callbacks that it caused, then + where the
-/// event was taken and - where it was not.
+/// event was taken and - where it was not. Callbacks of other steps stand as they are, and what is
+/// looked at stands in angle brackets.
 #pragma once
 
 #include <functional>
 #include <memory>
+#include <sstream>
 #include <string>
 #include <vector>
 
@@ -26,12 +28,25 @@ struct Stage {
 };
 inline Stage stage;
 
+/// Begins a word of the journal, where one has not just begun.
+inline void space() {
+  if (!stage.journal.empty() && stage.journal.back() != ' ') stage.journal += ' ';
+}
+
 /// What a callback writes. It may delete the widget.
 inline void note(const std::string& word) {
-  if (!stage.journal.empty() && stage.journal.back() != ' ') stage.journal += ' ';
+  space();
   stage.journal += word;
   if (++stage.calls == stage.deletingCall) stage.widget.reset();
 }
+/// The same with a "!" where the record is not the finger's.
+inline void noteTouch(const std::string& word, const MW::mouse_event* mouse) {
+  const MW::mouse_event& finger = stage.finger;
+  const bool isHis = mouse->finger == finger.finger && mouse->x == finger.x && mouse->y == finger.y;
+  note(word + (isHis ? "" : "!"));
+}
+/// The same with a "!" where the value is not 0.
+inline void noteZero(const std::string& word, int value) { note(word + (value == 0 ? "" : "!")); }
 
 using Step = std::function<void()>;
 using Steps = std::vector<Step>;
@@ -88,28 +103,52 @@ inline Step finger(unsigned int number) {
 inline Step keyDown(unsigned int code) { return detail::keyStep(MW::kEventKeyPress, code); }
 inline Step keyUp(unsigned int code) { return detail::keyStep(MW::kEventKeyRelease, code); }
 inline Step plug(unsigned int code) { return detail::keyStep(MW::kEventUser, code); }
+inline Step appEvent(int value) {
+  return [value] { detail::offerStep({.type = MW::kEventApplication, .value = value}); };
+}
 
-/// The clock, in GetTicks() milliseconds.
+/// The clock, in GetTicks() milliseconds. It starts at kStartTicks.
 inline Step at(unsigned int ticks) {
   return [ticks] { platform().ticks = ticks; };
 }
 inline Step later(unsigned int ms) {
   return [ms] { platform().ticks += ms; };
 }
+inline constexpr unsigned int kStartTicks = 1000;
 
-/// An operation on the widget.
-template <typename Subject = MW::Widget>
-Step call(void (*operation)(Subject&)) {
-  return [operation] { operation(static_cast<Subject&>(*stage.widget)); };
+/// An operation on the widget: call(&MW::Widget::onHideTimer, 500), or any function of it. That of
+/// a class of its own names it: call<MW::Slide>(...).
+template <typename Subject = MW::Widget, typename Operation, typename... Arguments>
+Step call(Operation operation, Arguments... arguments) {
+  return [=] {
+    space();
+    std::invoke(operation, static_cast<Subject&>(*stage.widget), arguments...);
+    space();
+  };
 }
-/// Writes what is read from the widget into the journal.
-template <typename Subject = MW::Widget>
-Step look(std::string (*read)(Subject&)) {
-  return [read] { stage.journal += '<' + read(static_cast<Subject&>(*stage.widget)) + "> "; };
+/// A drawing pass at the clock's time.
+inline Step draw() {
+  return call([](MW::Widget& widget) { widget.show(platform().ticks); });
+}
+/// Writes what is read from the widget into the journal: a text or a number.
+template <typename Subject = MW::Widget, typename Reader>
+Step look(Reader read) {
+  return call<Subject>([read](Subject& subject) {
+    std::ostringstream seen;
+    seen << '<' << std::invoke(read, subject) << '>';
+    stage.journal += seen.str();
+  });
 }
 /// Which finger holds the widget, as isSelect() says it.
 inline Step lookAtHold() {
-  return look(+[](MW::Widget& widget) { return "held " + std::to_string(widget.isSelect()); });
+  return look([](MW::Widget& widget) { return "held " + std::to_string(widget.isSelect()); });
+}
+/// The last line of the log since the last look.
+inline Step lookAtLog() {
+  return look([](MW::Widget&) {
+    const std::vector<LogLine> lines = platform().takeLog();
+    return lines.empty() ? "" : lines.back().message;
+  });
 }
 
 using Maker = std::function<std::unique_ptr<MW::Widget>()>;
@@ -117,6 +156,7 @@ using Maker = std::function<std::unique_ptr<MW::Widget>()>;
 /// The journal of the steps, played on a new widget; they end where the widget is deleted.
 inline std::string played(const Maker& make, const Steps& steps, int deletingCall = 0) {
   stage = {};
+  platform().ticks = kStartTicks;
   stage.widget = make();
   stage.deletingCall = deletingCall;
   for (const Step& step : steps) {
@@ -139,29 +179,48 @@ inline void expectCallbacksMayDelete(const Maker& make, const Steps& steps) {
   }
 }
 
-/// What a widget's touch callbacks are called with.
+/// A row of a table of plays.
+struct Play : Row {
+  Maker make;
+  Steps steps;
+  std::string journal;
+};
+/// Plays a row, and again for each of its callbacks, which then deletes the widget.
+inline void expectJournal(const Play& play) {
+  EXPECT_EQ(played(play.make, play.steps), play.journal);
+  expectCallbacksMayDelete(play.make, play.steps);
+}
+/// The fixture of such a table:
+///
+///     using SlidePlays = PlayTest;
+///     TEST_P(SlidePlays, TellTheirJournal) { expectJournal(GetParam()); }
+///     INSTANTIATE_TEST_SUITE_P(, SlidePlays, testing::ValuesIn(kPlays), kRowName);
+class PlayTest : public WidgetTest, public testing::WithParamInterface<Play> {};
+
+/// What a widget's touch callbacks are called with: 0, or the finger's record.
 enum class Told { Zero, Touch };
 /// The widget, whose callbacks of the base write their words into the journal.
 template <Told kind = Told::Touch>
 std::unique_ptr<MW::Widget> heard(std::unique_ptr<MW::Widget> widget) {
   if constexpr (kind == Told::Zero) {
-    widget->pressCallback = [](int) { note("press"); };
-    widget->clickCallback = [](int) { note("click"); };
-    widget->longPressCallback = [](int) { note("long"); };
-    widget->hoverCallback = [](int) { note("hover"); };
+    widget->pressCallback = [](int value) { noteZero("press", value); };
+    widget->clickCallback = [](int value) { noteZero("click", value); };
+    widget->longPressCallback = [](int value) { noteZero("long", value); };
   } else {
-    widget->pressCallback = [](MW::mouse_event*) { note("press"); };
-    widget->clickCallback = [](MW::mouse_event*) { note("click"); };
-    widget->longPressCallback = [](MW::mouse_event*) { note("long"); };
-    widget->hoverCallback = [](MW::mouse_event*) { note("hover"); };
+    widget->pressCallback = [](MW::mouse_event* mouse) { noteTouch("press", mouse); };
+    widget->clickCallback = [](MW::mouse_event* mouse) { noteTouch("click", mouse); };
+    widget->longPressCallback = [](MW::mouse_event* mouse) { noteTouch("long", mouse); };
+    widget->hoverCallback = [](MW::mouse_event* mouse) { noteTouch("hover", mouse); };
   }
-  widget->doubleClickCallback = [](int) { note("double"); };
-  widget->leftCallback = [](int) { note("left"); };
-  widget->rightCallback = [](int) { note("right"); };
-  widget->exitCallback = [](int) { note("exit"); };
-  widget->button1Callback = [](int) { note("button1"); };
-  widget->button2Callback = [](int) { note("button2"); };
-  widget->hookKeyCallback = [](int) { note("hook"); };
+  widget->doubleClickCallback = [](int value) { noteZero("double", value); };
+  widget->touchPressCallback = [](MW::mouse_event* mouse) { noteTouch("touch", mouse); };
+  widget->touchReleaseCallback = [](MW::mouse_event* mouse) { noteTouch("lift", mouse); };
+  widget->leftCallback = [](int value) { noteZero("left", value); };
+  widget->rightCallback = [](int value) { noteZero("right", value); };
+  widget->exitCallback = [](int value) { noteZero("exit", value); };
+  widget->button1Callback = [](int value) { noteZero("button1", value); };
+  widget->button2Callback = [](int value) { noteZero("button2", value); };
+  widget->hookKeyCallback = [](int value) { noteZero("hook", value); };
   widget->keyPressCallback = [](MW::kbd_event* key) { note("down" + std::to_string(key->code)); };
   widget->keyReleaseCallback = [](MW::kbd_event* key) { note("up" + std::to_string(key->code)); };
   widget->doubleKeyCallback = [](MW::kbd_event* key) { note("twice" + std::to_string(key->code)); };
@@ -170,6 +229,15 @@ std::unique_ptr<MW::Widget> heard(std::unique_ptr<MW::Widget> widget) {
   };
   widget->plugCallback = [](MW::kbd_event* key) { note("plug" + std::to_string(key->code)); };
   return widget;
+}
+/// Makes an active widget that is heard, of a class and its constructor's arguments.
+template <typename Subject, Told kind = Told::Touch, typename... Arguments>
+Maker makes(Arguments... arguments) {
+  return [=] {
+    auto made = std::make_unique<Subject>(arguments...);
+    made->setActive(1);
+    return heard<kind>(std::move(made));
+  };
 }
 
 }  // namespace brimol::test

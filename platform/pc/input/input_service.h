@@ -7,7 +7,7 @@
 #include <mutex>
 #include <thread>
 
-#include "input/clock.h"
+#include "clock/clock.h"
 #include "input/input_queue.h"
 
 namespace brimol::pc {

@@ -8,10 +8,10 @@
 #include <optional>
 #include <vector>
 
-#include "geometry.h"
 #include "input/input_service.h"
 #include "input/long_press.h"
 #include "input/pointers.h"
+#include "scene/geometry.h"
 
 namespace brimol::pc {
 

@@ -1,10 +1,10 @@
-#include "canvas.h"
+#include "painter/canvas.h"
 
 #include <array>
 #include <bit>
 #include <cwchar>
 
-#include "item.h"
+#include "scene/item.h"
 
 namespace brimol::pc {
 

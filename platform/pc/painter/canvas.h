@@ -3,8 +3,8 @@
 
 #include <cstdint>
 
-#include "cairo_handles.h"
-#include "rectangles.h"
+#include "scene/cairo_handles.h"
+#include "scene/rectangles.h"
 
 namespace brimol::pc {
 

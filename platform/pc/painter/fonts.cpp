@@ -1,4 +1,4 @@
-#include "fonts.h"
+#include "painter/fonts.h"
 
 #include <pango/pangocairo.h>
 #include <pango/pangofc-fontmap.h>
@@ -6,7 +6,7 @@
 #include <array>
 #include <cstdio>
 
-#include "cairo_handles.h"
+#include "scene/cairo_handles.h"
 
 namespace brimol::pc {
 

@@ -3,7 +3,7 @@
 
 #include <span>
 
-#include "text_handles.h"
+#include "painter/text_handles.h"
 
 namespace brimol::pc {
 

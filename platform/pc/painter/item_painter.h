@@ -1,10 +1,10 @@
 /// The drawing of every kind of display item.
 #pragma once
 
-#include "canvas.h"
-#include "item.h"
-#include "picture_cache.h"
-#include "text_painter.h"
+#include "painter/canvas.h"
+#include "painter/picture_cache.h"
+#include "painter/text_painter.h"
+#include "scene/item.h"
 
 namespace brimol::pc {
 
@@ -18,15 +18,10 @@ class ItemPainter {
   void draw(const SKIA_Item& item, const Pixels& clip);
 
  private:
-  using DrawFigure = void (ItemPainter::*)(const SKIA_Item& item, const Pixels& clip);
-  static const std::array<DrawFigure, 5> kFigures;  // by Figure
-
   void drawGround(const SKIA_Item& item, const Pixels& clip) const;
-  void drawNothing(const SKIA_Item& item, const Pixels& clip);
-  void drawText(const SKIA_Item& item, const Pixels& clip);
   void drawPicture(const SKIA_Item& item, const Pixels& clip);
-  void drawLine(const SKIA_Item& item, const Pixels& clip);
-  void drawArrow(const SKIA_Item& item, const Pixels& clip);
+  void drawLine(const SKIA_Item& item, const Pixels& clip) const;
+  void drawArrow(const SKIA_Item& item, const Pixels& clip) const;
 
   const Canvas& canvas;
   TextPainter texts;

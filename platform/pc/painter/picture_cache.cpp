@@ -1,6 +1,6 @@
-#include "picture_cache.h"
+#include "painter/picture_cache.h"
 
-#include "png_reader.h"
+#include "painter/png_reader.h"
 
 namespace brimol::pc {
 

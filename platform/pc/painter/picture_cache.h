@@ -5,9 +5,9 @@
 #include <string_view>
 #include <tuple>
 
-#include "cairo_handles.h"
-#include "geometry.h"
-#include "lru_cache.h"
+#include "painter/lru_cache.h"
+#include "scene/cairo_handles.h"
+#include "scene/geometry.h"
 
 namespace brimol::pc {
 

@@ -1,4 +1,4 @@
-#include "png_reader.h"
+#include "painter/png_reader.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>

@@ -3,8 +3,8 @@
 
 #include <string>
 
-#include "cairo_handles.h"
-#include "geometry.h"
+#include "scene/cairo_handles.h"
+#include "scene/geometry.h"
 
 namespace brimol::pc {
 

@@ -1,4 +1,4 @@
-#include "shapes.h"
+#include "painter/shapes.h"
 
 #include <cmath>
 

@@ -1,8 +1,8 @@
 /// Antialiased shapes.
 #pragma once
 
-#include "canvas.h"
-#include "polygon.h"
+#include "painter/canvas.h"
+#include "scene/polygon.h"
 
 namespace brimol::pc {
 

@@ -1,2 +1,0 @@
-add_executable(painter_bench painter_bench.cpp)
-target_link_libraries(painter_bench PRIVATE mw_flags brimol_pc_painter benchmark::benchmark)

@@ -1,0 +1,58 @@
+/// Where the picture is shown, and where the user's actions come from.
+#pragma once
+
+#include <cairo.h>
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+
+#include "input/input_service.h"
+#include "input/input_translator.h"
+#include "scene/geometry.h"
+
+namespace brimol::pc {
+
+enum class DisplayChoice {
+  Window,            ///< a window; that none can be opened is an error
+  WindowIfPossible,  ///< a window where SDL finds a video driver, headless otherwise
+  Headless,
+};
+
+/// A window or what stands in for one. The platform's thread opens it, calls it and destroys it;
+/// wake() alone may be called by any thread.
+class Display {
+ public:
+  Display() = default;
+  Display(const Display&) = delete;
+  Display& operator=(const Display&) = delete;
+  virtual ~Display() = default;
+
+  /// Shows what changed of `picture`, which is CAIRO_FORMAT_RGB24 in the screen's size. The picture
+  /// stays the caller's; it must live, at the same address, until the last wait() has returned.
+  virtual void present(cairo_surface_t* picture, const Region& changed) = 0;
+
+  /// Sleeps until the user does something, wake() was called, or `ms` milliseconds have passed;
+  /// without `ms` it has no end of its own. What the user did is told to the input.
+  virtual void wait(std::optional<uint32_t> ms) = 0;
+
+  /// Ends the wait that runs, or the next one where none does.
+  virtual void wake() = 0;
+
+  /// True once the user has asked to close the window.
+  virtual bool isCloseRequested() const = 0;
+};
+
+/// An open display, or one line that says why there is none.
+struct OpenedDisplay {
+  std::unique_ptr<Display> display;
+  std::string error;
+};
+
+/// Opens a display for a picture of the size `screen`. `input` is told what the user does, in the
+/// time of `service`. Both outlive the display.
+OpenedDisplay openDisplay(DisplayChoice choice, Size screen, InputTranslator& input,
+                          const InputService& service);
+
+}  // namespace brimol::pc

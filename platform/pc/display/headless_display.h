@@ -1,0 +1,25 @@
+/// A display that nobody sees.
+#pragma once
+
+#include <condition_variable>
+#include <mutex>
+
+#include "display/display.h"
+
+namespace brimol::pc {
+
+/// Shows nothing and has no user: all that happens to it is wake().
+class HeadlessDisplay : public Display {
+ public:
+  void present(cairo_surface_t*, const Region&) override {}
+  void wait(std::optional<uint32_t> ms) override;
+  void wake() override;
+  bool isCloseRequested() const override { return false; }
+
+ private:
+  std::mutex mutex;
+  std::condition_variable woken;
+  bool isWoken = false;  // guarded by mutex
+};
+
+}  // namespace brimol::pc

@@ -1,0 +1,97 @@
+#include "host/settings.h"
+
+#include <algorithm>
+#include <array>
+#include <charconv>
+#include <cstdlib>
+#include <optional>
+#include <string_view>
+
+namespace brimol::pc {
+
+namespace {
+
+constexpr const char* kDisplayVariable = "BRIMOL_DISPLAY";
+constexpr const char* kScreenVariable = "BRIMOL_SCREEN";
+constexpr std::array kDesktopVariables = {"DISPLAY", "WAYLAND_DISPLAY"};
+constexpr std::size_t kShownBytes = 60;  // of a wrong value
+
+std::string_view valueOf(const VariableLookup& lookup, const char* name) {
+  const char* const value = lookup(name);
+  return value == nullptr ? std::string_view() : std::string_view(value);
+}
+
+bool isControl(char c) {
+  constexpr char kDelete = '\x7f';
+  return (c >= '\0' && c < ' ') || c == kDelete;
+}
+
+std::string wrongValue(const char* name, std::string_view value, const std::string& wanted) {
+  std::string shown(value.substr(0, kShownBytes));
+  std::ranges::replace_if(shown, isControl, '?');
+  if (value.size() > kShownBytes) shown += "...";
+  return std::string(name) + "=" + shown + ": wanted " + wanted;
+}
+
+std::optional<int> readSide(std::string_view digits) {
+  int side = 0;
+  const char* const end = digits.data() + digits.size();
+  const auto [stop, problem] = std::from_chars(digits.data(), end, side);
+  const bool isNumber = problem == std::errc() && stop == end;
+  if (!isNumber || side < 1 || side > kMaxScreenSide) return std::nullopt;
+  return side;
+}
+
+std::optional<Size> readSize(std::string_view value) {
+  const std::size_t cross = value.find('x');
+  if (cross == std::string_view::npos) return std::nullopt;
+  const std::optional<int> width = readSide(value.substr(0, cross));
+  const std::optional<int> height = readSide(value.substr(cross + 1));
+  if (!width || !height) return std::nullopt;
+  return Size{*width, *height};
+}
+
+bool hasDesktop(const VariableLookup& lookup) {
+  return std::ranges::any_of(kDesktopVariables,
+                             [&](const char* name) { return !valueOf(lookup, name).empty(); });
+}
+
+std::string readDisplay(const VariableLookup& lookup, DisplayChoice& display) {
+  const std::string_view value = valueOf(lookup, kDisplayVariable);
+  if (value == "headless") {
+    display = DisplayChoice::Headless;
+  } else if (value == "window" || (value.empty() && hasDesktop(lookup))) {
+    display = DisplayChoice::Window;
+  } else if (!value.empty()) {
+    return wrongValue(kDisplayVariable, value, "window or headless");
+  }
+  return {};
+}
+
+std::string readScreen(const VariableLookup& lookup, Size& screen) {
+  const std::string_view value = valueOf(lookup, kScreenVariable);
+  if (value.empty()) return {};
+  const std::optional<Size> size = readSize(value);
+  if (!size) {
+    return wrongValue(kScreenVariable, value,
+                      "WIDTHxHEIGHT, each 1 to " + std::to_string(kMaxScreenSide));
+  }
+  screen = *size;
+  return {};
+}
+
+}  // namespace
+
+SettingsResult readSettings(const VariableLookup& lookup) {
+  SettingsResult result;
+  const std::string displayError = readDisplay(lookup, result.settings.display);
+  const std::string screenError = readScreen(lookup, result.settings.screen);
+  result.error = displayError.empty() ? screenError : displayError;
+  return result;
+}
+
+SettingsResult readSettings() {
+  return readSettings([](const char* name) -> const char* { return std::getenv(name); });
+}
+
+}  // namespace brimol::pc

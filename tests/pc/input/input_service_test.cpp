@@ -1,0 +1,151 @@
+// The queue of input records, and the pauses of the threads that wait for it or for the time.
+#include "input/input_service.h"
+
+#include <gmock/gmock.h>
+
+#include <array>
+#include <atomic>
+#include <latch>
+#include <thread>
+
+#include "input/event_records.h"
+#include "pc/support/record_text.h"
+
+namespace brimol::pc {
+namespace {
+
+using std::chrono::milliseconds;
+using std::chrono::steady_clock;
+using testing::ElementsAre;
+
+constexpr uint32_t kForeverMs = 120'000;  // longer than a test may take
+const Event kKeyDown = keyRecord(BRIMOL_KEY_DOWN, 273);
+const Event kKeyUp = keyRecord(BRIMOL_KEY_UP, 273);
+const Event kLong = pointerRecord(BRIMOL_LONG_PRESS, 0, {0, 0});
+
+Event motion(int finger, int x, int xrel) {
+  Event record = pointerRecord(BRIMOL_POINTER_MOTION, finger, {x, 0});
+  record.pointer.xrel = static_cast<int16_t>(xrel);
+  return record;
+}
+Event down(int finger) { return pointerRecord(BRIMOL_POINTER_DOWN, finger, {0, 0}); }
+Event up(int finger) { return pointerRecord(BRIMOL_POINTER_UP, finger, {0, 0}); }
+
+struct QueueCase {
+  const char* name;
+  std::vector<Event> pushed;
+  std::vector<std::string> kept;  // by a queue with room for three
+};
+
+const auto kQueueCases = std::to_array<QueueCase>({
+    {"the oldest motion of the finger merges",
+     {motion(1, 5, 5), motion(0, 2, 2), motion(0, 5, 3), motion(0, 6, 1)},
+     {"motion 1 at 5,0 by 5,0", "motion 0 at 5,0 by 5,0", "motion 0 at 6,0 by 1,0"}},
+    {"motion is not added beyond a release",
+     {motion(0, 5, 5), up(0), down(0), motion(0, 1, 1)},
+     {"up 0 at 0,0", "down 0 at 0,0", "motion 0 at 1,0 by 1,0"}},
+    {"sums stay in their words",
+     {motion(0, 0, -32000), motion(0, 0, -32000), up(0), down(1)},
+     {"motion 0 at 0,0 by -32768,0", "up 0 at 0,0", "down 1 at 0,0"}},
+    {"a long press leaves before a press",
+     {down(0), kLong, up(0), down(0)},
+     {"down 0 at 0,0", "up 0 at 0,0", "down 0 at 0,0"}},
+    {"a press leaves with its release",
+     {up(1), kKeyDown, down(1), kKeyUp},
+     {"up 1 at 0,0", "down 1 at 0,0"}},
+    {"presses without release are bounded too",
+     {down(0), down(1), down(2), down(3)},
+     {"down 1 at 0,0", "down 2 at 0,0", "down 3 at 0,0"}},
+});
+
+TEST(InputQueue, MakesRoomSoThatNoFingerStaysDown) {
+  for (const auto& [name, pushed, kept] : kQueueCases) {
+    InputQueue queue(3);
+    for (const Event& record : pushed) queue.push(record);
+    std::vector<std::string> taken;
+    for (Event record = {}; queue.take(record);) taken.push_back(textOf(record));
+    EXPECT_EQ(taken, kept) << name;
+  }
+}
+
+TEST(InputService, TakesABoundedNumberOfRecordsWhileOpen) {
+  InputService service;
+  service.post(kKeyDown);
+  service.open();
+  EXPECT_EQ(takeTexts(service).size(), 0U);
+  for (int i = 0; i < 5000; ++i) service.post(kKeyDown);
+  EXPECT_EQ(takeTexts(service).size(), InputQueue::kCapacity);
+  service.post(kKeyDown);
+  service.close();
+  service.open();
+  service.post(kKeyUp);
+  service.delay(kForeverMs);  // over at once: this thread polls, and a record waits
+  EXPECT_THAT(takeTexts(service), ElementsAre("key up 273"));
+  EXPECT_EQ(PollEvent(nullptr), 0);
+}
+
+void takeOne(InputService& service) {
+  for (Event record = {}; !service.poll(record);) service.delay(kForeverMs);
+}
+
+TEST(InputService, LosesNoWakeUp) {
+  InputService service;
+  service.open();
+  std::atomic<uint32_t> taken = 0;
+  std::thread poller([&] {
+    for (int i = 0; i < 3000; ++i) {
+      takeOne(service);
+      ++taken;
+      taken.notify_one();
+    }
+  });
+  for (uint32_t posted = 0; posted < 3000; ++posted) {
+    service.post(kKeyDown);
+    taken.wait(posted);
+  }
+  poller.join();
+}
+
+TEST(InputService, PausesUntilTheRealTimeOrTheHandReachesIt) {
+  InputService service;
+  service.open();
+  service.post(kKeyDown);
+  const auto before = steady_clock::now();
+  service.delay(20);
+  EXPECT_GE(steady_clock::now() - before, milliseconds(20)) << "this thread does not poll";
+  service.takeHand(0xFFFFFFF0);  // wraps soon
+  std::atomic<uint32_t> lasted = 0;
+  std::thread pausing([&] {
+    const uint32_t start = service.now();
+    service.delay(100);
+    lasted = service.now() - start;
+  });
+  while (lasted == 0) service.advance(7);
+  pausing.join();
+  EXPECT_GE(lasted, 100U);
+}
+
+TEST(InputService, LeavesNobodyWaitingAndTheTimeWhereItIsWhenItCloses) {
+  InputService service;
+  std::vector<uint32_t> times;
+  service.setTimeWatcher([&] { times.push_back(service.now()); });
+  service.takeHand(5000);
+  service.advance(250);
+  service.setTimeWatcher({});
+  EXPECT_THAT(times, ElementsAre(5000U, 5250U));
+  for (int round = 0; round < 100; ++round) {
+    std::latch started(1);
+    std::thread waiter([&] {
+      started.count_down();
+      service.delay(1);  // by hand, or real when the close is faster
+    });
+    started.wait();
+    service.close();
+    waiter.join();
+    EXPECT_LT(service.now() - 5250U, kForeverMs);
+    service.takeHand(5250);
+  }
+}
+
+}  // namespace
+}  // namespace brimol::pc

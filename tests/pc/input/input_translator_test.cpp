@@ -1,0 +1,140 @@
+// What the user does with mouse, fingers and keys, and the records that come of it.
+#include "input/input_translator.h"
+
+#include <gmock/gmock.h>
+
+#include <array>
+#include <limits>
+
+#include "display/sdl_input.h"
+#include "input/keymap.h"
+#include "pc/support/record_text.h"
+
+namespace brimol::pc {
+namespace {
+
+using testing::ElementsAre;
+
+constexpr Size kScreen = {1000, 2000};
+constexpr Size kWindow = {500, 1000};
+constexpr float kNoNumber = std::numeric_limits<float>::quiet_NaN();
+constexpr float kInfinity = std::numeric_limits<float>::infinity();
+
+SDL_Event mouse(Uint32 type, int x, int y, Uint8 which = SDL_BUTTON_LEFT, Uint32 device = 0) {
+  SDL_Event event = {};
+  event.button = {type, 0, 0, device, which, 0, 0, 0, x, y};  // a motion has them in the same place
+  return event;
+}
+SDL_Event touch(Uint32 type, SDL_FingerID finger, float x, float y, SDL_TouchID device = 7) {
+  SDL_Event event = {};
+  event.tfinger = {type, 0, device, finger, x, y, 0, 0, 0, 0};
+  return event;
+}
+SDL_Event key(Uint32 type, SDL_Keycode code) {
+  SDL_Event event = {};
+  event.key = {type, 0, 0, 0, 0, 0, 0, {SDL_SCANCODE_UNKNOWN, code, 0, 0}};
+  return event;
+}
+
+struct Play {
+  const char* name;
+  std::vector<SDL_Event> events;
+  std::vector<std::string> records;  // and those of a lost focus at the end
+};
+
+constexpr Uint32 kDown = SDL_MOUSEBUTTONDOWN;
+constexpr Uint32 kMove = SDL_MOUSEMOTION;
+constexpr Uint32 kUp = SDL_MOUSEBUTTONUP;
+
+const auto kPlays = std::to_array<Play>({
+    {"the left button alone, and no mouse that a touch plays",
+     {mouse(kMove, 1, 1), mouse(kDown, 0, 0, SDL_BUTTON_RIGHT),
+      mouse(kDown, 0, 0, SDL_BUTTON_LEFT, SDL_TOUCH_MOUSEID), mouse(kDown, 499, 999),
+      mouse(kMove, -9, 999), mouse(kMove, -99, 999), mouse(kUp, 0, 0), mouse(kUp, 0, 0)},
+     {"down 0 at 999,1999", "motion 0 at 0,1999 by -999,0", "up 0 at 0,0"}},
+    {"touches, the lowest free finger each, and none that the mouse plays",
+     {touch(SDL_FINGERDOWN, 5, 0, 0, SDL_MOUSE_TOUCHID), touch(SDL_FINGERDOWN, 5, 1, kInfinity),
+      touch(SDL_FINGERDOWN, 6, kNoNumber, -3), touch(SDL_FINGERDOWN, 5, 0, 0, 8),
+      touch(SDL_FINGERUP, 5, 1, 1), touch(SDL_FINGERMOTION, 6, 1, 0), mouse(kDown, 0, 0)},
+     {"down 0 at 999,1999", "down 1 at 0,0", "down 2 at 0,0", "up 0 at 999,1999",
+      "motion 1 at 999,0 by 999,0", "down 0 at 0,0", "up 0 at 0,0", "up 1 at 999,0",
+      "up 2 at 0,0"}},
+    {"Shift pins the mouse's fingers",
+     {key(SDL_KEYDOWN, SDLK_LSHIFT), mouse(kDown, 0, 0), mouse(kUp, 499, 0), mouse(kDown, 0, 999),
+      touch(SDL_FINGERDOWN, 5, 0, 0), touch(SDL_FINGERUP, 5, 0, 0), key(SDL_KEYDOWN, SDLK_RSHIFT),
+      key(SDL_KEYUP, SDLK_LSHIFT), mouse(kMove, 0, 0), key(SDL_KEYUP, SDLK_RSHIFT),
+      mouse(kUp, 0, 0)},
+     {"down 0 at 0,0", "motion 0 at 999,0 by 999,0", "down 1 at 0,1999", "down 2 at 0,0",
+      "up 2 at 0,0", "motion 1 at 0,0 by 0,-1999", "up 0 at 999,0", "up 1 at 0,0"}},
+    {"keys, once however they repeat",
+     {key(SDL_KEYUP, SDLK_UP), key(SDL_KEYDOWN, SDLK_UP), key(SDL_KEYDOWN, SDLK_UP),
+      key(SDL_KEYDOWN, SDLK_q), key(SDL_KEYDOWN, SDLK_RETURN), key(SDL_KEYDOWN, SDLK_KP_ENTER),
+      key(SDL_KEYUP, SDLK_RETURN), key(SDL_KEYUP, SDLK_KP_ENTER), key(SDL_KEYUP, SDLK_UP)},
+     {"key down 273", "key down 327", "key up 327", "key up 273"}},
+    {"a lost focus lifts everything",
+     {key(SDL_KEYDOWN, SDLK_LSHIFT), key(SDL_KEYDOWN, SDLK_h), mouse(kDown, 0, 0), mouse(kUp, 0, 0),
+      mouse(kDown, 499, 0)},
+     {"key down 323", "down 0 at 0,0", "down 1 at 999,0", "key up 323", "up 0 at 0,0",
+      "up 1 at 999,0"}},
+});
+
+class TranslatorTest : public testing::Test {
+ protected:
+  TranslatorTest() { service.open(); }
+
+  InputService service;
+  InputTranslator input{kScreen, service};
+};
+
+TEST_F(TranslatorTest, MakesRecordsOfWhatTheUserDoes) {
+  for (const auto& [name, events, records] : kPlays) {
+    for (const SDL_Event& event : events) passOn(event, WindowFit::of(kScreen, kWindow), 0, input);
+    input.releaseAll();
+    input.tick(1000);
+    EXPECT_EQ(takeTexts(service), records) << name;
+  }
+}
+
+TEST_F(TranslatorTest, ReportsLongPressesInTheOrderOfTime) {
+  for (const uint32_t start : {0U, 0xFFFFFF00U}) {
+    input.pointerDown(kMouse, {1, 1}, start);
+    input.pointerDown({1, 40}, {2, 2}, start + 200);
+    EXPECT_EQ(input.msToLongPress(start + 300), 200U);
+    input.tick(start + 499);
+    input.pointerMove(kMouse, {2, 1}, start + 499);
+    input.pointerUp(kMouse, {2, 1}, start + 500);
+    EXPECT_EQ(input.msToLongPress(start + 600), 100U);
+    input.pointerUp({1, 40}, {2, 2}, start + 699);
+    EXPECT_EQ(input.msToLongPress(start + 800), std::nullopt);
+    EXPECT_THAT(takeTexts(service),
+                ElementsAre("down 0 at 1,1", "down 1 at 2,2", "motion 0 at 2,1 by 1,0",
+                            "long 0 at 2,1", "up 0 at 2,1", "up 1 at 2,2"));
+  }
+}
+
+TEST(LongPress, AllowsMotionOfTwoPercentOfTheWidth) {
+  const auto staysWith = [](int width, ScreenPoint by) {
+    LongPress finger(width);
+    finger.press({500, 500}, 0);
+    finger.move({500 + by.x, 500 + by.y});
+    finger.move({500, 500});  // coming back does not help
+    return finger.due(500) && !finger.due(501);
+  };
+  EXPECT_TRUE(staysWith(1000, {12, -16}));
+  EXPECT_FALSE(staysWith(1000, {-13, 16}));
+  EXPECT_TRUE(staysWith(1440, {0, 28}));
+  EXPECT_FALSE(staysWith(1440, {0, 29}));
+  EXPECT_FALSE(staysWith(16384, {16383, 0}));
+}
+
+TEST(Keymap, PlaysTheKeysOfThePhoneAndSaysWhich) {
+  for (const char* const line :
+       {"Up                  up (273)", "Down                down (274)",
+        "Right               right (275)", "Keypad Enter        select (327)"}) {
+    EXPECT_THAT(helpText(), testing::HasSubstr(line));
+  }
+  EXPECT_EQ(phoneKey(SDLK_LEFT), 276U);
+}
+
+}  // namespace
+}  // namespace brimol::pc
