@@ -1,4 +1,5 @@
 #include <MW/button8.h>
+#include <MW/button_new.h>
 #include <MW/button_s.h>
 
 #include "support/drawings.h"

@@ -18,15 +18,10 @@ class ItemPainter {
   void draw(const SKIA_Item& item, const Pixels& clip);
 
  private:
-  using DrawFigure = void (ItemPainter::*)(const SKIA_Item& item, const Pixels& clip);
-  static const std::array<DrawFigure, 5> kFigures;  // by Figure
-
   void drawGround(const SKIA_Item& item, const Pixels& clip) const;
-  void drawNothing(const SKIA_Item& item, const Pixels& clip);
-  void drawText(const SKIA_Item& item, const Pixels& clip);
   void drawPicture(const SKIA_Item& item, const Pixels& clip);
-  void drawLine(const SKIA_Item& item, const Pixels& clip);
-  void drawArrow(const SKIA_Item& item, const Pixels& clip);
+  void drawLine(const SKIA_Item& item, const Pixels& clip) const;
+  void drawArrow(const SKIA_Item& item, const Pixels& clip) const;
 
   const Canvas& canvas;
   TextPainter texts;

@@ -50,12 +50,38 @@ TEST(Text, IsAlignedLineByLineAndCentredInHeight) {
   }
 }
 
-TEST(Text, IsCutAtTheRectangleAndTakesItsColourAndAlpha) {
+Area inkOf(std::string_view words, const Area& box) {
+  const SKIA_Rect rect = {box.x, box.y, box.width, box.height, 0};
+  return painted({textItem(SKIA_LABEL, rect, textOf(words, 40))}, {440, 240}).inked();
+}
+
+TEST(Text, IsNotCutInHeightByARectangleThatIsLower) {
+  for (const char* const words : {"Äpfel gÿ", "한국어 中", "שלוםץ", "عربي چ", "ฎฏปู่", "हिन्दी कु"}) {
+    const Area whole = inkOf(words, {20, 0, 400, 240});
+    EXPECT_GT(whole.height, 20) << words;
+    for (const int32_t height : {1, 20, 40}) {
+      const Area ink = inkOf(words, {20, 120 - height / 2, 400, height});
+      EXPECT_EQ(ink.height, whole.height) << words << " in " << height;
+      EXPECT_EQ(ink.width, whole.width) << words << " in " << height;
+    }
+  }
+  EXPECT_EQ(inkOf("glyph", {20, 120, 400, 0}).height, 0);
+}
+
+TEST(Text, ShowsTheLinesWholeWhoseMiddleLiesInTheRectangle) {
+  const int one = inkOf("gap", {20, 100, 400, 40}).height;
+  const int three = inkOf("gap\ngap\ngap", {20, 0, 400, 240}).height;
+  EXPECT_GT(three, 3 * one);
+  EXPECT_EQ(inkOf("gap\ngap\ngap", {20, 100, 400, 40}).height, one);
+  EXPECT_EQ(inkOf("gap\rgap\ngap", {20, 70, 400, 100}).height, three);
+}
+
+TEST(Text, IsCutAtTheSidesAndTakesItsColourAndAlpha) {
   const auto pixelOf = [](uint32_t color) { return drawn(textOf("████", 60, color)).at(60, 50); };
   EXPECT_EQ(pixelOf(0xFF123456), 0x123456U);
   EXPECT_EQ(pixelOf(0x80FFFFFF), 0x808080U);
   EXPECT_EQ(pixelOf(0x00FFFFFF), 0U);
-  EXPECT_EQ(drawn("████████████████████", 120).inked(), kWideArea);
+  EXPECT_EQ(drawn("████████████████████", 120).inked(), (Area{20, 0, 400, 100}));
 }
 
 TEST(Text, OfAnyLengthSizeAndBytesIsDrawnAsFarAsItGoes) {
