@@ -1,7 +1,7 @@
 /// Framed buttons side by side.
 #pragma once
 
-#include <MW/button_s.h>
+#include <MW/button_new.h>
 
 #include <memory>
 #include <span>

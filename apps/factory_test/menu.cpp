@@ -16,7 +16,6 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kExtendedHeader = 1;  // MW::MainList's mode
 constexpr uint32_t kFigureMs = 1000;
 constexpr uint32_t kRowColor = 0xFF787878;
 
@@ -30,12 +29,23 @@ constexpr auto kLooks = std::to_array<VerdictLook>({
     {Verdict::Fail, kFailColor},
 });
 
+// Moving up may scroll a row to the very top of the list, where the list does not draw it.
+int moveUpIntoView(MW::MainList& list) {
+  const int row = list.move_key_up(0);
+  MW::mouse_event belowEdge = {};
+  belowEdge.y = MW::MainList::kExtendedTitleHeight + 1;
+  MW::mouse_event aPixelDown = {};
+  aPixelDown.yrel = 1;
+  if (row >= 0 && list.position2index(belowEdge) == row) list.onHover(aPixelDown);
+  return row;
+}
+
 // What stands in an entry's row.
 std::string rowWords(const char* name) { return std::string("   ") + name; }
 
 }  // namespace
 
-Menu::Menu(const ResultBook& book) : list("Factory test", kExtendedHeader) {
+Menu::Menu(const ResultBook& book) : list("Factory test", MW::MainList::kExtended) {
   const auto& entries = testEntries();
   std::optional<Group> group;
   // Of no height: the list does not draw a row that begins exactly at its top.
@@ -96,7 +106,8 @@ void Menu::update(uint32_t now) {
 void Menu::refreshFigures() {
   const MachineFigures figures = readMachineFigures();
   const auto put = [this](MW::MainList::StatusText place, const std::string& words) {
-    list.setTextOption(place, words.c_str(), static_cast<int>(words.size()));
+    // Of an unknown figure the NUL is given, which empties its place.
+    list.setTextOption(place, words.c_str(), std::max(static_cast<int>(words.size()), 1));
   };
   put(MW::MainList::kBattery, figures.battery);
   put(MW::MainList::kCharger, figures.charger);
@@ -106,7 +117,7 @@ void Menu::refreshFigures() {
   put(MW::MainList::kSignal,
       std::to_string(verdicts.size()) + " of " + std::to_string(rowOfEntry.size()) + " ");
   put(MW::MainList::kTestMode, " " + figures.load);
-  put(MW::MainList::kBle, " ");
+  put(MW::MainList::kBle, "");
   MW::isDisplayUpdate(1);
 }
 
@@ -140,7 +151,7 @@ void Menu::followKey(unsigned int code) {
       // The list's own current item is the first one already, though nothing shows it yet.
       mark(markedRow == kNothing ? rowOfEntry.front() : list.move_key_down(0));
       break;
-    case MW::kKeyUp: mark(list.move_key_up(0)); break;
+    case MW::kKeyUp: mark(moveUpIntoView(list)); break;
     case MW::kKeySelect: choose(markedRow); break;
     case kKeyBack: leaveAsked = true; break;
     default: break;

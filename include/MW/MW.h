@@ -1,13 +1,16 @@
 /// Every public header of the toolkit.
 #pragma once
 
+#include <MW/auto_cap_screen.h>
 #include <MW/button.h>
 #include <MW/button3.h>
 #include <MW/button8.h>
 #include <MW/button_face.h>
+#include <MW/button_new.h>
 #include <MW/button_s.h>
 #include <MW/c_api.h>
 #include <MW/callback.h>
+#include <MW/color_page.h>
 #include <MW/dialog.h>
 #include <MW/dialog_list.h>
 #include <MW/dialog_new.h>
@@ -25,11 +28,13 @@
 #include <MW/prompt_dialog.h>
 #include <MW/push_button.h>
 #include <MW/records.h>
+#include <MW/row_list.h>
 #include <MW/screen.h>
 #include <MW/slide.h>
 #include <MW/slide_e.h>
 #include <MW/slide_move.h>
 #include <MW/static_text.h>
+#include <MW/styled_button.h>
 #include <MW/text_panel.h>
 #include <MW/timed.h>
 #include <MW/widget.h>

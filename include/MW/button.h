@@ -8,7 +8,7 @@ namespace MW {
 /// A filled rectangle with a caption.
 class MW_API Button : public PushButton {
  public:
-  /// Copies both records; `area`'s colour is the normal colour. Null records: see primitives.h.
+  /// Copies both records; `area`'s colour is the normal colour. Null records are all zero or empty.
   Button(const SKIA_Rect* area, const SKIA_Text* caption);
   ~Button() override;
 

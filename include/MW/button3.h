@@ -5,19 +5,25 @@
 
 namespace MW {
 
-/// A large white square with one or two captions that is placed by a position number, not by
-/// coordinates. Three of them fill the screen's width, in three rows:
-///
-///     position   left  centre  right
-///     top          10      12     11
-///     middle        7       9      8
-///     bottom        1       5      2
-///
-/// Any other position leaves the place and size as they are: empty at first.
+/// A large white square with one or two captions. A position places it, not coordinates: three
+/// squares fill the screen's width, in three rows. A number that is no position leaves the place
+/// and size as they are: empty at first.
 class MW_API Button3 : public PushButton {
  public:
-  /// Captioned by its position: 1 "PASS", 5 "RETRY", any other "FAIL". The caption's colour,
-  /// alignment and size are 0 until they are set.
+  enum Position {
+    kBottomLeft = 1,
+    kBottomRight = 2,
+    kBottomCentre = 5,
+    kMiddleLeft = 7,
+    kMiddleRight = 8,
+    kMiddleCentre = 9,
+    kTopLeft = 10,
+    kTopRight = 11,
+    kTopCentre = 12
+  };
+
+  /// Captioned by its position: kBottomLeft "PASS", kBottomCentre "RETRY", any other "FAIL". The
+  /// caption's colour, alignment and size are 0 until they are set, so that it cannot be seen.
   explicit Button3(int position);
   /// Copies the captions. A null one is left out.
   Button3(int position, const SKIA_Text* first);
@@ -29,19 +35,21 @@ class MW_API Button3 : public PushButton {
   using PushButton::show;
   /// The face, and then its captions as labels, unless a delayed show is pending. Returns 1.
   int show(unsigned int ticks) override;
-  /// The first caption's, as the four that follow.
+  // These read and write the first caption.
   char* getText() override;
   unsigned int getTextColor() override;
   int getFontSize() override;
   void setFontSize(int pixels) override;
   void setTextColor(unsigned int color) override;
-  /// Replaces the first caption's characters but not its length: a longer text is cut to the length
-  /// that the caption was given at construction, behind a shorter one stand NULs.
+  /// Replaces the first caption's characters but not its length, which stays that of construction:
+  /// a longer text is cut to it, a shorter one filled up with NULs. Construct the button with the
+  /// longest caption that it is to have.
   void setText(const char* newText) override;
   /// Places it anew on the present screen, in its normal colour. The rectangle is not read.
   void setRect(int position, const SKIA_Rect* unused) override;
 
-  /// What the constructors do: lays it out inactive, clears its callbacks, and registers it.
+  /// What the constructors do: lays it out inactive, clears its callbacks, and registers it once
+  /// more.
   void init(int position, const SKIA_Text* first, const SKIA_Text* second, int bottom);
 
  protected:

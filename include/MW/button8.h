@@ -10,30 +10,35 @@ namespace MW {
 /// Up to eight square cells in a rectangle, each of which its own finger can hold. A cell is a
 /// round box with a "*", red while it is held. The rectangle itself is not drawn.
 ///
-/// The layout number says rows x columns; cells are numbered row by row, from the left:
-///
-///     0: 1 x 1    1: 2 x 2    2: 3 x 2    3: 4 x 2    4: 2 x 3    5: 2 x 4
-///
-/// Any other number leaves the shape as it is: no cells at first.
-///
 /// A pad enters the base layer when it is constructed, inactive, and stays there until it is
 /// deleted or unregistered. Handlers run on the dispatch thread. A cell is free again when any
-/// finger lifts in it: a finger that slides away leaves it held. Touches inside the rectangle are
-/// taken, in a cell or not, but motions and long presses are not.
+/// finger lifts in it: a finger that slides away leaves it held. Presses and releases inside the
+/// rectangle are taken, in a cell or not; motions and long presses are not.
 ///
 /// Callbacks, functions of one mouse_event* that is valid for the call: `pressCallback` and
-/// `clickCallback` (released). The record is the event's, but its `state` says which cells are
-/// held now: bit 0 for the first.
+/// `clickCallback` (released). The record is a copy of the event's whose `state` is the sum of the
+/// held cells' values: 1 for the first cell, 2 for the second, 4 for the third and so on.
 class MW_API Button8 : public ButtonFace {
  public:
   static constexpr int kCells = 8;
+  /// Rows by columns; cells are numbered row by row, from the left. Any other number leaves the
+  /// shape as it is: no cells at first.
+  enum Layout {
+    kOneCell = 0,
+    kTwoByTwo = 1,
+    kThreeByTwo = 2,
+    kFourByTwo = 3,
+    kTwoByThree = 4,
+    kTwoByFour = 5
+  };
 
   /// Copies both records; `area`'s colour is that of free cells. The text is kept, not drawn. Null
-  /// records: see primitives.h.
+  /// records are all zero or empty.
   Button8(int layout, const SKIA_Rect* area, const SKIA_Text* caption);
   ~Button8() override;
 
-  using Widget::show;
+  /// show(0).
+  int show() override;
   /// The cells in their order. Returns 1.
   int show(unsigned int ticks) override;
   /// Makes it inactive and frees all cells. Returns 1.
@@ -41,24 +46,24 @@ class MW_API Button8 : public ButtonFace {
   bool onRecvEvent(event_data* event, unsigned int arg) override;
   void onPress(event_data* event) override;
   void onRelease(event_data* event) override;
-  /// Lays it out in a rectangle of any size, and takes over its colour. Held cells stay held.
-  /// Null: no change.
+  /// Lays it out in a rectangle of any size, and takes over its colour. Cells of a rectangle that
+  /// is too narrow for its layout overlap. Held cells stay held. Null: no change.
   void setRect(int layout, const SKIA_Rect* newRect) override;
-  /// The colour of free cells.
+  /// Sets the colour of free cells.
   void setBgColor(unsigned int color) override;
-  /// The colour and width in pixels of a frame that is not drawn.
+  /// Keep the colour and the width in pixels of a frame that is not drawn.
   void setBdColor(unsigned int color) override;
   void setBdWidth(int pixels);
   /// Takes the rows and columns of a layout number; setRect() lays cells out by them.
   void getRowCol(int layout);
-  /// The cell around an event's point, whose edges do not belong to it; kCells: none.
+  /// The cell that the event's point lies in, on none of its edges; kCells: none.
   int getButtonSelect(const event_data* event) const;
 
  protected:
   using Holders = std::array<int, kCells>;
 
   // Guarded by stateLock.
-  Holders cellSelect = {};  // the holding finger + 1, 0: free
+  Holders cellSelect = {};  // FingerHold::wordOf the holding finger, 0: free
   std::array<SKIA_Rect, kCells> cellRect = {};
   std::array<SKIA_Text, kCells> cellText = {};
   int rows = 0;

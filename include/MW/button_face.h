@@ -17,16 +17,16 @@ class MW_API ButtonFace : public Widget {
   void setFontSize(int pixels) override;
   void setText(const char* newText) override;
   void setTextColor(unsigned int color) override;
-  /// Moves and resizes it; the colour and the first argument are not read. Null: no change.
+  /// Moves and resizes it. The colour and the first argument are not read. Null: no change.
   void setRect(int variant, const SKIA_Rect* newRect) override;
   /// Gives it its normal colour, and asks for a redraw if it had another.
   void restoreColor() override;
 
  protected:
-  /// `logWord` speaks in the log and is a literal. Copies both records; `area`'s colour is the
-  /// normal colour. Null records: see primitives.h. The button is not registered yet.
+  /// `logWord` begins the log lines and is a literal. Copies both records; `area`'s colour is the
+  /// normal colour. Null records are all zero or empty. The button is not registered yet.
   ButtonFace(const char* logWord, const SKIA_Rect* area, const SKIA_Text* caption);
-  /// Logs which constructor calls, and registers the button.
+  /// Registers the button, with a log line that names the constructor.
   void enterWindow(int constructorNumber);
   void restoreFace();
 

@@ -7,17 +7,19 @@
 
 namespace MW {
 
-/// A title, two to eight rows with a check box each, and the buttons "CANCEL" and "OK".
+/// A modal choice: a title, two to eight rows with a check box each, and the buttons "CANCEL" and
+/// "OK".
 ///
-/// It is filled by addIndex() and drawn from initFinish() on, once it is active. A press on a row
-/// marks it. A finger that holds the dialog keeps others out until it lifts, and what it pressed,
-/// a button or the rows, is all that it can reach. Rows may be changed by any thread.
+/// addIndex() fills it, initFinish() ends that, and setActive(1) brings it up: before initFinish()
+/// it draws nothing. A press on a row marks it. The finger that pressed keeps the others out until
+/// it lifts, and reaches nothing but what it pressed, a button or the rows. The rows may be changed
+/// by any thread; that raises no redraw flag (isDisplayUpdate(1) does).
 ///
 /// Callbacks as for FramedDialog, but three are of one int*, valid for the call: `rowPressCallback`
-/// gets the row that was pressed; `button1Callback` ("CANCEL"; the dialog stays) the row confirmed
-/// last, to which the mark goes back; `button2Callback` ("OK"; the dialog has hidden itself before)
-/// the marked row, which is confirmed with it. A button whose callback is null leaves both rows as
-/// they are.
+/// gets the pressed row; `button1Callback` ("CANCEL"; the dialog stays up) the row confirmed last,
+/// to which the mark goes back; `button2Callback` ("OK"; the dialog has hidden itself) the marked
+/// row, which becomes the confirmed one. A button whose callback is null leaves both rows as they
+/// are.
 class MW_API DialogList : public FramedDialog {
  public:
   static constexpr int kRows = 8;
@@ -28,28 +30,30 @@ class MW_API DialogList : public FramedDialog {
   ~DialogList() override;
 
   using Widget::show;
-  /// Draws it, after initFinish(). Returns 1.
+  /// Draws it after initFinish(), be it active or not. Returns 1.
   int show(unsigned int ticks) override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
 
   using Widget::setText;
-  /// What the constructor does: an empty list, inactive, without callbacks, and registered.
+  /// What the constructor does: an empty list, inactive, without callbacks, and registered. Called
+  /// again, it registers the dialog once more, which is then drawn twice.
   void init_DialogList();
   /// Takes all rows away; they may be added again.
   void initIndex();
   /// Appends a row and returns its number, from 0. -1: the list is full or finished, the text is
-  /// null or longer than 126 bytes.
+  /// null or longer than 126 bytes. The text is copied.
   int addIndex(const char* rowText);
   /// Replaces a row's text; the number behind the last row's writes the text of a row that is not
   /// there yet. Another number, or a text that is null, empty or longer than 126 bytes: nothing.
   void setText(int index, const char* rowText);
-  /// Ends the filling and lays it out, `index` the marked and confirmed row; kNoRow or any other
-  /// number that is none: no mark. Returns the number of rows.
+  /// Ends the filling and lays it out. `index`: the marked and confirmed row; with kNoRow, or any
+  /// other number that is not a row's, none is marked. Returns the number of rows.
   int initFinish(int index);
-  /// Lays it out on the present screen for so many rows; for fewer than 2 or more than 8 it stays
-  /// as it was, empty at first. `index` as for initFinish().
+  /// Lays it out on the present screen for `rowCount` rows. With fewer than 2 or more than 8 the
+  /// layout stays as it was: at first everything has no size, and so nothing can be touched.
+  /// `index` as for initFinish().
   void setRect_static(int rowCount, int index);
-  /// The row at a touch, which may lie between its box and its text; kNoRow beside them.
+  /// The row at a touch on its check box, its text or between them; kNoRow elsewhere.
   int position2index(mouse_event mouse);
   void onListPress(mouse_event mouse);
   void onBtn1Released(mouse_event mouse);
@@ -72,9 +76,8 @@ class MW_API DialogList : public FramedDialog {
 
  private:
   void layOut(int rowCount, int index);
-  bool hoverAt(event_data* event);
   bool pressTarget(event_data* event);
-  bool releaseAt(event_data* event);
+  bool releaseTarget(event_data* event);
   bool isOnRows(const event_data* event) const;
   int rowAt(const mouse_event& mouse) const;
   void enable(int first, int second, int list);

@@ -7,11 +7,14 @@
 
 namespace MW {
 
-/// A prompt with a title, up to three lines, and below them one or two buttons, a progress row or
-/// nothing. Callbacks as for PromptDialog; the hook key is ignored.
+struct DialogGrid;
+
+/// A modal prompt with a title, up to three lines, and below them one or two buttons, a progress
+/// row or nothing. Callbacks as for PromptDialog; the hook key is ignored. A dialog without
+/// buttons answers no touch: the application hides it.
 ///
-/// The setters may be called by any thread, at any time; the dialog is laid out anew on the present
-/// screen by those that say so. Texts are copied, and cut to 127 bytes at a whole character.
+/// The setters may be called by any thread, at any time, but raise no redraw flag
+/// (isDisplayUpdate(1) does). Texts are copied, and cut to 127 bytes at a whole character.
 class MW_API DialogNew : public PromptDialog {
  public:
   static constexpr int kLines = 3;
@@ -23,40 +26,44 @@ class MW_API DialogNew : public PromptDialog {
   ~DialogNew() override;
 
   using Widget::show;
-  /// Draws it; a progress row grows. Returns 1.
+  /// Draws it, be it active or not; a progress row grows. Returns 1.
   int show(unsigned int ticks) override;
-  /// The lines, up to the first null one. Lays out: one line stands in larger letters than two or
-  /// three.
+  bool onRecvEvent(event_data* event, unsigned int arg) override;
+  /// The lines, up to the first null one; `align` as above. Lays out: the letters of one line are
+  /// larger than those of two or three.
   void setDesc(const char* line1, const char* line2, const char* line3, int align) override;
   /// The captions, up to the first null one. Lays out: one button is as wide as two, and without
   /// any there is no room for them.
   void setbutton(const char* caption1, const char* caption2) override;
 
+  using Widget::onPressKey;
   using Widget::setRect;
+  void onPressKey(kbd_event key);
   /// What the constructors do first: no title, lines, buttons or callbacks. The layout stays.
   void DialogNew_init();
   /// Lays it out on the present screen.
   void setRect();
-  /// The same as the one above, to the left.
+  /// Lines aligned to the left.
   void setDesc(const char* line1, const char* line2, const char* line3);
-  /// A progress row instead of buttons; touches answer nothing. The row shows that something goes
-  /// on, not how much: the argument is not used. Lays out.
+  /// A progress row instead of buttons. It shows that something goes on, not how much: the argument
+  /// is not used. Lays out.
   void setProgress(unsigned int amount);
   /// The colour of the screen around the dialog, half-transparent black at first.
   void setBackGroundColor(unsigned int color);
-  /// The colour behind the lines, from the next layout on, where it does not blink.
+  /// The colour behind the lines from the next layout on, where the body does not blink.
   void setDescColor(unsigned int color);
   /// 1, as at first: the body has the widget's blink colour. Else it keeps the colour that it has.
   void setDescBlink(int on);
 
  protected:
-  /// What stands below the lines: the number of the last button, or one of the others.
+  /// What stands below the lines. A derived class that sets another number leaves that row empty,
+  /// and with kHookMode gets the hook key.
   enum ButtonMode { kOneButton = 0, kTwoButtons = 1, kProgressRow = 3, kNoButtons = 4 };
   static constexpr int kNoLines = 4;
 
   // All are guarded by stateLock.
   int buttonMode = kNoButtons;
-  int descLast = kNoLines;  // the number of the last line
+  int descLast = kNoLines;  // the last line, from 0; beyond the three, or below 0: no line
   unsigned int descBgColor = kColorBlack;
   int descBlink = 1;
   std::array<SKIA_Rect, kLines> descRects = {};
@@ -67,6 +74,7 @@ class MW_API DialogNew : public PromptDialog {
   std::size_t lineCount() const;
   void layOut();
   void layOutLines();
+  void layOutButtons(const DialogGrid& grid);
 };
 
 }  // namespace MW

@@ -7,31 +7,38 @@
 
 namespace MW {
 
-/// A modal panel with a title and six large square buttons in three rows of two. A touch released
+/// A modal panel with a title and six large square buttons in three rows of two. A touch that lifts
 /// on the button that it pressed is the answer; one that slides off gives the button up.
 ///
-/// It enters the top layer when it is constructed, inactive, and leaves it when it is deleted.
-/// While it is active nothing below gets events. It never hides itself. Handlers run on the
-/// dispatch thread.
+/// The application owns it. It enters the top layer when it is constructed, inactive, and leaves it
+/// when it is deleted; setActive(1) brings it up, and it never hides itself. While it is active
+/// nothing below gets events. The application's thread draws it. onRecvEvent(), the one entry for
+/// events, runs on the dispatch thread and calls the handlers below it and the callbacks; a
+/// callback may delete the dialog. A null event is not taken.
 ///
-/// Callbacks besides its own: `hoverCallback`, of one mouse_event*; `plugCallback`, of one
-/// kbd_event*; `hookKeyCallback`, of one int that is called with 0: the hook key, where
-/// setButtonType(13) asked for it. Records are valid for the call.
+/// Neither a release is taken, though it may answer, nor the motion that gives a button up. No
+/// redraw follows an event that is not taken, nor a setter (any thread): the highlight goes from
+/// the screen after isDisplayUpdate(1).
+///
+/// Callbacks of the base besides its own ones: `hoverCallback`, of one mouse_event*;
+/// `plugCallback`, of one kbd_event*; `hookKeyCallback`, of one int, called with 0 for the hook key
+/// after setButtonType(kHookVariant). Records are copies, valid for the call.
 class MW_API DialogSelect : public Widget {
  public:
   static constexpr unsigned int kChoices = 6;
+  static constexpr int kHookVariant = 13;  ///< setButtonType(): the hook key answers
 
-  /// `kind` is kept for the application, and has no meaning here.
+  /// `kind` has no meaning here: a derived class finds it in `selectKind`.
   explicit DialogSelect(unsigned int kind);
   ~DialogSelect() override;
 
   using Widget::show;
-  /// Draws all six choices, those without a caption, too. Returns 1.
+  /// Draws it, be it active or not, with all six buttons, also those without a caption. Returns 1.
   int show(unsigned int ticks) override;
   /// Makes it inactive. Returns 1.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// 0: touches are told but choose nothing, until it is called with another value.
+  /// 0: touches are told but choose nothing, until it is called with another value. Any thread.
   void lcdOn(int on) override;
   void onHover(event_data* event) override;
   void onPress(event_data* event) override;
@@ -50,12 +57,13 @@ class MW_API DialogSelect : public Widget {
   /// Choice `index` as above; any other index: nothing.
   void onBtnPressed(mouse_event mouse, int index);
   void onBtnReleased(mouse_event mouse, int index);
-  /// The hook key is ignored, or goes to onHookKeyPressed() where it is asked for.
+  /// The hook key goes to onHookKeyPressed() in variant kHookVariant, and else nowhere.
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key) const;
   void onHookKeyPressed();
 
-  // The application's own callbacks; they hide the base's of the same names. Null: not wanted.
+  // The application's own callbacks; they hide the base's of the same names. Null: not wanted. Set
+  // them before the dialog is active or in one of them.
 
   /// The answer: the release, its `state` the number of the choice, 1 to 6 row by row.
   void (*choiceCallback)(mouse_event*) = nullptr;
@@ -85,7 +93,8 @@ class MW_API DialogSelect : public Widget {
   bool hoverAt(event_data* event);
   bool pressAt(event_data* event);
   void releaseAt(event_data* event);
-  bool isOn(int index, const event_data* event) const;
+  unsigned int pressedChoice() const;
+  bool isOn(unsigned int index, const event_data* event) const;
   void restoreFaces();
 };
 

@@ -7,11 +7,11 @@
 
 namespace MW {
 
-/// A title, lines of text of which the oldest go when there is no room, and the button "OK", which
-/// leaves the dialog up. Callbacks as for FramedDialog.
+/// A modal console: a title, lines of text of which the oldest goes when there is no room, and the
+/// button "OK", which leaves the dialog up. Callbacks as for FramedDialog.
 ///
-/// The finger that pressed a button holds the dialog until it is hidden: others press and move
-/// nothing meanwhile, though one that lifts on the button makes it answer.
+/// The finger that pressed the button holds the dialog until it is hidden: other fingers press and
+/// move nothing meanwhile, though the button answers any that lifts on it.
 class MW_API DialogShell : public FramedDialog {
  public:
   static constexpr int kLines = 25;
@@ -19,21 +19,22 @@ class MW_API DialogShell : public FramedDialog {
 
   /// At most 127 bytes of the title are taken. Null is the empty text.
   explicit DialogShell(const char* title);
-  /// With room for so many lines, 1 to 25; others are taken as the nearest of these.
+  /// With room for `lineCount` lines, brought into 1 to 25.
   DialogShell(const char* title, int lineCount);
   ~DialogShell() override;
 
   using Widget::show;
-  /// Draws it, while it takes lines. Returns 1.
+  /// Draws it, be it active or not; lines of no text stay blank. Returns 1.
   int show(unsigned int ticks) override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
 
   /// What the constructors do: an empty console, inactive, without callbacks, and registered.
+  /// Called again, it registers the dialog once more, which is then drawn twice.
   void init_DialogShell(const char* title);
-  /// Takes all lines away, and lets it take lines.
+  /// Takes all lines away. Any thread.
   void initShell();
-  /// Appends a copy of a line below the others and returns where it is kept, 0 to 24. kNoLine: the
-  /// line is null or longer than 126 bytes, or no lines are taken. Any thread.
+  /// Appends a copy of a line below the others and returns its slot, 0 to 24. kNoLine: the line is
+  /// null or longer than 126 bytes. Any thread; raises no redraw flag (isDisplayUpdate(1) does).
   int addShell(const char* line);
   /// Lays it out on the present screen.
   void setRect_static();
@@ -44,8 +45,8 @@ class MW_API DialogShell : public FramedDialog {
   std::array<SKIA_Rect, kLines> lineRects = {};  // by place, from the top
   std::array<SKIA_Text, kLines> lines = {};      // by slot
   std::array<int, kLines> order = {};            // the slot that stands at a place
-  int twoButtons = 0;                            // no operation sets it: meant so
-  int acceptLines = 0;
+  int twoButtons = 0;   // 1, from a derived class: setRect_static() lays out "CANCEL", too
+  int acceptLines = 0;  // 0, from a derived class: no line is taken and nothing drawn
 
  private:
   int takeSlot();

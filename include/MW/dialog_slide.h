@@ -6,23 +6,30 @@
 
 namespace MW {
 
-/// A title, a message, and below them a thumb between two captions. A finger drags the thumb by its
-/// relative motion; lifted with the thumb at an end, it answers with that side. The thumb then goes
-/// back to the middle, and the dialog stays up. A finger that is lifted without having moved
-/// answers as the drag before it did. A second finger that presses the thumb takes it over.
+/// A modal prompt: a title, a message, and below them a thumb between two captions. A finger drags
+/// the thumb by its relative motion, and if it lifts with the thumb at an end, the dialog answers
+/// with that side. The thumb then goes back to the middle; the dialog stays up. A finger that lifts
+/// without having moved answers as the drag before it did. A second finger that presses the thumb
+/// takes it over.
 ///
-/// It enters the top layer when it is constructed, inactive, and leaves it when it is deleted.
-/// While it is active nothing below gets events. Handlers run on the dispatch thread. The texts may
-/// be set by any thread; they are copied. A text of more than 127 bytes is empty, and so is a null
-/// one.
+/// The application owns it. It enters the top layer when it is constructed, inactive, and leaves it
+/// when it is deleted; setActive(1) brings it up. While it is active nothing below gets events. The
+/// application's thread draws it. onRecvEvent(), the one entry for events, runs on the dispatch
+/// thread and calls the handlers below it and the callbacks; a callback may delete the dialog. A
+/// null event is not taken. The texts may be set by any thread and are copied; that raises no
+/// redraw flag (isDisplayUpdate(1) does). A null text is empty, and so is one of more than 127
+/// bytes.
 class MW_API DialogSlide : public Widget {
  public:
-  /// Kinds 3, 4 and 5 ask whether a test that has passed is to be repeated. Others have no texts.
+  /// The kind that asks whether a passed test is to be repeated. Kinds 4 and 5 say the same.
+  static constexpr int kRepeatPassedTest = 3;
+
+  /// `dialogKind`: kRepeatPassedTest, or another number for a dialog whose texts the setters give.
   explicit DialogSlide(int dialogKind);
   ~DialogSlide() override;
 
   using Widget::show;
-  /// Draws it. Returns 1.
+  /// Draws it, be it active or not. Returns 1.
   int show(unsigned int ticks) override;
   /// Makes it inactive, and sensitive to touch the next time. Returns 1.
   int hide() override;
@@ -58,7 +65,8 @@ class MW_API DialogSlide : public Widget {
   void onPressKey(kbd_event key) const;
   void onReleaseKey(kbd_event key) const;
 
-  // Called on the dispatch thread. Null: not wanted. Records are valid for the call.
+  // Called on the dispatch thread; they hide the base's of the same names. Null: not wanted. Set
+  // them before the dialog is active or in one of them. Records are copies, valid for the call.
 
   void (*leftCallback)(int) = nullptr;  ///< the answers, called with 0
   void (*rightCallback)(int) = nullptr;
@@ -86,7 +94,7 @@ class MW_API DialogSlide : public Widget {
   SKIA_Text leftCaption = {};
   SKIA_Rect rightRect = {};
   SKIA_Text rightCaption = {};
-  int slideState = kBetween;  // a release keeps it: meant so
+  int slideState = kBetween;  // changed by motion alone, so that a release keeps it
   std::atomic<int> lcdOnFlag = 1;
 
  private:

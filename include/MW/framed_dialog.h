@@ -9,23 +9,30 @@ namespace MW {
 /// A frame in the middle of the screen: a title, a body, and below it up to two buttons. The
 /// classes derived from it say what stands in the body; this class is not used by itself.
 ///
-/// A dialog enters the top layer when it is constructed, inactive, and leaves it when it is
-/// deleted. While it is active nothing below gets events. Handlers run on the dispatch thread.
+/// The application owns a dialog. It enters the top layer when it is constructed, inactive, and
+/// leaves it when it is deleted; setActive(1) brings it up. While it is active nothing below gets
+/// events. The application's thread draws it. onRecvEvent(), the one entry for events, runs on the
+/// dispatch thread and calls the handlers below it and the callbacks; a callback may delete the
+/// dialog. A null event is not taken.
 ///
-/// A button turns kColorHighlight while a finger holds it; a finger that moves off it takes the
-/// highlight away, and one that lifts on it, wherever it came from, makes it answer.
+/// A button turns kColorHighlight when a finger presses it and goes back when a finger moves
+/// outside it or lifts. It answers a finger that lifts on it, wherever that finger came from. The
+/// dialog takes all motion from a button's press on until it is hidden.
 ///
-/// Callbacks of one int, called with 0: `button1Callback` (left; the dialog stays) and
-/// `button2Callback` (right; the dialog has hidden itself before). Of one mouse_event*:
-/// `pressCallback`, `hoverCallback`, `clickCallback` (any touch, any place, the last one at its
-/// release). Of one kbd_event*: `keyPressCallback`, `keyReleaseCallback`. Records are valid for the
-/// call.
+/// Callbacks, null where they are not wanted:
+/// - of one int, called with 0: `button1Callback` (the left button; the dialog stays up until the
+///   application hides it) and `button2Callback` (the right one; the dialog has hidden itself).
+/// - of one mouse_event*: `pressCallback`, `hoverCallback` and `clickCallback` hear of every press,
+///   motion and release, at any place; clickCallback after the buttons.
+/// - of one kbd_event*: `keyPressCallback`, `keyReleaseCallback`.
+/// Records are copies, valid for the call.
 class MW_API FramedDialog : public Widget {
  public:
-  /// Makes it inactive, and sensitive to touch the next time. Returns 1.
+  /// Makes it inactive, and sensitive to touch the next time. Returns 1. Any thread.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// 0: touches answer nothing until it is called with another value, or the dialog was hidden.
+  /// 0: the buttons ignore touches until it is called with another value, or the dialog was hidden.
+  /// Any thread.
   void lcdOn(int on) override;
   void onHover(event_data* event) override;
   void onPress(event_data* event) override;
@@ -41,25 +48,29 @@ class MW_API FramedDialog : public Widget {
   void onReleaseKey(kbd_event key);
 
  protected:
-  /// `logWord` speaks in the log and is a literal. The dialog is not registered yet.
+  /// What a button does when a finger lifts on it.
+  using Answer = void (FramedDialog::*)(mouse_event);
+
+  /// `logWord` stands in each log line; it must outlive the dialog. The derived class registers it.
   explicit FramedDialog(const char* logWord);
 
-  /// As constructed: no callback of those above, sensitive to touch.
+  /// As constructed: none of the callbacks above, sensitive to touch.
   void startOver();
 
   // What the touch handlers are made of, for a class whose touches mean more.
 
-  /// True for an event of a code up to `last`, 2 at most, when another finger holds the dialog.
-  bool isHeldByOther(const event_data& event, EventCode last) const;
-  /// Takes the highlight from the buttons that the finger is not on. False: no finger holds one.
-  bool leaveButtons(const event_data* event);
-  /// Tells of the press, and presses the button under the finger. Null: there was none.
+  /// Calls onPress(), and presses the button under the finger. Null: there is none, touches are
+  /// ignored, or the dialog is gone.
   const DialogButton* pressAt(event_data* event);
-  /// Takes the highlight away. True: the finger lifted on the button, which is to answer.
-  bool liftFrom(DialogButton& button, const event_data* event);
+  /// Takes the highlights away, and lets the button under the finger answer. False: the dialog is
+  /// gone.
+  bool releaseButtons(const event_data* event);
 
   const char* word;
-  // Guarded by stateLock, as far as it is not said otherwise.
+  Answer answer1 = &FramedDialog::onBtn1Released;
+  Answer answer2 = &FramedDialog::onBtn2Released;
+  bool leavesInTheDark = true;  // a finger that leaves a button dims it after lcdOn(0), too
+  // Guarded by stateLock, except for the flag.
   DialogFrame frame;
   DialogButton button1;
   DialogButton button2;
@@ -69,6 +80,7 @@ class MW_API FramedDialog : public Widget {
  private:
   bool hoverAt(event_data* event);
   bool releaseAt(event_data* event);
+  bool liftFrom(DialogButton& button, const event_data* event);
   void pressButton(DialogButton& button, const mouse_event& mouse);
   bool isOn(const DialogButton& button, const event_data* event) const;
   void restoreFace(DialogButton& button);

@@ -6,23 +6,27 @@
 
 namespace MW {
 
-/// Draws nothing and reports every event that it is offered to the application.
+/// Draws nothing, and tells the application about every event that it is offered.
 ///
 /// It enters the base layer when it is constructed, active, and stays there until it is deleted or
 /// unregistered. Keys, long presses, user and application events are taken; touch press, release
 /// and motion go on to the other widgets.
 ///
+/// It may be offered events before the application has set its callbacks, and while it sets them: a
+/// callback word may be assigned on any thread, and an event finds either the old function or the
+/// new one. An event that comes before is not told.
+///
 /// Callbacks. Of one kbd_event*: `keyPressCallback`; `keyReleaseCallback`; `doubleKeyCallback` and
-/// `tripleKeyCallback`, the second and third release of one key of which each comes within 1000 ms
-/// of the one before; `plugCallback`. Of one mouse_event*: `touchPressCallback`,
+/// `tripleKeyCallback`, the second and the third release of one key, each within 1000 ms of the one
+/// before; `plugCallback`. Of one mouse_event*: `touchPressCallback`,
 /// `touchReleaseCallback`, `longPressCallback`. The record is valid for the call. They are called
 /// on the dispatch thread, and a plug event that was held back on the thread that draws.
 ///
 /// Plug events (user events) of the codes 2, 17 and 18 are held back for 100 ms, so that a plug
 /// that bounces is told once it has settled: 17 and 18 are then told as 2. Another code is told at
-/// once when the last one of these was 2 or was told as 2, and a 2 that is still held is given up
-/// for it; before the first of them, and while 17 or 18 is held, it is dropped. Nothing is held
-/// while `plugCallback` is null.
+/// once if the last one of these three was 2 or was told as 2; a 2 that is still held is then not
+/// told any more. Before the first of the three, and while 17 or 18 is held, another code is
+/// dropped. Nothing is held while `plugCallback` is null.
 class MW_API Key : public Widget {
  public:
   Key();
@@ -43,7 +47,7 @@ class MW_API Key : public Widget {
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key);
   void onPressLong(mouse_event mouse);
-  /// Counts a release of the key that was released last; any other key ends the count.
+  /// Counts a release of the key that was released last. Any other key ends the count.
   void onKeyClickCount(kbd_event key);
 
  protected:

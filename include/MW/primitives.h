@@ -2,8 +2,8 @@
 ///
 /// They are in no layer and get no events: the application calls their show(), or copies them to
 /// the display-item table with add_MWWList(). Drawing and changing may happen on different threads.
-/// Constructors copy their records; a null rectangle or line is all zero, a null text empty. A
-/// text that fills its record without a NUL is cut.
+/// Constructors copy their records; a null rectangle or line is all zero, a null text empty. A text
+/// without a NUL in its record is cut to 127 bytes.
 #pragma once
 
 #include <MW/widget.h>
@@ -55,8 +55,8 @@ class MW_API Textbox : public TextPrimitive {
 /// A picture, named by a text that the platform understands (a file's path).
 class MW_API Image : public Widget {
  public:
-  /// Takes `string_len` bytes of the text, none where that is negative, and none of the record's
-  /// other fields. Of a text whose length is over 127 it takes what stands before the NUL.
+  /// Takes `string_len` bytes of the text, and none of the record's other fields. A negative length
+  /// is 0; a text of a length over 127 ends at its NUL.
   Image(const SKIA_Rect* area, const SKIA_Text* name);
   /// The handle that the platform gave to the item, a label.
   int show() override;
@@ -88,8 +88,8 @@ class MW_API Line : public Widget {
   /// The handle that the platform gave to the item.
   int show() override;
   int show(unsigned int ticks) override;
-  /// A rectangle that starts at the line's larger x and y and reaches back: its width and height
-  /// are zero or negative. Its colour is the line's.
+  /// The line's extent and colour. The rectangle starts at the larger x and y, and its width and
+  /// height are zero or negative: it contains no point, so compute a hit test from `x + w` to `x`.
   SKIA_Rect* getPositionAndSize() override;
   void setLnColor(unsigned int color) override;
   int add_MWWList() override;

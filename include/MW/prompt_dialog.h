@@ -11,25 +11,28 @@ namespace MW {
 /// itself.
 ///
 /// Callbacks besides FramedDialog's: `hookKeyCallback`, of one int, called with 0, where the hook
-/// key answers; other dialogs ignore that key's press. `plugCallback`, of one kbd_event*.
+/// key answers; elsewhere the press of that key is ignored. `plugCallback`, of one kbd_event*.
 class MW_API PromptDialog : public FramedDialog {
  public:
   bool onRecvEvent(event_data* event, unsigned int arg) override;
   void onPlugKey(kbd_event key) override;
 
-  using Widget::onPressKey;
-  void onPressKey(kbd_event key);
   void onHookKeyPressed();
-  /// Draws the progress row in the place of button 1, be the dialog active or not: one to ten
-  /// asterisks, one more every 100 ms. `ticks`: GetTicks() milliseconds.
+  /// Draws the progress row in the place of button 1, whether the dialog is active or not: one to
+  /// ten asterisks, one more every 100 ms. `ticks`: GetTicks() milliseconds. show() calls it where
+  /// there is such a row.
   void updateProgress(unsigned int ticks);
 
  protected:
+  /// The mode in which the hook key answers.
+  static constexpr int kHookMode = 13;
+
   explicit PromptDialog(const char* logWord);
 
+  /// A key's press. The hook key answers if `mode` is kHookMode.
+  void pressKey(const kbd_event& key, int mode);
   void drawProgress(unsigned int ticks);  // under stateLock
 
-  bool answersHookKey = false;
   StarRow progress;  // guarded by stateLock
 };
 

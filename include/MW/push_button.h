@@ -7,28 +7,33 @@
 
 namespace MW {
 
-/// A face that a finger presses, and that turns kColorHighlight meanwhile where its class does not
-/// say otherwise. Button, Button3, ButtonS and ButtonNew say what stands on it and where; this
-/// class is not used by itself.
+/// A face that a finger presses. While it is held it has the colour kColorHighlight, where its
+/// class does not say otherwise. Button, Button3, ButtonS and ButtonNew say what stands on it and
+/// where; this class is not used by itself.
 ///
 /// A button enters the base layer when it is constructed, inactive, and stays there until it is
-/// deleted or unregistered. A finger that presses it holds it until it lifts, wherever it moves;
-/// the colour goes back to normal as soon as it moves out. Handlers run on the dispatch thread.
+/// deleted or unregistered. A finger that presses it holds it, wherever it moves; the colour goes
+/// back to normal as soon as a finger moves outside. Handlers run on the dispatch thread.
+///
+/// A held button takes the touches of every finger, wherever they are: a press of a second one is a
+/// press of the button, and the first release of any finger ends the hold.
 ///
 /// Callbacks, each a function of one int that is called with 0 on the dispatch thread:
-/// `pressCallback`; `clickCallback`, released inside; `longPressCallback`, which also ends the
-/// hold; `doubleClickCallback`, the second of two clicks of which each step took under 500 ms.
+/// `pressCallback`; `clickCallback`, a release inside, also one whose press was elsewhere;
+/// `longPressCallback`, which also ends the hold; `doubleClickCallback`, the second of two clicks
+/// with each step under 500 ms.
 class MW_API PushButton : public ButtonFace {
  public:
   using Widget::show;
-  /// show(0): draws unless a delayed show is pending. Returns 1.
+  /// show(0), which draws unless a delayed show is pending. Returns 1.
   int show() override;
   /// Raises the redraw flag once a delayed show is due.
   void updateTimer(unsigned int ticks) override;
-  /// Makes it inactive and free, in its normal colour. Asks for no redraw. Returns 1.
+  /// Makes it inactive and free, in its normal colour. Does not ask for a redraw. Returns 1.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// Makes it active now, but visible and sensitive only in `ms` milliseconds.
+  /// Makes it active now. It is seen, and takes touches, from the first drawing pass after `ms`
+  /// milliseconds on.
   void onShowTimer(int ms) override;
   void onPress(event_data* event) override;
   void onRelease(event_data* event) override;
@@ -40,12 +45,12 @@ class MW_API PushButton : public ButtonFace {
 
   /// Whether an event is the button's at all: one inside, or any while it is held.
   bool isReachedBy(const event_data* event) const;
-  bool isInside(const event_data* event) const;
   /// Passes a press, release or long press to its operation. False: it is another event.
   bool handleGesture(event_data* event);
-  /// What every press does: the finger takes the button, and the application is told.
+  /// What every press does: the finger takes the button, and the application is told. The button
+  /// may be gone afterwards.
   void holdBy(const event_data* event);
-  /// What every release does inside: a click, and perhaps a double click. The button may be gone
+  /// What every release does: inside, a click, and perhaps a double click. The button may be gone
   /// afterwards.
   void clickAt(const event_data* event);
 

@@ -13,30 +13,36 @@ namespace MW {
 ///
 /// Callbacks: `pressCallback`, `hoverCallback`, `longPressCallback` and `clickCallback` (a release,
 /// wherever it is), each a function of one mouse_event* that is valid for the call; and
-/// `doubleClickCallback`, a function of one int that is called with 0: the second of two taps of
-/// which each is released within 25 pixels of where it was pressed, and each step takes under
-/// 500 ms. A tap that starts less than 50 pixels from an edge of the screen does not count.
+/// `doubleClickCallback`, a function of one int that is called with 0: the second of two taps, each
+/// released within 25 pixels of its press, with each step under 500 ms. A tap that starts less than
+/// 50 pixels from an edge of the screen does not count.
 ///
-/// With bit 2 set in its variant (`setButtonType(2)`) it reports events and passes them on. While a
-/// finger holds it, it is then offered, and reports, each event twice: once as a selected widget
-/// and once as an active one.
+/// With kPassOn in its variant it reports its events and passes them on. While a finger holds it,
+/// each event then reaches it twice, once as a selected widget and once as an active one: it
+/// reports both, and one tap can be a double tap.
 class MW_API Screen : public Widget {
  public:
+  /// A bit of the variant, which setButtonType() sets.
+  enum VariantBit { kPassOn = 2 };
+  /// setRect's modes.
+  enum SquareMode { kSquare = 0, kNoSquare = 1 };
+
   Screen();
   ~Screen() override;
 
   /// Draws nothing. Returns 1.
   int show() override;
   int show(unsigned int ticks) override;
-  /// Makes it inactive. Returns 1.
+  /// Makes it inactive. A finger that holds it is followed, and reported, until it lifts. Returns
+  /// 1.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
   void onHover(event_data* event) override;
   void onPress(event_data* event) override;
   void onRelease(event_data* event) override;
   void onPressLong(event_data* event) override;
-  /// Puts the square in which a tap must end around the point at `center`'s corner; with `mode` 1,
-  /// and near an edge, there is none. Null: nothing.
+  /// Puts the square in which a tap must end around the point at `center`'s corner. There is none
+  /// with kNoSquare, and near an edge of the screen. Null: no change.
   void setRect(int mode, const SKIA_Rect* center) override;
   void onTouchClickCount() override;
 
@@ -49,19 +55,22 @@ class MW_API Screen : public Widget {
 /// Fills the screen with one colour, to look for faults of the display.
 ///
 /// It enters the top layer when it is constructed, inactive, and stays there until it is deleted or
-/// unregistered.
+/// unregistered. While it is active no event reaches the base layer, though it acts on none: what
+/// ends it stands in the top layer, too, or does not wait for input.
 class MW_API FullScreen : public Widget {
  public:
-  /// 0 white, 1 red, 2 green, 3 blue, any other grey.
+  /// What it is filled with; any other number is grey as well.
+  enum Fill { kWhite = 0, kRed = 1, kGreen = 2, kBlue = 3, kGrey = 4 };
+
   explicit FullScreen(int color);
   ~FullScreen() override;
 
   /// One box, a pixel wider and higher than the screen. Returns 1.
   int show() override;
   int show(unsigned int ticks) override;
-  /// Makes it inactive and the panel on. Returns 1.
+  /// Makes it inactive, and remembers the panel as on. Returns 1.
   int hide() override;
-  /// Keeps whether the panel is on; nothing else follows from it here.
+  /// Remembers whether the panel is on, for a derived class. It draws the same on either.
   void lcdOn(int on) override;
   using Widget::setRect;
   /// Fills the present screen with the colour of that number.

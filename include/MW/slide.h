@@ -12,22 +12,24 @@ namespace MW {
 ///
 /// It enters the base layer when it is constructed, inactive, and stays there until it is deleted
 /// or unregistered. A finger that presses the knob drags it; at the other end, or near it, the
-/// switch changes and lets go of the finger. A finger that lifts before, or another finger that
-/// presses elsewhere, lets the knob snap back. Handlers run on the dispatch thread.
+/// switch changes and lets go of the finger. The knob snaps back when the finger lifts before that,
+/// and when any finger presses elsewhere. Handlers run on the dispatch thread.
 ///
-/// `state`: 0 left and 1 right, of a switch that changes when the knob reaches the far end; 2 left
-/// and 3 right, of one that changes when it comes within a unit of it. Any other stands at the left
-/// and cannot be changed by dragging.
-///
-/// Callbacks: `leftCallback` and `rightCallback`, functions of one int that are called with 0 after
-/// the change; `doubleClickCallback` (the double tap), a function of one mouse_event* whose `state`
-/// is 1: two taps on the knob of a locked switch, each step under 500 ms. A locked switch shows its
-/// knob alone, dimmed, and does not move.
+/// Callbacks: `leftCallback` and `rightCallback`, functions of one int that are called with 0 once
+/// `state` has changed; `doubleClickCallback` (the double tap), a function of one mouse_event* that
+/// is valid for the call and whose `state` is 1: two taps on the knob of a locked switch, each step
+/// under 500 ms. A locked switch shows its knob alone, dimmed, and does not move.
 class MW_API Slide : public Widget {
  public:
-  /// Copies the records; `area`'s colour is not read. `second` may be null; otherwise both captions
-  /// stand on the knob, one above the other. The second one has its record's `string_len`, 0 to
-  /// 127, and of its text as many bytes as its `size` says; behind them stand NULs.
+  /// A full-travel switch changes when the knob reaches the far end, a half-travel one when the
+  /// knob comes within a unit of it. Any other state stands at the left, and dragging does not
+  /// change it.
+  enum State { kFullLeft = 0, kFullRight = 1, kHalfLeft = 2, kHalfRight = 3 };
+
+  /// Copies the records; `area`'s colour is not read. A null area is all zero, a null first caption
+  /// empty. With a second caption both stand on the knob, one above the other. The second one is
+  /// cut to as many bytes as its `size` says, and filled up with NULs to its `string_len`: give it
+  /// a size of at least its length.
   Slide(int startState, const SKIA_Rect* area, const SKIA_Text* first, const SKIA_Text* second);
   ~Slide() override;
 
@@ -35,12 +37,14 @@ class MW_API Slide : public Widget {
   int show() override;
   /// Draws the switch, its knob in its place while no finger holds it. Returns 1.
   int show(unsigned int ticks) override;
-  /// Makes it inactive. Returns 1.
+  /// Makes it inactive. A finger that holds the knob is followed until it lifts: it can still
+  /// change the switch. Returns 1.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
   void onPress(event_data* event) override;
   void onRelease(event_data* event) override;
-  /// Lays the switch out in `area`, its knob where `newState` says; `state` stays. Null: nothing.
+  /// Lays the switch out in `area`, its knob where `newState` says until the next drawing pass puts
+  /// it where `state` says. Null: no change.
   void setRect(int newState, const SKIA_Rect* area) override;
   void Lock() override;
   void unLock() override;
@@ -51,7 +55,9 @@ class MW_API Slide : public Widget {
   void onHover(mouse_event mouse);
   void onTouchClickCount(mouse_event mouse);
 
-  std::atomic<int> state;  ///< see above; changed on the dispatch thread
+  /// A State. Dragging changes it on the dispatch thread; a callback may read and set it. Another
+  /// thread reads and sets it through std::atomic_ref, as the switch itself does.
+  int state;
 
  protected:
   /// What the two classes of switches differ in.
@@ -61,7 +67,7 @@ class MW_API Slide : public Widget {
 
   Look look;
   std::atomic<int> locked = 0;
-  KnobHold hold{select, ownerFinger};
+  KnobHold knobHold{hold, ownerFinger};
   DoubleTap clicks;  // dispatch thread
   int captionCount;  // 1 or 2
   // The rest, and `rect`, the knob, is guarded by stateLock.
@@ -78,7 +84,6 @@ class MW_API Slide : public Widget {
  private:
   enum class Change { None, ToLeft, ToRight };
 
-  bool isOnKnob(const event_data* event) const;
   void snapKnob();
   Change drag(int by);
   void drawTrack() const;

@@ -4,34 +4,40 @@
 #include <MW/detail/knob_hold.h>
 #include <MW/widget.h>
 
+#include <cstddef>
+
 namespace MW {
 
 /// A bar with a square knob marked "EXIT" at one end and a caption beside it. Dragging the knob to
 /// the very other end asks to exit.
 ///
 /// It enters the base layer when it is constructed, inactive, and stays there until it is deleted
-/// or unregistered; setActive() alone shows and hides it. A finger that presses the knob drags it;
-/// a finger that lifts before the end, or another that presses elsewhere, lets the knob snap back.
+/// or unregistered; setActive() alone shows and hides it. A finger that presses the knob drags it.
+/// The knob snaps back when the finger lifts before the end, and when any finger presses elsewhere.
 /// Handlers run on the dispatch thread.
 ///
-/// `state` 0, 2 or 4: the knob starts at the left and exits at the right; 1, 3 or 5: the other way
-/// round. Any other starts at the right and never exits. Dragging does not change it.
-///
-/// Callback: `exitCallback`, a function of one int that is called with 0; the knob has been let go
-/// before, and goes home with the next drawing pass.
+/// Callback: `exitCallback`, a function of one int that is called with 0. The finger no longer
+/// holds the knob then, and the next drawing pass puts the knob back.
 class MW_API SlideE : public Widget {
  public:
-  /// Copies the records; the bar has `area`'s colour. The last argument is not read. Null records
-  /// are all zero or empty.
+  /// Where the knob starts; it exits at the other end. 2 and 4 are kFromLeft as well, 3 and 5
+  /// kFromRight. Any other starts at the right and never exits.
+  enum State { kFromLeft = 0, kFromRight = 1 };
+
+  /// Copies the records; the bar has `area`'s colour. The last argument is not read, and may be
+  /// null. Null records are all zero or empty.
   SlideE(int startState, const SKIA_Rect* area, const SKIA_Text* caption, const char* unused);
   SlideE(int startState, const SKIA_Rect* area, const SKIA_Text* caption, const SKIA_Text* unused);
+  SlideE(int startState, const SKIA_Rect* area, const SKIA_Text* caption, std::nullptr_t unused);
   ~SlideE() override;
 
-  using Widget::show;
+  /// show(0).
+  int show() override;
   /// Draws it, its knob at home while no finger holds it. Returns 1.
   int show(unsigned int ticks) override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// Lays it out in `area`, its knob where `newState` says; `state` stays. Null: nothing.
+  /// Lays it out in `area`, its knob where `newState` says until the next drawing pass puts it
+  /// where `state` says. Null: no change.
   void setRect(int newState, const SKIA_Rect* area) override;
 
   using Widget::onHover;
@@ -41,14 +47,17 @@ class MW_API SlideE : public Widget {
   void onRelease(mouse_event mouse);
   /// Drags the knob by the event's relative motion.
   void onHover(mouse_event mouse);
-  /// What the constructors do: lays it out inactive, clears the slide callbacks, and registers it.
+  /// What the constructors do: lays it out inactive, clears the slide callbacks, and registers it
+  /// once more.
   void SlideE_init(int startState, const SKIA_Rect* area, const SKIA_Text* caption,
                    const char* unused);
 
-  std::atomic<int> state;  ///< see above
+  /// A State. Dragging does not change it. It is set before the slide is active, or through
+  /// std::atomic_ref, as the slide itself reads it.
+  int state;
 
  protected:
-  KnobHold hold{select, ownerFinger};
+  KnobHold knobHold{hold, ownerFinger};
   // The rest, `rect`, the knob, and `point`, its arrow, is guarded by stateLock.
   int unit = 0;  // pixels, the knob's side
   SKIA_Rect track = {};

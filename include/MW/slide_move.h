@@ -9,29 +9,33 @@ namespace MW {
 /// A bar whose knob a finger drags to choose a number; what lies left of the knob is red. It has no
 /// callbacks: the application asks getValue().
 ///
-/// It is a control for percentages: from 99.9 on the knob's place reads as 100, whatever the range.
+/// It is a control for percentages: a place of 99.9 or more reads as 100, whatever the range. Give
+/// it no maximum above 100.
 ///
 /// It enters the base layer when it is constructed, inactive, and stays there until it is deleted
-/// or unregistered; setActive() alone shows and hides it. A finger that presses the knob drags it,
-/// and where it lifts, or another finger presses elsewhere, the knob stays. Handlers run on the
-/// dispatch thread, getValue() and setValue() on any.
+/// or unregistered; setActive() alone shows and hides it. A finger that presses the knob drags it.
+/// When the finger lifts, or any finger presses elsewhere, the knob stays where it is. Handlers run
+/// on the dispatch thread; any thread may call getValue() and setValue().
 class MW_API SlideMove : public Widget {
  public:
+  /// A knob's width that stands for 20 per cent and for the value written on the knob.
+  enum KnobWidth { kValueKnob = 0 };
+
   /// Copies `area`; null is all zero. `percent`: the knob's width in hundredths of the bar's, at
-  /// most 50; 0 is 20, with the value written on the knob. `a` and `b` bound the value, in either
-  /// order; equal ones stand for 0 to 1. `initial` becomes `b` unless it is less than `b`, and else
-  /// `a` unless it is more than `a`: give the lower bound first, and two different ones, or the
-  /// knob may start beside the bar.
+  /// most 50, or kValueKnob. `a` and `b` bound the value, in either order; equal ones stand for 0
+  /// to 1. `initial` becomes `b` unless it is less than `b`, and else `a` unless it is more than
+  /// `a`: give the lower bound first, and two different ones, or the knob may start beside the bar.
   SlideMove(const SKIA_Rect* area, int percent, int a, int b, int initial);
   ~SlideMove() override;
 
-  using Widget::show;
+  /// show(0).
+  int show() override;
   /// Draws it. Returns 1.
   int show(unsigned int ticks) override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
   void onPress(event_data* event) override;
   void onRelease(event_data* event) override;
-  /// Are kept, but dragging goes on.
+  /// Are remembered, for a derived class. A locked slider can still be dragged.
   void Lock() override;
   void unLock() override;
 
@@ -39,9 +43,10 @@ class MW_API SlideMove : public Widget {
   using Widget::setRect;
   /// Drags the knob by the event's relative motion.
   void onHover(mouse_event mouse);
-  /// Lays it out in `area`, its knob where the value says. Null: nothing.
+  /// Lays it out in `area`, its knob where the value says. Null: no change.
   void setRect(const SKIA_Rect* area);
-  /// Draws the fill up to that rectangle's left edge, and the knob's frame there. Null: nothing.
+  /// Lays the fill out up to that rectangle's left edge, and the knob's frame there. It draws
+  /// nothing, and the next drawing pass lays both out by the knob again. Null: no change.
   void setRect_Slide(const SKIA_Rect* knob);
   int getValue() const;
   /// Takes any number, read as an int, and moves the knob there: beside the bar for one out of
@@ -56,7 +61,7 @@ class MW_API SlideMove : public Widget {
 
  protected:
   std::atomic<int> locked = 0;
-  KnobHold hold{select, ownerFinger};
+  KnobHold knobHold{hold, ownerFinger};
   int minValue;  // these four stay after construction
   int maxValue;
   int knobPercent;

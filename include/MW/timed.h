@@ -9,12 +9,15 @@ namespace MW {
 /// One or two lines of text that hide themselves after a while.
 ///
 /// It enters the base layer when it is constructed and leaves it when it is deleted. It is inactive
-/// until onHideTimer(); made active in any other way it goes away in the next drawing pass.
+/// until onHideTimer(). Made active in any other way, it goes away in the next drawing pass.
+///
+/// show() without ticks draws nothing: only the time tells whether the box is still to be seen.
 class MW_API Toastbox : public Widget {
  public:
-  /// One line, on a box of `area`'s colour. Copies the records; null ones are all zero or empty.
+  /// One line, on a box of `area`'s colour. Copies the records. Null records are all zero or empty.
   Toastbox(const SKIA_Rect* area, const SKIA_Text* line);
-  /// Two lines, each in half of the box. With an odd height the box is one pixel lower than `area`.
+  /// Two lines, each in half of the box. An odd height loses its last pixel, so that both halves
+  /// are alike.
   Toastbox(const SKIA_Rect* area, const SKIA_Text* line, const SKIA_Text* message);
   ~Toastbox() override;
 
@@ -23,13 +26,14 @@ class MW_API Toastbox : public Widget {
   int show(unsigned int ticks) override;
   /// Raises the redraw flag once its time is over.
   void updateTimer(unsigned int ticks) override;
-  /// The first line.
+  /// Sets the first line.
   void setText(const char* newText) override;
-  /// The second line; without one: nothing.
+  /// Sets the second line. Does nothing on a box of one line.
   void setMsg(const char* message) override;
   /// Shows it from now for `ms` milliseconds; a time that still runs is replaced.
   void onHideTimer(int ms) override;
-  /// `lineCount` 2 divides the box into two halves; any other leaves them as they are.
+  /// `lineCount` 2 divides the box into two halves; any other leaves them as they are. Null: no
+  /// change.
   void setRect(int lineCount, const SKIA_Rect* newRect) override;
 
   /// What the constructors do: lays it out inactive, and registers it.
@@ -49,10 +53,12 @@ class MW_API Toastbox : public Widget {
 ///
 /// It enters the base layer when it is constructed and leaves it when it is deleted. It is inactive
 /// until onProgressbar().
+///
+/// show() without ticks draws nothing: the row grows with the time.
 class MW_API Progressbar : public Widget {
  public:
   /// The bar is twice as high as `area`: the caption stands in the upper half, the asterisks in the
-  /// lower. The first argument is not read. Copies the records; null ones are all zero or empty.
+  /// lower. The first argument is not read. Copies the records. Null records are all zero or empty.
   Progressbar(int unused, const SKIA_Rect* area, const SKIA_Text* caption);
   ~Progressbar() override;
 
@@ -61,7 +67,7 @@ class MW_API Progressbar : public Widget {
   int show(unsigned int ticks) override;
   /// Raises the redraw flag when the row is to grow or the time is over.
   void updateTimer(unsigned int ticks) override;
-  /// The first argument is not read.
+  /// The first argument is not read. Null: no change.
   void setRect(int unused, const SKIA_Rect* newRect) override;
   /// Shows it from now for `ms` milliseconds; 0 takes it away.
   void onProgressbar(int ms) override;
@@ -69,7 +75,7 @@ class MW_API Progressbar : public Widget {
  protected:
   // Guarded by stateLock.
   SKIA_Rect frameRect = {};
-  SKIA_Rect barRect = {};  // its width is never set: meant so, it draws nothing
+  SKIA_Rect barRect = {};  // its width stays 0, so that nothing of it is seen
   SKIA_Rect textRect = {};
   SKIA_Rect starRect = {};
   SKIA_Text starText = {};

@@ -57,8 +57,8 @@ class MW_API WidgetList {
 
   // Changes of an item. 1, or kNotFound, which is logged; index 0 is never found.
 
-  /// The first `len` bytes of `s`, cut to 127 bytes at a whole character. Null `s` is the empty
-  /// text; `len` 0 changes nothing.
+  /// The first `len` bytes of `s`, NULs among them, cut to 127 bytes at a whole character. Null `s`
+  /// is the empty text; `len` 0 changes nothing.
   static int setText(int index, const char* s, unsigned int len);
   static int setColor(int index, unsigned int textColor, unsigned int fillColor,
                       unsigned int lineColor);

@@ -9,23 +9,48 @@
 
 namespace MW {
 
+/// What a descriptor builds. A widget registers itself.
+enum RcuiKind {
+  kRcuiTextbox = 0,
+  kRcuiBox = 2,
+  kRcuiLine = 4,
+  kRcuiImage = 5,
+  /// While `visible`, a text box directly below the column's last one, as wide, high and coloured
+  /// as that. Else an item of the type 14.
+  kRcuiNextInColumn = 7,
+  kRcuiFirstInColumn = 8,  ///< the same, but it begins a new column at its own rectangle
+  kRcuiLabel = 9,
+  kRcuiDialog = 10,         ///< a Dialog of `dialogKind`
+  kRcuiDialogNew = 14,      ///< `desc` 0 to 2 are its lines, 3 and 4 its captions
+  kRcuiButton = 15,         ///< a Button
+  kRcuiButton3Left = 17,    ///< a Button3 at the foot; `rect.y` pixels stay free below it
+  kRcuiButton3Centre = 18,  ///< a Button3 at the foot; `rect.y` pixels stay free below it
+  kRcuiButton3Right = 19,   ///< a Button3 at the foot; `rect.y` pixels stay free below it
+  kRcuiSlideFromLeft = 21,  ///< a SlideE
+  kRcuiSlideFromRight = 22,
+  kRcuiToastbox = 23,    ///< `desc` 0 is its second line, where there is one
+  kRcuiFullScreen = 24,  ///< a white FullScreen
+  kRcuiProgressbar = 25,
+  kRcuiKey = 26
+};
+
 /// What to build. An application fills it and keeps it for the constructor's call alone.
 struct ref_t {
   int32_t index = 0;  ///< kinds 0 to 9: the index in the display-item table; the toolkit writes it
-  int32_t kind = 0;   ///< see WidgetRcui
+  int32_t kind = 0;   ///< RcuiKind
   int32_t unread8 = 0;
-  int32_t dialogKind = 0;  ///< kind 10: the Dialog's number
+  int32_t dialogKind = 0;  ///< of kRcuiDialog
   uint8_t unread16 = 0;
-  uint8_t visible = 0;  ///< kinds 7, 8: stands in the column; 10 to 26: the widget is active
+  uint8_t visible = 0;  ///< not 0: stands in the column, or the widget is active
   uint8_t unread18 = 0;
-  uint8_t cbIndex = 0;  ///< kinds 10 to 26: not 0: the callbacks are copied
+  uint8_t cbIndex = 0;  ///< not 0: the widget gets the callbacks
   int32_t unread20 = 0;
   SKIA_Rect rect = {};       ///< of a line: x1, y1, x2, y2 and the colour
   int32_t lineWidth = 0;     ///< pixels
   int32_t unread48[3] = {};  // NOLINT(modernize-avoid-c-arrays): a record's words
   SKIA_Text text = {};       ///< the caption
-  /// Kinds 14 and 23: five texts, or null. The record has no gap before it where pointers are eight
-  /// bytes wide, so it is not aligned there: read it by value.
+  /// Of kRcuiDialogNew and kRcuiToastbox: five texts, or null. The record has no gap before it
+  /// where pointers are eight bytes wide, so it is not aligned there: read it by value.
   [[gnu::packed]] const SKIA_Text* desc = nullptr;
 };
 static_assert(offsetof(ref_t, index) == 0 && offsetof(ref_t, kind) == 4);
@@ -60,32 +85,17 @@ static_assert(offsetof(ref_cb_t, cbTouchRelease) == 5 * sizeof(Callback));
 static_assert(offsetof(ref_cb_t, cbDoubleKey) == 10 * sizeof(Callback));
 static_assert(offsetof(ref_cb_t, cbHover) == 14 * sizeof(Callback));
 
-/// Builds one item or widget from a descriptor.
+/// Builds one item or widget from a descriptor; RcuiKind says which.
 ///
-/// Kinds 0 to 9 copy a still picture to the display-item table (WidgetList) and have no widget. The
-/// item is a text box of kind 0, a box of 2, a line of 4, a picture of 5 and a label of 9; items of
-/// 1, 3 and 6 have the number 14, whose look is the platform's.
+/// Items are copied to the display-item table (WidgetList) and have no widget. All objects of the
+/// process share one column; make them on one thread, as with WidgetList. A kind that has no name
+/// builds nothing; a negative one is logged. Of 0 to 9 those without a name are items of the type
+/// 14, whose look is the platform's.
 ///
-/// Kinds 7 and 8 that are visible are text boxes in a column: 8 begins one at its own rectangle, 7
-/// stands directly below the one before, as wide, high and coloured as it. All objects of the
-/// process share the column, and one thread makes them, as it uses WidgetList. Those that are not
-/// visible are items of the number 14.
-///
-/// Kinds that build a widget, which registers itself:
-///
-///     10  Dialog of `dialogKind`           21  SlideE from the left
-///     14  DialogNew; `desc` 0 to 2 are     22  SlideE from the right
-///         its lines, 3 and 4 its captions  23  Toastbox; `desc` 0 is its second line
-///     15  Button                           24  FullScreen, white
-///     17  Button3 at the bottom left       25  Progressbar
-///     18  Button3 at the bottom centre     26  Key
-///     19  Button3 at the bottom right
-///
-/// Of a Button3, `rect.y` is the number of pixels that stay free below it. Any other kind builds
-/// nothing; one that is not 0 to 42 is logged.
-///
-/// Texts are copied, and cut at their NUL or the end of their record. One without a NUL is logged,
-/// and so is a length that is negative or beyond the text's end, which counts as the text's.
+/// Texts are copied where the kind shows them. One without a NUL is logged and cut to 127 bytes. A
+/// length that is negative or above 127 is logged and replaced by the text's own. The length of an
+/// item's text counts, NULs within it included; widgets show their texts up to the NUL. One of the
+/// five texts of `desc` is there when its length is not 0, even where its first byte is the NUL.
 ///
 /// The object owns its widget and deletes it with itself: the application must not delete it,
 /// neither from a callback, but may delete the WidgetRcui there. The object itself is in no layer

@@ -34,6 +34,11 @@ std::string_view boundedText(const char* given, std::size_t count) {
   return cutText({given, strnlen(given, std::min<std::size_t>(count, SKIA_TEXT_BYTES))}, kTextMax);
 }
 
+std::string_view countedText(const char* given, std::size_t count) {
+  if (given == nullptr) return "";
+  return cutText({given, std::min<std::size_t>(count, SKIA_TEXT_BYTES)}, kTextMax);
+}
+
 void putTextOpen(SKIA_Text& record, std::string_view bounded) {
   // An empty view may point nowhere.
   if (!bounded.empty()) std::memmove(record.text, bounded.data(), bounded.size());

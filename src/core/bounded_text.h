@@ -1,7 +1,6 @@
 /// Texts that stay within their record, whatever is given.
 #pragma once
 
-#include <MW/api.h>
 #include <brimol/scene.h>
 
 #include <cstddef>
@@ -13,18 +12,20 @@ namespace MW {
 inline constexpr int kTextMax = SKIA_TEXT_BYTES - 1;
 
 /// At most the first `limit` bytes, and no character of several bytes cut in half.
-MW_API std::string_view cutText(std::string_view given, std::size_t limit);
+std::string_view cutText(std::string_view given, std::size_t limit);
 
 /// What a record can hold of a C string, or of its first `count` bytes: at most kTextMax bytes, up
 /// to the NUL if there is one, and no character of several bytes cut in half. Null is empty.
-MW_API std::string_view boundedText(const char* given);
-MW_API std::string_view boundedText(const char* given, std::size_t count);
+std::string_view boundedText(const char* given);
+std::string_view boundedText(const char* given, std::size_t count);
+/// The first `count` bytes, NULs among them, cut to kTextMax at a whole character. Null is empty.
+std::string_view countedText(const char* given, std::size_t count);
 
 /// Puts the text and a NUL into the record and sets its length; the rest of the record stays.
-MW_API void putText(SKIA_Text& record, std::string_view bounded);
+void putText(SKIA_Text& record, std::string_view bounded);
 /// The same without the NUL: what stood behind the new text stays there, and the length alone says
 /// where it ends.
-MW_API void putTextOpen(SKIA_Text& record, std::string_view bounded);
+void putTextOpen(SKIA_Text& record, std::string_view bounded);
 
 /// What a number is filled up with at its left, and to how many characters.
 struct Padding {
@@ -33,10 +34,10 @@ struct Padding {
 };
 
 /// Puts a number and what stands behind it: a pass over many rows has no time for printf.
-MW_API void putNumber(SKIA_Text& record, int number, Padding padding, std::string_view behind);
+void putNumber(SKIA_Text& record, int number, Padding padding, std::string_view behind);
 
 /// A copy of an application's record: its colour, alignment and size, and its text up to the NUL
 /// with the length that this gives. Null: an empty record.
-MW_API SKIA_Text copyText(const SKIA_Text* given);
+SKIA_Text copyText(const SKIA_Text* given);
 
 }  // namespace MW

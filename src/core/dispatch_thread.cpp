@@ -7,6 +7,7 @@
 #include <brimol/scene.h>
 
 #include "core/class_log.h"
+#include "core/layer_walk.h"
 #include "core/layers.h"
 
 namespace MW {
@@ -32,6 +33,7 @@ bool offerToSelected(int type, event_data* event) {
 Offer offerToActive(int type, event_data* event) {
   Offer offer;
   LayerWalk walk(Layers::layer(type));
+  offer.isLast = walk.isRefused();
   while (Widget* const widget = walk.next()) {
     if (!widget->isActive()) continue;
     offer.isLast = true;
@@ -71,10 +73,19 @@ func_dispatchEvent::~func_dispatchEvent() {
   kLog.print(LogLevel::Debug, "func_dispatchEvent destory!");
 }
 
+bool func_dispatchEvent::isOnThisThread() const {
+  return thread.load() == std::this_thread::get_id();
+}
+
 bool func_dispatchEvent::threadLoop() {
+  thread = std::this_thread::get_id();
   EventService* const service = Window::getEventService();
-  event_data* const event = service != nullptr ? service->recvEvent() : nullptr;
-  if (event != nullptr && dispatch(event)) isDisplayUpdate(1);
+  const event_data* const received = service != nullptr ? service->recvEvent() : nullptr;
+  if (received != nullptr) {
+    // A handler may end and start the window, so that the service's record changes meanwhile.
+    event_data event = *received;
+    if (dispatch(&event)) isDisplayUpdate(1);
+  }
   Delay(1);
   if (exitPending()) {
     kLog.print(LogLevel::Debug, "func_dispatchEvent->threadLoop exitPending: %d", 1);

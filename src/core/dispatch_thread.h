@@ -1,21 +1,31 @@
 /// The thread that hands queued events to the widgets.
 #pragma once
 
-#include <MW/api.h>
 #include <utils/Thread.h>
+
+#include <atomic>
+#include <thread>
 
 namespace MW {
 
 /// Window::init starts it. It takes one event a round from the event service, offers it to the
 /// active widgets of the top layer and, while none is active there, to those of the base layer,
 /// and raises the redraw flag for an event that a widget took.
-class MW_API func_dispatchEvent : public android::Thread {
+class func_dispatchEvent : public android::Thread {
  public:
   func_dispatchEvent();
   ~func_dispatchEvent() override;
 
   /// One round, which ends with a pause of a millisecond. Returns true: go on.
   bool threadLoop() override;
+
+  /// Whether its thread calls this, that is: a handler.
+  bool isOnThisThread() const;
+  /// Whether it is to end after its round, or has ended.
+  bool isEnding() const { return exitPending(); }
+
+ private:
+  std::atomic<std::thread::id> thread;
 };
 
 }  // namespace MW

@@ -3,79 +3,15 @@
 #include <MW/widget.h>
 
 #include <algorithm>
-#include <chrono>
 #include <new>
+
+#include "core/layer_walk.h"
 
 namespace MW {
 
-struct WalkRecord {
-  std::atomic<bool> taken = true;
-  std::atomic<std::thread::id> thread;
-  std::atomic<const WidgetBlock*> pinned = nullptr;  // not freed while it stands here
-  std::atomic<const Widget*> calling = nullptr;      // its handler runs, or is about to
-  std::atomic<const Widget*> waitingFor = nullptr;   // the walking thread waits for its handler
-  WalkRecord* next = nullptr;
-};
-
 namespace {
-
 constexpr std::size_t kSmallestBlock = 16;
-constexpr int kWaitDepth = 8;  // threads in a chain of waiting ones
-constexpr std::chrono::microseconds kWaitPause{50};
-
-std::atomic<WalkRecord*> walkRecords = nullptr;  // grows at the front, never shrinks
-
-// Null: no memory.
-WalkRecord* takeRecord() {
-  for (WalkRecord* record = walkRecords; record != nullptr; record = record->next) {
-    if (!record->taken.exchange(true)) return record;
-  }
-  auto* const added = new (std::nothrow) WalkRecord;
-  if (added == nullptr) return nullptr;
-  added->next = walkRecords;
-  while (!walkRecords.compare_exchange_weak(added->next, added)) {
-  }
-  return added;
 }
-
-bool isPinned(const WidgetBlock* block) {
-  for (const WalkRecord* record = walkRecords; record != nullptr; record = record->next) {
-    if (record->pinned == block) return true;
-  }
-  return false;
-}
-
-// Whether a caller of `widget` can go on only after this thread has.
-// NOLINTNEXTLINE(misc-no-recursion): as deep as `depth` says
-bool waitsForThisThread(const Widget* widget, int depth) {
-  if (widget == nullptr || depth == 0) return false;
-  for (const WalkRecord* record = walkRecords; record != nullptr; record = record->next) {
-    if (record->calling != widget) continue;
-    if (record->thread.load() == std::this_thread::get_id()) return true;
-    if (waitsForThisThread(record->waitingFor, depth - 1)) return true;
-  }
-  return false;
-}
-
-bool isCalledElsewhere(const WalkRecord& record, const Widget* widget) {
-  return record.calling == widget && record.thread.load() != std::this_thread::get_id();
-}
-
-void tellWaitingFor(const Widget* widget) {
-  for (WalkRecord* record = walkRecords; record != nullptr; record = record->next) {
-    if (record->thread.load() == std::this_thread::get_id()) record->waitingFor = widget;
-  }
-}
-
-void waitForCaller(const WalkRecord& record, const Widget* widget) {
-  tellWaitingFor(widget);
-  while (isCalledElsewhere(record, widget) && !waitsForThisThread(record.waitingFor, kWaitDepth)) {
-    std::this_thread::sleep_for(kWaitPause);
-  }
-  tellWaitingFor(nullptr);
-}
-
-}  // namespace
 
 std::unique_ptr<WidgetBlock> WidgetBlock::make(std::size_t capacity) {
   std::unique_ptr<WidgetBlock> block(new (std::nothrow) WidgetBlock);
@@ -119,7 +55,7 @@ void Layer::dropClearedPlaces() {
 void Layer::freeOlderBlocks() {
   std::unique_ptr<WidgetBlock>* link = &current.load()->older;
   while (*link) {
-    if (isPinned(link->get())) {
+    if (LayerWalk::isPinned(link->get())) {
       link = &(*link)->older;
     } else {
       *link = std::move((*link)->older);
@@ -161,47 +97,6 @@ int Layer::removeAll(const Widget* widget) {
   }
   if (removed > 0) dropClearedPlaces();
   return removed;
-}
-
-LayerWalk::LayerWalk(const Layer& layer) : record(takeRecord()) {
-  if (record == nullptr) return;
-  record->thread.store(std::this_thread::get_id(), std::memory_order_release);
-  // Pinned first and compared then: a block that is still current was not freed before it was
-  // pinned, and is not freed while it is.
-  do {
-    block = layer.current;
-    record->pinned = block;
-  } while (layer.current != block);
-  if (block != nullptr) end = block->used;
-}
-
-// Released in this order: whoever reads one of them sees everything that this walk did before.
-LayerWalk::~LayerWalk() {
-  if (record == nullptr) return;
-  record->calling.store(nullptr, std::memory_order_release);
-  record->pinned.store(nullptr, std::memory_order_release);
-  record->thread.store(std::thread::id(), std::memory_order_release);
-  record->taken.store(false, std::memory_order_release);
-}
-
-Widget* LayerWalk::next() {
-  while (position < end) {
-    const std::atomic<Widget*>& place = block->places[position++];
-    Widget* const widget = place;
-    if (widget == nullptr) continue;
-    // Published first and compared then. A thread that removes the widget clears the place first
-    // and reads this then, so that at least one of the two sees the other.
-    record->calling = widget;
-    if (place == widget) return widget;
-  }
-  if (record != nullptr) record->calling.store(nullptr, std::memory_order_release);
-  return nullptr;
-}
-
-void LayerWalk::waitUntilNotCalled(const Widget* widget) {
-  for (const WalkRecord* record = walkRecords; record != nullptr; record = record->next) {
-    if (isCalledElsewhere(*record, widget)) waitForCaller(*record, widget);
-  }
 }
 
 }  // namespace MW

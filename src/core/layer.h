@@ -1,18 +1,13 @@
-/// A layer of live widgets, and the walks over it.
+/// A layer of live widgets.
 #pragma once
 
 #include <atomic>
 #include <cstddef>
 #include <memory>
-#include <thread>
 
 namespace MW {
 
 class Widget;
-
-/// What one walk tells the threads that change layers. Records are handed from walk to walk and
-/// never freed, so that they can be read at any time.
-struct WalkRecord;
 
 /// A fixed number of places that are filled from the front. A place that was filled is cleared when
 /// its widget leaves and is not used again, so that a walk can go on while others write.
@@ -55,34 +50,6 @@ class Layer {
   // Never freed: widgets may leave as late as at the end of the program.
   std::atomic<WidgetBlock*> current = nullptr;
   std::atomic<int> live = 0;
-};
-
-/// One walk, front to back, over the widgets that stood in the layer when it began.
-///
-///     LayerWalk walk(layer);
-///     while (Widget* widget = walk.next()) { ... }
-///
-/// The widget that next() returned can be called until the following next() or the walk's end: a
-/// thread that removes it waits so long. Widgets that left in the meantime are passed over.
-class LayerWalk {
- public:
-  explicit LayerWalk(const Layer& layer);
-  ~LayerWalk();
-  LayerWalk(const LayerWalk&) = delete;
-  LayerWalk& operator=(const LayerWalk&) = delete;
-
-  Widget* next();
-
-  /// Waits until no other thread calls the widget, which must have left the layers. Returns at once
-  /// where the caller of that widget waits, itself or through others, for one that this thread is
-  /// calling: neither could ever go on.
-  static void waitUntilNotCalled(const Widget* widget);
-
- private:
-  WalkRecord* record;  // null where there was no memory for one: the walk meets no widget
-  const WidgetBlock* block = nullptr;
-  std::size_t position = 0;
-  std::size_t end = 0;
 };
 
 }  // namespace MW

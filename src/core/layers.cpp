@@ -2,7 +2,14 @@
 
 #include <MW/widget.h>
 
+#include "core/class_log.h"
+#include "core/layer_walk.h"
+
 namespace MW {
+
+namespace {
+constexpr ClassLog kLog("WINDOW");
+}
 
 constinit std::mutex Layers::lock;
 constinit std::array<Layer, 2> Layers::layers;
@@ -10,19 +17,19 @@ constinit int Layers::widgetCount = 0;
 
 const Layer& Layers::layer(int type) { return layers[static_cast<std::size_t>(type)]; }
 
-Layers::Change Layers::enter(Widget& widget) {
+Layers::Entry Layers::enter(Widget& widget) {
   const std::lock_guard guard(lock);
   const int type = widget.type();
-  if (!isLayer(type)) return {type, widgetCount, false};
+  if (!isLayer(type)) return {widgetCount, false};
   const int size = layers[static_cast<std::size_t>(type)].append(&widget);
-  if (size == 0) return {type, widgetCount, false};
-  // The number is the layer's size, and so no longer unique after a removal: meant so.
+  if (size == 0) return {widgetCount, false};
+  // After a removal two widgets of a layer have the same number.
   widget.setId(size);
   ++widget.registrations;
-  return {type, ++widgetCount, true};
+  return {++widgetCount, true};
 }
 
-Layers::Change Layers::leaveById(Widget& widget) {
+void Layers::leaveById(Widget& widget) {
   const int type = widget.type();
   Widget* removed = nullptr;
   int count = 0;
@@ -34,21 +41,28 @@ Layers::Change Layers::leaveById(Widget& widget) {
     count = --widgetCount;
     gone = widget.registrations == 0;
   }
+  logCount(count);
   if (removed != nullptr) LayerWalk::waitUntilNotCalled(removed);
   // It may have left by another thread's removal that is still waiting.
   if (gone && removed != &widget) LayerWalk::waitUntilNotCalled(&widget);
-  return {type, count, removed != nullptr};
 }
 
-void Layers::leave(Widget& widget) {
+void Layers::leave(Widget& widget, Count count) {
+  int lowered = 0;
   {
     const std::lock_guard guard(lock);
     for (Layer& each : layers) {
       if (widget.registrations == 0) break;
       widget.registrations -= each.removeAll(&widget);
     }
+    if (count == Count::Lowered) lowered = --widgetCount;
   }
+  if (count == Count::Lowered) logCount(lowered);
   LayerWalk::waitUntilNotCalled(&widget);
+}
+
+void Layers::logCount(int count) {
+  kLog.print(LogLevel::Debug, "unregisterWidget: num_widget=%d", count);
 }
 
 }  // namespace MW

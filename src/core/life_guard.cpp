@@ -1,20 +1,31 @@
 #include "core/life_guard.h"
 
+#include <mutex>
+
 namespace MW {
 
 namespace {
-thread_local LifeGuard* innermost = nullptr;
+constinit std::mutex guardsLock;
+constinit LifeGuard* newest = nullptr;  // guarded by guardsLock
+}  // namespace
+
+LifeGuard::LifeGuard(const Widget* guarded) : widget(guarded) {
+  const std::lock_guard guard(guardsLock);
+  older = newest;
+  if (older != nullptr) older->newer = this;
+  newest = this;
 }
 
-LifeGuard::LifeGuard(const Widget* guarded) : widget(guarded), outer(innermost) {
-  innermost = this;
+LifeGuard::~LifeGuard() {
+  const std::lock_guard guard(guardsLock);
+  if (older != nullptr) older->newer = newer;
+  (newer != nullptr ? newer->older : newest) = older;
 }
-
-LifeGuard::~LifeGuard() { innermost = outer; }
 
 void LifeGuard::widgetEnds(const Widget* ended) {
-  for (LifeGuard* guard = innermost; guard != nullptr; guard = guard->outer) {
-    if (guard->widget == ended) guard->widget = nullptr;
+  const std::lock_guard guard(guardsLock);
+  for (LifeGuard* each = newest; each != nullptr; each = each->older) {
+    if (each->widget == ended) each->widget = nullptr;
   }
 }
 

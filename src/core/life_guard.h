@@ -1,13 +1,15 @@
 /// Tells a handler whether the callback that it has just called deleted the widget.
 #pragma once
 
+#include <atomic>
+
 namespace MW {
 
 class Widget;
 
-/// Stands on the stack around a callback, on the thread that calls it. A handler of a widget runs
-/// on one thread at a time for each walk, and deletion waits for the other threads, so that only
-/// this thread can delete the widget meanwhile.
+/// Stands on the stack around a callback. The widget may be deleted by the callback itself, or on
+/// another thread: deleting waits for a handler there, but not where that handler waits in turn for
+/// one on the deleting thread.
 class LifeGuard {
  public:
   explicit LifeGuard(const Widget* guarded);
@@ -17,12 +19,14 @@ class LifeGuard {
 
   bool isAlive() const { return widget != nullptr; }
 
-  /// The widget's destructor tells every guard of this thread.
+  /// The widget's destructor tells every guard, of whatever thread.
   static void widgetEnds(const Widget* ended);
 
  private:
-  const Widget* widget;
-  LifeGuard* outer;
+  std::atomic<const Widget*> widget;
+  // The guards of all threads; guarded by a lock of their own.
+  LifeGuard* older = nullptr;
+  LifeGuard* newer = nullptr;
 };
 
 }  // namespace MW

@@ -1,7 +1,7 @@
 #include <MW/widget.h>
-#include <MW/window.h>
 
 #include "core/hit_test.h"
+#include "core/layer_walk.h"
 #include "core/layers.h"
 #include "core/life_guard.h"
 
@@ -17,15 +17,12 @@ Widget::Widget() = default;
 
 Widget::~Widget() {
   leaveLayers();
+  LayerWalk::forget(this);
   LifeGuard::widgetEnds(this);
 }
 
-void Widget::leaveLayers() { Layers::leave(*this); }
-
-void Widget::leaveWindow() {
-  Window::unregisterWidget(this);
-  leaveLayers();
-}
+void Widget::leaveLayers() { Layers::leave(*this, Layers::Count::Kept); }
+void Widget::leaveWindow() { Layers::leave(*this, Layers::Count::Lowered); }
 
 bool Widget::isUnder(const SKIA_Rect& field, const event_data* event) const {
   return event != nullptr && isPointerEvent(*event) && contains(read(field), positionOf(*event));

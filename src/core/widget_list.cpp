@@ -136,7 +136,7 @@ int WidgetList::setText(int index, const char* s, unsigned int len) {
   if (is_init == 0) return 0;
   SKIA_Item* const item = itemToChange(index, "setText");
   if (item == nullptr) return kNotFound;
-  if (len != 0) putText(item->text, boundedText(s, len));
+  if (len != 0) putText(item->text, countedText(s, len));
   return 1;
 }
 

@@ -11,6 +11,7 @@
 #include "core/class_log.h"
 #include "core/dispatch_thread.h"
 #include "core/geometry.h"
+#include "core/layer_walk.h"
 #include "core/layers.h"
 #include "core/thread_start.h"
 
@@ -30,8 +31,68 @@ constinit int displayUpdate = 0;  // guarded by updateLock
 // The input thread may ask for the service while it is being created or deleted.
 constinit std::atomic<EventService*> eventService = nullptr;
 
-// Null until init; init and destroy alone touch it.
+// Starting and ending, one at a time.
+constinit std::mutex lifeLock;
+// Guarded by lifeLock. Null until a start and after an end; one that is to end after its round
+// stands here until somebody waited for it or the window starts again.
 android::sp<func_dispatchEvent> event_dispatcher;
+
+// Not owned where this thread is inside a handler and another one starts or ends the window: that
+// one may wait for the handler.
+std::unique_lock<std::mutex> lockLife() {
+  if (LayerWalk::isOnThisThread()) return std::unique_lock(lifeLock, std::try_to_lock);
+  return std::unique_lock(lifeLock);
+}
+
+// False: it ends after its round, which this thread cannot wait for.
+bool endDispatcher() {
+  if (event_dispatcher == nullptr) return true;
+  event_dispatcher->requestExit();
+  if (event_dispatcher->isOnThisThread()) return true;
+  if (LayerWalk::isOnThisThread()) return false;
+  event_dispatcher->requestExitAndWait();
+  event_dispatcher.clear();
+  return true;
+}
+
+void endService() {
+  delete eventService.load();
+  eventService = nullptr;
+}
+
+// Does what is left of an end that a handler asked for. False: this thread cannot wait for it.
+bool finishEnd() {
+  if (event_dispatcher == nullptr || !event_dispatcher->isEnding()) return true;
+  if (!endDispatcher()) return false;
+  event_dispatcher.clear();
+  endService();
+  return true;
+}
+
+bool startService() {
+  if (eventService == nullptr) eventService = new (std::nothrow) EventService;
+  if (eventService != nullptr) return true;
+  kLog.print(LogLevel::Error, "init->EventService failed!!");
+  return false;
+}
+
+bool startDispatcher() {
+  event_dispatcher = createThread<func_dispatchEvent>();
+  if (event_dispatcher != nullptr && startThread(*event_dispatcher)) return true;
+  event_dispatcher.clear();
+  kLog.print(LogLevel::Error, "init->func_dispatchEvent failed!!");
+  return false;
+}
+
+// A word that applications may set, and that any thread may read.
+template <typename Number>
+Number load(Number& word) {
+  return std::atomic_ref(word).load(std::memory_order_relaxed);
+}
+template <typename Number>
+void store(Number& word, Number value) {
+  std::atomic_ref(word).store(value, std::memory_order_relaxed);
+}
 
 template <typename Visit>
 void visitActive(int type, Visit visit) {
@@ -51,27 +112,23 @@ float Window::xdpi = 0;
 float Window::ydpi = 0;
 
 int Window::init() {
-  if (event_dispatcher != nullptr) return 1;
-  if (eventService == nullptr) eventService = new (std::nothrow) EventService;
-  event_dispatcher = createThread<func_dispatchEvent>();
-  if (event_dispatcher == nullptr || !startThread(*event_dispatcher)) {
-    event_dispatcher.clear();
-    kLog.print(LogLevel::Error, "init->func_dispatchEvent failed!!");
+  const std::unique_lock life = lockLife();
+  if (!life || !finishEnd()) {
+    kLog.print(LogLevel::Error, "init: the window is not at its end yet");
     return 0;
   }
-  return 1;
+  if (event_dispatcher != nullptr) return 1;
+  return startService() && startDispatcher() ? 1 : 0;
 }
 
 int Window::destroy() {
-  if (event_dispatcher != nullptr) {
-    // A callback on the dispatch thread that ends the window cannot wait for its own thread; the
-    // thread then ends after this round.
-    event_dispatcher->requestExit();
-    event_dispatcher->requestExitAndWait();
+  const std::unique_lock life = lockLife();
+  if (!life || !endDispatcher()) {
+    kLog.print(LogLevel::Error,
+               "destroy: a handler asks for it: the rest is left to the next call");
+    return 1;
   }
-  event_dispatcher.clear();
-  delete eventService.load();
-  eventService = nullptr;
+  endService();
   kLog.print(LogLevel::Error, "event_dispatcher End");
   return 1;
 }
@@ -84,9 +141,9 @@ int Window::registerWidget(Widget* widget) {
     return 1;
   }
   kLog.print(LogLevel::Warning, "registerWidget: type=%d", widget->type());
-  const Layers::Change change = Layers::enter(*widget);
-  if (!change.done) kLog.print(LogLevel::Error, "registerWidget: not registered");
-  kLog.print(LogLevel::Debug, "registerWidget: num_widget=%d", change.count);
+  const Layers::Entry entry = Layers::enter(*widget);
+  if (!entry.done) kLog.print(LogLevel::Error, "registerWidget: not registered");
+  kLog.print(LogLevel::Debug, "registerWidget: num_widget=%d", entry.count);
   return 1;
 }
 
@@ -95,8 +152,7 @@ int Window::unregisterWidget(Widget* widget) {
     kLog.print(LogLevel::Error, "unregisterWidget: no widget");
     return 1;
   }
-  const Layers::Change change = Layers::leaveById(*widget);
-  kLog.print(LogLevel::Debug, "unregisterWidget: num_widget=%d", change.count);
+  Layers::leaveById(*widget);
   return 1;
 }
 
@@ -115,25 +171,33 @@ void Window::updateTimer(unsigned int) {
 }
 
 int Window::getwindowsize(int* outWidth, int* outHeight) {
-  if (width == 0 || height == 0) {
-    width = kDefaultWidth;
-    height = kDefaultHeight;
+  int w = load(width);
+  int h = load(height);
+  if (w == 0 || h == 0) {
+    store(width, w = kDefaultWidth);
+    store(height, h = kDefaultHeight);
   }
-  if (outWidth != nullptr) *outWidth = width;
-  if (outHeight != nullptr) *outHeight = height;
+  if (outWidth != nullptr) *outWidth = w;
+  if (outHeight != nullptr) *outHeight = h;
   return 1;
 }
 
 int Window::getMura(float* outXdpi, float* outYdpi, float mm) {
-  if (xdpi == 0 || ydpi == 0) getDpi(&xdpi, &ydpi);
-  if (outXdpi != nullptr) *outXdpi = xdpi;
-  if (outYdpi != nullptr) *outYdpi = ydpi;
-  // Rounded up and kept so, but never rounded down: meant so, and so is that the horizontal
-  // density alone is rounded and serves both axes.
-  const int rounded = truncated(double{xdpi} + kRoundUp);
-  if (rounded != truncated(xdpi)) xdpi = static_cast<float>(rounded);
-  const int pixels = truncated(mm * xdpi / kMmPerInch);
-  kLog.print(LogLevel::Error, "getMura[%f dpi] %fmm = %d pixel", xdpi, mm, pixels);
+  float x = load(xdpi);
+  float y = load(ydpi);
+  if (x == 0 || y == 0) {
+    getDpi(&x, &y);
+    store(xdpi, x);
+    store(ydpi, y);
+  }
+  if (outXdpi != nullptr) *outXdpi = x;
+  if (outYdpi != nullptr) *outYdpi = y;
+  // A density is rounded up and kept so, but never rounded down. The horizontal one serves both
+  // axes and alone is rounded.
+  const int rounded = truncated(double{x} + kRoundUp);
+  if (rounded != truncated(x)) store(xdpi, x = static_cast<float>(rounded));
+  const int pixels = truncated(mm * x / kMmPerInch);
+  kLog.print(LogLevel::Error, "getMura[%f dpi] %fmm = %d pixel", x, mm, pixels);
   return pixels;
 }
 

@@ -25,8 +25,6 @@ namespace {
 
 constexpr ClassLog kLog("WIDGETRCUI");
 
-constexpr std::size_t kDescTexts = 5;
-
 using Made = std::unique_ptr<Widget>;
 
 template <typename Class, typename... Arguments>
@@ -36,131 +34,143 @@ Made make(Arguments... arguments) {
 
 void complain(const char* what) { kLog.print(LogLevel::Error, "WidgetRcui -> %s", what); }
 
-bool isSound(const SKIA_Text& given, int length) {
-  return given.string_len >= 0 && given.string_len <= length;
-}
-
-// A copy that holds what its length says, whatever the descriptor says.
+// A copy that stays within its record, whatever the descriptor says. NULs before its length stay.
 SKIA_Text soundText(const SKIA_Text& given) {
-  SKIA_Text text = copyText(&given);
-  if (std::ranges::count(given.text, '\0') == 0) complain("text has no NUL");
-  if (isSound(given, text.string_len)) {
+  SKIA_Text text = given;
+  if (std::ranges::count(given.text, '\0') == 0) {
+    complain("text has no NUL");
+    putText(text, boundedText(given.text));
     text.string_len = given.string_len;
-  } else {
+  }
+  if (given.string_len < 0 || given.string_len > kTextMax) {
     kLog.print(LogLevel::Error, "WidgetRcui -> text length is bad : %d", given.string_len);
+    putText(text, boundedText(given.text));
   }
   return text;
 }
 
-// What a maker reads: the descriptor's records by themselves, and its text made sound.
-struct Parts {
-  int dialogKind;
-  SKIA_Rect rect;
-  SKIA_Text text;
-  const SKIA_Text* desc;
+Made makeDialog(const ref_t& from) { return make<Dialog>(from.dialogKind); }
+
+// One of the five texts as a C string of at most 126 bytes; null where its length is 0.
+class DialogText {
+ public:
+  explicit DialogText(const SKIA_Text& given) : isGiven(given.string_len != 0) {
+    constexpr std::size_t kMost = kTextMax - 1;
+    if (!isGiven) return;
+    text = soundText(given);
+    putText(text, cutText({text.text, static_cast<std::size_t>(text.string_len)}, kMost));
+  }
+  const char* words() const { return isGiven ? text.text : nullptr; }
+  int align() const { return isGiven ? text.align : SKIA_ALIGN_LEFT; }
+
+ private:
+  bool isGiven;
+  SKIA_Text text = {};
 };
 
-Made makeDialog(const Parts& from) { return make<Dialog>(from.dialogKind); }
-
-// A copy of at most 126 bytes.
-SKIA_Text dialogText(const SKIA_Text& given) {
-  constexpr std::size_t kMost = kTextMax - 1;
-  SKIA_Text text = soundText(given);
-  putText(text, cutText({text.text, static_cast<std::size_t>(text.string_len)}, kMost));
-  return text;
-}
-
-const char* orNone(const SKIA_Text& text) { return text.string_len != 0 ? text.text : nullptr; }
-
-// The texts are the three lines and the two captions; an empty one is none.
 void describe(Widget& dialog, const SKIA_Text* desc) {
-  std::array<SKIA_Text, kDescTexts> texts;
-  std::transform(desc, desc + kDescTexts, texts.begin(), dialogText);
-  const auto& [line1, line2, line3, caption1, caption2] = texts;
-  const int align = line1.string_len != 0 ? line1.align : SKIA_ALIGN_LEFT;
-  dialog.setDesc(orNone(line1), orNone(line2), orNone(line3), align);
-  dialog.setbutton(orNone(caption1), orNone(caption2));
+  const DialogText line1(desc[0]);
+  const DialogText line2(desc[1]);
+  const DialogText line3(desc[2]);
+  const DialogText caption1(desc[3]);
+  const DialogText caption2(desc[4]);
+  dialog.setDesc(line1.words(), line2.words(), line3.words(), line1.align());
+  dialog.setbutton(caption1.words(), caption2.words());
 }
 
-Made makeDialogNew(const Parts& from) {
-  Made made = make<DialogNew>(from.text.text, from.text.align, static_cast<int>(from.text.color));
+Made makeDialogNew(const ref_t& from) {
+  const SKIA_Text title = soundText(from.text);
+  Made made = make<DialogNew>(title.text, title.align, static_cast<int>(title.color));
   if (made != nullptr && from.desc != nullptr) describe(*made, from.desc);
   return made;
 }
 
-Made makeButton(const Parts& from) { return make<Button>(&from.rect, &from.text); }
+Made makeButton(const ref_t& from) {
+  const SKIA_Text caption = soundText(from.text);
+  return make<Button>(&from.rect, &caption);
+}
 
 template <int position>
-Made makeButton3(const Parts& from) {
-  return make<Button3>(position, &from.text, from.rect.y);
+Made makeButton3(const ref_t& from) {
+  const SKIA_Text caption = soundText(from.text);
+  return make<Button3>(position, &caption, from.rect.y);
 }
 
-// The picture files are not read.
-Made makeSlideFromLeft(const Parts& from) {
-  return make<SlideE>(0, &from.rect, &from.text, "/vendor/data/640_slidebtn.png");
-}
-Made makeSlideFromRight(const Parts& from) {
-  return make<SlideE>(1, &from.rect, &from.text, "/vendor/data/640_slidebtn_reverse.png");
-}
-
-Made makeToastbox(const Parts& from) {
-  if (from.desc != nullptr) {
-    const SKIA_Text message = soundText(*from.desc);
-    if (message.string_len != 0) return make<Toastbox>(&from.rect, &from.text, &message);
-  }
-  return make<Toastbox>(&from.rect, &from.text);
+template <int fromSide>
+Made makeSlide(const ref_t& from) {
+  constexpr std::array kFiles = {"/vendor/data/640_slidebtn.png",
+                                 "/vendor/data/640_slidebtn_reverse.png"};  // not read
+  const SKIA_Text caption = soundText(from.text);
+  return make<SlideE>(fromSide, &from.rect, &caption, kFiles.at(fromSide));
 }
 
-Made makeFullScreen(const Parts&) { return make<FullScreen>(0); }
-Made makeProgressbar(const Parts& from) { return make<Progressbar>(0, &from.rect, &from.text); }
-Made makeKey(const Parts&) { return make<Key>(); }
+Made makeToastbox(const ref_t& from) {
+  const SKIA_Text line = soundText(from.text);
+  const SKIA_Text* const desc = from.desc;
+  if (desc == nullptr || desc->string_len == 0) return make<Toastbox>(&from.rect, &line);
+  const SKIA_Text message = soundText(*desc);
+  return make<Toastbox>(&from.rect, &line, &message);
+}
+
+Made makeFullScreen(const ref_t&) { return make<FullScreen>(0); }
+
+Made makeProgressbar(const ref_t& from) {
+  const SKIA_Text caption = soundText(from.text);
+  return make<Progressbar>(0, &from.rect, &caption);
+}
+
+Made makeKey(const ref_t&) { return make<Key>(); }
 
 struct InterfaceKind {
   int kind;
-  Made (*make)(const Parts& from);
+  Made (*make)(const ref_t& from);
 };
 
 // Ascending by kind; the kinds between build nothing.
 constexpr auto kInterfaceKinds = std::to_array<InterfaceKind>({
-    {10, makeDialog},
-    {14, makeDialogNew},
-    {15, makeButton},
-    {17, makeButton3<1>},
-    {18, makeButton3<5>},
-    {19, makeButton3<2>},
-    {21, makeSlideFromLeft},
-    {22, makeSlideFromRight},
-    {23, makeToastbox},
-    {24, makeFullScreen},
-    {25, makeProgressbar},
-    {26, makeKey},
+    {kRcuiDialog, makeDialog},
+    {kRcuiDialogNew, makeDialogNew},
+    {kRcuiButton, makeButton},
+    {kRcuiButton3Left, makeButton3<1>},
+    {kRcuiButton3Centre, makeButton3<5>},
+    {kRcuiButton3Right, makeButton3<2>},
+    {kRcuiSlideFromLeft, makeSlide<0>},
+    {kRcuiSlideFromRight, makeSlide<1>},
+    {kRcuiToastbox, makeToastbox},
+    {kRcuiFullScreen, makeFullScreen},
+    {kRcuiProgressbar, makeProgressbar},
+    {kRcuiKey, makeKey},
 });
 static_assert(std::ranges::is_sorted(kInterfaceKinds, {}, &InterfaceKind::kind));
-constexpr int kFirstInterface = 10;
+constexpr int kFirstInterface = kRcuiDialog;
 constexpr int kLastInterface = 42;
 
-// By kind. The types are not the numbers of the pictures that they are named after: meant so.
+enum class Caption { Unread, Read };
 enum class Column { None, Continue, Begin };
 struct ItemKind {
   int type;
+  Caption caption;
   Column column;  // where the item stands while it is visible
 };
-constexpr int kStackedType = 1;
+constexpr int kPlatformsOwn = 14;  // a type of which the platform alone knows the look
 constexpr int kTypeLimit = 15;
+
+// By kind.
 constexpr auto kItemKinds = std::to_array<ItemKind>({
-    {1, Column::None},
-    {14, Column::None},
-    {3, Column::None},
-    {14, Column::None},
-    {6, Column::None},
-    {7, Column::None},
-    {14, Column::None},
-    {14, Column::Continue},
-    {14, Column::Begin},
-    {0, Column::None},
+    {SKIA_TEXTBOX, Caption::Read, Column::None},
+    {kPlatformsOwn, Caption::Unread, Column::None},
+    {SKIA_BOX, Caption::Unread, Column::None},
+    {kPlatformsOwn, Caption::Unread, Column::None},
+    {SKIA_LINE, Caption::Unread, Column::None},
+    {SKIA_IMAGE, Caption::Read, Column::None},
+    {kPlatformsOwn, Caption::Unread, Column::None},
+    {kPlatformsOwn, Caption::Unread, Column::Continue},
+    {kPlatformsOwn, Caption::Unread, Column::Begin},
+    {SKIA_LABEL, Caption::Read, Column::None},
 });
 static_assert(kItemKinds.size() == kFirstInterface);
-constexpr ItemKind kRefused = {kTypeLimit, Column::None};
+constexpr ItemKind kStacked = {SKIA_TEXTBOX, Caption::Read, Column::None};
+constexpr ItemKind kRefused = {kTypeLimit, Caption::Unread, Column::None};
 
 ItemKind itemKind(int kind) {
   const auto row = static_cast<std::size_t>(kind);
@@ -215,7 +225,7 @@ WidgetRcui::WidgetRcui(ref_t* ref, const ref_cb_t* cb, unsigned int unused) {
     complain("ref is NULL");
   } else if (ref->kind >= 0 && ref->kind < kFirstInterface) {
     ref->index = makeRcuiWidget(ref, unused);
-  } else {
+  } else if (ref->kind <= kLastInterface) {
     makeRcuiInterface(ref, cb, unused);
   }
 }
@@ -227,19 +237,19 @@ int WidgetRcui::makeRcuiWidget(const ref_t* ref, unsigned int) {
     complain("ref is NULL");
     return 0;
   }
-  auto [type, column] = itemKind(ref->kind);
-  if (type >= kTypeLimit) {
+  ItemKind item = itemKind(ref->kind);
+  if (item.type >= kTypeLimit) {
     kLog.print(LogLevel::Debug, "makeRcuiWidget item(%d) iyys not allow", ref->kind);
     return 0;
   }
   rect = ref->rect;
   point = {rect.x, rect.y, rect.w, rect.h, rect.color, ref->lineWidth};
-  if (column != Column::None && ref->visible != 0) {
-    rect = placeInColumn(rect, column);
-    type = kStackedType;
+  if (item.column != Column::None && ref->visible != 0) {
+    rect = placeInColumn(rect, item.column);
+    item = kStacked;
   }
-  const SKIA_Text caption = soundText(ref->text);
-  return MWWList_addQueue_c(type, &rect, &point, &caption);
+  const SKIA_Text caption = item.caption == Caption::Read ? soundText(ref->text) : ref->text;
+  return MWWList_addQueue_c(item.type, &rect, &point, &caption);
 }
 
 void WidgetRcui::makeRcuiInterface(const ref_t* ref, const ref_cb_t* cb, unsigned int unused) {
@@ -253,7 +263,7 @@ void WidgetRcui::makeRcuiInterface(const ref_t* ref, const ref_cb_t* cb, unsigne
   }
   const auto row = std::ranges::find(kInterfaceKinds, ref->kind, &InterfaceKind::kind);
   if (row == kInterfaceKinds.end()) return;
-  Made made = row->make({ref->dialogKind, ref->rect, soundText(ref->text), ref->desc});
+  Made made = row->make(*ref);
   if (made == nullptr) return;
   made->setActive(0);  // a Key is active already, and its callbacks are still to come
   w = std::move(made);

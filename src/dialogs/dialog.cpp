@@ -12,14 +12,11 @@ namespace MW {
 
 namespace {
 
-constexpr int kHookKeyKind = 13;
 constexpr int kSmallTextPercent = 30;  // of a row, where there are two lines
 
-// The second line of the kind that was constructed last and had one. A kind without one takes it:
-// meant so.
+// The second line of the dialog that was constructed last and had one. A kind without one takes it
+// over; none of those draws it.
 constinit std::atomic<const char*> lastSecondLine = nullptr;
-
-const DialogClass& classOf(int kind) { return dialogClass(Dialog::isType(kind)); }
 
 void putIfGiven(SKIA_Text& record, const char* words) {
   if (words != nullptr) putText(record, boundedText(words));
@@ -28,7 +25,6 @@ void putIfGiven(SKIA_Text& record, const char* words) {
 }  // namespace
 
 Dialog::Dialog(int dialogKind) : PromptDialog("DIALOG"), kind(dialogKind) {
-  answersHookKey = kind == kHookKeyKind;
   setRect(dialogKind);
   fillIn();
   Window::registerWidget(this);
@@ -37,21 +33,22 @@ Dialog::Dialog(int dialogKind) : PromptDialog("DIALOG"), kind(dialogKind) {
 Dialog::~Dialog() { leaveWindow(); }
 
 void Dialog::fillIn() {
-  const DialogKind& row = dialogKind(kind);
-  button1.enabled = row.enabled1;
-  button2.enabled = row.enabled2;
-  if (row.messageSize != 0) message.size = row.messageSize;
-  if (row.secondSize != 0) second.size = row.secondSize;
-  if (row.second != nullptr) lastSecondLine = row.second;
-  putIfGiven(frame.title, row.title);
-  putIfGiven(message, row.message);
-  putIfGiven(second, row.second != nullptr ? row.second : lastSecondLine.load());
-  putIfGiven(button1.caption, row.button1);
-  putIfGiven(button2.caption, row.button2);
+  const CatalogueEntry& entry = catalogueEntry(kind);
+  const auto& [firstLine, secondLine] = entry.lines;
+  const auto& [left, right, touches] = entry.buttons;
+  button1.enabled = touches == Touches::None ? 0 : 1;
+  button2.enabled = touches == Touches::Both ? 1 : 0;
+  if (entry.letterSize != 0) message.size = second.size = entry.letterSize;
+  if (secondLine != nullptr) lastSecondLine = secondLine;
+  putIfGiven(frame.title, entry.title);
+  putIfGiven(message, firstLine);
+  putIfGiven(second, lastSecondLine);
+  putIfGiven(button1.caption, left);
+  putIfGiven(button2.caption, right);
 }
 
 int Dialog::show(unsigned int ticks) {
-  const DialogClass& layout = classOf(kind);
+  const DialogLayout& layout = dialogLayout(kind);
   const std::lock_guard guard(stateLock);
   frame.body.color = updateBlink(ticks);
   drawFrame(frame);
@@ -70,18 +67,19 @@ int Dialog::show(unsigned int ticks) {
 }
 
 bool Dialog::onRecvEvent(event_data* event, unsigned int arg) {
-  if (event == nullptr || event->type != kEventKeyRelease) {
-    return PromptDialog::onRecvEvent(event, arg);
+  if (event == nullptr) return false;
+  switch (event->type) {
+    case kEventKeyPress: onPressKey(event->key); return true;
+    case kEventKeyRelease: onReleaseKey(event->key); return true;
+    default: return PromptDialog::onRecvEvent(event, arg);
   }
-  onReleaseKey(event->key);
-  return true;
 }
 
-int Dialog::isType(int dialogKind) { return MW::dialogKind(dialogKind).layout; }
+int Dialog::isType(int dialogKind) { return dialogLayout(dialogKind).number; }
 
 void Dialog::setRect(int dialogKind) {
   const ScreenSize screen = presentScreen();
-  const DialogClass& layout = classOf(dialogKind);
+  const DialogLayout& layout = dialogLayout(dialogKind);
   const DialogGrid grid = layOutGrid(screen, layout.rows);
   const auto smallText = toPixels(percentOf(grid.row, kSmallTextPercent));
   const bool isSmall = layout.secondLine == SecondLine::Drawn;
@@ -90,7 +88,7 @@ void Dialog::setRect(int dialogKind) {
   const std::lock_guard guard(stateLock);
   layOutFrame(frame, screen, grid);
   styleTitle(frame.title, layout.align);
-  frame.backdrop.color = layout.backdrop == Backdrop::Alarm ? kAlarmColor : kColorShadow;
+  frame.backdrop.color = layout.backdrop;
   messageRect = messageArea(grid);
   if (isSmall) messageRect.h = smallText;
   message.color = kColorWhite;
@@ -114,6 +112,8 @@ void Dialog::setDesc(const char* newMessage) {
   const std::lock_guard guard(stateLock);
   putTextOpen(message, boundedText(newMessage));
 }
+
+void Dialog::onPressKey(kbd_event key) { pressKey(key, kind); }
 
 void Dialog::onReleaseKey(kbd_event key) {
   keyClicks.follow(key, GetTicks());

@@ -1,22 +1,15 @@
 /// The built-in dialogs as data.
 #pragma once
 
+#include <cstdint>
+
 namespace MW {
 
-enum class Backdrop { Shadow, Alarm };
 enum class Buttons { None, One, Two, Progress };
 enum class SecondLine { Hidden, Drawn };
 
-/// What dialogs of a class share.
-struct DialogClass {
-  int rows;  // of the frame
-  Buttons buttons;
-  SecondLine secondLine;
-  Backdrop backdrop;
-  int align;  // of title and message
-};
-
-enum DialogClassNumber {
+/// Dialog::isType() tells these numbers.
+enum LayoutNumber {
   kStandard,
   kTwoLine,
   kHook,
@@ -27,23 +20,45 @@ enum DialogClassNumber {
   kWait
 };
 
-/// One kind. Null texts leave what stands in the dialog.
-struct DialogKind {
-  int kind;
-  DialogClassNumber layout;
-  const char* title;
-  const char* message;
-  const char* second;
-  const char* button1;
-  const char* button2;
-  int enabled1;
-  int enabled2;
-  int messageSize;  // pixels; 0: as the class says
-  int secondSize;
+/// What the kinds of one layout share.
+struct DialogLayout {
+  LayoutNumber number;
+  int rows;  // of the frame
+  Buttons buttons;
+  SecondLine secondLine;
+  int align;  // of title and message
+  uint32_t backdrop;
 };
 
-/// The row of a kind; one without texts for a kind that is not in the table.
-const DialogKind& dialogKind(int kind);
-const DialogClass& dialogClass(int number);
+/// What stands below the title. Null: no second line.
+struct Lines {
+  const char* first = nullptr;
+  const char* second = nullptr;
+};
+
+/// The buttons that touches reach, drawn or not.
+enum class Touches { None, Left, Both };
+
+/// What stands on the buttons (null: nothing), and which of them answer.
+struct ButtonRow {
+  const char* left = nullptr;
+  const char* right = nullptr;
+  Touches touches = Touches::Both;
+};
+
+/// What one kind says. Null texts leave what stands in the dialog.
+struct CatalogueEntry {
+  int kind;
+  LayoutNumber layout;
+  const char* title;
+  Lines lines;
+  ButtonRow buttons;
+  int letterSize = 0;  // of the lines, in pixels; 0: as the layout says
+};
+
+/// The entry of a kind; one without texts for a number that is not in the catalogue.
+const CatalogueEntry& catalogueEntry(int kind);
+/// The layout of a kind.
+const DialogLayout& dialogLayout(int kind);
 
 }  // namespace MW

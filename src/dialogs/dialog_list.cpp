@@ -1,9 +1,9 @@
 #include <MW/dialog_list.h>
-#include <MW/event_service.h>
 #include <MW/window.h>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
+#include "core/hit_test.h"
 #include "core/life_guard.h"
 #include "dialogs/dialog_parts.h"
 
@@ -39,6 +39,9 @@ SKIA_Rect markIn(const SKIA_Rect& box) {
 }  // namespace
 
 DialogList::DialogList(const char* title) : FramedDialog(kWord) {
+  answer1 = static_cast<Answer>(&DialogList::onBtn1Released);
+  answer2 = static_cast<Answer>(&DialogList::onBtn2Released);
+  leavesInTheDark = false;
   kLog.print(LogLevel::Debug, "call registerWidget");
   putText(frame.title, boundedText(title));
   putText(button1.caption, "CANCEL");
@@ -72,7 +75,7 @@ int DialogList::addIndex(const char* rowText) {
   return count++;
 }
 
-// One further than the last row: meant so.
+// `index` may be one further than the last row.
 void DialogList::setText(int index, const char* rowText) {
   const auto given = wholeText(rowText, kLongestLine);
   if (!given || given->empty()) return;
@@ -139,19 +142,12 @@ int DialogList::show(unsigned int ticks) {
 }
 
 bool DialogList::onRecvEvent(event_data* event, unsigned int arg) {
-  if (event == nullptr || isHeldByOther(*event, kEventRelease)) return false;
+  if (event == nullptr || (isPointerEvent(*event) && hold.isOthers(event->mouse))) return false;
   switch (event->type) {
-    case kEventMotion: return hoverAt(event);
     case kEventPress: return pressTarget(event);
-    case kEventRelease: return releaseAt(event);
+    case kEventRelease: return releaseTarget(event);
     default: return FramedDialog::onRecvEvent(event, arg);
   }
-}
-
-bool DialogList::hoverAt(event_data* event) {
-  const LifeGuard self(this);
-  onHover(event);
-  return self.isAlive() && lcdOnFlag != 0 && leaveButtons(event);
 }
 
 bool DialogList::pressTarget(event_data* event) {
@@ -167,14 +163,10 @@ bool DialogList::pressTarget(event_data* event) {
   return true;
 }
 
-bool DialogList::releaseAt(event_data* event) {
-  const LifeGuard self(this);
-  const bool answers = lcdOnFlag != 0;
-  if (answers && liftFrom(button1, event)) onBtn1Released(event->mouse);
-  if (self.isAlive() && answers && liftFrom(button2, event)) onBtn2Released(event->mouse);
-  if (!self.isAlive()) return true;
+bool DialogList::releaseTarget(event_data* event) {
+  if (!releaseButtons(event)) return true;
   enable(1, 1, 1);
-  setSelect(0);
+  hold.letGo();
   onRelease(event);
   return true;
 }
@@ -188,9 +180,6 @@ int DialogList::position2index(mouse_event mouse) {
 }
 
 int DialogList::rowAt(const mouse_event& mouse) const {
-  const auto isBetween = [](int64_t low, int64_t value, int64_t high) {
-    return low < value && value < high;
-  };
   const std::lock_guard guard(stateLock);
   for (int i = 0; i < count; ++i) {
     const auto& [box, area, words] = rows.at(static_cast<std::size_t>(i));
@@ -203,7 +192,7 @@ int DialogList::rowAt(const mouse_event& mouse) const {
 }
 
 void DialogList::onListPress(mouse_event mouse) {
-  setSelect(static_cast<int>(mouse.finger + 1));
+  hold.press(mouse);
   int index = position2index(mouse);
   if (index == kNoRow) return;
   write(selectedIndex, index);
@@ -228,8 +217,7 @@ void DialogList::onBtn2Released(mouse_event) {
 }
 
 bool DialogList::isOnRows(const event_data* event) const {
-  const SKIA_Rect body = read(frame.body);
-  return read(listEnabled) != 0 && EventService::isMouseEventForMe(&body, event);
+  return read(listEnabled) != 0 && isUnder(frame.body, event);
 }
 
 void DialogList::enable(int first, int second, int list) {

@@ -22,12 +22,13 @@ struct LineGrid {
   int64_t size;  // of the letters
 };
 
-constexpr LineGrid divideBody(int64_t bodyHeight, int last) {
-  const int64_t pitch = bodyHeight / (last + 2);
-  return {pitch, pitch / (last + 2), last == 0 ? bodyHeight / kSingleLineParts : pitch};
+constexpr LineGrid divideBody(int64_t bodyHeight, std::size_t lines) {
+  const auto parts = static_cast<int64_t>(lines + 1);
+  const int64_t pitch = bodyHeight / parts;
+  return {pitch, pitch / parts, lines == 1 ? bodyHeight / kSingleLineParts : pitch};
 }
-static_assert(divideBody(228, 0).pitch == 114 && divideBody(228, 0).gap == 57);
-static_assert(divideBody(228, 0).size == 76 && divideBody(228, 2).size == 57);
+static_assert(divideBody(228, 1).pitch == 114 && divideBody(228, 1).gap == 57);
+static_assert(divideBody(228, 1).size == 76 && divideBody(228, 3).size == 57);
 
 SKIA_Rect faceOf(int button, int buttons, const DialogGrid& grid) {
   const int64_t w = (grid.w - (kFaceGap * (buttons - 1) + 2 * kFaceGap)) / buttons;
@@ -82,11 +83,27 @@ int DialogNew::show(unsigned int ticks) {
   if (descBlink == 1) frame.body.color = updateBlink(ticks);
   drawFrame(frame);
   for (std::size_t i = 0; i < lineCount(); ++i) skia_add_label_c(descRects.at(i), descs.at(i));
-  if (buttonMode == kProgressRow) drawProgress(ticks);
-  if (buttonMode == kOneButton || buttonMode == kTwoButtons) drawButton(button1);
-  if (buttonMode == kTwoButtons) drawButton(button2);
+  switch (buttonMode) {
+    case kProgressRow: drawProgress(ticks); break;
+    case kOneButton: drawButton(button1); break;
+    case kTwoButtons:
+      drawButton(button1);
+      drawButton(button2);
+      break;
+    default: break;
+  }
   return 1;
 }
+
+bool DialogNew::onRecvEvent(event_data* event, unsigned int arg) {
+  if (event == nullptr || event->type != kEventKeyPress) {
+    return PromptDialog::onRecvEvent(event, arg);
+  }
+  onPressKey(event->key);
+  return true;
+}
+
+void DialogNew::onPressKey(kbd_event key) { pressKey(key, read(buttonMode)); }
 
 void DialogNew::setRect() {
   const std::lock_guard guard(stateLock);
@@ -101,16 +118,24 @@ void DialogNew::layOut() {
   if (frame.title.size == 0) frame.title.size = kDialogTitleSize;
   layOutLines();
   btnNormalColor = kColorWhite;
-  if (buttonMode == kNoButtons) return;
-  const int buttons = buttonMode == kTwoButtons ? 2 : 1;
-  placeButton(button1, grid, faceOf(0, buttons, grid));
-  if (buttons == 2) placeButton(button2, grid, faceOf(1, buttons, grid));
+  layOutButtons(grid);
+}
+
+void DialogNew::layOutButtons(const DialogGrid& grid) {
+  switch (buttonMode) {
+    case kOneButton:
+    case kProgressRow: placeButton(button1, grid, faceOf(0, 1, grid)); break;
+    case kTwoButtons:
+      placeButton(button1, grid, faceOf(0, 2, grid));
+      placeButton(button2, grid, faceOf(1, 2, grid));
+      break;
+    default: break;
+  }
 }
 
 void DialogNew::layOutLines() {
-  if (lineCount() == 0) return;
   const SKIA_Rect& body = frame.body;
-  const auto [pitch, gap, size] = divideBody(body.h, descLast);
+  const auto [pitch, gap, size] = divideBody(body.h, lineCount());
   int64_t top = body.y + gap;
   for (std::size_t i = 0; i < lineCount(); ++i) {
     descRects.at(i) = makeRect(body.x + gap, top, body.w - 2 * gap, pitch, 0);
@@ -121,7 +146,8 @@ void DialogNew::layOutLines() {
 }
 
 std::size_t DialogNew::lineCount() const {
-  return descLast == kNoLines ? 0 : static_cast<std::size_t>(descLast) + 1;
+  const bool hasLines = descLast >= 0 && descLast < kLines;
+  return hasLines ? static_cast<std::size_t>(descLast) + 1 : 0;
 }
 
 void DialogNew::setDesc(const char* line1, const char* line2, const char* line3, int align) {

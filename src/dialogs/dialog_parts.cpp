@@ -19,17 +19,17 @@ constexpr int64_t kTextMargin = 10;
 void layOutFrame(DialogFrame& dialog, ScreenSize screen, const DialogGrid& grid) {
   const auto [x, y, w, row, body, height] = grid;
   dialog.backdrop = overScreen(screen, dialog.backdrop.color);
-  dialog.frame = makeRect(x, y, w, height, kDialogFrameColor);
+  dialog.frame = makeRect(x, y, w, height, kColorGrey);
   dialog.titleBar = makeRect(x + 1, y + 1, w - 2, row, kColorBlack);
   dialog.titleArea = makeRect(x + kTitleMarginX, y + kTitleMarginY, w - 2 * kTitleMarginX,
                               row - 2 * kTitleMarginY, 0);
   dialog.body = makeRect(x + 1, y + row + 1, w - 2, body - 2, kColorBlack);
   const int32_t lineY = toPixels(y + 1 + row);
-  dialog.separator = {toPixels(x + 1), lineY, toPixels(x + 1 + w - 2), lineY, kDialogTitleColor, 1};
+  dialog.separator = {toPixels(x + 1), lineY, toPixels(x + 1 + w - 2), lineY, kColorHighlight, 1};
 }
 
 void styleTitle(SKIA_Text& title, int align) {
-  title.color = kDialogTitleColor;
+  title.color = kColorHighlight;
   title.align = align;
   title.size = kDialogTitleSize;
 }

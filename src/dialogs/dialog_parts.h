@@ -13,9 +13,6 @@
 
 namespace MW {
 
-constexpr uint32_t kDialogFrameColor = kColorGrey;
-constexpr uint32_t kDialogTitleColor = kColorHighlight;
-constexpr uint32_t kAlarmColor = kColorRed;
 constexpr int kDialogTitleSize = 70;  // pixels
 constexpr int kDialogTextSize = 60;   // pixels
 

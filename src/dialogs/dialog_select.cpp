@@ -1,5 +1,4 @@
 #include <MW/dialog_select.h>
-#include <MW/event_service.h>
 #include <MW/window.h>
 
 #include "core/class_log.h"
@@ -11,8 +10,7 @@ namespace MW {
 
 namespace {
 
-constexpr ClassLog kLog("BUTTON");  // meant so, though it is a dialog
-constexpr uint32_t kPanelColor = kColorGrey;
+constexpr ClassLog kLog("BUTTON");
 constexpr int kTextSize = 70;  // pixels
 constexpr int kInsetPercent = 90;
 constexpr int kPanelPercent = 80;
@@ -20,7 +18,6 @@ constexpr int kTitlePart = 10;  // of the panel's height
 constexpr int kRowPart = 4;     // of the panel's height
 constexpr int kFacePart = 4;    // of the panel's width
 constexpr int kColumns = 2;
-constexpr int kHooked = 13;  // the variant that answers the hook key
 
 constexpr SKIA_Rect layOutPanel(ScreenSize screen) {
   return makeRect(screen.w - percentOf(screen.w, kInsetPercent),
@@ -76,7 +73,7 @@ bool DialogSelect::onRecvEvent(event_data* event, unsigned int) {
   switch (event->type) {
     case kEventMotion: return hoverAt(event);
     case kEventPress: return pressAt(event);
-    case kEventRelease: releaseAt(event); return false;  // never taken: meant so
+    case kEventRelease: releaseAt(event); return false;
     case kEventKeyPress: onPressKey(event->key); return true;
     case kEventKeyRelease: onReleaseKey(event->key); return true;
     case kEventUser: onPlugKey(event->key); return true;
@@ -88,7 +85,7 @@ bool DialogSelect::hoverAt(event_data* event) {
   const LifeGuard self(this);
   onHover(event);
   if (!self.isAlive() || enabled == 0) return false;
-  if (isOn(select - 1, event)) return true;
+  if (isOn(pressedChoice(), event)) return true;
   restoreFaces();
   select = 0;
   return false;
@@ -98,9 +95,9 @@ bool DialogSelect::pressAt(event_data* event) {
   const LifeGuard self(this);
   onPress(event);
   if (!self.isAlive() || enabled == 0) return false;
-  for (int i = 0; i < static_cast<int>(kChoices); ++i) {
+  for (unsigned int i = 0; i < kChoices; ++i) {
     if (!isOn(i, event)) continue;
-    onBtnPressed(event->mouse, i);
+    onBtnPressed(event->mouse, static_cast<int>(i));
     return true;
   }
   return false;
@@ -109,8 +106,8 @@ bool DialogSelect::pressAt(event_data* event) {
 void DialogSelect::releaseAt(event_data* event) {
   const LifeGuard self(this);
   if (enabled != 0) {
-    const int chosen = select - 1;
-    if (isOn(chosen, event)) onBtnReleased(event->mouse, chosen);
+    const unsigned int chosen = pressedChoice();
+    if (isOn(chosen, event)) onBtnReleased(event->mouse, static_cast<int>(chosen));
     if (!self.isAlive()) return;
     restoreFaces();
   }
@@ -119,10 +116,7 @@ void DialogSelect::releaseAt(event_data* event) {
 
 void DialogSelect::lcdOn(int on) { enabled = on; }
 
-void DialogSelect::onHover(event_data* event) {
-  if (event != nullptr) hoverCallback(&event->mouse);
-}
-
+void DialogSelect::onHover(event_data* event) { tell(hoverCallback, event); }
 void DialogSelect::onPress(event_data* event) { tell(touchPressCallback, event); }
 
 void DialogSelect::onRelease(event_data* event) {
@@ -141,7 +135,7 @@ void DialogSelect::setRect(int, int) {
   const SKIA_Rect panel = layOutPanel(screen);
   const std::lock_guard guard(stateLock);
   backdrop = overScreen(screen, kColorShadow);
-  border = grown(panel, 1, kPanelColor);
+  border = grown(panel, 1, kColorGrey);
   titleStrip = {panel.x, panel.y, panel.w, panel.h / kTitlePart, kColorBlack};
   int index = 0;
   for (Choice& each : choices) each.face = layOutFace(panel, index++, optionColor);
@@ -176,7 +170,7 @@ void DialogSelect::onBtnReleased(mouse_event mouse, int index) {
 
 void DialogSelect::onPressKey(kbd_event key) {
   if (key.code == kKeyHook) {
-    if (buttonType == kHooked) onHookKeyPressed();
+    if (buttonType == kHookVariant) onHookKeyPressed();
     return;
   }
   kLog.print(LogLevel::Debug, "key pressed sym = %d", static_cast<int>(key.code));
@@ -193,11 +187,13 @@ void DialogSelect::onHookKeyPressed() {
   hookKeyCallback(0);
 }
 
-bool DialogSelect::isOn(int index, const event_data* event) const {
-  const auto asked = static_cast<unsigned int>(index);
-  if (asked >= kChoices) return false;
-  const SKIA_Rect face = read(choices.at(asked).face);
-  return EventService::isMouseEventForMe(&face, event);
+// One less than the selection, which anyone may have set to any number.
+unsigned int DialogSelect::pressedChoice() const {
+  return static_cast<unsigned int>(select.load()) - 1;
+}
+
+bool DialogSelect::isOn(unsigned int index, const event_data* event) const {
+  return index < kChoices && isUnder(choices.at(index).face, event);
 }
 
 void DialogSelect::restoreFaces() {

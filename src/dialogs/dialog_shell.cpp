@@ -6,6 +6,7 @@
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
+#include "core/hit_test.h"
 #include "dialogs/dialog_parts.h"
 
 namespace MW {
@@ -94,7 +95,6 @@ void DialogShell::setRect_static() {
   btnNormalColor = kColorWhite;
 }
 
-// The second button is drawn, empty, though it is not laid out: meant so.
 int DialogShell::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
   if (acceptLines == 0) return 1;
@@ -106,12 +106,14 @@ int DialogShell::show(unsigned int ticks) {
     if (line.string_len != 0) skia_add_textbox_c(lineRects.at(i), line);
   }
   drawButton(button1);
-  drawButton(button2);
+  drawButton(button2);  // of no size while there is one button
   return 1;
 }
 
 bool DialogShell::onRecvEvent(event_data* event, unsigned int arg) {
-  if (event == nullptr || isHeldByOther(*event, kEventPress)) return false;
+  if (event == nullptr) return false;
+  const bool mayAnswer = event->type == kEventRelease || !isPointerEvent(*event);
+  if (!mayAnswer && hold.isOthers(event->mouse)) return false;
   return FramedDialog::onRecvEvent(event, arg);
 }
 

@@ -1,5 +1,4 @@
 #include <MW/dialog_slide.h>
-#include <MW/event_service.h>
 #include <MW/window.h>
 
 #include "core/class_log.h"
@@ -12,7 +11,6 @@ namespace MW {
 namespace {
 
 constexpr ClassLog kLog("DIALOGSLIDE");
-constexpr int kFirstRepeatKind = 3;
 constexpr int kLastRepeatKind = 5;
 constexpr int kFrameRows = 3;
 constexpr int kMessageSize = 70;  // pixels, and so the rest
@@ -24,15 +22,13 @@ void answer(const char* side, void (*call)(int)) {
   if (call != nullptr) call(0);
 }
 
-int holderOf(const mouse_event& mouse) { return static_cast<int>(mouse.finger + 1); }
-
 }  // namespace
 
 DialogSlide::DialogSlide(int dialogKind) : kind(dialogKind) {
   setType(kTopLayer);
   setRect_init(dialogKind);
   setRect(dialogKind);
-  if (kind >= kFirstRepeatKind && kind <= kLastRepeatKind) {
+  if (kind >= kRepeatPassedTest && kind <= kLastRepeatKind) {
     setTitle("Warning");
     setDesc("Test already pass. Try again?");
     setLeft("CANCEL");
@@ -87,17 +83,14 @@ bool DialogSlide::letGoAt(const event_data* event) {
   return true;
 }
 
-// A second finger takes the thumb over: meant so.
 bool DialogSlide::grabAt(const event_data* event) {
-  const SKIA_Rect home = read(thumbHome);
-  if (lcdOnFlag == 0 || !EventService::isMouseEventForMe(&home, event)) return false;
+  if (lcdOnFlag == 0 || !isUnder(thumbHome, event)) return false;
   onSlidePressed(event->mouse);
   return true;
 }
 
 bool DialogSlide::isHeldBy(const mouse_event& mouse) const {
-  const int holder = select;
-  return holder != 0 && holder == holderOf(mouse) && lcdOnFlag != 0;
+  return hold.isOwner(mouse) && lcdOnFlag != 0;
 }
 
 void DialogSlide::lcdOn(int on) { lcdOnFlag = on; }
@@ -127,7 +120,7 @@ void DialogSlide::setRect_init(int) {
   style(second, kColorWhite, SKIA_ALIGN_LEFT, kMessageSize);
   style(leftCaption, kColorBlack, SKIA_ALIGN_CENTRE, captionSize(grid));
   style(thumbCaption, kColorWhite, SKIA_ALIGN_CENTRE, captionSize(grid));
-  style(rightCaption, kColorBlack, SKIA_ALIGN_CENTRE, captionSize(grid));  // on black: meant so
+  style(rightCaption, kColorBlack, SKIA_ALIGN_CENTRE, captionSize(grid));
 }
 
 void DialogSlide::setRect(int) {
@@ -152,8 +145,8 @@ void DialogSlide::replace(SKIA_Text& record, const char* words) {
 }
 
 void DialogSlide::onSlidePressed(mouse_event mouse) {
-  setSelect(holderOf(mouse));
-  kLog.print(LogLevel::Debug, "onSlidePressed!!: %d", holderOf(mouse));
+  hold.press(mouse);
+  kLog.print(LogLevel::Debug, "onSlidePressed!!: %d", FingerHold::wordOf(mouse));
 }
 
 void DialogSlide::onSlideHover(mouse_event mouse) {
@@ -174,9 +167,9 @@ void DialogSlide::onSlideHover(mouse_event mouse) {
 }
 
 void DialogSlide::onSlideReleased(mouse_event mouse) {
-  setSelect(0);
+  hold.letGo();
   setRect(kind);
-  kLog.print(LogLevel::Debug, "onSlideReleased!!:%d", holderOf(mouse));
+  kLog.print(LogLevel::Debug, "onSlideReleased!!:%d", FingerHold::wordOf(mouse));
   switch (read(slideState)) {
     case kAtLeft: answer("Left Slide", leftCallback); break;
     case kAtRight: answer("Right Slide", rightCallback); break;

@@ -1,8 +1,8 @@
-#include <MW/event_service.h>
 #include <MW/framed_dialog.h>
 
 #include "core/class_log.h"
 #include "core/life_guard.h"
+#include "dialogs/tell.h"
 
 namespace MW {
 
@@ -37,11 +37,8 @@ bool FramedDialog::onRecvEvent(event_data* event, unsigned int) {
 bool FramedDialog::hoverAt(event_data* event) {
   const LifeGuard self(this);
   onHover(event);
-  return self.isAlive() && leaveButtons(event);
-}
-
-bool FramedDialog::leaveButtons(const event_data* event) {
-  if (select == 0) return false;
+  if (!self.isAlive() || !hold.isHeld()) return false;
+  if (!leavesInTheDark && lcdOnFlag == 0) return false;
   for (DialogButton* const button : {&button1, &button2}) {
     if (!isOn(*button, event)) restoreFace(*button);
   }
@@ -63,15 +60,18 @@ const DialogButton* FramedDialog::pressAt(event_data* event) {
   return nullptr;
 }
 
-// Both buttons answer where their faces overlap, which they do where one wide button hides an
-// enabled second one: meant so.
 bool FramedDialog::releaseAt(event_data* event) {
-  const LifeGuard self(this);
-  const bool answers = lcdOnFlag != 0;
-  if (answers && liftFrom(button1, event)) onBtn1Released(event->mouse);
-  if (self.isAlive() && answers && liftFrom(button2, event)) onBtn2Released(event->mouse);
-  if (self.isAlive()) onRelease(event);
+  if (releaseButtons(event)) onRelease(event);
   return true;
+}
+
+// Both answer where their faces overlap: one wide button may hide an enabled second one.
+bool FramedDialog::releaseButtons(const event_data* event) {
+  if (lcdOnFlag == 0) return true;
+  const LifeGuard self(this);
+  if (liftFrom(button1, event)) (this->*answer1)(event->mouse);
+  if (self.isAlive() && liftFrom(button2, event)) (this->*answer2)(event->mouse);
+  return self.isAlive();
 }
 
 bool FramedDialog::liftFrom(DialogButton& button, const event_data* event) {
@@ -81,17 +81,9 @@ bool FramedDialog::liftFrom(DialogButton& button, const event_data* event) {
 
 void FramedDialog::lcdOn(int on) { lcdOnFlag = on; }
 
-void FramedDialog::onHover(event_data* event) {
-  if (event != nullptr) hoverCallback(&event->mouse);
-}
-
-void FramedDialog::onPress(event_data* event) {
-  if (event != nullptr) pressCallback(&event->mouse);
-}
-
-void FramedDialog::onRelease(event_data* event) {
-  if (event != nullptr) clickCallback(&event->mouse);
-}
+void FramedDialog::onHover(event_data* event) { tell(hoverCallback, event); }
+void FramedDialog::onPress(event_data* event) { tell(pressCallback, event); }
+void FramedDialog::onRelease(event_data* event) { tell(clickCallback, event); }
 
 void FramedDialog::onBtn1Pressed(mouse_event mouse) {
   ClassLog(word).print(LogLevel::Debug, "btn1 pressed!!");
@@ -108,7 +100,6 @@ void FramedDialog::onBtn1Released(mouse_event) {
   button1Callback(0);
 }
 
-// The right button dismisses the dialog by itself, the left one does not: meant so.
 void FramedDialog::onBtn2Released(mouse_event) {
   ClassLog(word).print(LogLevel::Debug, "btn2 released!!");
   hide();
@@ -125,20 +116,13 @@ void FramedDialog::onReleaseKey(kbd_event key) {
   keyReleaseCallback(&key);
 }
 
-bool FramedDialog::isHeldByOther(const event_data& event, EventCode last) const {
-  if (event.type < kEventMotion || event.type > last) return false;
-  const int holder = select;
-  return holder != 0 && holder != static_cast<int>(event.mouse.finger + 1);
-}
-
 void FramedDialog::pressButton(DialogButton& button, const mouse_event& mouse) {
   write(button.face.color, kColorHighlight);
-  setSelect(static_cast<int>(mouse.finger + 1));
+  hold.press(mouse);
 }
 
 bool FramedDialog::isOn(const DialogButton& button, const event_data* event) const {
-  const DialogButton current = read(button);
-  return current.enabled != 0 && EventService::isMouseEventForMe(&current.face, event);
+  return read(button.enabled) != 0 && isUnder(button.face, event);
 }
 
 // A button that takes no touches keeps its face.

@@ -11,12 +11,9 @@ constexpr uint32_t kMostStars = 10;
 PromptDialog::PromptDialog(const char* logWord) : FramedDialog(logWord) {}
 
 bool PromptDialog::onRecvEvent(event_data* event, unsigned int arg) {
-  if (event == nullptr) return false;
-  switch (event->type) {
-    case kEventKeyPress: onPressKey(event->key); return true;
-    case kEventUser: onPlugKey(event->key); return true;
-    default: return FramedDialog::onRecvEvent(event, arg);
-  }
+  if (event == nullptr || event->type != kEventUser) return FramedDialog::onRecvEvent(event, arg);
+  onPlugKey(event->key);
+  return true;
 }
 
 void PromptDialog::onPlugKey(kbd_event key) {
@@ -24,10 +21,10 @@ void PromptDialog::onPlugKey(kbd_event key) {
   plugCallback(&key);
 }
 
-void PromptDialog::onPressKey(kbd_event key) {
+void PromptDialog::pressKey(const kbd_event& key, int mode) {
   if (key.code != kKeyHook) {
-    FramedDialog::onPressKey(key);
-  } else if (answersHookKey) {
+    onPressKey(key);
+  } else if (mode == kHookMode) {
     onHookKeyPressed();
   }
 }

@@ -17,22 +17,22 @@ enum class Column { Left, Centre, Right };
 enum class Row { Top, Middle, Bottom };
 
 struct Cell {
-  int position;
+  Button3::Position position;
   Column column;
   Row row;
 };
 
 // A position that is not in the table is no cell.
 constexpr auto kCells = std::to_array<Cell>({
-    {1, Column::Left, Row::Bottom},
-    {2, Column::Right, Row::Bottom},
-    {5, Column::Centre, Row::Bottom},
-    {7, Column::Left, Row::Middle},
-    {8, Column::Right, Row::Middle},
-    {9, Column::Centre, Row::Middle},
-    {10, Column::Left, Row::Top},
-    {11, Column::Right, Row::Top},
-    {12, Column::Centre, Row::Top},
+    {Button3::kBottomLeft, Column::Left, Row::Bottom},
+    {Button3::kBottomRight, Column::Right, Row::Bottom},
+    {Button3::kBottomCentre, Column::Centre, Row::Bottom},
+    {Button3::kMiddleLeft, Column::Left, Row::Middle},
+    {Button3::kMiddleRight, Column::Right, Row::Middle},
+    {Button3::kMiddleCentre, Column::Centre, Row::Middle},
+    {Button3::kTopLeft, Column::Left, Row::Top},
+    {Button3::kTopRight, Column::Right, Row::Top},
+    {Button3::kTopCentre, Column::Centre, Row::Top},
 });
 
 // Three squares and four gaps fill the width, reckoned in thousandths of a pixel.
@@ -74,10 +74,8 @@ constexpr int64_t topOf(Row row, const Grid& grid, int screenHeight, int bottomO
 }
 
 constexpr const char* verdictOf(int position) {
-  constexpr int kPass = 1;
-  constexpr int kRetry = 5;
-  if (position == kPass) return "PASS";
-  return position == kRetry ? "RETRY" : "FAIL";
+  if (position == Button3::kBottomLeft) return "PASS";
+  return position == Button3::kBottomCentre ? "RETRY" : "FAIL";
 }
 
 SKIA_Text captionOf(const char* words) {
@@ -119,8 +117,8 @@ int Button3::getFontSize() { return read(caption1.size); }
 void Button3::setFontSize(int pixels) { write(caption1.size, pixels); }
 void Button3::setTextColor(unsigned int color) { write(caption1.color, color); }
 
-// The new length goes to the button box's own, empty, text, and the caption keeps its length:
-// meant so.
+// The new length goes to the button box's own text, which is empty; the caption keeps the length of
+// its construction.
 void Button3::setText(const char* newText) {
   const std::string_view given = boundedText(newText);
   const std::lock_guard guard(stateLock);

@@ -1,17 +1,16 @@
 #include <MW/button8.h>
-#include <MW/event_service.h>
 
 #include <algorithm>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/geometry.h"
+#include "core/hit_test.h"
 
 namespace MW {
 
 namespace {
 
-constexpr uint32_t kHeldColor = kColorRed;
 constexpr int kMarkSize = 60;   // pixels
 constexpr int kFrameWidth = 1;  // pixels
 constexpr double kGapPercent = 3.0;
@@ -22,7 +21,7 @@ struct Shape {
   int cols;
 };
 
-// By layout number.
+// By Button8::Layout.
 constexpr auto kShapes = std::to_array<Shape>({{1, 1}, {2, 2}, {3, 2}, {4, 2}, {2, 3}, {2, 4}});
 static_assert(std::ranges::all_of(kShapes, [](const Shape& shape) {
   return shape.rows * shape.cols <= Button8::kCells;
@@ -30,8 +29,8 @@ static_assert(std::ranges::all_of(kShapes, [](const Shape& shape) {
 
 using Cells = std::array<SKIA_Rect, Button8::kCells>;
 
-// The longer side of the shape decides how large the squares are. Its length goes through a float:
-// meant so.
+// The longer side of the shape decides how large the squares are. Its length goes through a float,
+// which rounds lengths above 2^24.
 constexpr int64_t sideOf(const SKIA_Rect& area, const Shape& shape) {
   const int count = std::max(shape.rows, shape.cols);
   const int length = shape.rows <= shape.cols ? area.w : area.h;
@@ -59,11 +58,6 @@ static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[1].x == 210);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[2].y == 218);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[2].w == 170);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {3, 2})[0].x == -22);  // too narrow: they overlap
-
-constexpr bool isWithin(const SKIA_Rect& cell, const mouse_event& mouse) {
-  return cell.x < mouse.x && mouse.x < int64_t{cell.x} + cell.w && cell.y < mouse.y &&
-         mouse.y < int64_t{cell.y} + cell.h;
-}
 
 template <typename Holders>
 constexpr unsigned int maskOf(const Holders& holders) {
@@ -94,10 +88,12 @@ Button8::Button8(int layout, const SKIA_Rect* area, const SKIA_Text* caption)
 
 Button8::~Button8() { leaveLayers(); }
 
+int Button8::show() { return show(0); }
+
 int Button8::show(unsigned int) {
   const std::lock_guard guard(stateLock);
   for (std::size_t i = 0; i < static_cast<std::size_t>(cellCount); ++i) {
-    cellRect.at(i).color = cellSelect.at(i) != 0 ? kHeldColor : rect.color;
+    cellRect.at(i).color = cellSelect.at(i) != 0 ? kColorRed : rect.color;
     skia_add_roundbox_c(cellRect.at(i));
     skia_add_label_c(cellRect.at(i), cellText.at(i));
   }
@@ -111,8 +107,7 @@ int Button8::hide() {
 }
 
 bool Button8::onRecvEvent(event_data* event, unsigned int) {
-  const SKIA_Rect area = read(rect);
-  if (!EventService::isMouseEventForMe(&area, event)) return false;
+  if (!isUnder(rect, event)) return false;
   switch (event->type) {
     case kEventPress: onPress(event); return true;
     case kEventRelease: onRelease(event); return true;
@@ -124,7 +119,7 @@ void Button8::onPress(event_data* event) {
   const int cell = getButtonSelect(event);
   if (cell == kCells) return;
   const ClassLog log(word);
-  const Holders held = setHolder(cell, static_cast<int>(event->mouse.finger + 1));
+  const Holders held = setHolder(cell, FingerHold::wordOf(event->mouse));
   const unsigned int mask = maskOf(held);
   mouse_event told = withState(event->mouse, mask);
   pressCallback(&told);
@@ -178,7 +173,7 @@ int Button8::getButtonSelect(const event_data* event) const {
   if (event == nullptr) return kCells;
   const std::lock_guard guard(stateLock);
   for (int i = 0; i < cellCount; ++i) {
-    if (isWithin(cellRect.at(static_cast<std::size_t>(i)), event->mouse)) return i;
+    if (containsInside(cellRect.at(static_cast<std::size_t>(i)), positionOf(*event))) return i;
   }
   return kCells;
 }

@@ -11,14 +11,12 @@ namespace MW {
 
 namespace {
 
-// The widgets' own numbers, and what the display-item table calls the same things: both are fixed.
+// The widgets' own numbers. Those of the display-item table differ from them; both are fixed.
 constexpr int kTypeLabel = 3;
 constexpr int kTypeImage = 5;
 constexpr int kTypeBox = 6;
 constexpr int kTypeLine = 7;
 constexpr int kTypeTextbox = 8;
-
-SKIA_Rect copyRect(const SKIA_Rect* given) { return given != nullptr ? *given : SKIA_Rect{}; }
 
 SKIA_Text imageName(const SKIA_Text* given) {
   SKIA_Text record = {};
@@ -137,7 +135,7 @@ int Line::show(unsigned int) { return skia_add_line_c(read(point)); }
 
 SKIA_Rect* Line::getPositionAndSize() {
   const std::lock_guard guard(stateLock);
-  // Anchored at the larger coordinates and reaching back from there: meant so.
+  // Anchored at the larger coordinates, it reaches back from there.
   rect.x = std::max(point.x1, point.x2);
   rect.y = std::max(point.y1, point.y2);
   rect.w = toPixels(int64_t{std::min(point.x1, point.x2)} - rect.x);

@@ -1,5 +1,4 @@
 #include <MW/c_api.h>
-#include <MW/event_service.h>
 #include <MW/push_button.h>
 #include <brimol/input.h>
 
@@ -28,12 +27,8 @@ bool PushButton::onRecvEvent(event_data* event, unsigned int) {
 
 // A held button follows every finger, wherever it is.
 bool PushButton::isReachedBy(const event_data* event) const {
-  return event != nullptr && !read(delayedShow).isPending() && (select != 0 || isInside(event));
-}
-
-bool PushButton::isInside(const event_data* event) const {
-  const SKIA_Rect area = read(rect);
-  return EventService::isMouseEventForMe(&area, event);
+  return event != nullptr && !read(delayedShow).isPending() &&
+         (hold.isHeld() || isUnder(rect, event));
 }
 
 bool PushButton::handleGesture(event_data* event) {
@@ -46,9 +41,9 @@ bool PushButton::handleGesture(event_data* event) {
 }
 
 bool PushButton::moveAcross(event_data* event) {
-  if (select == 0) return false;
+  if (!hold.isHeld()) return false;
   // Still held outside, and not highlighted again when the finger comes back.
-  if (!isInside(event)) restoreFace();
+  if (!isUnder(rect, event)) restoreFace();
   return true;
 }
 
@@ -70,7 +65,7 @@ void PushButton::onPress(event_data* event) {
 }
 
 void PushButton::holdBy(const event_data* event) {
-  select = static_cast<int>(event->mouse.finger + 1);
+  hold.press(event->mouse);
   const LifeGuard self(this);
   pressCallback(0);
   if (self.isAlive() && doubleClickCallback) clicks.press(GetTicks());
@@ -78,14 +73,14 @@ void PushButton::holdBy(const event_data* event) {
 
 void PushButton::onRelease(event_data* event) {
   const ClassLog log(word);
-  select = 0;
+  hold.letGo();
   restoreFace();
   clickAt(event);
   log.print(LogLevel::Debug, "released!!");
 }
 
 void PushButton::clickAt(const event_data* event) {
-  if (!isInside(event)) return;
+  if (!isUnder(rect, event)) return;
   const LifeGuard self(this);
   clickCallback(0);
   if (self.isAlive() && doubleClickCallback && clicks.isRunning()) onTouchClickCount();
@@ -98,7 +93,7 @@ void PushButton::onPressLong(event_data*) {
   const LifeGuard self(this);
   longPressCallback(0);
   if (!self.isAlive()) return;
-  select = 0;
+  hold.letGo();
   restoreFace();
 }
 

@@ -1,4 +1,3 @@
-#include <MW/event_service.h>
 #include <MW/screen.h>
 #include <MW/window.h>
 #include <brimol/input.h>
@@ -13,11 +12,10 @@ namespace MW {
 
 namespace {
 
-constexpr ClassLog kLog("BUTTON");  // the screen speaks under the button's name: meant so
-constexpr int kPassOn = 2;          // the bit of the variant
-constexpr int kEmptySquare = 1;     // setRect's mode
+constexpr ClassLog kLog("BUTTON");  // whoever reads the log finds the screen under this name
 constexpr int kSquareSide = 50;     // pixels, and the least distance from an edge
 
+// By FullScreen::Fill.
 constexpr auto kFills = std::to_array<uint32_t>({kColorWhite, kColorRed, kColorGreen, kColorBlue});
 
 constexpr uint32_t fillOf(int color) {
@@ -66,9 +64,9 @@ void Screen::onPress(event_data* event) {
   const mouse_event& mouse = event->mouse;
   kLog.print(LogLevel::Debug, "pressed!!");
   rect.color = kColorHighlight;
-  select = static_cast<int>(mouse.finger + 1);
+  hold.press(mouse);
   const SKIA_Rect center = {mouse.x, mouse.y, 0, 0, 0};
-  setRect(0, &center);
+  setRect(kSquare, &center);
   const LifeGuard self(this);
   pressCallback(&event->mouse);
   if (self.isAlive() && doubleClickCallback) clicks.press(GetTicks());
@@ -76,12 +74,12 @@ void Screen::onPress(event_data* event) {
 
 void Screen::onRelease(event_data* event) {
   if (event == nullptr) return;
-  select = 0;
+  hold.letGo();
   const LifeGuard self(this);
   clickCallback(&event->mouse);
   if (!self.isAlive() || !doubleClickCallback || rect.w == 0 || rect.h == 0) return;
-  if (!EventService::isMouseEventForMe(&rect, event)) {
-    setRect(kEmptySquare, &rect);
+  if (!isUnder(rect, event)) {
+    setRect(kNoSquare, &rect);
   } else if (clicks.isRunning()) {
     onTouchClickCount();
   }
@@ -97,7 +95,7 @@ void Screen::setRect(int mode, const SKIA_Rect* center) {
     return kSquareSide <= at && at <= length - kSquareSide;
   };
   const bool counts =
-      mode != kEmptySquare && isWithin(center->x, screenW) && isWithin(center->y, screenH);
+      mode != kNoSquare && isWithin(center->x, screenW) && isWithin(center->y, screenH);
   if (counts) {
     rect.x = center->x - kSquareSide / 2;
     rect.y = center->y - kSquareSide / 2;
@@ -108,7 +106,7 @@ void Screen::setRect(int mode, const SKIA_Rect* center) {
 
 void Screen::onTouchClickCount() {
   const int count = clicks.tap(GetTicks());
-  if (count == 0) return setRect(kEmptySquare, &rect);
+  if (count == 0) return setRect(kNoSquare, &rect);
   kLog.print(LogLevel::Debug, "onTouchClickCount!! %d", count);
   if (count == DoubleTap::kDouble) doubleClickCallback(0);
 }

@@ -1,9 +1,9 @@
-#include <MW/event_service.h>
 #include <MW/slide.h>
 #include <MW/window.h>
 #include <brimol/input.h>
 
 #include <algorithm>
+#include <atomic>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
@@ -24,19 +24,16 @@ constexpr int kTrackUnits = 5;
 constexpr int kKnobUnits = 2;
 constexpr int kTravelUnits = kTrackUnits - kKnobUnits;
 
-// What `state` counts: odd ones stand at the right, the upper pair changes before the far end.
-constexpr int kFullLeft = 0;
-constexpr int kFullRight = 1;
-constexpr int kHalfLeft = 2;
-constexpr int kHalfRight = 3;
-constexpr bool isRightState(int state) { return state == kFullRight || state == kHalfRight; }
-constexpr bool isLeftState(int state) { return state == kFullLeft || state == kHalfLeft; }
+constexpr bool isRight(int state) {
+  return state == Slide::kFullRight || state == Slide::kHalfRight;
+}
+constexpr bool isLeft(int state) { return state == Slide::kFullLeft || state == Slide::kHalfLeft; }
 
 constexpr SKIA_Text kOn = {"ON", 2, kColorGreen, SKIA_ALIGN_CENTRE, kLegendSize};
 constexpr SKIA_Text kOff = {"OFF", 3, kOffColor, SKIA_ALIGN_CENTRE, kLegendSize};
 
 // The second caption has the length that its record says, and of its text as many bytes as its size
-// says; NULs fill what is missing: meant so.
+// says; NULs fill what is missing.
 SKIA_Text secondCaption(const SKIA_Text* given) {
   SKIA_Text caption = {};
   if (given == nullptr) return caption;
@@ -101,22 +98,22 @@ int Slide::hide() {
 
 bool Slide::onRecvEvent(event_data* event, unsigned int) {
   if (event == nullptr) return false;
-  return routeKnobTouch(*this, hold.touch(*event, read(rect)), event);
+  return routeKnobTouch(*this, knobHold.touch(*event, read(rect)), event);
 }
 
 void Slide::onPress(event_data* event) {
   if (event == nullptr) return;
-  hold.grab(event->mouse);
+  knobHold.grab(event->mouse);
   kLog.print(LogLevel::Debug, "pressed!!: %d", static_cast<int>(event->mouse.finger));
   if (locked != 0 && doubleClickCallback) clicks.press(GetTicks());
 }
 
 void Slide::onRelease(event_data* event) {
   if (event == nullptr) return;
-  hold.letGo();
+  knobHold.letGo();
   snapKnob();
   kLog.print(LogLevel::Debug, "released!!:%d", static_cast<int>(event->mouse.finger));
-  if (locked != 0 && isOnKnob(event) && doubleClickCallback && clicks.isRunning()) {
+  if (locked != 0 && isUnder(rect, event) && doubleClickCallback && clicks.isRunning()) {
     onTouchClickCount(event->mouse);
   }
 }
@@ -128,11 +125,11 @@ void Slide::onHover(mouse_event mouse) {
   const LifeGuard self(this);
   (change == Change::ToLeft ? leftCallback : rightCallback)(0);
   if (!self.isAlive()) return;
-  hold.letGo();
+  knobHold.letGo();
   snapKnob();
 }
 
-// Full-travel states change at the far end, the half-travel ones within a unit of it.
+// Full-travel switches change at the far end, half-travel ones within a unit of it.
 Slide::Change Slide::drag(int by) {
   const std::lock_guard guard(stateLock);
   const int64_t left = track.x;
@@ -141,14 +138,16 @@ Slide::Change Slide::drag(int by) {
   rect.x = toPixels(wanted <= left ? left : std::min(wanted, end));
   const bool isAtLeft = wanted <= left;
   const bool isAtRight = !isAtLeft && wanted >= end;
-  const bool goesLeft = isAtLeft || (!isAtRight && state == kHalfRight && wanted <= left + unit);
-  const bool goesRight = isAtRight || (!isAtLeft && state == kHalfLeft && wanted > end - unit);
-  if (goesLeft && isRightState(state)) {
-    --state;
+  const std::atomic_ref shared(state);
+  const int now = shared;
+  const bool goesLeft = isAtLeft || (!isAtRight && now == kHalfRight && wanted <= left + unit);
+  const bool goesRight = isAtRight || (!isAtLeft && now == kHalfLeft && wanted > end - unit);
+  if (goesLeft && isRight(now)) {
+    shared = now - 1;
     return Change::ToLeft;
   }
-  if (goesRight && isLeftState(state)) {
-    ++state;
+  if (goesRight && isLeft(now)) {
+    shared = now + 1;
     return Change::ToRight;
   }
   return Change::None;
@@ -175,7 +174,7 @@ void Slide::setRect(int newState, const SKIA_Rect* area) {
   if (look == Look::Plain) leftSlot = {to.x, to.y, to.w, to.h, kColorWhite};
   rightSlot = makeRect(int64_t{to.x} + int64_t{kTravelUnits} * unit, to.y,
                        int64_t{kKnobUnits} * unit, height, kColorWhite);
-  rect = isRightState(newState) ? rightSlot : leftSlot;
+  rect = isRight(newState) ? rightSlot : leftSlot;
   labelRect1 = rect;
   labelRect2 = rect;
   if (captionCount != kTwoCaptions) return;
@@ -187,13 +186,8 @@ void Slide::setRect(int newState, const SKIA_Rect* area) {
 void Slide::Lock() { locked = 1; }
 void Slide::unLock() { locked = 0; }
 
-bool Slide::isOnKnob(const event_data* event) const {
-  const SKIA_Rect knob = read(rect);
-  return EventService::isMouseEventForMe(&knob, event);
-}
-
 // The track is laid out from itself and so never moves; setRect reads it under the lock.
-void Slide::snapKnob() { setRect(state, &track); }
+void Slide::snapKnob() { setRect(std::atomic_ref(state), &track); }
 
 SlideV::SlideV(int startState, const SKIA_Rect* area, const SKIA_Text* first,
                const SKIA_Text* second)

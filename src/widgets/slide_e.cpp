@@ -2,6 +2,7 @@
 #include <MW/window.h>
 
 #include <algorithm>
+#include <atomic>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
@@ -14,9 +15,7 @@ namespace {
 constexpr ClassLog kLog("SLIDE_EXIT");
 constexpr const char* kMark = "EXIT";
 constexpr int kMarkPercent = 25;  // of the bar's height
-constexpr uint32_t kKnobColor = kColorGrey;
-constexpr uint32_t kArrowColor = kColorRed;
-constexpr int kArrowRight = 0;  // the arrow's direction words
+constexpr int kArrowRight = 0;    // the arrow's direction words
 constexpr int kArrowLeft = 1;
 
 constexpr bool startsAtLeft(int state) { return state == 0 || state == 2 || state == 4; }
@@ -35,6 +34,9 @@ SlideE::SlideE(int startState, const SKIA_Rect* area, const SKIA_Text* caption, 
 SlideE::SlideE(int startState, const SKIA_Rect* area, const SKIA_Text* caption, const SKIA_Text*)
     : SlideE(startState, area, caption, "") {}
 
+SlideE::SlideE(int startState, const SKIA_Rect* area, const SKIA_Text* caption, std::nullptr_t)
+    : SlideE(startState, area, caption, "") {}
+
 SlideE::~SlideE() { leaveLayers(); }
 
 void SlideE::SlideE_init(int startState, const SKIA_Rect* area, const SKIA_Text* caption,
@@ -43,7 +45,7 @@ void SlideE::SlideE_init(int startState, const SKIA_Rect* area, const SKIA_Text*
   setActive(0);
   setType(kBaseLayer);
   SlideE::setRect(startState, area);
-  state = startState;
+  std::atomic_ref(state).store(startState);
   leftCallback = rightCallback = exitCallback = nullptr;
   {
     const std::lock_guard guard(stateLock);
@@ -52,6 +54,8 @@ void SlideE::SlideE_init(int startState, const SKIA_Rect* area, const SKIA_Text*
   }
   Window::registerWidget(this);
 }
+
+int SlideE::show() { return show(0); }
 
 int SlideE::show(unsigned int) {
   if (!hold.isHeld()) snapKnob();
@@ -66,7 +70,7 @@ int SlideE::show(unsigned int) {
 
 bool SlideE::onRecvEvent(event_data* event, unsigned int) {
   if (event == nullptr) return false;
-  switch (hold.touch(*event, read(rect))) {
+  switch (knobHold.touch(*event, read(rect))) {
     case KnobHold::Touch::NotMine: return false;
     case KnobHold::Touch::Grab: onPress(event->mouse); return true;
     case KnobHold::Touch::Cancel:
@@ -78,16 +82,16 @@ bool SlideE::onRecvEvent(event_data* event, unsigned int) {
   return false;
 }
 
-void SlideE::onPress(mouse_event mouse) { hold.grab(mouse); }
+void SlideE::onPress(mouse_event mouse) { knobHold.grab(mouse); }
 
 void SlideE::onRelease(mouse_event) {
-  hold.letGo();
+  knobHold.letGo();
   snapKnob();
 }
 
 void SlideE::onHover(mouse_event mouse) {
   if (!drag(mouse.xrel)) return;
-  hold.letGo();
+  knobHold.letGo();
   exitCallback(0);
 }
 
@@ -99,7 +103,8 @@ bool SlideE::drag(int by) {
   const int64_t wanted = int64_t{rect.x} + by;
   const bool isAtLeft = wanted <= left;
   rect.x = toPixels(isAtLeft ? left : std::min(wanted, end));
-  return isAtLeft ? exitsAtLeft(state) : wanted >= end && startsAtLeft(state);
+  const int now = std::atomic_ref(state);
+  return isAtLeft ? exitsAtLeft(now) : wanted >= end && startsAtLeft(now);
 }
 
 void SlideE::setRect(int newState, const SKIA_Rect* area) {
@@ -112,12 +117,12 @@ void SlideE::setRect(int newState, const SKIA_Rect* area) {
   unit = to.h;
   track = to;
   labelRect1 = makeRect(isAtLeft ? behindKnob : to.x, to.y, int64_t{to.w} - to.h, to.h, to.color);
-  rect = makeRect(isAtLeft ? to.x : knobAtRight, to.y, to.h, to.h, kKnobColor);
-  point.color = kArrowColor;
+  rect = makeRect(isAtLeft ? to.x : knobAtRight, to.y, to.h, to.h, kColorGrey);
+  point.color = kColorRed;
   point.width = isAtLeft ? kArrowRight : kArrowLeft;
 }
 
 // The bar is laid out from itself and so never moves; setRect reads it under the lock.
-void SlideE::snapKnob() { setRect(state, &track); }
+void SlideE::snapKnob() { setRect(std::atomic_ref(state), &track); }
 
 }  // namespace MW

@@ -14,8 +14,6 @@ namespace {
 
 constexpr ClassLog kLog("SLIDE");
 constexpr uint32_t kKnobColor = 0xFF4F4F4F;
-constexpr uint32_t kGrooveColor = kColorGrey;
-constexpr uint32_t kFillColor = kColorRed;
 constexpr int kDefaultKnobPercent = 20;
 constexpr int kMostKnobPercent = 50;
 constexpr int kInnerFrame = 1;  // pixels around the knob
@@ -26,7 +24,7 @@ constexpr int kValueTextPart = 3;  // of the knob's height
 
 constexpr Padding kValuePadding = {' ', 3};
 
-// What the value is from here on, a maximum above it or not: meant so.
+// From here on the value is full, even where the maximum lies above.
 constexpr double kNearlyFull = 99.9;
 constexpr int kFull = 100;
 
@@ -40,7 +38,7 @@ constexpr ValueRange rangeOf(int a, int b) {
   return {std::min(a, b), std::max(a, b)};
 }
 
-// Goes by the bounds as they were given, not by their order: meant so.
+// Goes by the bounds as they were given: with the higher one first, every start is a bound.
 constexpr int startOf(int a, int b, int initial) {
   if (initial >= b) return b;
   return initial <= a ? a : initial;
@@ -62,7 +60,8 @@ constexpr int valueAt(unsigned int position, float perStep, int lowest) {
 static_assert(valueAt(399, 4, 0) == 99 && valueAt(400, 4, 0) == 100 && valueAt(40, 4, -5) == 5);
 
 constexpr int shownKnobPercent(int percent) {
-  return percent == 0 ? kDefaultKnobPercent : std::min(percent, kMostKnobPercent);
+  return percent == SlideMove::kValueKnob ? kDefaultKnobPercent
+                                          : std::min(percent, kMostKnobPercent);
 }
 
 }  // namespace
@@ -71,15 +70,17 @@ SlideMove::SlideMove(const SKIA_Rect* area, int percent, int a, int b, int initi
     : minValue(rangeOf(a, b).lowest),
       maxValue(rangeOf(a, b).highest),
       knobPercent(shownKnobPercent(percent)),
-      showValue(percent == 0 ? 1 : 0),
+      showValue(percent == kValueKnob ? 1 : 0),
       value(startOf(a, b, initial)) {
   kLog.print(LogLevel::Debug, "call registerWidget");
   setType(kBaseLayer);
-  setRect(area);
+  layOut(copyRect(area));
   Window::registerWidget(this);
 }
 
 SlideMove::~SlideMove() { leaveLayers(); }
+
+int SlideMove::show() { return show(0); }
 
 int SlideMove::show(unsigned int) {
   const std::lock_guard guard(stateLock);
@@ -100,19 +101,19 @@ int SlideMove::show(unsigned int) {
 
 bool SlideMove::onRecvEvent(event_data* event, unsigned int) {
   if (event == nullptr) return false;
-  return routeKnobTouch(*this, hold.touch(*event, read(rect)), event);
+  return routeKnobTouch(*this, knobHold.touch(*event, read(rect)), event);
 }
 
 void SlideMove::onPress(event_data* event) {
   if (event == nullptr) return;
   kLog.print(LogLevel::Debug, "pressed!!: %d", static_cast<int>(event->mouse.finger));
-  hold.grab(event->mouse);
+  knobHold.grab(event->mouse);
 }
 
 void SlideMove::onRelease(event_data* event) {
   if (event == nullptr) return;
   kLog.print(LogLevel::Debug, "released!!:%d", static_cast<int>(event->mouse.finger));
-  hold.letGo();
+  knobHold.letGo();
 }
 
 void SlideMove::Lock() { locked = 1; }
@@ -142,7 +143,7 @@ void SlideMove::layOut(const SKIA_Rect& area) {
   frameInner = grown(rect, kInnerFrame, kColorWhite);
   frameOuter = grown(rect, kOuterFrame, kColorBlack);
   fillUpTo(rect.x);
-  groove = {track.x, fill.y, track.w, fill.h, kGrooveColor};
+  groove = {track.x, fill.y, track.w, fill.h, kColorGrey};
   valueText.align = SKIA_ALIGN_CENTRE;
   valueText.size = rect.h / kValueTextPart;
   valueText.color = kColorWhite;
@@ -159,7 +160,7 @@ void SlideMove::setRect_Slide(const SKIA_Rect* knob) {
 void SlideMove::fillUpTo(int32_t knobX) {
   const int64_t margin = track.h / kTenths;
   fill = makeRect(track.x, int64_t{track.y} + margin, int64_t{knobX} - track.x + kFillOverlap,
-                  int64_t{track.h} - 2 * margin, kFillColor);
+                  int64_t{track.h} - 2 * margin, kColorRed);
   frameInner.x = toPixels(int64_t{knobX} - kInnerFrame);
   frameOuter.x = toPixels(int64_t{knobX} - kOuterFrame);
 }

@@ -15,11 +15,22 @@
 #include "e2e/user.h"
 #include "e2e/verdicts.h"
 #include "layout.h"
+#include "test.h"
 
 namespace factory_test {
 namespace {
 
 using namespace screens;
+
+TEST(HeadlessMenu, ShowsTheRowThatTheUpKeyMarks) {
+  runWith({}, [] {
+    for (std::size_t row = 0; row < testEntries().size(); ++row) User::key(SDLK_DOWN);
+    for (std::size_t row = 1; row < testEntries().size(); ++row) User::key(SDLK_UP);
+    constexpr SKIA_Rect kTopRow = {0, 511, kScreen.width, percentOf(kScreen.height, kEntryPercent),
+                                   0};
+    EXPECT_TRUE(User::sees(kTopRow, 0xFF787878));
+  });
+}
 
 /// A folder of the test's own.
 class HeadlessApplication : public testing::Test {

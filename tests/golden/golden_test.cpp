@@ -12,6 +12,7 @@
 #include "golden/golden_cases.h"
 #include "input/input_service.h"
 #include "scene/frame_sink.h"
+#include "scene/item.h"
 #include "scene/recorder.h"
 #include "support/records.h"
 
@@ -44,6 +45,7 @@ std::string drawnItems(const Case& drawn) {
   constexpr auto kKinds =
       std::to_array<const char*>({"label", "textbox", "buttonbox", "box", "roundbox", "staticbox",
                                   "line", "image", "roundtextbox", "roundbuttonbox", "arrow"});
+  static_assert(kKinds.size() == kItemKinds.size());
   std::ostringstream out;
   for (const SKIA_Item& item : frameOf(drawn)) {
     out << kKinds.at(static_cast<std::size_t>(item.kind)) << ' ' << item.rect;

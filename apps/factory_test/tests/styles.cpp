@@ -1,5 +1,6 @@
 // Push buttons without a highlight, in all their styles.
 #include <MW/button.h>
+#include <MW/button_new.h>
 #include <MW/button_s.h>
 
 #include <array>

@@ -1,4 +1,5 @@
 // Pages of one colour with texts anywhere on them.
+#include <MW/auto_cap_screen.h>
 #include <MW/dialog_warn.h>
 
 #include <memory>

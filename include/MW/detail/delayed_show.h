@@ -5,8 +5,9 @@
 
 namespace MW {
 
-/// Until the first drawing pass at or after the due time the widget is neither drawn nor offered
-/// events. Times are GetTicks() milliseconds. The holder's lock guards it.
+/// Until the first drawing pass at or after the due time the widget is not drawn and takes no
+/// events. Times are GetTicks() milliseconds and are compared as they are: a due time behind the
+/// clock's wrap is reached at once. The holder's lock guards it.
 class DelayedShow {
  public:
   constexpr void start(uint32_t now, uint32_t delayMs) {

@@ -5,14 +5,15 @@
 
 namespace MW {
 
-/// Counts taps of which each ends within 500 ms of the one before. Times are GetTicks()
-/// milliseconds; 0 stands for none. One thread, the one that handles events.
+/// Counts taps, each of which ends within 500 ms of the one before. Times are GetTicks()
+/// milliseconds; 0 stands for none. The clock's wrap may cut a series short. One thread, the one
+/// that handles events.
 class DoubleTap {
  public:
   static constexpr uint32_t kWindowMs = 500;
   static constexpr int kDouble = 2;  ///< what tap() answers to a double tap
 
-  /// A press: forgets a tap that lies too far back, and starts the time when none runs.
+  /// A press: forgets a tap that lies too far back, and starts the time if none runs.
   constexpr void press(uint32_t now) {
     if (isStale(now)) reset();
     if (time == 0) time = now;
@@ -20,7 +21,8 @@ class DoubleTap {
   constexpr bool isRunning() const { return time != 0; }
   /// Whether the last tap lies too far back to be one of two.
   constexpr bool isStale(uint32_t now) const { return time != 0 && time < now - kWindowMs; }
-  /// A completed tap: how many there were in a row, or 0 when it came too late, which starts over.
+  /// A completed tap: how many there were in a row, or 0 for one that came too late and starts the
+  /// count anew.
   constexpr int tap(uint32_t now) {
     if (now >= time + kWindowMs) {
       reset();

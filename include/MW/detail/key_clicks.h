@@ -7,8 +7,9 @@
 
 namespace MW {
 
-/// Counts the releases of one key of which each comes within 1000 ms of the one before. Times are
-/// GetTicks() milliseconds. One thread, the one that handles events, or the holder's lock.
+/// Counts the releases of one key, each of which comes within 1000 ms of the one before. Times are
+/// GetTicks() milliseconds; their wrap may cut a series short. It belongs to the thread that
+/// handles events, or to the holder's lock.
 class KeyClicks {
  public:
   static constexpr uint32_t kWindowMs = 1000;

@@ -8,9 +8,9 @@
 
 namespace MW {
 
-/// Counts steps of a little over 100 ms. Times are GetTicks() milliseconds; the differences are
-/// unsigned, so that a start in the future makes the first step fall due at once. The holder's lock
-/// guards it.
+/// Counts steps of a little over 100 ms. Times are GetTicks() milliseconds. Their difference is
+/// unsigned: the wrap does no harm, and after a start in the future the first step is due at once.
+/// The holder's lock guards it.
 class StarRow {
  public:
   constexpr void restart(uint32_t at) {

@@ -115,7 +115,7 @@ void TurnClock::delay(uint32_t ms) {
   waitForTurn(lock, me, time + std::max(ms, 1U));
 }
 
-void TurnClock::setWaitsInside(bool waits) { self().waitsInside = waits; }
+bool TurnClock::setWaitsInside(bool waits) { return self().waitsInside.exchange(waits); }
 
 void TurnClock::wakePoller() {
   const std::lock_guard lock(mutex);

@@ -68,8 +68,8 @@ class TurnClock {
   /// Pauses the calling thread for `ms` milliseconds, 1 at least.
   void delay(uint32_t ms);
   /// Has what the calling thread is about to wait for counted as work of its own, or not any more:
-  /// what the platform itself waits for ends by itself.
-  void setWaitsInside(bool waits);
+  /// what the platform itself waits for ends by itself. Returns what it was before.
+  bool setWaitsInside(bool waits);
 
   // By any thread.
 

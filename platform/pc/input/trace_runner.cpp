@@ -32,14 +32,19 @@ struct RestAfter {
 
 }  // namespace
 
+std::vector<WorldChange> worldAtStart(const Trace& trace) {
+  std::vector<WorldChange> changes;
+  for (const TraceStep& step : trace.steps) {
+    const auto* const change = std::get_if<WorldChange>(&step.action);
+    if (change == nullptr || step.timing != TraceStep::Timing::AsSoonAsPossible) break;
+    changes.push_back(*change);
+  }
+  return changes;
+}
+
 TraceRunner::TraceRunner(const Trace& played, TraceStage target)
     : trace(played), stage(std::move(target)), fingers(stage.screen, stage.post) {
-  // What the world is at the start is so before anything is asked.
-  const auto isOfTheStart = [this] {
-    return !isOver() && step().timing == TraceStep::Timing::AsSoonAsPossible &&
-           std::holds_alternative<WorldChange>(step().action);
-  };
-  for (; isOfTheStart(); ++next) stage.changeWorld(std::get<WorldChange>(step().action));
+  next = worldAtStart(trace).size();
 }
 
 // None: it waits for the first frame.

@@ -26,6 +26,9 @@ struct TraceStage {
   std::function<void(const TraceLine& line, const std::string& why)> judge;  // empty: it passed
 };
 
+/// The lines at the head of a trace that say what the world is at the start.
+std::vector<WorldChange> worldAtStart(const Trace& trace);
+
 /// Why a session failed: the line that is to blame, and what is wrong, in one line or several.
 struct TraceFailure {
   TraceLine line;
@@ -33,7 +36,8 @@ struct TraceFailure {
 };
 
 /// A state machine: it is told what time it is and what the application shows and logs, and acts on
-/// its stage. It reads no clock, and knows no thread: one call at a time. `trace` outlives it.
+/// its stage. It reads no clock, and knows no thread: one call at a time. `trace` outlives it. What
+/// the world is at the start is not its matter.
 class TraceRunner {
  public:
   TraceRunner(const Trace& played, TraceStage target);

@@ -4,32 +4,27 @@
 
 namespace brimol::pc {
 
-const std::array<ItemPainter::DrawFigure, 5> ItemPainter::kFigures = {
-    &ItemPainter::drawNothing, &ItemPainter::drawText,  &ItemPainter::drawPicture,
-    &ItemPainter::drawLine,    &ItemPainter::drawArrow,
-};
-
-ItemPainter::ItemPainter(const Canvas& target) : canvas(target), texts(projectFontFiles()) {}
-
 void ItemPainter::draw(const SKIA_Item& item, const Pixels& clip) {
   const Pixels area = within(boundsOf(item, wholeOf(canvas.size())), clip);
   if (isEmpty(area)) return;
   drawGround(item, area);
-  (this->*kFigures[static_cast<std::size_t>(figureOf(item))])(item, area);
-}
-
-void ItemPainter::drawGround(const SKIA_Item& item, const Pixels& clip) const {
-  switch (kindOf(item).ground) {
-    case Ground::None: return;
-    case Ground::Square: canvas.fill(clip, item.rect.color); return;
-    case Ground::Round: fillRoundBox({canvas, clip, item.rect.color}, edgesOf(item.rect)); return;
+  switch (figureOf(item)) {
+    case Figure::None: return;
+    case Figure::Text: return texts.draw(canvas, item.rect, item.text, area);
+    case Figure::Picture: return drawPicture(item, area);
+    case Figure::Line: return drawLine(item, area);
+    case Figure::Arrow: return drawArrow(item, area);
   }
 }
 
-void ItemPainter::drawNothing(const SKIA_Item&, const Pixels&) {}
-
-void ItemPainter::drawText(const SKIA_Item& item, const Pixels& clip) {
-  texts.draw(canvas, item.rect, item.text, clip);
+void ItemPainter::drawGround(const SKIA_Item& item, const Pixels& clip) const {
+  const Brush brush = {canvas, clip, item.rect.color};
+  const Edges box = edgesOf(item.rect);
+  switch (groundOf(item)) {
+    case Ground::None: return;
+    case Ground::Square: return brush.fill(box);
+    case Ground::Round: return fillRoundBox(brush, box);
+  }
 }
 
 void ItemPainter::drawPicture(const SKIA_Item& item, const Pixels& clip) {
@@ -42,12 +37,12 @@ void ItemPainter::drawPicture(const SKIA_Item& item, const Pixels& clip) {
   cairo_fill(context);
 }
 
-void ItemPainter::drawLine(const SKIA_Item& item, const Pixels& clip) {
+void ItemPainter::drawLine(const SKIA_Item& item, const Pixels& clip) const {
   if (isAxisAligned(item.point)) return canvas.fill(clip, item.point.color);
   fillPolygon({canvas, clip, item.point.color}, lineOutline(item.point), wholeOf(canvas.size()));
 }
 
-void ItemPainter::drawArrow(const SKIA_Item& item, const Pixels& clip) {
+void ItemPainter::drawArrow(const SKIA_Item& item, const Pixels& clip) const {
   const Edges box = edgesOf(item.rect);
   fillPolygon({canvas, clip, item.point.color},
               item.point.width == 0 ? rightArrowOutline(box) : leftArrowOutline(box),

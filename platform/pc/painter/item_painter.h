@@ -12,21 +12,16 @@ namespace brimol::pc {
 class ItemPainter {
  public:
   /// `target` outlives the painter.
-  explicit ItemPainter(const Canvas& target);
+  explicit ItemPainter(const Canvas& target) : canvas(target) {}
 
   /// Draws of the item what lies in `clip`: within the canvas, not empty.
   void draw(const SKIA_Item& item, const Pixels& clip);
 
  private:
-  using DrawFigure = void (ItemPainter::*)(const SKIA_Item& item, const Pixels& clip);
-  static const std::array<DrawFigure, 5> kFigures;  // by Figure
-
   void drawGround(const SKIA_Item& item, const Pixels& clip) const;
-  void drawNothing(const SKIA_Item& item, const Pixels& clip);
-  void drawText(const SKIA_Item& item, const Pixels& clip);
   void drawPicture(const SKIA_Item& item, const Pixels& clip);
-  void drawLine(const SKIA_Item& item, const Pixels& clip);
-  void drawArrow(const SKIA_Item& item, const Pixels& clip);
+  void drawLine(const SKIA_Item& item, const Pixels& clip) const;
+  void drawArrow(const SKIA_Item& item, const Pixels& clip) const;
 
   const Canvas& canvas;
   TextPainter texts;

@@ -12,7 +12,7 @@ constexpr uint32_t kBlack = 0xFF000000;
 
 // Whether nothing below the item shows in `piece`.
 bool hides(const SKIA_Item& item, const Pixels& piece) {
-  return kindOf(item).ground == Ground::Square && alphaOf(item.rect.color) == kOpaque &&
+  return groundOf(item) == Ground::Square && alphaOf(item.rect.color) == kOpaque &&
          covers(edgesOf(item.rect), piece);
 }
 

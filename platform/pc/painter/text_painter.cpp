@@ -10,9 +10,6 @@ namespace brimol::pc {
 
 namespace {
 
-constexpr int kMostPixels = 1024;  // font size
-constexpr int kAlignRight = 2;     // as the record has it; any other value is left
-constexpr int kAlignCentred = 5;
 constexpr int kFarAway = 1'000'000;  // pixels; no text reaches from there to a screen
 
 // Pango's colours have 16 bits for each of a colour's 8.
@@ -36,14 +33,15 @@ int pixelsOf(int pangoUnits) { return PANGO_PIXELS(pangoUnits); }
 int64_t centred(int64_t low, int64_t high, int size) { return low + (high - low - size) / 2; }
 
 int64_t aligned(const Edges& box, int align, int width) {
-  if (align == kAlignRight) return box.right - width;
-  if (align == kAlignCentred) return centred(box.left, box.right, width);
+  if (align == SKIA_ALIGN_RIGHT) return box.right - width;
+  if (align == SKIA_ALIGN_CENTRE) return centred(box.left, box.right, width);
   return box.left;
 }
 
 bool isNear(int64_t position) { return position >= -kFarAway && position <= kFarAway; }
 
-// Line by line, since each is aligned to the box and not to the longest of them.
+// Line by line, since each is aligned to the box and not to the longest of them. In a box with room
+// for fewer lines, those whose middle lies outside are left out, and the others are whole.
 void showLines(cairo_t* context, PangoLayout* layout, const Edges& box, int align) {
   int height = 0;
   pango_layout_get_size(layout, nullptr, &height);
@@ -52,6 +50,8 @@ void showLines(cairo_t* context, PangoLayout* layout, const Edges& box, int alig
   do {
     PangoRectangle extents;
     pango_layout_iter_get_line_extents(iter.get(), nullptr, &extents);
+    const int64_t middle = top + pixelsOf(extents.y + extents.height / 2);
+    if (middle < box.top || middle > box.bottom) continue;
     const int64_t x = aligned(box, align, pixelsOf(extents.width));
     const int64_t y = top + pixelsOf(pango_layout_iter_get_baseline(iter.get()));
     if (!isNear(x) || !isNear(y)) continue;
@@ -62,12 +62,9 @@ void showLines(cairo_t* context, PangoLayout* layout, const Edges& box, int alig
 
 }  // namespace
 
-TextPainter::TextPainter(std::span<const char* const> fontFiles)
-    : fonts(fontFiles), layouts(kMostLayouts) {}
-
 void TextPainter::draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_Text& text,
                        const Pixels& clip) {
-  if (text.size <= 0 || alphaOf(text.color) == 0 || shownText(text).empty()) return;
+  if (textSizeOf(text) == 0 || alphaOf(text.color) == 0 || shownText(text).empty()) return;
   PangoLayout* const layout = layoutOf(text);
   cairo_t* const context = canvas.context();
   cairo_save(context);
@@ -78,14 +75,14 @@ void TextPainter::draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_T
 }
 
 PangoLayout* TextPainter::layoutOf(const SKIA_Text& text) {
-  Key key{std::string(shownText(text)), std::min(text.size, kMostPixels), text.color};
+  Key key{std::string(shownText(text)), textSizeOf(text), text.color};
   if (const TextLayout* const known = layouts.find(key)) return known->get();
   TextLayout layout = makeLayout(key);
   return layouts.put(std::move(key), std::move(layout), 1).get();
 }
 
 TextLayout TextPainter::makeLayout(const Key& key) const {
-  TextLayout layout(pango_layout_new(fonts.context()));
+  TextLayout layout(pango_layout_new(fonts->context()));
   const FontDescription font = projectFonts(key.size);
   pango_layout_set_font_description(layout.get(), font.get());
   const AttributeList attributes = attributesOf(key.color);

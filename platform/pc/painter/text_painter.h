@@ -15,12 +15,12 @@ namespace brimol::pc {
 /// Draws texts and keeps the layouts of the recent ones. One thread uses it.
 class TextPainter {
  public:
-  explicit TextPainter(std::span<const char* const> fontFiles);
+  TextPainter() : fonts(borrowFonts()), layouts(kMostLayouts) {}
 
-  /// Draws the text in the middle of the rectangle's height, aligned as the record asks; what does
-  /// not fit is cut at the rectangle. Only pixels in `clip`, which lies within the canvas and the
-  /// rectangle, change. A size of at most 0 pixels draws nothing, one above 1024 is 1024; bytes
-  /// that are no UTF-8 draw the replacement character.
+  /// Draws the text in the middle of the rectangle's height, aligned as the record asks. Lines
+  /// whose middle lies above or below the rectangle are left out. Only pixels in `clip` change: the
+  /// item's bounds, or a part of them within the canvas. Bytes that are no UTF-8 draw the
+  /// replacement character.
   void draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_Text& text, const Pixels& clip);
 
   /// Bounded by kMostLayouts.
@@ -41,7 +41,7 @@ class TextPainter {
   PangoLayout* layoutOf(const SKIA_Text& text);
   TextLayout makeLayout(const Key& key) const;
 
-  Fonts fonts;
+  BorrowedFonts fonts;
   LruCache<Key, TextLayout> layouts;
 };
 

@@ -1,5 +1,6 @@
 #include "scene/item.h"
 
+#include <algorithm>
 #include <cstring>
 #include <tuple>
 
@@ -30,8 +31,35 @@ bool sameArrow(const SKIA_Item& one, const SKIA_Item& other) {
   return one.point.color == other.point.color && (one.point.width == 0) == (other.point.width == 0);
 }
 
+// Most that a line's ascent and descent add up to, in per cent of the text's size: those of the
+// Arabic font, the highest.
+constexpr int64_t kLinePercent = 212;
+
+int64_t linesOf(std::string_view text) {
+  return 1 + std::ranges::count(text, '\n') + std::ranges::count(text, '\r');
+}
+
+// How far the drawn lines reach above and below a rectangle of that height at most. The text stands
+// in the middle, and lines whose own middle lies outside are not drawn.
+int64_t reachOf(const SKIA_Text& text, int64_t height) {
+  constexpr int64_t kWhole = 100;
+  const std::string_view words = shownText(text);
+  if (words.empty()) return 0;
+  const int64_t line = (textSizeOf(text) * kLinePercent + kWhole - 1) / kWhole;
+  return std::clamp<int64_t>((line * linesOf(words) - height + 1) / 2, 0, (line + 1) / 2);
+}
+
 Pixels rectBounds(const SKIA_Item& item, const Pixels& limits) {
   return within(edgesOf(item.rect), limits);
+}
+
+Pixels textBounds(const SKIA_Item& item, const Pixels& limits) {
+  Edges box = edgesOf(item.rect);
+  if (isEmpty(box)) return {};
+  const int64_t reach = reachOf(item.text, item.rect.h);
+  box.top -= reach;
+  box.bottom += reach;
+  return within(box, limits);
 }
 
 Pixels lineBounds(const SKIA_Item& item, const Pixels& limits) {
@@ -40,18 +68,19 @@ Pixels lineBounds(const SKIA_Item& item, const Pixels& limits) {
 
 // What differs between the figures; a line alone has no rectangle.
 struct FigureTraits {
+  Figure figure;
   bool (*same)(const SKIA_Item& one, const SKIA_Item& other);
   Pixels (*bounds)(const SKIA_Item& item, const Pixels& limits);
 };
 
-// By Figure.
 constexpr auto kFigures = std::to_array<FigureTraits>({
-    {sameNothing, rectBounds},
-    {sameText, rectBounds},
-    {sameName, rectBounds},
-    {sameLine, lineBounds},
-    {sameArrow, rectBounds},
+    {Figure::None, sameNothing, rectBounds},
+    {Figure::Text, sameText, textBounds},
+    {Figure::Picture, sameName, rectBounds},
+    {Figure::Line, sameLine, lineBounds},
+    {Figure::Arrow, sameArrow, rectBounds},
 });
+static_assert(isInOrder(kFigures, &FigureTraits::figure));
 
 const FigureTraits& traitsOf(Figure figure) { return kFigures[static_cast<std::size_t>(figure)]; }
 
@@ -61,13 +90,14 @@ bool sameRect(const SKIA_Rect& one, const SKIA_Rect& other) {
 
 }  // namespace
 
-ItemKind kindOf(const SKIA_Item& item) {
-  if (!isKnownKind(item.kind)) return {Ground::None, Figure::None, Unsized::Nothing};
-  return kItemKinds[static_cast<std::size_t>(item.kind)];
+Ground groundOf(const SKIA_Item& item) {
+  return isKnownKind(item.kind) ? kItemKinds[static_cast<std::size_t>(item.kind)].ground
+                                : Ground::None;
 }
 
 Figure figureOf(const SKIA_Item& item) {
-  const ItemKind kind = kindOf(item);
+  if (!isKnownKind(item.kind)) return Figure::None;
+  const ItemKind& kind = kItemKinds[static_cast<std::size_t>(item.kind)];
   if (kind.unsizedText == Unsized::Nothing || item.text.size != 0) return kind.figure;
   return shownText(item.text).empty() ? Figure::None : Figure::Picture;
 }
@@ -77,11 +107,13 @@ std::string_view shownText(const SKIA_Text& text) {
   return {text.text, strnlen(text.text, room)};
 }
 
+int textSizeOf(const SKIA_Text& text) { return std::clamp(text.size, 0, kMostTextSize); }
+
 bool drawTheSame(const SKIA_Item& one, const SKIA_Item& other) {
   const Figure figure = figureOf(one);
   if (one.kind != other.kind || figure != figureOf(other)) return false;
   if (figure != Figure::Line && !sameRect(one.rect, other.rect)) return false;
-  if (kindOf(one).ground != Ground::None && one.rect.color != other.rect.color) return false;
+  if (groundOf(one) != Ground::None && one.rect.color != other.rect.color) return false;
   return traitsOf(figure).same(one, other);
 }
 

@@ -20,36 +20,46 @@ enum class Figure : uint8_t { None, Text, Picture, Line, Arrow };
 enum class Unsized : uint8_t { Nothing, PictureName };
 
 struct ItemKind {
+  SKIA_ItemKind kind;
   Ground ground;
   Figure figure;
   Unsized unsizedText;
 };
 
-/// By SKIA_ItemKind. Any other kind shows nothing.
+/// Whether the row of each enumerator stands where its value says.
+template <class Rows, class Column>
+constexpr bool isInOrder(const Rows& rows, Column column) {
+  for (std::size_t i = 0; i < rows.size(); ++i) {
+    if (static_cast<std::size_t>(rows[i].*column) != i) return false;
+  }
+  return true;
+}
+
+/// By kind. Any other kind shows nothing.
 inline constexpr auto kItemKinds = std::to_array<ItemKind>({
-    {Ground::None, Figure::Text, Unsized::PictureName},  // SKIA_LABEL
-    {Ground::Square, Figure::Text, Unsized::Nothing},    // SKIA_TEXTBOX
-    {Ground::Square, Figure::Text, Unsized::Nothing},    // SKIA_BUTTONBOX
-    {Ground::Square, Figure::None, Unsized::Nothing},    // SKIA_BOX
-    {Ground::Round, Figure::None, Unsized::Nothing},     // SKIA_ROUNDBOX
-    {Ground::Square, Figure::Text, Unsized::Nothing},    // SKIA_STATICBOX
-    {Ground::None, Figure::Line, Unsized::Nothing},      // SKIA_LINE
-    {Ground::None, Figure::Picture, Unsized::Nothing},   // SKIA_IMAGE
-    {Ground::Round, Figure::Text, Unsized::Nothing},     // SKIA_ROUNDTEXTBOX
-    {Ground::Round, Figure::Text, Unsized::Nothing},     // SKIA_ROUNDBUTTONBOX
-    {Ground::None, Figure::Arrow, Unsized::Nothing},     // SKIA_ARROW
+    {SKIA_LABEL, Ground::None, Figure::Text, Unsized::PictureName},
+    {SKIA_TEXTBOX, Ground::Square, Figure::Text, Unsized::Nothing},
+    {SKIA_BUTTONBOX, Ground::Square, Figure::Text, Unsized::Nothing},
+    {SKIA_BOX, Ground::Square, Figure::None, Unsized::Nothing},
+    {SKIA_ROUNDBOX, Ground::Round, Figure::None, Unsized::Nothing},
+    {SKIA_STATICBOX, Ground::Square, Figure::Text, Unsized::Nothing},
+    {SKIA_LINE, Ground::None, Figure::Line, Unsized::Nothing},
+    {SKIA_IMAGE, Ground::None, Figure::Picture, Unsized::Nothing},
+    {SKIA_ROUNDTEXTBOX, Ground::Round, Figure::Text, Unsized::Nothing},
+    {SKIA_ROUNDBUTTONBOX, Ground::Round, Figure::Text, Unsized::Nothing},
+    {SKIA_ARROW, Ground::None, Figure::Arrow, Unsized::Nothing},
 });
-static_assert(kItemKinds.size() == SKIA_ARROW + 1);
-static_assert(kItemKinds[SKIA_LINE].figure == Figure::Line);
+static_assert(isInOrder(kItemKinds, &ItemKind::kind));
 
 constexpr bool isKnownKind(int32_t kind) {
   return kind >= 0 && static_cast<std::size_t>(kind) < kItemKinds.size();
 }
 
-/// The item's row in the table, or a row that shows nothing.
-ItemKind kindOf(const SKIA_Item& item);
+/// The ground of the item; none where its kind is unknown.
+Ground groundOf(const SKIA_Item& item);
 
-/// What the item draws, once the oddity of unsized labels is settled.
+/// What the item draws, once the oddity of unsized labels is settled; none where its kind is
+/// unknown.
 Figure figureOf(const SKIA_Item& item);
 
 /// A colour's alpha byte.
@@ -62,7 +72,12 @@ std::string_view shownText(const SKIA_Text& text);
 /// Whether both draw the same, as far as their words tell.
 bool drawTheSame(const SKIA_Item& one, const SKIA_Item& other);
 
-/// Every pixel in `limits` that the item can touch.
+/// The pixels that the record asks the text to be high, at most kMostTextSize; 0: it is not drawn.
+int textSizeOf(const SKIA_Text& text);
+inline constexpr int kMostTextSize = 1024;
+
+/// Every pixel in `limits` that the item can touch. A text reaches above and below a rectangle that
+/// is lower than its lines, so that no letter is cut in height.
 Pixels boundsOf(const SKIA_Item& item, const Pixels& limits);
 
 }  // namespace brimol::pc

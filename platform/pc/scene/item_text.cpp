@@ -52,7 +52,7 @@ std::string textOfItem(const SKIA_Item& item) {
   const SKIA_Rect& rect = item.rect;
   std::string text = kKindNames.at(static_cast<std::size_t>(item.kind));
   if (figureOf(item) != Figure::Line) text += numbers(rect.x, rect.y, rect.w, rect.h);
-  if (kindOf(item).ground != Ground::None) text += colour(rect.color);
+  if (groundOf(item) != Ground::None) text += colour(rect.color);
   return text + figureText(item);
 }
 

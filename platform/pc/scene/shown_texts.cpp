@@ -21,7 +21,7 @@ Pixels pointIn(const Pixels& area) {
 }
 
 bool hidesMiddle(const SKIA_Item& item, const Pixels& middle) {
-  const bool isDrawn = kindOf(item).ground != Ground::None && alphaOf(item.rect.color) != 0;
+  const bool isDrawn = groundOf(item) != Ground::None && alphaOf(item.rect.color) != 0;
   return isDrawn && covers(edgesOf(item.rect), middle);
 }
 

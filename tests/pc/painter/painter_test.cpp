@@ -93,6 +93,19 @@ TEST(Scene, RepaintsNoMoreThanWhatChanged) {
   }
 }
 
+TEST(Painter, LeavesNothingOfATextThatReachedBeyondItsRectangle) {
+  const SKIA_Item row = textItem(SKIA_TEXTBOX, {10, 28, 80, 10, kBlue}, textOf("gÄg", 30));
+  const Picture shown = painted({row});
+  EXPECT_GT(shown.inkIn({10, 20, 60, 8}), 0);
+  EXPECT_GT(shown.inkIn({10, 38, 60, 8}), 0);
+  EXPECT_EQ(shown.inkIn({80, 28, 10, 10}, kBlue), 0);
+  EXPECT_EQ(shown.inkIn({80, 0, 10, 28}), 0) << "the box is not higher than its rectangle";
+  Painter painter(kScreen);
+  painter.paint({row});
+  painter.paint({});
+  EXPECT_EQ(pictureOf(painter.picture()), painted({}));
+}
+
 using Random = std::mt19937;
 
 template <typename Row>

@@ -1,0 +1,85 @@
+#include "core/layer_walk.h"
+
+#include <atomic>
+#include <optional>
+#include <thread>
+
+#include "support/widget_test.h"
+
+namespace {
+
+using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+using MW::Window;
+
+using LayerWalkTest = WidgetTest;
+
+TEST_F(LayerWalkTest, KnowsTheThreadsInsideHandlers) {
+  ProbeWidget widget;
+  bool here = false;
+  bool elsewhere = true;
+  widget.onShow = [&](unsigned int) {
+    here = MW::LayerWalk::isOnThisThread();
+    std::jthread([&] { elsewhere = MW::LayerWalk::isOnThisThread(); }).join();
+  };
+  widget.enter();
+  Window::show(0);
+  EXPECT_TRUE(here);
+  EXPECT_FALSE(elsewhere || MW::LayerWalk::isOnThisThread());
+}
+
+// A widget that, when it is drawn within so many drawing passes, goes and is followed by another
+// one in the same place, which another thread takes away before the handler returns.
+class Heir : public MW::Widget {
+ public:
+  explicit Heir(int passesWithin) : depth(passesWithin) {
+    type_ = MW::kBaseLayer;
+    setActive(1);
+    Window::registerWidget(this);
+  }
+  ~Heir() override { leaveLayers(); }
+  int show(unsigned int) override;
+
+ private:
+  int depth;
+};
+std::optional<Heir> place;
+
+int Heir::show(unsigned int) {
+  if (--depth > 0) return Window::show(0), 0;
+  place.emplace(0);
+  std::jthread([] { place.reset(); }).join();
+  return 0;
+}
+
+TEST_F(LayerWalkTest, ACallOfADeletedWidgetIsNoCallOfTheNextOneThere) {
+  for (const int depth : {1, 2, 9}) {
+    place.emplace(depth);
+    Window::show(0);
+    EXPECT_FALSE(place.has_value());
+  }
+}
+
+// The widget stands in the layer twice, and is called again as soon as a call ends.
+TEST_F(LayerWalkTest, ARemovalWaitsForOneCallAlone) {
+  constexpr int kCalls = 50;
+  constexpr int kTurns = 20'000;  // given to the other thread in each call
+  std::atomic<int> calls = 0;
+  std::atomic<bool> isRemoved = false;
+  ProbeWidget widget;
+  widget.onShow = [&](unsigned int) {
+    ++calls;
+    calls.notify_all();
+    for (int i = 0; i < kTurns && !isRemoved; ++i) std::this_thread::yield();
+  };
+  widget.enter();
+  widget.enter();
+  const std::jthread remover([&] {
+    calls.wait(0);
+    Window::unregisterWidget(&widget);
+    isRemoved = true;
+  });
+  while (calls < kCalls && !isRemoved) Window::show(0);
+  EXPECT_LT(calls, kCalls);
+}
+
+}  // namespace

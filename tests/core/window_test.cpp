@@ -1,0 +1,232 @@
+#include <MW/dialog.h>
+#include <MW/event_service.h>
+
+#include <algorithm>
+#include <array>
+#include <climits>
+#include <cmath>
+#include <latch>
+#include <thread>
+
+#include "support/widget_test.h"
+
+namespace {
+
+using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+using MW::Window;
+
+using WindowTest = WidgetTest;
+
+TEST_F(WindowTest, UnregisteringTakesTheFirstOfEqualIds) {
+  std::string drawn;
+  const JournalWidget a(drawn, 'a');
+  JournalWidget b(drawn, 'b');
+  const JournalWidget c(drawn, 'c');
+  Window::unregisterWidget(&b);
+  JournalWidget d(drawn, 'd');
+  EXPECT_EQ(std::pair(c.id(), d.id()), std::pair(3, 3));
+  EXPECT_EQ(JournalWidget(drawn, 'D', 0).id(), 1) << "layers are numbered apart";
+  Window::unregisterWidget(&d);
+  Window::show(1);
+  EXPECT_EQ(drawn, "ad") << "c left in place of d";
+}
+
+// Whose numbers are the same goes by itself all the same.
+TEST_F(WindowTest, DeletingADialogTakesNoOtherAway) {
+  MW::Dialog second(1);
+  auto first = std::make_unique<MW::Dialog>(1);
+  MW::Dialog third(1);
+  first.reset();
+  auto fourth = std::make_unique<MW::Dialog>(1);
+  EXPECT_EQ(fourth->id(), third.id());
+  third.setActive(1);
+  Window::show(1);
+  const std::vector<Drawing> before = platform().takeDrawings();
+  platform().takeLog();
+  fourth.reset();
+  EXPECT_EQ(platform().takeLog().size(), 1U);
+  Window::show(1);
+  EXPECT_FALSE(before.empty());
+  EXPECT_EQ(platform().takeDrawings(), before);
+}
+
+TEST_F(WindowTest, RegistrationsAreCountedAndRefused) {
+  std::string calls;
+  const JournalWidget widget(calls, 'w');
+  const std::vector<LogLine> entered = platform().takeLog();
+  EXPECT_EQ(entered.at(0), logLines(kWarning, {"[WINDOW] registerWidget: type=1"})[0]);
+  const std::string counted = "[WINDOW] registerWidget: num_widget=";
+  const int count = std::stoi(entered.at(1).message.substr(counted.size()));
+  EXPECT_EQ(entered.at(1), logLines(kDebug, {counted + std::to_string(count)})[0]);
+  for (const int type : {-1, 2, INT_MIN}) {
+    ProbeWidget stranger(type);
+    stranger.enter();
+    EXPECT_EQ(stranger.id(), 0);
+    Window::unregisterWidget(&stranger);
+  }
+  const std::string left = "[WINDOW] unregisterWidget: num_widget=" + std::to_string(count - 3);
+  EXPECT_EQ(platform().takeLog().back(), logLines(kDebug, {left})[0]) << "counted all the same";
+  EXPECT_EQ(Window::registerWidget(nullptr) + Window::unregisterWidget(nullptr), 2);
+}
+
+TEST_F(WindowTest, DrawsAndTimesTheBaseLayerFirst) {
+  std::string calls;
+  const JournalWidget dialog(calls, 'D', 0);
+  JournalWidget a(calls, 'a');
+  JournalWidget hidden(calls, 'h');
+  const JournalWidget b(calls, 'b');
+  hidden.setActive(0);
+  a.onShow = a.onTimer = [&](unsigned int ticks) { calls += std::to_string(ticks); };
+  platform().ticks = 70;
+  Window::show(5);
+  Window::show();
+  Window::updateTimer(5);
+  EXPECT_EQ(calls, "5bD70bD70bD") << "the timer pass reads the clock";
+}
+
+TEST_F(WindowTest, ChangesDuringAPassSkipAndRepeatNothing) {
+  std::string calls;
+  std::vector<std::unique_ptr<JournalWidget>> all;
+  const auto add = [&](char name) { all.push_back(std::make_unique<JournalWidget>(calls, name)); };
+  const auto unregister = [&](std::size_t i) { Window::unregisterWidget(all[i].get()); };
+  // Widgets a, b and c are drawn twice; what a does when it is drawn first.
+  const auto callsWith = [&](const std::function<void()>& change) {
+    all.clear();
+    calls.clear();
+    for (const char name : {'a', 'b', 'c'}) add(name);
+    bool changed = false;
+    all[0]->onShow = [&](unsigned int) {
+      calls += 'a';
+      if (!std::exchange(changed, true)) change();
+    };
+    Window::show(1);
+    calls += ' ';
+    Window::show(2);
+    return calls;
+  };
+  EXPECT_EQ(callsWith([&] { unregister(0); }), "abc bc");
+  EXPECT_EQ(callsWith([&] { unregister(1); }), "ac ac");
+  EXPECT_EQ(callsWith([&] { all.resize(1); }), "a a");
+  EXPECT_EQ(callsWith([&] { Window::show(1); }), "aabcbc abc");
+  EXPECT_EQ(callsWith([&] { unregister(1), all[1]->enter(); }), "ac acb");
+  const auto addMany = [&] { std::ranges::for_each(std::string(40, 'n'), add); };
+  EXPECT_EQ(callsWith(addMany), "abc abc" + std::string(40, 'n'));
+}
+
+TEST_F(WindowTest, TurnsMillimetresIntoPixels) {
+  using Pixels = std::pair<float, int>;  // the density as it is kept, and the length
+  const auto pixels = [](float dpi, float mm) {
+    Window::xdpi = 0;
+    platform().xdpi = platform().ydpi = dpi;
+    float told = 0;
+    const int count = Window::getMura(&told, nullptr, mm);
+    EXPECT_EQ(told, dpi) << "before it is rounded";
+    EXPECT_EQ(Window::ydpi, dpi) << "only the horizontal density is rounded";
+    return Pixels(Window::xdpi, count);
+  };
+  EXPECT_EQ(pixels(401.6F, 10), Pixels(402, 158));
+  EXPECT_EQ(pixels(401.4F, 10), Pixels(401.4F, 158));
+  EXPECT_EQ(pixels(100.5F, 254), Pixels(101, 1010));
+  EXPECT_EQ(pixels(INFINITY, 10), Pixels(INFINITY, INT_MAX));
+  EXPECT_EQ(pixels(-3e9F, 100), Pixels(-3e9F, INT_MIN));
+  EXPECT_EQ(pixels(400, NAN), Pixels(400, 0));
+  EXPECT_EQ(platform().takeLog()[0],
+            logLines(kError, {"[WINDOW] getMura[402.000000 dpi] 10.000000mm = 158 pixel"})[0]);
+}
+
+const LogLine kLeftOver = logLines(
+    kError, {"[WINDOW] destroy: a handler asks for it: the rest is left to the next call"})[0];
+const LogLine kEnd = logLines(kError, {"[WINDOW] event_dispatcher End"})[0];
+
+long countOf(const std::vector<LogLine>& lines, const LogLine& line) {
+  return std::ranges::count(lines, line);
+}
+
+TEST_F(WindowTest, StartsAndEndsOnAnyThreadsAtOnce) {
+  for (int round = 0; round < 50; ++round) {
+    ASSERT_EQ(Window::init(), 1);
+    std::latch allThere(4);
+    const auto meet = [&](int (*operation)()) {
+      return [&allThere, operation] {
+        allThere.arrive_and_wait();
+        EXPECT_EQ(operation(), 1);
+      };
+    };
+    const std::array<std::jthread, 4> threads = {
+        std::jthread(meet(&Window::destroy)), std::jthread(meet(&Window::init)),
+        std::jthread(meet(&Window::destroy)), std::jthread(meet(&Window::destroy))};
+  }
+  Window::destroy();
+  EXPECT_EQ(Window::getEventService(), nullptr);
+  EXPECT_EQ(platform().inits, platform().quits);
+}
+
+// The handler of a drawing pass that waited for the dispatch thread would wait for itself: there a
+// callback deletes the handler's widget.
+TEST_F(WindowTest, ADrawnHandlerThatEndsTheWindowDoesNotWait) {
+  ASSERT_EQ(Window::init(), 1);
+  std::latch bothInside(2);
+  auto drawn = std::make_unique<ProbeWidget>();
+  drawn->onShow = [&](unsigned int) {
+    bothInside.arrive_and_wait();
+    EXPECT_EQ(Window::destroy(), 1);
+    EXPECT_EQ(Window::init(), 0) << "not before the end";
+    EXPECT_NE(Window::getEventService(), nullptr);
+  };
+  drawn->enter();
+  ProbeWidget offered;
+  offered.onEvent = [&](auto*, auto) {
+    bothInside.arrive_and_wait();
+    drawn.reset();
+    return true;
+  };
+  offered.enter();
+  Window::getEventService()->AppEvent(1);
+  Window::show(0);
+  EXPECT_EQ(countOf(platform().takeLog(), kLeftOver), 1);
+  EXPECT_EQ(Window::init(), 1) << "ends the rest, and starts anew";
+  EXPECT_EQ(std::pair(platform().inits, platform().quits), std::pair(2, 1));
+  Window::destroy();
+  EXPECT_EQ(drawn, nullptr);
+  EXPECT_EQ(Window::getEventService(), nullptr);
+}
+
+TEST_F(WindowTest, ADispatchedHandlerEndsAndStartsTheWindow) {
+  ASSERT_EQ(Window::init(), 1);
+  std::latch isOver(1);
+  ProbeWidget widget;
+  widget.onEvent = [&](auto*, auto) {
+    EXPECT_EQ(Window::destroy(), 1);
+    EXPECT_EQ(Window::getEventService(), nullptr);
+    EXPECT_EQ(Window::init(), 1);
+    EXPECT_NE(Window::getEventService(), nullptr);
+    isOver.count_down();
+    return true;
+  };
+  widget.enter();
+  Window::getEventService()->AppEvent(1);
+  isOver.wait();
+  Window::destroy();
+  EXPECT_EQ(std::pair(platform().inits, platform().quits), std::pair(2, 2));
+  EXPECT_EQ(countOf(platform().takeLog(), kEnd), 2);
+}
+
+// An exit callback and the application's thread.
+TEST_F(WindowTest, AHandlerEndsTheWindowWhileAnotherThreadDoes) {
+  for (int round = 0; round < 50; ++round) {
+    ASSERT_EQ(Window::init(), 1);
+    std::latch bothThere(2);
+    ProbeWidget widget;
+    widget.onEvent = [&](auto*, auto) {
+      bothThere.arrive_and_wait();
+      return Window::destroy() == 1;
+    };
+    widget.enter();
+    Window::getEventService()->AppEvent(1);
+    bothThere.arrive_and_wait();
+    Window::destroy();
+    EXPECT_EQ(Window::getEventService(), nullptr);
+  }
+}
+
+}  // namespace
