@@ -1,0 +1,45 @@
+/// What a finger does on a text panel.
+#pragma once
+
+#include <MW/detail/double_tap.h>
+
+#include <cstdint>
+
+namespace MW {
+
+/// What happened on a text panel, each with a callback of its own.
+enum class TextTouch { None, Press, Release, LongPress, DoubleTap };
+
+/// Is told of a finger on a panel and answers what happened. Times are GetTicks() milliseconds. One
+/// thread, the one that handles events.
+class TextGesture {
+ public:
+  constexpr TextTouch press() const { return TextTouch::Press; }
+  constexpr TextTouch longPress() const { return TextTouch::LongPress; }
+  /// Outside the panel nothing happens.
+  constexpr TextTouch release(bool isInside) const {
+    return isInside ? TextTouch::Release : TextTouch::None;
+  }
+  /// Behind what happened on a panel that wants double taps: a press awaits a tap.
+  constexpr void awaitTap(TextTouch what, uint32_t now) {
+    if (what == TextTouch::Press) taps.press(now);
+  }
+  /// Whether a release ended an awaited tap, which tap() is then told of.
+  constexpr bool isTap(TextTouch what) const {
+    return what == TextTouch::Release && taps.isRunning();
+  }
+  /// A tap: the second of a series is a double tap, a third is not.
+  constexpr TextTouch tap(uint32_t now) {
+    counted = taps.tap(now);
+    return counted == DoubleTap::kDouble ? TextTouch::DoubleTap : TextTouch::None;
+  }
+  /// The number of the last tap in its series, from 1; 0 where it came too late.
+  constexpr int tapNumber() const { return counted; }
+  constexpr void reset() { *this = TextGesture(); }
+
+ private:
+  DoubleTap taps;
+  int counted = 0;
+};
+
+}  // namespace MW
