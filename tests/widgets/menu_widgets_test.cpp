@@ -32,7 +32,7 @@ Made list(const char* title, int height) {
   return made;
 }
 
-enum Class { Button, Screen, Slide, Plain, Key, Dialog, Toast, Bar, Fill, List };
+enum Class { Button, Screen, Slide, Plain, Key, Toast, Bar, Fill, List };
 
 // `variant`: the number that its constructor takes, or its button type.
 Made make(Class which, int variant, const SKIA_Rect& area, const SKIA_Text& text) {
@@ -42,7 +42,6 @@ Made make(Class which, int variant, const SKIA_Rect& area, const SKIA_Text& text
     case Slide: return std::make_unique<MW::Slide>(variant, &area, &text, &text);
     case Plain: return std::make_unique<MW::SlideV>(variant, &area, &text, &text);
     case Key: return std::make_unique<MW::Key>();
-    case Dialog: return std::make_unique<MW::Dialog>(variant);
     case Toast: return std::make_unique<MW::Toastbox>(&area, &text, &text);
     case Bar: return std::make_unique<MW::Progressbar>(variant, &area, &text);
     case Fill: return std::make_unique<MW::FullScreen>(variant);
@@ -79,19 +78,6 @@ constexpr auto kInput = std::to_array<ScriptCase>({
     {Key, 0, "t1000 u2 t1100 d t1101 d t9000 d u5 d", " +  2u 5u+"},
     {Key, 0, "t1000 u17 t1050 u18 u5 t1150 d t1151 d", " + ++  2u"},
     {Key, 0, "t1000 u5 t9000 d u2 u5 t9999 d", " + +5u+ "},
-    {Dialog, 0, "f2 p154,1400 ? r714,1619 ? g", "p+<3/1/725>1c+<3/0/725>[DIALOG] btn1 released!!"},
-    {Dialog, 0, "p1285,1619 ? r ? g", "p+<1/1/725>2c+<0/0/725>[DIALOG] btn2 released!!"},
-    {Dialog, 0, "m300,1500 p720,1500 r l300,1500 a1 k323", "h-p-c+--+"},
-    {Dialog, 0, "p300,1500 m301,1500 ? m720,1500 ? r", "p+h+<1/1/725>h+<1/0/725>c+"},
-    {Dialog, 0, "o0 p300,1500 r h p", "p-c+p+"},
-    {Dialog, 24, "p900,1500 r", "p+12c+"},
-    {Dialog, 13, "k323 k274 u17 g", "H+274k+17u+[DIALOG] key onPlugKey sym = 17"},
-    {Dialog, 0, "t1000 K5 t1999 K5 K5 K5 K6 t2999 K5", " 5r+ 5D5r+5T5r+5r+6r+ 5r+"},
-    {Dialog, 23,
-     "t100 * n101 * n100 * n1 * n100 K5 n100 * n1 * n101 * n101 * n101 * n101 * n101 * n101 * n101 "
-     "* "
-     "n101 *",
-     " 11125r+23456789101"},
     {Bar, 0,
      "* t1000 B1111 * n100 * n1 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * n101 * "
      "n101 * n1 * B0 * B9 *",
@@ -148,10 +134,10 @@ TEST_F(MenuWidgetTest, TakesAnyScreenAndRecord) {
   using std::pair;
   for (const auto& [which, texts] :
        {pair(Button, 2), pair(Screen, 0), pair(Slide, 2), pair(Plain, 2), pair(Key, 0),
-        pair(Dialog, 0), pair(Toast, 2), pair(Bar, 1), pair(Fill, 0), pair(List, 1)}) {
+        pair(Toast, 2), pair(Bar, 1), pair(Fill, 0), pair(List, 1)}) {
     SCOPED_TRACE(which);
     widget = make(which, 1, kArea, kCaption);
-    EXPECT_EQ(layerSize(which == Dialog || which == Fill ? 0 : 1), 1);
+    EXPECT_EQ(layerSize(which == Fill ? 0 : 1), 1);
     EXPECT_EQ(widget->isActive(), which == Key);
     EXPECT_FALSE(widget->onRecvEvent(nullptr, 0));
     for (const int w : kHostileSizes) {
