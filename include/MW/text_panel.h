@@ -66,9 +66,9 @@ class MW_API TextPanel : public Widget {
 
   // What the handlers do before they call back. Each logs, and answers what happened.
 
-  TextTouch takePress(const event_data* event);
+  TextTouch takePress(const event_data& event);
   TextTouch takeRelease(const event_data* event);
-  TextTouch takeLongPress() const;
+  TextTouch takeLongPress();
   TextTouch takeTap();
 
   unsigned int saved_bg_color = 0;  // 0xAARRGGBB; guarded by stateLock

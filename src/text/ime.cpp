@@ -143,17 +143,16 @@ void Ime::tell(TextTouch what) {
 }
 
 void Ime::onPress(event_data* event) {
-  const TextTouch what = takePress(event);
+  if (event == nullptr) return;
   const LifeGuard self(this);
-  tell(what);
-  if (self.isAlive() && double_tap_cb != nullptr) gesture.awaitTap(what, GetTicks());
+  tell(takePress(*event));
+  if (self.isAlive() && double_tap_cb != nullptr) gesture.awaitTap(GetTicks());
 }
 
 void Ime::onRelease(event_data* event) {
-  const TextTouch what = takeRelease(event);
   const LifeGuard self(this);
-  tell(what);
-  if (self.isAlive() && double_tap_cb != nullptr && gesture.isTap(what)) onTouchClickCount();
+  tell(takeRelease(event));
+  if (self.isAlive() && double_tap_cb != nullptr && gesture.endedTap()) onTouchClickCount();
   kLog.print(LogLevel::Debug, "released!!");
 }
 

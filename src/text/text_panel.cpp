@@ -65,10 +65,9 @@ void TextPanel::restoreColor() {
   askForRedraw();
 }
 
-TextTouch TextPanel::takePress(const event_data* event) {
-  if (event == nullptr) return TextTouch::None;
+TextTouch TextPanel::takePress(const event_data& event) {
   ClassLog(word).print(LogLevel::Debug, "pressed!!");
-  hold.press(event->mouse);
+  hold.press(event.mouse);
   return gesture.press();
 }
 
@@ -77,7 +76,7 @@ TextTouch TextPanel::takeRelease(const event_data* event) {
   return gesture.release(isUnder(rect, event));
 }
 
-TextTouch TextPanel::takeLongPress() const {
+TextTouch TextPanel::takeLongPress() {
   ClassLog(word).print(LogLevel::Debug, "long pressed!!");
   return gesture.longPress();
 }

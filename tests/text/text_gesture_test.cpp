@@ -14,20 +14,27 @@ static_assert(TextGesture().longPress() == TextTouch::LongPress);
 static_assert(TextGesture().release(true) == TextTouch::Release);
 static_assert(TextGesture().release(false) == TextTouch::None);
 
-constexpr TextGesture awaiting(TextTouch what, uint32_t now = 1000) {
+enum class Start { Press, LongPress, Nothing };
+enum class End { Inside, Outside };
+
+// Whether a tap was awaited and ended.
+constexpr bool isTap(Start start, End end) {
   TextGesture gesture;
-  gesture.awaitTap(what, now);
-  return gesture;
+  if (start == Start::Press) gesture.press();
+  if (start == Start::LongPress) gesture.longPress();
+  gesture.awaitTap(1000);
+  gesture.release(end == End::Inside);
+  return gesture.endedTap();
 }
-static_assert(awaiting(TextTouch::Press).isTap(TextTouch::Release));
-static_assert(!awaiting(TextTouch::Press).isTap(TextTouch::None), "lifted outside");
-static_assert(!awaiting(TextTouch::LongPress).isTap(TextTouch::Release));
-static_assert(!awaiting(TextTouch::None).isTap(TextTouch::Release));
+static_assert(isTap(Start::Press, End::Inside) && !isTap(Start::Press, End::Outside));
+static_assert(!isTap(Start::LongPress, End::Inside) && !isTap(Start::Nothing, End::Inside));
 
 // The number of the last of several taps, each so long after the one before; negative where it is a
 // double tap.
 constexpr int lastOf(std::initializer_list<uint32_t> pauses, uint32_t start = 1000) {
-  TextGesture gesture = awaiting(TextTouch::Press, start);
+  TextGesture gesture;
+  gesture.press();
+  gesture.awaitTap(start);
   uint32_t now = start;
   TextTouch what = TextTouch::None;
   for (const uint32_t pause : pauses) what = gesture.tap(now += pause);

@@ -14,20 +14,18 @@ enum class TextTouch { None, Press, Release, LongPress, DoubleTap };
 /// thread, the one that handles events.
 class TextGesture {
  public:
-  constexpr TextTouch press() const { return TextTouch::Press; }
-  constexpr TextTouch longPress() const { return TextTouch::LongPress; }
+  constexpr TextTouch press() { return last = TextTouch::Press; }
+  constexpr TextTouch longPress() { return last = TextTouch::LongPress; }
   /// Outside the panel nothing happens.
-  constexpr TextTouch release(bool isInside) const {
-    return isInside ? TextTouch::Release : TextTouch::None;
+  constexpr TextTouch release(bool isInside) {
+    return last = isInside ? TextTouch::Release : TextTouch::None;
   }
-  /// Behind what happened on a panel that wants double taps: a press awaits a tap.
-  constexpr void awaitTap(TextTouch what, uint32_t now) {
-    if (what == TextTouch::Press) taps.press(now);
+  /// Behind each press of a panel that wants double taps.
+  constexpr void awaitTap(uint32_t now) {
+    if (last == TextTouch::Press) taps.press(now);
   }
   /// Whether a release ended an awaited tap, which tap() is then told of.
-  constexpr bool isTap(TextTouch what) const {
-    return what == TextTouch::Release && taps.isRunning();
-  }
+  constexpr bool endedTap() const { return last == TextTouch::Release && taps.isRunning(); }
   /// A tap: the second of a series is a double tap, a third is not.
   constexpr TextTouch tap(uint32_t now) {
     counted = taps.tap(now);
@@ -38,6 +36,7 @@ class TextGesture {
   constexpr void reset() { *this = TextGesture(); }
 
  private:
+  TextTouch last = TextTouch::None;
   DoubleTap taps;
   int counted = 0;
 };
