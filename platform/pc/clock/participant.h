@@ -14,6 +14,7 @@ struct TurnClock::Participant {
   uint64_t wake = 0;       // when its pause ends
   bool isPoller = false;
   bool isOutside = false;  // away, and named as one that blocks outside
+  bool isAtWork = false;   // has the turn and knows it
   int calls = 0;           // since its pause; the thread's own
   std::atomic<bool> waitsInside = false;
   std::atomic<bool> arrives = false;  // waits for the clock's lock, or is about to
