@@ -4,6 +4,7 @@
 
 #include <cstdlib>
 
+#include "paths.h"
 #include "runs.h"
 
 namespace brimol::replay {
@@ -16,8 +17,8 @@ class Junit : public InFolder {
   // As xmllint sees it.
   bool isValid(const std::string& xml) const {
     const auto file = write("report.xml", xml);
-    const std::string command = std::string(std::getenv("XMLLINT")) + " --noout --schema " +
-                                std::getenv("JUNIT_SCHEMA") + " " + file.native() + " 2>&1";
+    const std::string command =
+        std::string(kXmllint) + " --noout --schema " + kJunitSchema + " " + file.native() + " 2>&1";
     return std::system(command.c_str()) == 0;
   }
 };

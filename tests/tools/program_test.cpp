@@ -6,6 +6,7 @@
 #include <cstdlib>
 #include <thread>
 
+#include "paths.h"
 #include "runs.h"
 
 namespace brimol::replay {
@@ -21,10 +22,10 @@ class Program : public InFolder {
   int replay(const std::string& arguments) {
     std::string words = arguments;
     if (const auto place = words.find("APP"); place != std::string::npos) {
-      words.replace(place, 3, std::getenv("FAKE_APPLICATION"));
+      words.replace(place, 3, kFakeApplication);
     }
-    const std::string command = "cd " + folder.native() + " && exec " +
-                                std::getenv("BRIMOL_REPLAY") + " " + words + " >said.txt 2>&1";
+    const std::string command =
+        "cd " + folder.native() + " && exec " + kReplayProgram + " " + words + " >said.txt 2>&1";
     const int status = std::system(command.c_str());
     said = bytesOf(folder / "said.txt");
     return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
@@ -82,8 +83,8 @@ TEST_F(Program, EndsTheApplicationWhenItIsInterrupted) {
     ::kill(std::stoi(bytesOf(folder / "pid.txt")), SIGTERM);
   });
   const std::string command = "cd " + folder.native() + " && echo $$ >pid.txt && exec " +
-                              std::getenv("BRIMOL_REPLAY") + " --dir d menu.trace -- " +
-                              std::getenv("FAKE_APPLICATION") + " hang >said.txt 2>&1";
+                              kReplayProgram + " --dir d menu.trace -- " + kFakeApplication +
+                              " hang >said.txt 2>&1";
   const int status = std::system(command.c_str());
   killer.join();
   EXPECT_EQ(WEXITSTATUS(status), 130);

@@ -106,6 +106,10 @@ class Entries {
       movement["motions"] = movement["motions"].get<int>() + 1;
       return;
     }
+    const bool repeatsStep = happening.kind == Kind::Expectation && !list.empty() &&
+                             list.back()["kind"] == nameOf(Kind::Step) &&
+                             list.back().value("where", "") == happening.place.text();
+    if (repeatsStep) list.erase(list.size() - 1);
     if (count >= kMostHappenings && !isFailure(happening)) {
       ++leftOut;
       return;
