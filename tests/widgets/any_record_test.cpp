@@ -58,22 +58,33 @@ INSTANTIATE_TEST_SUITE_P(, AnyRecord, testing::ValuesIn(kKinds), kRowName);
 const std::string kLongest(127, 'x');
 constexpr auto kHostile = {0, 1, 7, -1, -1080, INT_MIN, INT_MAX};
 
-TEST_P(AnyRecord, IsDrawnCutAndTouchedOnAnyScreen) {
+const Steps kTouches = {press(9, INT_MAX),
+                        drag(INT_MIN, INT_MAX),
+                        drag(INT_MAX, INT_MIN),
+                        draw(),
+                        release(0, 0),
+                        longPress(),
+                        keyUp(5),
+                        plug(2)};
+
+// Touches a widget of such an area, and says how many of its texts fill their record.
+std::ptrdiff_t longTexts(const Kind& kind, const SKIA_Rect& area) {
   SKIA_Text endless = {};
   std::ranges::fill(endless.text, 'x');
   endless.string_len = endless.size = INT_MAX;
+  played([&] { return kind.make(&area, &endless); }, kTouches);
+  const Made made = kind.make(&area, &endless);
+  made->setText(std::string(300, 'x').c_str());
+  made->setMsg(std::string(300, 'x').c_str());
   const auto isLongest = [](const Drawing& each) { return each.text.text == kLongest; };
+  return std::ranges::count_if(shown(*made), isLongest);
+}
+
+TEST_P(AnyRecord, IsDrawnCutAndTouchedOnAnyScreen) {
   for (const int w : kHostile) {
     for (const int h : kHostile) {
       setScreen(w, h);
-      const SKIA_Rect area = {w, h, w, h, 0};
-      const Made made = GetParam().make(&area, &endless);
-      made->setText(std::string(300, 'x').c_str());
-      made->setMsg(std::string(300, 'x').c_str());
-      EXPECT_EQ(std::ranges::count_if(shown(*made), isLongest), GetParam().texts);
-      played([&] { return GetParam().make(&area, &endless); },
-             {press(9, INT_MAX), drag(INT_MIN, INT_MAX), drag(INT_MAX, INT_MIN), draw(),
-              release(0, 0), longPress(), keyUp(5), plug(2), draw()});
+      EXPECT_EQ(longTexts(GetParam(), {w, h, w, h, 0}), GetParam().texts);
     }
   }
 }

@@ -13,35 +13,32 @@ using MW::Button8;
 constexpr SKIA_Rect kArea = {0, 0, 400, 800, 5};
 
 // A pad that tells which cells are held.
-template <int layout>
-std::unique_ptr<MW::Widget> pad() {
-  auto made = std::make_unique<Button8>(layout, &kArea, nullptr);
-  made->setActive(1);
-  made->pressCallback = made->clickCallback = [](MW::mouse_event* mouse) {
-    noteTouch("held" + std::to_string(mouse->state), mouse);
-  };
-  return made;
+PlaysOn pad(int layout) {
+  return {[layout] {
+    auto made = std::make_unique<Button8>(layout, &kArea, nullptr);
+    made->setActive(1);
+    made->pressCallback = made->clickCallback = [](MW::mouse_event* mouse) {
+      noteTouch("held" + std::to_string(mouse->state), mouse);
+    };
+    return made;
+  }};
 }
+const PlaysOn kPad = pad(Button8::kFourByTwo);
 
 const std::vector<Play> kPlays = {
-    {"EachCellHasItsOwnFinger",
-     pad<Button8::kFourByTwo>,
-     {press(21, 25), finger(4), press(379, 387), lookAtLog(), finger(0), release(21, 25)},
-     "held1+ held9+ <[BUTTON8] pressed (3) - state = 9  1,0,0,5,0,0,0,0!!> held8+"},
-    {"AnEdgeBelongsToNoCell", pad<Button8::kFourByTwo>, {press(20, 25), press(21, 24)}, "+ +"},
-    {"AFingerThatSlidesAwayLeavesItsCellHeld",
-     pad<Button8::kFourByTwo>,
-     {press(21, 25), moveTo(30, 300), longPress(), release(), release(5, 5)},
-     "held1+ - - held1+ +"},
-    {"AnyFingerFreesACell",
-     pad<Button8::kFourByTwo>,
-     {press(21, 25), finger(6), release(30, 30), lookAtLog()},
-     "held1+ held0+ <[BUTTON8] released (0) - state = 0 !!>"},
-    {"TakesNothingOutside", pad<Button8::kOneCell>, {press(400, 5), press(399, 5)}, "- +"},
-    {"HidingFreesAllCells",
-     pad<Button8::kTwoByTwo>,
-     {press(100, 300), call(&MW::Widget::hide), look(&MW::Widget::isActive), press(300, 300)},
-     "held1+ <0> held2+"},
+    kPad("EachCellHasItsOwnFinger",
+         {press(21, 25), finger(4), press(379, 387), lookAtLog(), finger(0), release(21, 25)},
+         "held1+ held9+ <[BUTTON8] pressed (3) - state = 9  1,0,0,5,0,0,0,0!!> held8+"),
+    kPad("AnEdgeBelongsToNoCell", {press(20, 25), press(21, 24)}, "+ +"),
+    kPad("AFingerThatSlidesAwayLeavesItsCellHeld",
+         {press(21, 25), moveTo(30, 300), longPress(), release(), release(5, 5)},
+         "held1+ - - held1+ +"),
+    kPad("AnyFingerFreesACell", {press(21, 25), finger(6), release(30, 30), lookAtLog()},
+         "held1+ held0+ <[BUTTON8] released (0) - state = 0 !!>"),
+    pad(Button8::kOneCell)("TakesNothingOutside", {press(400, 5), press(399, 5)}, "- +"),
+    kPad("HidingFreesAllCells",
+         {press(100, 300), call(&MW::Widget::hide), look(&MW::Widget::isActive), press(300, 300)},
+         "held4+ <0> held8+"),
 };
 TEST_P(Button8Plays, TellTheirJournal) { expectJournal(GetParam()); }
 INSTANTIATE_TEST_SUITE_P(, Button8Plays, testing::ValuesIn(kPlays), kRowName);

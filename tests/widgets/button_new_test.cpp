@@ -11,13 +11,13 @@ using MW::ButtonNew;
 constexpr SKIA_Rect kArea = {10, 20, 100, 50, 5};
 const SKIA_Text* const kNoText = nullptr;
 
-TEST_F(ButtonNewTest, TakesNoMotionAndIsClickedAfterALongPress) {
-  expectJournal({"",
-                 makes<ButtonNew, Told::Zero>(ButtonNew::kTextBox, &kArea, kNoText),
-                 {press(109, 69), moveTo(9, 9), look(&MW::Widget::getBgColor), longPress(),
-                  lookAtHold(), release(), release(50, 40), lookAtLog()},
-                 "press+ - <5> long+ <held 0> - click+ <[BUTTONNEW] released!!>"});
-}
+const PlaysOn kButton = {makes<ButtonNew, Told::Zero>(ButtonNew::kTextBox, &kArea, kNoText)};
+const Play kPlay = kButton("",
+                           {press(109, 69), moveTo(9, 9), look(&MW::Widget::getBgColor),
+                            longPress(), lookAtHold(), release(), release(50, 40), lookAtLog()},
+                           "press+ - <5> long+ <held 0> - click+ <[BUTTONNEW] released!!>");
+
+TEST_F(ButtonNewTest, TakesNoMotionAndIsClickedAfterALongPress) { expectJournal(kPlay); }
 
 TEST_F(ButtonNewTest, OnlyTheFramedStyleHasAFrame) {
   const std::vector<std::pair<int, std::size_t>> drawings = {

@@ -11,36 +11,28 @@ using ScreenTest = WidgetTest;
 using ScreenPlays = PlayTest;
 using MW::Screen;
 
-const Maker kScreen = makes<Screen>();  // 1440 x 2560
+const PlaysOn kScreen = {makes<Screen>()};  // 1440 x 2560
 Step passOn() { return call(&MW::Widget::setButtonType, Screen::kPassOn); }
 
 const std::vector<Play> kPlays = {
-    {"TellsEveryTouchAndLeavesKeysAlone",
-     kScreen,
-     {finger(2), press(-5, 9000), moveTo(1, 2), longPress(3, 4), finger(7), release(5, 6),
-      keyDown(5), keyUp(5), plug(17)},
-     "press+ hover+ long+ click+ - - -"},
-    {"PassesTouchesOn",
-     kScreen,
-     {passOn(), press(1, 1), moveTo(2, 2), longPress(), release()},
-     "press- hover- long- click-"},
-    {"ATapThatReachesItTwiceIsADoubleTap",
-     kScreen,
-     {passOn(), press(500, 500), release(), release()},
-     "press- click- click double-"},
-    {"TapsOfADoubleTapMayLieApart",
-     kScreen,
-     {press(500, 500), release(475, 524), press(60, 2500), release(), press(), release(),
-      lookAtLog()},
-     "press+ click+ press+ click double+ press+ click+ <[BUTTON] onTouchClickCount!! 3>"},
-    {"ALateTapStartsAnew",
-     kScreen,
-     {press(500, 500), release(), press(), later(500), release(), press(), release()},
-     "press+ click+ press+ click+ press+ click+"},
-    {"HidingLeavesItHeld",
-     kScreen,
-     {press(500, 500), call(&MW::Widget::hide), look(&MW::Widget::isActive), lookAtHold()},
-     "press+ <0> <held 1>"},
+    kScreen("TellsEveryTouchAndLeavesKeysAlone",
+            {finger(2), press(-5, 9000), moveTo(1, 2), longPress(3, 4), finger(7), release(5, 6),
+             keyDown(5), keyUp(5), plug(17)},
+            "press+ hover+ long+ click+ - - -"),
+    kScreen("PassesTouchesOn", {passOn(), press(1, 1), moveTo(2, 2), longPress(), release()},
+            "press- hover- long- click-"),
+    kScreen("ATapThatReachesItTwiceIsADoubleTap", {passOn(), press(500, 500), release(), release()},
+            "press- click- click double-"),
+    kScreen("TapsOfADoubleTapMayLieApart",
+            {press(500, 500), release(475, 524), press(60, 2500), release(), press(), release(),
+             lookAtLog()},
+            "press+ click+ press+ click double+ press+ click+ <[BUTTON] onTouchClickCount!! 3>"),
+    kScreen("ALateTapStartsAnew",
+            {press(500, 500), release(), press(), later(500), release(), press(), release()},
+            "press+ click+ press+ click+ press+ click+"),
+    kScreen("HidingLeavesItHeld",
+            {press(500, 500), call(&MW::Widget::hide), look(&MW::Widget::isActive), lookAtHold()},
+            "press+ <0> <held 1>"),
 };
 TEST_P(ScreenPlays, TellTheirJournal) { expectJournal(GetParam()); }
 INSTANTIATE_TEST_SUITE_P(, ScreenPlays, testing::ValuesIn(kPlays), kRowName);
@@ -54,7 +46,7 @@ TEST_F(ScreenTest, CountsNoTapBesideItsSquare) {
                                  {{500, 500}, {474, 500}},
                                  {{500, 500}, {500, 525}}}) {
     const Steps steps = {press(700, 700), release(), press(from.x, from.y), release(to.x, to.y)};
-    EXPECT_EQ(played(kScreen, steps), "press+ click+ press+ click+");
+    EXPECT_EQ(played(kScreen.make, steps), "press+ click+ press+ click+");
   }
 }
 

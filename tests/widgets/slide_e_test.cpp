@@ -13,7 +13,9 @@ using MW::SlideE;
 constexpr SKIA_Rect kBar = {0, 0, 600, 100, 7};  // the knob goes from 0 to 500
 const SKIA_Text* const kNoText = nullptr;
 
-Maker exitSlide(int state) { return makes<SlideE>(state, &kBar, kNoText, nullptr); }
+PlaysOn from(int state) { return {makes<SlideE>(state, &kBar, kNoText, nullptr)}; }
+const PlaysOn kLeft = from(SlideE::kFromLeft);
+const PlaysOn kRight = from(SlideE::kFromRight);
 
 Step knob() {
   return look<SlideE>([](SlideE& slide) {
@@ -24,30 +26,23 @@ Step knob() {
 }
 
 const std::vector<Play> kPlays = {
-    {"ExitsAtTheRight",
-     exitSlide(SlideE::kFromLeft),
-     {press(99, 99), drag(499, 0), knob(), drag(1, 0), knob()},
-     "+ + <0 at 499 held> exit+ <0 at 0>"},
-    {"ExitsAtTheLeft",
-     exitSlide(SlideE::kFromRight),
-     {press(500, 0), drag(-499, 0), drag(9, 0), drag(-10, 0), knob(), drag(600, 0)},
-     "+ + + exit+ <1 at 500> -"},
-    {"SnapsBackWhenItIsReleased",
-     exitSlide(2),
-     {press(0, 0), drag(-5, 0), drag(5, 0), knob(), release(900, 0), knob()},
-     "+ + + <2 at 5 held> + <2 at 0>"},
-    {"ExitsByAnyMotionToTheOtherEndAlone",
-     exitSlide(4),
-     {press(0, 0), drag(INT_MIN, 0), knob(), drag(INT_MAX, 0)},
-     "+ + <4 at 0 held> exit+"},
-    {"AnotherStateNeverExits",
-     exitSlide(7),
-     {press(500, 0), drag(INT_MIN, 0), knob(), drag(INT_MAX, 0), knob()},
-     "+ + <7 at 0 held> + <7 at 500 held>"},
-    {"ASecondFingerBesideTheKnobCancelsTheDrag",
-     exitSlide(SlideE::kFromLeft),
-     {press(0, 0), drag(50, 0), finger(2), press(300, 9), lookAtLog(), knob()},
-     "+ + + <[SLIDE_EXIT] Another touch finger pressed!\nDisabled button selection!> <0 at 0>"},
+    kLeft("ExitsAtTheRight", {press(99, 99), drag(499, 0), knob(), drag(1, 0), knob()},
+          "+ + <0 at 499 held> exit+ <0 at 0>"),
+    kRight("ExitsAtTheLeft",
+           {press(500, 0), drag(-499, 0), drag(9, 0), drag(-10, 0), knob(), drag(600, 0)},
+           "+ + + exit+ <1 at 500> -"),
+    from(2)("SnapsBackWhenItIsReleased",
+            {press(0, 0), drag(-5, 0), drag(5, 0), knob(), release(900, 0), knob()},
+            "+ + + <2 at 5 held> + <2 at 0>"),
+    from(4)("ExitsByAnyMotionToTheOtherEndAlone",
+            {press(0, 0), drag(INT_MIN, 0), knob(), drag(INT_MAX, 0)}, "+ + <4 at 0 held> exit+"),
+    from(7)("AnotherStateNeverExits",
+            {press(500, 0), drag(INT_MIN, 0), knob(), drag(INT_MAX, 0), knob()},
+            "+ + <7 at 0 held> + <7 at 500 held>"),
+    kLeft(
+        "ASecondFingerBesideTheKnobCancelsTheDrag",
+        {press(0, 0), drag(50, 0), finger(2), press(300, 9), lookAtLog(), knob()},
+        "+ + + <[SLIDE_EXIT] Another touch finger pressed!\nDisabled button selection!> <0 at 0>"),
 };
 TEST_P(SlideEPlays, TellTheirJournal) { expectJournal(GetParam()); }
 INSTANTIATE_TEST_SUITE_P(, SlideEPlays, testing::ValuesIn(kPlays), kRowName);

@@ -13,8 +13,8 @@ using MW::SlideMove;
 
 constexpr SKIA_Rect kBar = {0, 0, 600, 100, 7};
 
-Maker slide(int percent, int a, int b, int initial) {
-  return makes<SlideMove>(&kBar, percent, a, b, initial);
+PlaysOn slide(int percent, int a, int b, int initial) {
+  return {makes<SlideMove>(&kBar, percent, a, b, initial)};
 }
 
 Step value() {
@@ -25,32 +25,30 @@ Step value() {
 }
 
 const std::vector<Play> kPlays = {
-    {"TruncatesToTheValueAtTheKnob",
-     slide(SlideMove::kValueKnob, 0, 100, 50),
-     {value(), press(240, 9), drag(239, 0), value(), drag(1, 0), value(), release(), value()},
-     "<50 at 240> + + <99 at 479> + <100 at 480> + <100 at 480>"},
-    {"ReadsNoMoreThanAHundred",
-     slide(80, 0, 200, 80),
-     {press(120, 9), drag(29, 0), value(), drag(1, 0), value(), drag(900, 0), value()},
-     "+ + <99 at 149> + <100 at 150> + <100 at 300>"},
-    {"EqualBoundsAreZeroToOne", slide(51, 10, 10, 5), {value()}, "<10 at 3000>"},
-    {"TheHigherBoundFirstMakesEveryStartABound",
-     slide(50, 100, 0, 50),
-     {value(), press(0, 0), drag(-9, 0), drag(150, 0), value()},
-     "<0 at 0> + + + <50 at 150>"},
-    {"StartsAtTheLowerBound", slide(50, 150, 250, 0), {value()}, "<150 at 0>"},
-    {"StaysWhereTheDragIsCancelled",
-     slide(20, 0, 100, 100),
-     {press(480, 0), lookAtLog(), drag(-48, 0), finger(3), press(0, 0), value()},
-     "+ <[SLIDE] pressed!!: 0> + + <90 at 432>"},
-    {"LockingChangesNothing",
-     slide(20, 0, 100, 0),
-     {call(&MW::Widget::Lock), press(0, 0), drag(48, 0), value()},
-     "+ + <10 at 48>"},
-    {"TakesTheWidestRange",
-     slide(20, INT_MIN, INT_MAX, 0),
-     {press(240, 0), drag(INT_MAX, 0), value(), drag(INT_MIN, 0), value()},
-     "+ + <100 at 480> + <-2147483648 at 0>"},
+    slide(SlideMove::kValueKnob, 0, 100, 50)(
+        "TruncatesToTheValueAtTheKnob",
+        {value(), press(240, 9), drag(239, 0), value(), drag(1, 0), value(), release(), value()},
+        "<50 at 240> + + <99 at 479> + <100 at 480> + <100 at 480>"),
+    slide(80, 0, 200, 80)(
+        "ReadsNoMoreThanAHundred",
+        {press(120, 9), drag(29, 0), value(), drag(1, 0), value(), drag(900, 0), value()},
+        "+ + <99 at 149> + <100 at 150> + <100 at 300>"),
+    slide(51, 10, 10, 5)("EqualBoundsAreZeroToOne", {value()}, "<10 at 3000>"),
+    slide(50, 100, 0, 50)("TheHigherBoundFirstMakesEveryStartABound",
+                          {value(), press(0, 0), drag(-9, 0), drag(150, 0), value()},
+                          "<0 at 0> + + + <50 at 150>"),
+    slide(50, 150, 250, 0)("StartsAtTheLowerBound", {value()}, "<150 at 0>"),
+    slide(20, 0, 100, 100)(
+        "StaysWhereTheDragIsCancelled",
+        {press(480, 0), lookAtLog(), drag(-48, 0), finger(3), press(0, 0), value()},
+        "+ <[SLIDE] pressed!!: 0> + + <90 at 432>"),
+    slide(20, 0, 100, 0)("LockingChangesNothing",
+                         {call(&MW::Widget::Lock), press(0, 0), drag(48, 0), value()},
+                         "+ + <10 at 48>"),
+    slide(20, INT_MIN, INT_MAX, 0)(
+        "TakesTheWidestRange",
+        {press(240, 0), drag(INT_MAX, 0), value(), drag(INT_MIN, 0), value()},
+        "+ + <100 at 480> + <-2147483648 at 0>"),
 };
 TEST_P(SlideMovePlays, TellTheirJournal) { expectJournal(GetParam()); }
 INSTANTIATE_TEST_SUITE_P(, SlideMovePlays, testing::ValuesIn(kPlays), kRowName);

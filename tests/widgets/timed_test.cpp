@@ -10,9 +10,9 @@ using MW::Widget;
 
 constexpr SKIA_Rect kArea = {10, 20, 503, 101, 0};
 const SKIA_Text kCaption = textRecord("Wi-Fi");
-const Maker kToast = makes<MW::Toastbox>(&kArea, &kCaption);
-const Maker kTwoLines = makes<MW::Toastbox>(&kArea, &kCaption, &kCaption);
-const Maker kBar = makes<MW::Progressbar>(0, &kArea, &kCaption);
+const PlaysOn kToast = {makes<MW::Toastbox>(&kArea, &kCaption)};
+const PlaysOn kTwoLines = {makes<MW::Toastbox>(&kArea, &kCaption, &kCaption)};
+const PlaysOn kBar = {makes<MW::Progressbar>(0, &kArea, &kCaption)};
 
 Step showFor(int ms) { return call(&Widget::onHideTimer, ms); }
 Step runFor(int ms) { return call(&Widget::onProgressbar, ms); }
@@ -37,26 +37,21 @@ Steps stepsOfStars(int count) {
 }
 
 const std::vector<Play> kPlays = {
-    {"AToastGoesWithoutATime", kToast, {seen()}, "<gone>"},
-    {"AToastGoesAfterItsTime",
-     kToast,
-     {showFor(500), lookAtRedraw(), seen(), later(500), seen(), later(1), seen(), seen()},
-     "<redraw> <Wi-Fi> <Wi-Fi> <!gone> <gone>"},
-    {"AToastGoesAtOnceAtTheWrap", kToast, {at(~255U), showFor(512), later(1), seen()}, "<!gone>"},
-    {"AToastOfTwoLinesHasAMessage", kTwoLines, {setMsg("below"), showFor(1), seen()}, "<below>"},
-    {"AToastOfOneLineHasNone", kToast, {setMsg("below"), showFor(1), seen()}, "<Wi-Fi>"},
-    {"ABarShowsNothingBeforeItRuns", kBar, {seen()}, "<nothing>"},
-    {"ABarGrowsAndStartsAnew", kBar, stepsOfStars(12),
-     "<!*> <!**> <!***> <!****> <!*****> <!******> <!*******> <!********> <!*********> <!*> "
-     "<!*> <!**>"},
-    {"ABarEndsAfterItsTime",
-     kBar,
-     {runFor(50), seen(), later(50), seen(), later(1), seen()},
-     "<!*> <*> <!gone>"},
-    {"ABarIsTakenAway",
-     kBar,
-     {runFor(50), seen(), runFor(0), seen(), runFor(9), seen()},
-     "<!*> <gone> <!*>"},
+    kToast("AToastGoesWithoutATime", {seen()}, "<gone>"),
+    kToast("AToastGoesAfterItsTime",
+           {showFor(500), lookAtRedraw(), seen(), later(500), seen(), later(1), seen(), seen()},
+           "<redraw> <Wi-Fi> <Wi-Fi> <!gone> <gone>"),
+    kToast("AToastGoesAtOnceAtTheWrap", {at(~255U), showFor(512), later(1), seen()}, "<!gone>"),
+    kTwoLines("AToastOfTwoLinesHasAMessage", {setMsg("below"), showFor(1), seen()}, "<below>"),
+    kToast("AToastOfOneLineHasNone", {setMsg("below"), showFor(1), seen()}, "<Wi-Fi>"),
+    kBar("ABarShowsNothingBeforeItRuns", {seen()}, "<nothing>"),
+    kBar("ABarGrowsAndStartsAnew", stepsOfStars(12),
+         "<!*> <!**> <!***> <!****> <!*****> <!******> <!*******> <!********> <!*********> <!*> "
+         "<!*> <!**>"),
+    kBar("ABarEndsAfterItsTime", {runFor(50), seen(), later(50), seen(), later(1), seen()},
+         "<!*> <*> <!gone>"),
+    kBar("ABarIsTakenAway", {runFor(50), seen(), runFor(0), seen(), runFor(9), seen()},
+         "<!*> <gone> <!*>"),
 };
 TEST_P(TimedPlays, TellTheirJournal) { expectJournal(GetParam()); }
 INSTANTIATE_TEST_SUITE_P(, TimedPlays, testing::ValuesIn(kPlays), kRowName);
