@@ -44,7 +44,7 @@ class MW_API DialogSlide : public Widget {
   using Widget::onReleaseKey;
   using Widget::setDesc;
   using Widget::setRect;
-  /// The number of the layout class: 0, for any kind.
+  /// The number of a kind's layout, as Dialog::isType() gives it: 0 for any kind.
   static int isType(int dialogKind);
   /// Lays it out on the present screen, the same for any kind; the thumb stays until setRect().
   void setRect_init(int dialogKind);
