@@ -93,8 +93,8 @@ bool TurnClock::othersRun() {
   const pid_t self = ::gettid();
   return std::ranges::any_of(threadsOfProcess(), [&](pid_t thread) {
     const bool isOurs = thread == self || std::ranges::any_of(participants, [&](const auto& each) {
-      return each.thread == thread && each.state == Participant::State::Waiting;
-    });
+                          return each.thread == thread && each.state == Participant::State::Waiting;
+                        });
     return !isOurs && lookAt(thread) == ThreadState::Running;
   });
 }

@@ -16,8 +16,8 @@ namespace brimol::pc {
 
 struct TraceLine {
   std::string file;
-  int number = 0;   // from 1
-  std::string text; // as it is written, without blanks at its ends
+  int number = 0;    // from 1
+  std::string text;  // as it is written, without blanks at its ends
 };
 
 /// Pixels, or hundredths of per cent of the screen's side.

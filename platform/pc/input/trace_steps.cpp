@@ -85,7 +85,8 @@ TraceStep::Action readKey(TraceWords& words) {
   // "up" and "down" are keys, too, unless a key follows.
   TraceWords ahead = words;
   const std::string first = ahead.word("a key");
-  const bool isHalf = (first == "down" || first == "up") && !ahead.isAtEnd() && ahead.peek() != "for";
+  const bool isHalf =
+      (first == "down" || first == "up") && !ahead.isAtEnd() && ahead.peek() != "for";
   if (isHalf) {
     stroke.kind = first == "down" ? KeyStroke::Kind::Down : KeyStroke::Kind::Up;
     (void)words.word("a key");
@@ -142,7 +143,8 @@ TraceStep::Action readExpect(TraceWords& words) { return readLook(words, kExpect
 TraceStep::Action readWait(TraceWords& words) {
   if (words.takes("until")) return readLook(words, kWaitUntilMs);
   constexpr uint64_t kMostMs = 86'400'000;  // a day
-  return Pause{static_cast<uint32_t>(words.number("'until', or a number of milliseconds", kMostMs))};
+  return Pause{
+      static_cast<uint32_t>(words.number("'until', or a number of milliseconds", kMostMs))};
 }
 
 TraceStep::Action readShot(TraceWords& words) {
@@ -185,7 +187,8 @@ TraceStep::Action readFingerRecord(TraceWords& words) {
 
 template <BrimolEventType kType>
 TraceStep::Action readKeyRecord(TraceWords& words) {
-  return RawRecord{keyRecord(kType, static_cast<uint32_t>(words.number("a key's code", kMostWord)))};
+  return RawRecord{
+      keyRecord(kType, static_cast<uint32_t>(words.number("a key's code", kMostWord)))};
 }
 
 struct StepRow {
@@ -234,7 +237,9 @@ uint64_t readUtc(const std::string& text) {
   const std::time_t seconds = ::timegm(&parts);
   if (seconds < 0) throw BadLine{"'" + text + wanted};
   uint64_t ms = static_cast<uint64_t>(seconds) * kSecond;
-  if (*rest == '.') ms += TraceWords(std::string(rest + 1, text.c_str() + text.size() - 1)).number("a part of a second", kSecond - 1);
+  if (*rest == '.')
+    ms += TraceWords(std::string(rest + 1, text.c_str() + text.size() - 1))
+              .number("a part of a second", kSecond - 1);
   const std::string written = utcText(ms);
   if (text != written && text != written.substr(0, written.size() - 5) + "Z") {
     throw BadLine{"'" + text + wanted};
