@@ -34,7 +34,7 @@ struct Place {
   std::optional<TextPattern> text;
 };
 
-struct Area {
+struct SearchArea {
   Coordinate x;
   Coordinate y;
   Coordinate w;
@@ -64,7 +64,7 @@ struct Look {
   enum class Subject { Text, NoText, Pixel, Log, NoLog };
   Subject subject = Subject::Text;
   TextPattern pattern;
-  std::optional<Area> area;
+  std::optional<SearchArea> area;
   Coordinate x;
   Coordinate y;
   uint32_t colour = 0;  // 0x00RRGGBB

@@ -24,7 +24,7 @@ std::string listOf(const std::vector<ShownText>& texts) {
   std::string list;
   for (const ShownText& each : texts) {
     const auto [x, y] = middleOf(each.area);
-    list += "\n  " + quoted(each.text) + " at " + std::to_string(x) + ' ' + std::to_string(y);
+    list += "\n  " + inQuotes(each.text) + " at " + std::to_string(x) + ' ' + std::to_string(y);
   }
   return list.empty() ? " nothing" : list;
 }
@@ -155,7 +155,7 @@ TraceRunner::Outcome TraceRunner::attempt(const Typing& typing, uint64_t now) {
     if (place) ++shifts;
   }
   if (!place)
-    return lookAgainUntil(lookUntil.value_or(now + kFindMs), now, quoted(key) + ": " + why);
+    return lookAgainUntil(lookUntil.value_or(now + kFindMs), now, inQuotes(key) + ": " + why);
   lookUntil = std::nullopt;
   planTouch({.kind = Touch::Kind::Tap, .place = {}, .to = {}, .duration = kTapMs, .finger = 0},
             *place, *place, now);
@@ -182,7 +182,7 @@ std::string TraceRunner::whyNot(const Look& look) {
   }
   std::vector<ShownText> texts = shownTexts(newest, stage.screen);
   if (look.area) {
-    const Area& area = *look.area;
+    const SearchArea& area = *look.area;
     const Pixels limits = {area.x.pixels(stage.screen.w), area.y.pixels(stage.screen.h),
                            area.w.pixels(stage.screen.w), area.h.pixels(stage.screen.h)};
     std::erase_if(texts, [&](const ShownText& each) { return isEmpty(within(each.area, limits)); });

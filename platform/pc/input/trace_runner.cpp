@@ -68,7 +68,9 @@ std::optional<uint64_t> TraceRunner::due(uint64_t soonest) const {
   if (!planned.empty()) {
     consider(planned.front().time);
   } else if (isOver()) {
-    if (!trace.leavesRunning || !closedBy) consider(closedBy.value_or(soonest));
+    if (!trace.leavesRunning || !closedBy) {
+      consider(closedBy.value_or(stepDone.value_or(0) + restMs));
+    }
   } else if (lookUntil) {
     consider(hasSeen ? std::min(soonest, *lookUntil) : *lookUntil);
   } else {
@@ -128,6 +130,8 @@ void TraceRunner::finishStep(uint64_t now) {
 }
 
 void TraceRunner::finishTrace(uint64_t now) {
+  const uint64_t start = stepDone.value_or(0) + restMs;
+  if (!closedBy && start > now) return;
   if (!closedBy) {
     closedBy = now + kCloseMs;
     if (!trace.leavesRunning) stage.close();
