@@ -68,7 +68,7 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
   }
   if (outcome == Outcome::Pass) keep(*running, Verdict::Pass, now);
   if (outcome == Outcome::Fail) keep(*running, Verdict::Fail, now);
-  // Who only looks at a test does not take back its verdict.
+  // Looking at a test without a verdict keeps the one that it had.
   if (outcome == Outcome::Left && book.find(testEntries().at(entry).id) == nullptr) {
     keep(*running, Verdict::None, now);
   }
