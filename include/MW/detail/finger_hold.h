@@ -7,6 +7,9 @@
 
 namespace MW {
 
+/// Who holds a widget, as one finger asks.
+enum class HeldBy { Nobody, ThisFinger, AnotherFinger };
+
 /// The finger that pressed holds until it lifts. Stands on the widget's own selection, which the
 /// window's routing reads as well: 0 while no finger holds, else the finger's number + 1. Any
 /// thread.
@@ -23,11 +26,14 @@ class FingerHold {
   void letGo() { selection = 0; }
   bool isHeld() const { return selection != 0; }
   bool isOwner(const mouse_event& mouse) const { return selection == wordOf(mouse); }
-  /// Whether another finger than this one holds.
-  bool isOthers(const mouse_event& mouse) const {
+  /// Read once, so that the answer does not change halfway.
+  HeldBy heldBy(const mouse_event& mouse) const {
     const int holder = selection;
-    return holder != 0 && holder != wordOf(mouse);
+    if (holder == 0) return HeldBy::Nobody;
+    return holder == wordOf(mouse) ? HeldBy::ThisFinger : HeldBy::AnotherFinger;
   }
+  /// Whether another finger than this one holds.
+  bool isOthers(const mouse_event& mouse) const { return heldBy(mouse) == HeldBy::AnotherFinger; }
 
  private:
   std::atomic<int>& selection;
