@@ -8,6 +8,7 @@
 #include "complain.h"
 #include "layout.h"
 #include "results/junit.h"
+#include "world.h"
 
 namespace factory_test {
 
@@ -52,9 +53,7 @@ void FactoryTest::updatePrompt() {
 
 void FactoryTest::start(std::size_t entry, uint32_t now) {
   surroundings.log.add(std::string("Test ") + testEntries().at(entry).id);
-  const auto clock = std::chrono::system_clock::now();
-  running = Running{entry, testEntries().at(entry).make(surroundings),
-                    std::chrono::floor<std::chrono::seconds>(clock), now};
+  running = Running{entry, testEntries().at(entry).make(surroundings), presentTime(), now};
   running->test->enter();
   MW::isDisplayUpdate(1);
 }
