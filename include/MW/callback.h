@@ -1,9 +1,9 @@
 /// The callback word that applications store their functions in.
 #pragma once
 
-#include <MW/api.h>
 #include <MW/records.h>
 
+#include <atomic>
 #include <concepts>
 #include <cstddef>
 #include <type_traits>
@@ -13,14 +13,19 @@ namespace MW {
 /// A plain function of the application, or null: not wanted. One pointer wide.
 ///
 /// It takes `nullptr`, a function or a captureless lambda that returns nothing and takes one int,
-/// mouse_event*, kbd_event* or int*. Which of them a class calls it with stands at the class; a
-/// function of another kind compiles, but must not be stored there. Calling a null one does
-/// nothing. A word may be assigned at any time on the thread that calls it, and elsewhere while its
-/// widget is not active.
+/// mouse_event*, kbd_event* or int*. The class that calls the word says which of them it calls it
+/// with. A function of another kind compiles, and is then called with an argument that it does not
+/// understand. Calling a null word does nothing.
+///
+/// A word may be assigned on any thread at any time, also while its widget is active: a handler
+/// calls the function before or the function after the assignment. The function before may still
+/// run when the assignment returns.
 class Callback {
  public:
   constexpr Callback() = default;
   constexpr Callback(std::nullptr_t) {}  // NOLINT(google-explicit-constructor): assigned from null
+  /// A plain copy: not of a word that another thread may assign meanwhile.
+  constexpr Callback(const Callback&) = default;
 
   template <typename Function>
   requires(std::convertible_to<Function, void (*)(int)>)
@@ -39,7 +44,22 @@ class Callback {
   requires(std::convertible_to<Function, void (*)(int*)>) Callback(Function function)
       : word(erase(static_cast<void (*)(int*)>(function))) {}
 
-  explicit operator bool() const { return word != nullptr; }
+  Callback& operator=(std::nullptr_t) {
+    store({});
+    return *this;
+  }
+  /// From a function, a lambda or another word.
+  template <typename Source>
+  requires(std::convertible_to<const Source&, Callback>) Callback& operator=(const Source& source) {
+    store(source);
+    return *this;
+  }
+  // A template is no copy assignment, and one that is written by hand would not be trivial. This
+  // one, which no overload resolution prefers, stands for it, so that the class stays trivially
+  // copyable and every assignment goes the atomic way.
+  Callback& operator=(const volatile Callback&) = delete;
+
+  explicit operator bool() const { return load() != nullptr; }
 
   void operator()(int value) const { call(value); }
   void operator()(mouse_event* event) const { call(event); }
@@ -57,10 +77,17 @@ class Callback {
   // A function pointer that went through another function pointer type comes back unchanged.
   template <typename Argument>
   void call(Argument argument) const {
-    if (word != nullptr) reinterpret_cast<void (*)(Argument)>(word)(argument);
+    const Word function = load();
+    if (function != nullptr) reinterpret_cast<void (*)(Argument)>(function)(argument);
   }
 
-  Word word = nullptr;
+  // What the assigning thread wrote before is seen by the function.
+  Word load() const { return std::atomic_ref(word).load(std::memory_order_acquire); }
+  void store(const Callback& source) {
+    std::atomic_ref(word).store(source.load(), std::memory_order_release);
+  }
+
+  mutable Word word = nullptr;  // mutable: std::atomic_ref reads nothing that is const
 };
 
 static_assert(sizeof(Callback) == sizeof(void (*)()), "descriptors count on one word each");

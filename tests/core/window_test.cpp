@@ -113,6 +113,19 @@ TEST_F(WindowTest, ChangesDuringAPassSkipAndRepeatNothing) {
   EXPECT_EQ(callsWith(addMany), "abc abc" + std::string(40, 'n'));
 }
 
+TEST_F(WindowTest, TheFirstLooksAtTheScreensSizeMayMeet) {
+  std::latch bothThere(2);
+  const auto look = [&] {
+    bothThere.arrive_and_wait();
+    int width = 0;
+    int height = 0;
+    EXPECT_EQ(Window::getwindowsize(&width, &height), 1);
+    EXPECT_EQ(std::pair(width, height), std::pair(1440, 2560));
+  };
+  { const std::array<std::jthread, 2> threads = {std::jthread(look), std::jthread(look)}; }
+  EXPECT_EQ(std::pair(Window::width, Window::height), std::pair(1440, 2560)) << "it keeps them";
+}
+
 TEST_F(WindowTest, TurnsMillimetresIntoPixels) {
   using Pixels = std::pair<float, int>;  // the density as it is kept, and the length
   const auto pixels = [](float dpi, float mm) {
@@ -146,15 +159,13 @@ TEST_F(WindowTest, StartsAndEndsOnAnyThreadsAtOnce) {
   for (int round = 0; round < 50; ++round) {
     ASSERT_EQ(Window::init(), 1);
     std::latch allThere(4);
-    const auto meet = [&](int (*operation)()) {
-      return [&allThere, operation] {
-        allThere.arrive_and_wait();
-        EXPECT_EQ(operation(), 1);
-      };
+    const auto meet = [&allThere](int (*operation)()) {
+      allThere.arrive_and_wait();
+      EXPECT_EQ(operation(), 1);
     };
     const std::array<std::jthread, 4> threads = {
-        std::jthread(meet(&Window::destroy)), std::jthread(meet(&Window::init)),
-        std::jthread(meet(&Window::destroy)), std::jthread(meet(&Window::destroy))};
+        std::jthread(meet, &Window::destroy), std::jthread(meet, &Window::init),
+        std::jthread(meet, &Window::destroy), std::jthread(meet, &Window::destroy)};
   }
   Window::destroy();
   EXPECT_EQ(Window::getEventService(), nullptr);
