@@ -28,6 +28,7 @@
 #include <MW/prompt_dialog.h>
 #include <MW/push_button.h>
 #include <MW/records.h>
+#include <MW/row_list.h>
 #include <MW/screen.h>
 #include <MW/slide.h>
 #include <MW/slide_e.h>

@@ -1,24 +1,30 @@
 /// The scrolling main menu.
 #pragma once
 
-#include <MW/detail/click_slop.h>
-#include <MW/widget.h>
+#include <MW/row_list.h>
 
 #include <array>
 
 namespace MW {
 
+class RowColumn;
+
 /// A title bar with status texts, and under it a list of up to 64 items that a finger scrolls.
 ///
 /// It enters the base layer when it is constructed, inactive, and leaves it when it is deleted. It
-/// is filled by addIndex() and drawn from initFinish() on. The items and their number may be
-/// changed by the application's thread while handlers run.
+/// is filled by addIndex() and drawn from initFinish() on. The items may be changed on any thread
+/// while handlers run.
+///
+/// An item is drawn where its top lies below the list's, so an item whose top is the list's own is
+/// missing: the first one at rest, and the one that move_key_up() scrolled to. Begin the list with
+/// an item of height 0, and scroll down by a pixel (onHover()) once a key has scrolled up.
 ///
 /// The list marks no current item and does not move by keys itself: the application calls
 /// move_key_down() and move_key_up() from its key callback and recolours the item.
 ///
 /// Its callbacks get the event's record, valid for the call, and the list, on the dispatch thread.
-class MW_API MainList : public Widget {
+/// Assign them before the list becomes active.
+class MW_API MainList : public RowList {
  public:
   static constexpr int kItems = 64;
   static constexpr int kOptions = 8;
@@ -32,8 +38,13 @@ class MW_API MainList : public Widget {
     kExtended = 1  ///< the other five status texts, too
   };
 
-  /// What an item's `kind` says; others look as kGrey with white text.
-  enum ItemKind { kEnd = 0, kSelectable = 1, kGrey = 2, kDark = 3 };
+  /// What an item's `kind` says. Any other looks as kSelectable, but is not clicked.
+  enum ItemKind {
+    kEnd = 0,         ///< ends the list: neither it nor what stands behind it is drawn
+    kSelectable = 1,  ///< white on grey (0xFF787878); clicks and keys find it
+    kGrey = 2,        ///< dark grey (0xFF353535) on the same grey
+    kDark = 3         ///< white on nearly black (0xFF0F0F0F)
+  };
 
   /// The numbers of the status texts, for setTextOption().
   enum StatusText {
@@ -47,20 +58,17 @@ class MW_API MainList : public Widget {
     kBrightness
   };
 
-  /// `listMode` 1 adds five more status texts to the title bar.
+  /// `listMode`: a Mode; any other value is kPlain.
   MainList(const char* listTitle, int listMode);
   explicit MainList(const char* listTitle);
   ~MainList() override;
 
-  /// show(0).
-  int show() override;
+  using RowList::show;
   /// Draws it. Returns 1.
   int show(unsigned int ticks) override;
   /// Makes it inactive. Returns 0.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// Keeps whether the panel is on; when that changes, the finger that holds the list is let go.
-  void lcdOn(int on) override;
 
   using Widget::onHover;
   using Widget::onPress;
@@ -72,14 +80,18 @@ class MW_API MainList : public Widget {
   using Widget::setText;
   using Widget::setTextColor;
 
-  /// What the constructors do: an empty list, laid out inactive and registered.
+  /// What the constructors do: an empty list without callbacks, laid out inactive and registered. A
+  /// list that is registered already is drawn and called twice from here on: unregister it first.
   void init_MainList(int listMode);
-  /// Lays it out on the present screen.
+  /// Lays it out on the present screen, with the title bar of a mode. The status texts become what
+  /// they were at first; which of them are drawn stays as the constructor's mode said.
   void setRect(int listMode);
-  /// Takes all items away.
+  /// Takes all items away. A finished list stays finished, so that it takes no new ones: only
+  /// init_MainList() opens it again.
   void initIndex();
   /// Appends an item and returns its number, from 0. -1: the list is full or finished, the text is
-  /// null or longer than 126 bytes. `height` in pixels.
+  /// null or longer than 126 bytes. `height` in pixels. The colours are the kind's, not the
+  /// record's.
   int addIndex(int kind, const SKIA_Text* item, int height);
   /// Ends the filling; the first selectable item becomes the current one.
   void initFinish();
@@ -88,40 +100,42 @@ class MW_API MainList : public Widget {
 
   // Changes of an item. Another number than an item's: nothing.
 
-  /// Copies `length` bytes, 1 to 126, and no NUL: what stood behind them stays there, and the
-  /// length alone says where the text ends. Null, or any other length: nothing.
+  /// Copies a text of up to `length` bytes, 1 to 126, without its NUL: what stood behind it stays
+  /// there, and the length alone says where the text ends. To empty an item give ("", 1). Null, or
+  /// any other length: nothing.
   void setText(int item, const char* newText, unsigned int length);
   void setFontSize(int item, int pixels);
   void setTextColor(int item, unsigned int color);
   void setBGColor(int item, unsigned int color);
+  /// Changes what the item is, not its colours.
   void setListType(int item, int kind);
 
-  // The status texts. `length` bytes, 1 to 126, of `newText`; null, another length or number:
-  // nothing.
+  // The status texts: up to `length` bytes, 1 to 126, of `newText`. To empty one give ("", 1).
+  // Null, or another length or number: nothing.
 
   void setTextOption(int number, const char* newText, int length);
   void setTextBattery(const char* newText, int length);
   void setTextTa(const char* newText, int length);
   void setTextBrightness(const char* newText, int length);
-  /// Does nothing: meant so.
+  /// Does nothing: the title bar stays black.
   void setTitleBGColor(int color);
 
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key);
   void onPress(mouse_event mouse);
   void onRelease(mouse_event mouse);
+  /// Scrolls by the motion, if the list is higher than its area.
   void onHover(mouse_event mouse);
-  /// The item at the position; its first row of pixels does not belong to it. Where there is none,
-  /// -1, or -100 if all 64 items are there and none of kind 0 ends the list.
+  /// The item at the position; its first line of pixels does not belong to it. Where there is none,
+  /// -1, or -100 if all 64 items are there and none of kEnd ends the list.
   int position2index(mouse_event mouse);
-  /// Adds a motion to the drag; one that is too long takes the click away.
-  void inClick(int dx, int dy);
   /// Moves the current item to the next, or previous, selectable one and scrolls it into view. The
   /// item's number, or -100 when there is none. The argument is not read.
   int move_key_down(int unused);
   int move_key_up(int unused);
 
-  void (*clickCallback)(mouse_event* event, MainList* list) = nullptr;  ///< a selectable item
+  /// A selectable item was pressed and released. list->position2index(*event) says which.
+  void (*clickCallback)(mouse_event* event, MainList* list) = nullptr;
   void (*keyPressCallback)(kbd_event* event, MainList* list) = nullptr;
   void (*keyReleaseCallback)(kbd_event* event, MainList* list) = nullptr;
   void (*pressCallback)(mouse_event* event, MainList* list) = nullptr;
@@ -140,32 +154,27 @@ class MW_API MainList : public Widget {
     SKIA_Text text = {};
   };
 
-  // Guarded by stateLock, as far as it is not said otherwise.
-  int mode = 0;
-  SKIA_Text title = {};
+  // Guarded by stateLock.
+  int mode = kPlain;
   SKIA_Rect screenRect = {};
   SKIA_Rect titleBar = {};
   SKIA_Rect titleRect = {};
-  SKIA_Rect bottomEdge = {};
-  SKIA_Rect listRect = {};
   std::array<Option, kOptions> option;
   std::array<Item, kItems> items;
   int count = 0;
   int finished = 0;  // 1 after initFinish()
   int current = -1;
   int scroll = 0;  // pixels, 0 or less
-  ClickSlop click;
-  int touchSlop = 0;  // pixels
-  int shown = 0;      // 1 between the first drawing and hide()
-  std::atomic<int> lcdState = 1;
+  int shown = 0;   // 1 between the first drawing and hide()
 
  private:
   template <typename Change>
   void changeItem(int item, Change change);
   bool isClicked(int item) const;
-  int64_t contentHeight() const;
-  int64_t heightUpTo(int end) const;
   int nextSelectable(int from, int step) const;
+  RowColumn columnOf(int itemCount) const;
+  RowColumn shownColumn() const;
+  RowColumn wholeColumn() const;
   void drawItems() const;
   void drawStatus() const;
 };

@@ -1,14 +1,15 @@
 /// The list of results in levels.
 #pragma once
 
-#include <MW/detail/click_slop.h>
 #include <MW/detail/double_tap.h>
-#include <MW/widget.h>
+#include <MW/row_list.h>
 
 #include <array>
 #include <vector>
 
 namespace MW {
+
+class RowColumn;
 
 /// A line of a result text, taken apart. Texts are cut to 255 bytes at a whole character.
 struct MpdLine {
@@ -24,33 +25,41 @@ struct MpdLine {
 static_assert(sizeof(MpdLine) == 776, "flag, level and three texts");
 
 /// A full-screen list of up to 64 results in levels, one row of five cells each: the expand marker,
-/// the level, the head text, the name and the value.
+/// the level, the head text, the name and the value. Above it stands an empty white box from a
+/// thirteenth of the screen's height on, a seventh of that height high. A row is 141 pixels high,
+/// its text 19 on every screen.
 ///
 /// A row whose next one has a higher level can be expanded: "[>]", its children are hidden, or
 /// "[V]". A double tap, each step under 500 ms, changes that. All others are marked "[*]". The last
-/// row is never hidden and does not change. A row's colour goes by its level, 1 to 3.
+/// row is never hidden and does not change. A row's colour goes by its level: 1 grey, 2 light
+/// orange, 3 orange.
 ///
-/// It enters the base layer when it is constructed, active, and leaves it when it is deleted. It is
-/// filled by cal_line(), on any thread, also while it is drawn and handlers run.
+/// It enters the base layer when it is constructed, active at once, and leaves it when it is
+/// deleted. It is filled by cal_line(), on any thread, also while it is drawn and handlers run.
 ///
 /// Its callbacks get the event's record, valid for the call, and the list, on the dispatch thread.
-class MW_API MpdWid : public Widget {
+/// Assign them before Window::init, on the dispatch thread, or while the list is unregistered: an
+/// event may arrive as soon as the constructor has returned.
+class MW_API MpdWid : public RowList {
  public:
   static constexpr int kItems = 64;
+
+  /// What setListType() takes.
+  enum ListType {
+    kHitEnd = 0,  ///< hit tests end at this row
+    kRow = 1      ///< what cal_line() and addIndex() make
+  };
 
   /// The title is kept, not drawn.
   explicit MpdWid(const char* listTitle);
   ~MpdWid() override;
 
-  /// show(0).
-  int show() override;
+  using RowList::show;
   /// Draws it. Returns 1.
   int show(unsigned int ticks) override;
   /// Makes it inactive. Returns 1.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// Keeps whether the panel is on; when that changes, the finger that holds the list is let go.
-  void lcdOn(int on) override;
 
   using Widget::onHover;
   using Widget::onPress;
@@ -63,10 +72,11 @@ class MW_API MpdWid : public Widget {
   using Widget::setText;
   using Widget::setTextColor;
 
-  /// What the constructor does: an empty list, laid out, active and registered. Not while it
-  /// handles events.
+  /// What the constructor does: an empty list without callbacks, laid out, active and registered.
+  /// Not while it handles events. A list that is registered already is drawn and called twice from
+  /// here on: unregister it first.
   void init_MpdWid();
-  /// Lays it out on the present screen.
+  /// Lays it out on the present screen. The rows stay where they are until initIndex().
   void setRect();
   /// Scrolls to the first row.
   void initIndex();
@@ -80,10 +90,14 @@ class MW_API MpdWid : public Widget {
   ///   the name is "no name", and the value all that stands behind "[MPDIA]". Without "[MPDIA]" the
   ///   name is "no name", and the value the line.
   ///
-  /// `lines` is a C string, read up to its NUL or up to the byte with the number `length`, that one
-  /// included: meant so. Only what a "\n" ends is a line; one that is the text's first byte ends
-  /// none. Of more than 64 lines the first 64 are shown. Null, or a length of 0 or less: an empty
-  /// list. Drawn texts are cut to 127 bytes. Without memory the rows stay, and a line is logged.
+  /// `lines` is a C string of at least `length` + 1 bytes, of which the last may be the NUL: it is
+  /// read up to its NUL or up to the byte with the number `length`, that one included. Only what a
+  /// "\n" ends is a line; one that is the text's first byte ends none. Of more than 64 lines the
+  /// first 64 are shown. Null, or a length of 0 or less: an empty list. Drawn texts are cut to 127
+  /// bytes. Without memory the rows stay, and a line is logged.
+  ///
+  /// The scroll stays: call initIndex() afterwards, or a shorter list may stand above its area,
+  /// where nothing of it shows.
   void cal_line(const char* lines, int length);
   /// Fills a row: marked "[>]" with `details`, else "[*]". Texts are copied, and cut to 127 bytes
   /// at a whole character; null is empty. A level but 1 to 3 leaves the colour as it was. It is
@@ -96,11 +110,11 @@ class MW_API MpdWid : public Widget {
 
   /// Of a row that cal_line() counted; another index: nothing.
   void setBGColor(int index, unsigned int color);
-  /// 0: hit tests end at this row, which is what a click is told for; see click_cb.
+  /// A ListType; any value but kHitEnd is as kRow.
   void setListType(int index, int listType);
 
-  /// The height of the rows, gaps included. It counts as many of the first rows that are not of
-  /// list type 0 as the last drawing left visible: meant so.
+  /// The height of the rows, gaps included. It counts as many of the first rows as the last drawing
+  /// left visible, but for those of kHitEnd.
   int Max_height();
   /// Scrolls back to where rows are.
   void onHover_temp();
@@ -116,13 +130,12 @@ class MW_API MpdWid : public Widget {
   void onTouchClickCount(event_data* event);
   /// Expands or collapses the row under the event.
   void depth_cal(event_data* event);
-  /// The row at the position, hidden ones counted, and reckoned from the list's top twice: meant
-  /// so. -1: the search came to a row of list type 0; -100: none.
+  /// Which row the position is taken for: hidden rows count like visible ones, and the list's top
+  /// counts twice, so that it is not the row that the user sees there. -1: the search came to a row
+  /// of kHitEnd; -100: none.
   int position2index(mouse_event mouse);
-  /// Adds a motion to the drag; one that is too long takes the click away.
-  void inClick(int dx, int dy);
 
-  // These do nothing: meant so.
+  // These are here for callers of an older interface and do nothing.
 
   void control_context(int, SKIA_Rect*, char*);
   void setText(int, const char*, unsigned int);
@@ -130,7 +143,8 @@ class MW_API MpdWid : public Widget {
   void setTextColor(int, int);
 
   /// A press and a release, without a drag between them, that position2index() both answers with
-  /// -1: only lists with a row of list type 0 are clicked.
+  /// -1. So a list is clicked only below its rows before the first one of kHitEnd, and never
+  /// without such a row.
   void (*click_cb)(mouse_event* event, MpdWid* list) = nullptr;
   void (*key_press_cb)(kbd_event* event, MpdWid* list) = nullptr;
   void (*key_release_cb)(kbd_event* event, MpdWid* list) = nullptr;
@@ -142,7 +156,7 @@ class MW_API MpdWid : public Widget {
   static constexpr int kCells = 5;
 
   struct Item {
-    int listType = 0;
+    int listType = kHitEnd;
     int y = 0;       // pixels, by the last drawing
     int height = 0;  // pixels
     unsigned int color = 0;
@@ -155,25 +169,21 @@ class MW_API MpdWid : public Widget {
   };
 
   // Guarded by stateLock, as far as it is not said otherwise.
-  SKIA_Text title = {};
   std::array<SKIA_Rect, kCells> cell = {};  // of the row being drawn
-  SKIA_Rect list_rect = {};
-  SKIA_Rect bottom_line = {};
   SKIA_Rect header_box = {};
   std::array<Item, kItems> item = {};
-  int scroll_y = 0;  // of the first row
-  ClickSlop click;
-  int touch_slop = 0;     // pixels
+  int scroll_y = 0;       // of the first row
   int mpd_line = 0;       // rows, at most kItems
   int visible_count = 0;  // rows that the last drawing left visible
   std::vector<MpdLine> mpd_buf;
   unsigned int normalColor = 0;  // of `rect`, before a press
   DoubleTap taps;                // dispatch thread
-  std::atomic<int> lcdState = 1;
 
  private:
   void fillItem(int index, const MpdLine& line);
-  int contentHeight() const;
+  RowColumn visibleColumn() const;
+  RowColumn countedColumn() const;
+  RowColumn hitColumn() const;
   void scrollTo(int64_t top);
   void drawRows();
   void drawRow(const Item& row);

@@ -34,6 +34,11 @@ constexpr SKIA_Rect makeRect(int64_t x, int64_t y, int64_t w, int64_t h, uint32_
   return {toPixels(x), toPixels(y), toPixels(w), toPixels(h), color};
 }
 
+/// A null rectangle is all zero.
+constexpr SKIA_Rect copyRect(const SKIA_Rect* given) {
+  return given != nullptr ? *given : SKIA_Rect{};
+}
+
 /// Truncates toward zero.
 constexpr int64_t percentOf(int64_t length, int percent) {
   constexpr int kWhole = 100;

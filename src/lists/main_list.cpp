@@ -3,26 +3,23 @@
 
 #include <algorithm>
 #include <cstring>
-#include <utility>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/geometry.h"
 #include "core/life_guard.h"
 #include "core/present_screen.h"
-#include "lists/list_input.h"
 #include "lists/main_list_tables.h"
+#include "lists/row_column.h"
 
 namespace MW {
 
 namespace {
 
 constexpr ClassLog kLog("MAINLIST");
-constexpr int kItemGap = 3;  // pixels, and so the rest
-constexpr int kTitleSize = 70;
-constexpr int kEdgeHeight = 2;
-constexpr int kSlopPercent = 2;  // of the screen's width
+constexpr int kItemGap = 3;  // pixels
 constexpr int kNoItem = -1;
+static_assert(MainList::kItems <= RowColumn::kMost);
 constexpr int kLongestText = kTextMax - 1;  // bytes
 
 bool isText(const char* given, int64_t length) {
@@ -31,14 +28,12 @@ bool isText(const char* given, int64_t length) {
 
 }  // namespace
 
-MainList::MainList(const char* listTitle, int listMode) {
+MainList::MainList(const char* listTitle, int listMode) : RowList("MAINLIST", listTitle) {
   kLog.print(LogLevel::Debug, "call registerWidget");
-  title = {{}, 0, kColorWhite, SKIA_ALIGN_LEFT, kTitleSize};
-  putText(title, boundedText(listTitle));
   init_MainList(listMode);
 }
 
-MainList::MainList(const char* listTitle) : MainList(listTitle, 0) {}
+MainList::MainList(const char* listTitle) : MainList(listTitle, kPlain) {}
 
 MainList::~MainList() { leaveWindow(); }
 
@@ -69,9 +64,8 @@ void MainList::setRect(int listMode) {
   screenRect = {0, 0, screen.w, screen.h, 0};
   titleBar = {0, 0, screen.w, titleHeight, kColorBlack};
   titleRect = {0, 0, screen.w, kTitleHeight, kColorBlack};
-  bottomEdge = {0, screen.h, screen.w, kEdgeHeight, kColorBlack};
   listRect = makeRect(0, titleHeight, screen.w, int64_t{screen.h} - titleHeight, 0);
-  touchSlop = toPixels(percentOf(screen.w, kSlopPercent));
+  layOutFrame(screen.w, screen.h);
   for (std::size_t i = 0; i < option.size(); ++i) {
     const StatusRow& row = kStatusRows.at(i);
     option.at(i).rect = statusRect(row, screen.w);
@@ -110,18 +104,30 @@ void MainList::initFinish() {
 
 int MainList::Max_height() {
   const std::lock_guard guard(stateLock);
-  return toPixels(contentHeight());
+  return toPixels(wholeColumn().height());
 }
 
-int64_t MainList::contentHeight() const {
-  int64_t height = -kItemGap;
+// The first items, where the list has scrolled them.
+RowColumn MainList::columnOf(int itemCount) const {
+  RowColumn column(int64_t{listRect.y} + scroll, kItemGap);
+  for (int i = 0; i < itemCount; ++i) column.add(items.at(static_cast<std::size_t>(i)).height);
+  return column;
+}
+
+// Those that are drawn and clicked.
+RowColumn MainList::shownColumn() const {
+  const auto* const end = std::ranges::find(items, kEnd, &Item::kind);
+  return columnOf(static_cast<int>(end - items.begin()));
+}
+
+// Those that the list's height counts: it goes on behind an end that was set between items.
+RowColumn MainList::wholeColumn() const {
+  RowColumn column(listRect.y, kItemGap);
   for (const Item& item : items) {
-    if (item.kind != kEnd) height += int64_t{item.height} + kItemGap;
+    if (item.kind != kEnd) column.add(item.height);
   }
-  return height;
+  return column;
 }
-
-int MainList::show() { return show(0); }
 
 int MainList::show(unsigned int) {
   const std::lock_guard guard(stateLock);
@@ -138,17 +144,14 @@ int MainList::show(unsigned int) {
   return 1;
 }
 
-// An item is drawn when its top lies within the list, edges excluded: one whose top stands exactly
-// at the list's is not. Meant so.
 void MainList::drawItems() const {
   const int64_t bottom = int64_t{listRect.y} + listRect.h;
-  int64_t y = int64_t{listRect.y} + scroll;
-  for (const Item& item : items) {
-    if (item.kind == kEnd) return;
-    if (listRect.y < y && y < bottom) {
-      skia_add_textbox_c(makeRect(0, y, screenRect.w, item.height, item.bgColor), item.text);
-    }
-    y += int64_t{item.height} + kItemGap;
+  const RowColumn column = shownColumn();
+  for (int i = 0; i < column.count(); ++i) {
+    const int64_t y = column.topOf(i);
+    if (!isBetween(listRect.y, y, bottom)) continue;
+    const Item& item = items.at(static_cast<std::size_t>(i));
+    skia_add_textbox_c(makeRect(0, y, screenRect.w, item.height, item.bgColor), item.text);
   }
 }
 
@@ -163,14 +166,10 @@ void MainList::drawStatus() const {
 
 int MainList::hide() {
   if (read(shown) == 1) kLog.print(LogLevel::Debug, "HIDE<-%s", title.text);
-  setActive(0);  // first: a drawing pass that still met it active would set `shown` again
+  setActive(0);  // before `shown`: a drawing pass that still met it active would set `shown` again
   setSelect(0);
   write(shown, 0);
   return 0;
-}
-
-void MainList::lcdOn(int on) {
-  if (lcdState.exchange(on) != on) setSelect(0);
 }
 
 template <typename Change>
@@ -228,7 +227,7 @@ bool MainList::onRecvEvent(event_data* event, unsigned int) {
     case kEventKeyRelease: onReleaseKey(event->key); return true;
     default: break;
   }
-  if (!takesTouch(*event, select, read(listRect), kEventRelease, kLog)) return false;
+  if (!takesTouch(*event, kEventRelease)) return false;
   switch (event->type) {
     case kEventMotion: onHover(event->mouse); return true;
     case kEventPress: onPress(event->mouse); return true;
@@ -238,27 +237,22 @@ bool MainList::onRecvEvent(event_data* event, unsigned int) {
 }
 
 void MainList::onPressKey(kbd_event key) {
-  logKeyPress(kLog, key);
+  logKeyPress(key);
   if (auto* const call = keyPressCallback) call(&key, this);
 }
 
 void MainList::onReleaseKey(kbd_event key) {
-  logKeyRelease(kLog, key);
+  logKeyRelease(key);
   if (auto* const call = keyReleaseCallback) call(&key, this);
 }
 
 void MainList::onPress(mouse_event mouse) {
-  setSelect(static_cast<int>(mouse.finger + 1));
-  const int item = position2index(mouse);
-  {
-    const std::lock_guard guard(stateLock);
-    click.press(item);
-  }
+  pressRow(mouse, position2index(mouse));
   if (auto* const call = pressCallback) call(&mouse, this);
 }
 
 void MainList::onRelease(mouse_event mouse) {
-  setSelect(0);
+  hold.letGo();
   const int item = position2index(mouse);
   const LifeGuard self(this);
   if (isClicked(item)) {
@@ -278,35 +272,23 @@ void MainList::onHover(mouse_event mouse) {
   inClick(mouse.xrel, mouse.yrel);
   {
     const std::lock_guard guard(stateLock);
-    const int64_t content = toPixels(contentHeight());
-    if (content < int64_t{screenRect.h} - titleBar.h) return;  // all of it is in view
-    const int64_t lowest = std::min<int64_t>(listRect.h - content, 0);
-    scroll = toPixels(std::clamp(int64_t{scroll} + mouse.yrel, lowest, int64_t{0}));
+    const RowColumn column = wholeColumn();
+    if (column.height() < int64_t{screenRect.h} - titleBar.h) return;  // all of it is in view
+    scroll = toPixels(column.clampScroll(int64_t{scroll} + mouse.yrel, listRect.h));
   }
   if (auto* const call = scrollCallback) call(&mouse, this);
 }
 
 int MainList::position2index(mouse_event mouse) {
-  const auto [top, rows] = [this] {
+  const RowColumn column = [this] {
     const std::lock_guard guard(stateLock);
-    return std::pair(int64_t{listRect.y} + scroll, items);
+    return shownColumn();
   }();
-  int64_t y = top;
-  int index = 0;
-  for (const Item& item : rows) {
-    if (item.kind == kEnd) return kNoItem;
-    const int64_t bottom = y + item.height;
-    logRow(kLog, y, mouse, bottom);
-    if (isOnRow(y, mouse, bottom)) return index;
-    y = bottom + kItemGap;
-    ++index;
-  }
-  return ClickSlop::kNone;
-}
-
-void MainList::inClick(int dx, int dy) {
-  const std::lock_guard guard(stateLock);
-  click.move(dx, dy, touchSlop);
+  const int item = column.rowAt(mouse.y);
+  const int looked = item != RowColumn::kNoRow ? item + 1 : column.count();
+  for (int i = 0; i < looked; ++i) logHit(column.topOf(i), mouse, column.bottomOf(i));
+  if (item != RowColumn::kNoRow) return item;
+  return column.count() < kItems ? kNoItem : ClickSlop::kNone;
 }
 
 int MainList::move_key_down(int) {
@@ -314,8 +296,8 @@ int MainList::move_key_down(int) {
   const int next = nextSelectable(current, 1);
   if (next == kNoItem) return kNotMoved;
   current = next;
-  const int64_t bottom = heightUpTo(next + 1);
-  if (bottom + scroll > listRect.h) scroll = toPixels(listRect.h - bottom);
+  const int64_t below = columnOf(next + 1).topOf(next + 1) - listRect.y - listRect.h;
+  if (below > 0) scroll = toPixels(scroll - below);
   return next;
 }
 
@@ -324,8 +306,8 @@ int MainList::move_key_up(int) {
   const int previous = nextSelectable(current, -1);
   if (previous == kNoItem) return kNotMoved;
   current = previous;
-  const int64_t top = heightUpTo(previous);
-  if (top + scroll < 0) scroll = toPixels(-top);
+  const int64_t above = listRect.y - columnOf(previous).topOf(previous);
+  if (above > 0) scroll = toPixels(scroll + above);
   return previous;
 }
 
@@ -335,15 +317,6 @@ int MainList::nextSelectable(int from, int step) const {
     if (items.at(static_cast<std::size_t>(i)).kind == kSelectable) return i;
   }
   return kNoItem;
-}
-
-// Of the items before `end`, each with its gap.
-int64_t MainList::heightUpTo(int end) const {
-  int64_t sum = 0;
-  for (int i = 0; i < end; ++i) {
-    sum += int64_t{items.at(static_cast<std::size_t>(i)).height} + kItemGap;
-  }
-  return sum;
 }
 
 }  // namespace MW

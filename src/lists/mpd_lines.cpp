@@ -46,7 +46,7 @@ MpdLine parseLine(std::string_view line) {
   const std::size_t close = isMarked ? rest.find(']', 1) : std::string_view::npos;
   if (close == std::string_view::npos) {
     putField(parsed.name, kNoName);
-    putField(parsed.value, rest);  // with the separator: meant so
+    putField(parsed.value, rest);  // the separator belongs to it
   } else {
     putField(parsed.name, rest.substr(1, close - 1));
     putField(parsed.value, tailOf(rest, close + 1));
@@ -65,7 +65,7 @@ std::vector<MpdLine> parseMpdLines(std::string_view text) {
   std::vector<MpdLine> lines;
   std::size_t start = 0;
   while (lines.size() < MpdWid::kItems) {
-    // The text's first byte ends no line: meant so.
+    // The text's first byte ends no line.
     const std::size_t end = text.find('\n', std::max<std::size_t>(start, 1));
     if (end == std::string_view::npos) break;
     lines.push_back(parseLine(text.substr(start, end - start)));

@@ -12,9 +12,9 @@
 #include "core/geometry.h"
 #include "core/life_guard.h"
 #include "core/present_screen.h"
-#include "lists/list_input.h"
 #include "lists/mpd_lines.h"
 #include "lists/mpd_wid_tables.h"
+#include "lists/row_column.h"
 
 namespace MW {
 
@@ -24,11 +24,9 @@ constexpr ClassLog kLog("MPDWID");
 constexpr int kRowHeight = 141;  // pixels, and so the rest
 constexpr int kRowGap = 1;
 constexpr int kDrawnAbove = 143;  // a row is drawn whose top lies by less above the list's
-constexpr int kTitleSize = 70;
 constexpr int kRowTextSize = 19;
-constexpr int kLineHeight = 2;
-constexpr int kSlopPercent = 2;  // of the screen's width
-constexpr int kEndRow = -1;      // the row of list type 0 that ends a hit test
+constexpr int kEndRow = -1;  // the row that ends a hit test
+static_assert(MpdWid::kItems <= RowColumn::kMost);
 
 // Parts of the screen's height.
 constexpr int kAboveHeader = 13;
@@ -46,10 +44,8 @@ bool isMarked(const SKIA_Text& text, const Marker& marker) {
 
 }  // namespace
 
-MpdWid::MpdWid(const char* listTitle) {
+MpdWid::MpdWid(const char* listTitle) : RowList("MPDWID", listTitle) {
   kLog.print(LogLevel::Debug, "MpdWid");
-  title = {{}, 0, kColorWhite, SKIA_ALIGN_LEFT, kTitleSize};
-  putText(title, boundedText(listTitle));
   init_MpdWid();
 }
 
@@ -84,18 +80,17 @@ void MpdWid::setRect() {
   const int headerHeight = screen.h / kHeader;
   const int64_t top = int64_t{headerTop} + headerHeight;
   const std::lock_guard guard(stateLock);
-  touch_slop = toPixels(percentOf(screen.w, kSlopPercent));
+  layOutFrame(screen.w, screen.h);
   rect = {0, 0, screen.w, screen.h, rect.color};
-  bottom_line = {0, screen.h, screen.w, kLineHeight, kColorBlack};
   header_box = makeRect(kMargin, headerTop, width, headerHeight, kColorWhite);
-  list_rect = makeRect(kMargin, top, width, screen.h - top, 0);
+  listRect = makeRect(kMargin, top, width, screen.h - top, 0);
   cell = layOutCells(screen.w);
 }
 
 void MpdWid::initIndex() {
   kLog.print(LogLevel::Debug, "initIndex");
   const std::lock_guard guard(stateLock);
-  scroll_y = list_rect.y;
+  scroll_y = listRect.y;
 }
 
 void MpdWid::cal_line(const char* lines, int length) try {
@@ -133,7 +128,7 @@ void MpdWid::fillItem(int index, const MpdLine& line) {
   Item& filled = item.at(static_cast<std::size_t>(index));
   const auto* const row = std::ranges::find(kLevelColors, line.level, &LevelColor::level);
   if (row != kLevelColors.end()) filled.color = row->color;
-  filled.listType = 1;
+  filled.listType = kRow;
   filled.height = kRowHeight;
   filled.level = line.level;
   filled.marker = rowText((line.details ? kCollapsed : kLeaf).words);
@@ -159,39 +154,40 @@ void MpdWid::setListType(int index, int listType) {
   if (index >= 0 && index < mpd_line) item.at(static_cast<std::size_t>(index)).listType = listType;
 }
 
-int MpdWid::show() { return show(0); }
-
 int MpdWid::show(unsigned int) {
   const std::lock_guard guard(stateLock);
   drawRows();
   skia_add_box_c(header_box);
-  skia_add_box_c(bottom_line);
+  skia_add_box_c(bottomEdge);
   scrollTo(scroll_y);
   return 1;
 }
 
 void MpdWid::drawRows() {
-  const int64_t bottom = int64_t{list_rect.y} + list_rect.h;
-  int64_t y = scroll_y;
-  int hidden = 0;  // rows still to be skipped
-  visible_count = mpd_line;
-  for (int i = 0; i < mpd_line; ++i) {
+  const int64_t top = int64_t{listRect.y} - kDrawnAbove;
+  const int64_t bottom = int64_t{listRect.y} + listRect.h;
+  const RowColumn column = visibleColumn();
+  visible_count = 0;
+  for (int i = 0; i < column.count(); ++i) {
     Item& row = item.at(static_cast<std::size_t>(i));
-    row.y = toPixels(y);
-    if (hidden == 0) {
-      hidden = hiddenFrom(i);
-      visible_count -= hidden;
-    }
-    if (hidden > 0) {
-      --hidden;
-      continue;
-    }
-    if (int64_t{list_rect.y} - kDrawnAbove < y && y < bottom) drawRow(row);
-    y += row.height + kRowGap;
+    row.y = toPixels(column.topOf(i));
+    if (column.isHidden(i)) continue;
+    ++visible_count;
+    if (isBetween(top, column.topOf(i), bottom)) drawRow(row);
   }
 }
 
-// How many rows from this one on are hidden by the one before. The last row never is: meant so.
+// The rows where they are seen.
+RowColumn MpdWid::visibleColumn() const {
+  RowColumn column(scroll_y, kRowGap);
+  while (column.count() < mpd_line) {
+    for (int hidden = hiddenFrom(column.count()); hidden > 0; --hidden) column.addHidden();
+    column.add(item.at(static_cast<std::size_t>(column.count())).height);
+  }
+  return column;
+}
+
+// How many rows from this one on are hidden by the one before. The last row never is.
 int MpdWid::hiddenFrom(int first) const {
   const int last = mpd_line - 1;
   if (first == 0) return 0;
@@ -219,21 +215,18 @@ int MpdWid::hide() {
   return 1;
 }
 
-void MpdWid::lcdOn(int on) {
-  if (lcdState.exchange(on) != on) setSelect(0);
-}
-
 int MpdWid::Max_height() {
   const std::lock_guard guard(stateLock);
-  return contentHeight();
+  return toPixels(countedColumn().height());
 }
 
-int MpdWid::contentHeight() const {
-  int height = -kRowGap;
+// The rows that the list's height counts.
+RowColumn MpdWid::countedColumn() const {
+  RowColumn column(listRect.y, kRowGap);
   for (int i = 0; i < visible_count; ++i) {
-    if (item.at(static_cast<std::size_t>(i)).listType != 0) height += kRowHeight + kRowGap;
+    if (item.at(static_cast<std::size_t>(i)).listType != kHitEnd) column.add(kRowHeight);
   }
-  return height;
+  return column;
 }
 
 void MpdWid::onHover_temp() {
@@ -242,12 +235,11 @@ void MpdWid::onHover_temp() {
 }
 
 void MpdWid::scrollTo(int64_t top) {
-  const int64_t highest = list_rect.y;
-  const int64_t content = contentHeight();
-  // Too few rows to scroll do not come back from above in part either: meant so.
-  if (content < list_rect.h && top < highest) return;
-  const int64_t lowest = highest + list_rect.h - content;
-  scroll_y = toPixels(std::min(std::max(top, lowest), highest));
+  const RowColumn column = countedColumn();
+  const int64_t wanted = top - listRect.y;
+  // Too few rows to scroll come back from above at once or not at all.
+  if (column.height() < listRect.h && wanted < 0) return;
+  scroll_y = toPixels(listRect.y + column.clampScroll(wanted, listRect.h));
 }
 
 bool MpdWid::onRecvEvent(event_data* event, unsigned int) {
@@ -257,7 +249,7 @@ bool MpdWid::onRecvEvent(event_data* event, unsigned int) {
     case kEventKeyRelease: onReleaseKey(event->key); return true;
     default: break;
   }
-  if (!takesTouch(*event, select, read(list_rect), kEventLongPress, kLog)) return false;
+  if (!takesTouch(*event, kEventLongPress)) return false;
   const LifeGuard self(this);
   switch (event->type) {
     case kEventMotion: onHover(event->mouse); return true;
@@ -274,22 +266,17 @@ bool MpdWid::onRecvEvent(event_data* event, unsigned int) {
 }
 
 void MpdWid::onPressKey(kbd_event key) {
-  logKeyPress(kLog, key);
+  logKeyPress(key);
   if (auto* const call = key_press_cb) call(&key, this);
 }
 
 void MpdWid::onReleaseKey(kbd_event key) {
-  logKeyRelease(kLog, key);
+  logKeyRelease(key);
   if (auto* const call = key_release_cb) call(&key, this);
 }
 
 void MpdWid::onPress(mouse_event mouse) {
-  setSelect(static_cast<int>(mouse.finger + 1));
-  const int row = position2index(mouse);
-  {
-    const std::lock_guard guard(stateLock);
-    click.press(row);
-  }
+  pressRow(mouse, position2index(mouse));
   if (auto* const call = press_cb) call(&mouse, this);
 }
 
@@ -301,7 +288,7 @@ void MpdWid::onMpdPress(event_data* event) {
     if (rect.color != kColorHighlight) normalColor = rect.color;
     rect.color = kColorHighlight;
   }
-  setSelect(static_cast<int>(event->mouse.finger + 1));
+  hold.press(event->mouse);
   const unsigned int now = GetTicks();
   const bool isStale = taps.isStale(now);
   if (isStale) kLog.print(LogLevel::Debug, "nclick_start_ms < next_ms");
@@ -310,7 +297,7 @@ void MpdWid::onMpdPress(event_data* event) {
 }
 
 void MpdWid::onRelease(mouse_event mouse) {
-  setSelect(0);
+  hold.letGo();
   const int row = position2index(mouse);
   const LifeGuard self(this);
   if (row == kEndRow && row == read(click).row()) {
@@ -322,7 +309,7 @@ void MpdWid::onRelease(mouse_event mouse) {
 
 void MpdWid::onMpdRelease(event_data* event) {
   kLog.print(LogLevel::Debug, "onMpdRelease!!");
-  setSelect(0);
+  hold.letGo();
   {
     const std::lock_guard guard(stateLock);
     rect.color = normalColor;
@@ -343,7 +330,7 @@ void MpdWid::depth_cal(event_data* event) {
   const std::lock_guard guard(stateLock);
   for (int i = 0; i + 1 < mpd_line; ++i) {
     Item& row = item.at(static_cast<std::size_t>(i));
-    if (row.y >= y || y >= item.at(static_cast<std::size_t>(i) + 1).y) continue;
+    if (!isBetween(row.y, y, item.at(static_cast<std::size_t>(i) + 1).y)) continue;
     if (isMarked(row.marker, kLeaf)) continue;
     row.marker = rowText((isMarked(row.marker, kCollapsed) ? kExpanded : kCollapsed).words);
   }
@@ -358,25 +345,24 @@ void MpdWid::onHover(mouse_event mouse) {
   if (auto* const call = hover_cb) call(&mouse, this);
 }
 
-int MpdWid::position2index(mouse_event mouse) {
-  const std::lock_guard guard(stateLock);
-  int64_t top = int64_t{list_rect.y} + scroll_y;
+// The rows before the first that ends a hit test. The list's top counts twice.
+RowColumn MpdWid::hitColumn() const {
+  RowColumn column(int64_t{listRect.y} + scroll_y, kRowGap);
   for (int i = 0; i < mpd_line; ++i) {
     const Item& row = item.at(static_cast<std::size_t>(i));
-    if (row.listType == 0) return kEndRow;
-    const int64_t bottom = top + row.height;
-    if (isOnRow(top, mouse, bottom)) {
-      logRow(kLog, top, mouse, bottom);
-      return i;
-    }
-    top = bottom + kRowGap;
+    if (row.listType == kHitEnd) break;
+    column.add(row.height);
   }
-  return ClickSlop::kNone;
+  return column;
 }
 
-void MpdWid::inClick(int dx, int dy) {
+int MpdWid::position2index(mouse_event mouse) {
   const std::lock_guard guard(stateLock);
-  click.move(dx, dy, touch_slop);
+  const RowColumn column = hitColumn();
+  const int row = column.rowAt(mouse.y);
+  if (row == RowColumn::kNoRow) return column.count() < mpd_line ? kEndRow : ClickSlop::kNone;
+  logHit(column.topOf(row), mouse, column.bottomOf(row));
+  return row;
 }
 
 void MpdWid::control_context(int, SKIA_Rect*, char*) {}

@@ -3,6 +3,7 @@
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
+#include "core/geometry.h"
 #include "core/redraw.h"
 
 namespace MW {
@@ -10,7 +11,7 @@ namespace MW {
 ButtonFace::ButtonFace(const char* logWord, const SKIA_Rect* area, const SKIA_Text* caption)
     : word(logWord) {
   type_ = kBaseLayer;
-  if (area != nullptr) rect = *area;
+  rect = copyRect(area);
   normalColor = rect.color;
   text = copyText(caption);
 }

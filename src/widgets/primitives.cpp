@@ -18,8 +18,6 @@ constexpr int kTypeBox = 6;
 constexpr int kTypeLine = 7;
 constexpr int kTypeTextbox = 8;
 
-SKIA_Rect copyRect(const SKIA_Rect* given) { return given != nullptr ? *given : SKIA_Rect{}; }
-
 SKIA_Text imageName(const SKIA_Text* given) {
   SKIA_Text record = {};
   if (given == nullptr) return record;

@@ -74,7 +74,7 @@ SlideMove::SlideMove(const SKIA_Rect* area, int percent, int a, int b, int initi
       value(startOf(a, b, initial)) {
   kLog.print(LogLevel::Debug, "call registerWidget");
   setType(kBaseLayer);
-  setRect(area);
+  layOut(copyRect(area));
   Window::registerWidget(this);
 }
 

@@ -99,8 +99,9 @@ void Toastbox::setRect(int lineCount, const SKIA_Rect* newRect) {
 }
 
 Progressbar::Progressbar(int, const SKIA_Rect* area, const SKIA_Text* caption) {
+  const SKIA_Rect given = copyRect(area);
   setType(kBaseLayer);
-  Progressbar::setRect(0, area);
+  Progressbar::setRect(0, &given);
   text = copyText(caption);
   starText.color = kColorWhite;
   starText.align = SKIA_ALIGN_CENTRE;

@@ -130,6 +130,10 @@ Step call(Operation operation, Arguments... arguments) {
 inline Step draw() {
   return call([](MW::Widget& widget) { widget.show(platform().ticks); });
 }
+/// A timer pass at the clock's time.
+inline Step timer() {
+  return call([](MW::Widget& widget) { widget.updateTimer(platform().ticks); });
+}
 /// Writes what is read from the widget into the journal: a text or a number.
 template <typename Subject = MW::Widget, typename Reader>
 Step look(Reader read) {
@@ -142,6 +146,14 @@ Step look(Reader read) {
 /// Which finger holds the widget, as isSelect() says it.
 inline Step lookAtHold() {
   return look([](MW::Widget& widget) { return "held " + std::to_string(widget.isSelect()); });
+}
+/// Whether a redraw was asked for since the last look.
+inline Step lookAtRedraw() {
+  return look([](MW::Widget&) { return MW::isDisplayUpdate(0) == 1 ? "redraw" : "still"; });
+}
+/// How many drawing calls a drawing pass makes.
+inline Step lookAtDrawings() {
+  return look([](MW::Widget& widget) { return shown(widget).size(); });
 }
 /// The last line of the log since the last look.
 inline Step lookAtLog() {
@@ -157,6 +169,8 @@ using Maker = std::function<std::unique_ptr<MW::Widget>()>;
 inline std::string played(const Maker& make, const Steps& steps, int deletingCall = 0) {
   stage = {};
   platform().ticks = kStartTicks;
+  platform().takeLog();
+  MW::isDisplayUpdate(0);
   stage.widget = make();
   stage.deletingCall = deletingCall;
   for (const Step& step : steps) {
@@ -237,6 +251,15 @@ Maker makes(Arguments... arguments) {
     auto made = std::make_unique<Subject>(arguments...);
     made->setActive(1);
     return heard<kind>(std::move(made));
+  };
+}
+
+/// The same widget without one of its callbacks.
+inline Maker without(MW::Callback MW::Widget::*word, const Maker& make) {
+  return [=] {
+    auto made = make();
+    (*made).*word = nullptr;
+    return made;
   };
 }
 

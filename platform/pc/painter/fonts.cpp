@@ -5,6 +5,8 @@
 
 #include <array>
 #include <cstdio>
+#include <mutex>
+#include <vector>
 
 #include "scene/cairo_handles.h"
 
@@ -36,10 +38,10 @@ constexpr double kDotsPerInch = 96;  // sizes are absolute, so that nothing depe
 
 const FcChar8* fileName(const char* file) { return reinterpret_cast<const FcChar8*>(file); }
 
-FontConfig configOf(std::span<const char* const> files) {
+FontConfig makeConfig() {
   FontConfig config(FcConfigCreate());
   FcConfigSetSysRoot(config.get(), nullptr);
-  for (const char* const file : files) {
+  for (const char* const file : kFontFiles) {
     if (FcConfigAppFontAddFile(config.get(), fileName(file)) == FcTrue) continue;
     std::fprintf(stderr, "brimol: cannot use the font file %s; texts may look different\n", file);
   }
@@ -70,9 +72,15 @@ TextContext contextOf(PangoFontMap* map) {
   return context;
 }
 
-}  // namespace
+// What nobody has borrowed. Fonts are never destroyed: Pango matches them on a thread of its own,
+// which may still put its last match away, and would then find no map to put it into.
+struct Shelf {
+  std::mutex mutex;
+  std::vector<Fonts*> fonts;  // guarded by mutex
+};
+Shelf& gShelf = *new Shelf;
 
-std::span<const char* const> projectFontFiles() { return kFontFiles; }
+}  // namespace
 
 FontDescription projectFonts(int size) {
   FontDescription font(pango_font_description_new());
@@ -83,17 +91,23 @@ FontDescription projectFonts(int size) {
 
 // The configuration becomes the process's own before Pango first looks for one: the machine's is
 // then never read, which saves its time and its complaints.
-Fonts::Fonts(std::span<const char* const> files) : config(configOf(files)) {
+Fonts::Fonts() : config(makeConfig()) {
   FcConfigSetCurrent(config.get());
   map = mapOf(config.get());
   placing = contextOf(map.get());
 }
 
-// A font map keeps its configuration for ever unless it gets another one. An empty one takes its
-// place in the process: without any, what Pango still asks for would have the machine's be read.
-Fonts::~Fonts() {
-  pango_fc_font_map_set_config(PANGO_FC_FONT_MAP(map.get()), nullptr);
-  if (FcConfigGetCurrent() == config.get()) FcConfigSetCurrent(FontConfig(FcConfigCreate()).get());
+void FontsReturner::operator()(Fonts* fonts) const {
+  const std::lock_guard lock(gShelf.mutex);
+  gShelf.fonts.push_back(fonts);
+}
+
+BorrowedFonts borrowFonts() {
+  const std::lock_guard lock(gShelf.mutex);
+  if (gShelf.fonts.empty()) return BorrowedFonts(new Fonts);
+  Fonts* const fonts = gShelf.fonts.back();
+  gShelf.fonts.pop_back();
+  return BorrowedFonts(fonts);
 }
 
 }  // namespace brimol::pc

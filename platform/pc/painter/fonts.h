@@ -1,24 +1,21 @@
 /// The project's own fonts, whatever the machine, its user and its settings prefer.
 #pragma once
 
-#include <span>
+#include <memory>
 
 #include "painter/text_handles.h"
 
 namespace brimol::pc {
 
-/// The font files in which texts are drawn, the preferred one first.
-std::span<const char* const> projectFontFiles();
-
-/// The description of those fonts at `size` pixels.
+/// The description of the project's fonts at `size` pixels.
 FontDescription projectFonts(int size);
 
-/// The fonts, and how their glyphs are placed and rendered. One thread uses it.
+/// The fonts, and how their glyphs are placed and rendered. A file that cannot be used is told on
+/// stderr and left out; texts are drawn with the others.
 class Fonts {
  public:
-  /// A file that cannot be used is told on stderr and left out; texts are drawn with the others.
-  explicit Fonts(std::span<const char* const> files);
-  ~Fonts();
+  Fonts();
+  ~Fonts() = delete;
   Fonts(const Fonts&) = delete;
   Fonts& operator=(const Fonts&) = delete;
 
@@ -29,5 +26,15 @@ class Fonts {
   FontMap map;
   TextContext placing;
 };
+
+struct FontsReturner {
+  void operator()(Fonts* fonts) const;
+};
+
+/// Fonts for one thread at a time. They are kept for the next borrower when they come back.
+using BorrowedFonts = std::unique_ptr<Fonts, FontsReturner>;
+
+/// Any thread may borrow.
+BorrowedFonts borrowFonts();
 
 }  // namespace brimol::pc

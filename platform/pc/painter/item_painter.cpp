@@ -4,8 +4,6 @@
 
 namespace brimol::pc {
 
-ItemPainter::ItemPainter(const Canvas& target) : canvas(target), texts(projectFontFiles()) {}
-
 void ItemPainter::draw(const SKIA_Item& item, const Pixels& clip) {
   const Pixels area = within(boundsOf(item, wholeOf(canvas.size())), clip);
   if (isEmpty(area)) return;

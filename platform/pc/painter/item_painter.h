@@ -12,7 +12,7 @@ namespace brimol::pc {
 class ItemPainter {
  public:
   /// `target` outlives the painter.
-  explicit ItemPainter(const Canvas& target);
+  explicit ItemPainter(const Canvas& target) : canvas(target) {}
 
   /// Draws of the item what lies in `clip`: within the canvas, not empty.
   void draw(const SKIA_Item& item, const Pixels& clip);

@@ -62,9 +62,6 @@ void showLines(cairo_t* context, PangoLayout* layout, const Edges& box, int alig
 
 }  // namespace
 
-TextPainter::TextPainter(std::span<const char* const> fontFiles)
-    : fonts(fontFiles), layouts(kMostLayouts) {}
-
 void TextPainter::draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_Text& text,
                        const Pixels& clip) {
   if (textSizeOf(text) == 0 || alphaOf(text.color) == 0 || shownText(text).empty()) return;
@@ -85,7 +82,7 @@ PangoLayout* TextPainter::layoutOf(const SKIA_Text& text) {
 }
 
 TextLayout TextPainter::makeLayout(const Key& key) const {
-  TextLayout layout(pango_layout_new(fonts.context()));
+  TextLayout layout(pango_layout_new(fonts->context()));
   const FontDescription font = projectFonts(key.size);
   pango_layout_set_font_description(layout.get(), font.get());
   const AttributeList attributes = attributesOf(key.color);

@@ -15,7 +15,7 @@ namespace brimol::pc {
 /// Draws texts and keeps the layouts of the recent ones. One thread uses it.
 class TextPainter {
  public:
-  explicit TextPainter(std::span<const char* const> fontFiles);
+  TextPainter() : fonts(borrowFonts()), layouts(kMostLayouts) {}
 
   /// Draws the text in the middle of the rectangle's height, aligned as the record asks. Lines
   /// whose middle lies above or below the rectangle are left out. Only pixels in `clip` change: the
@@ -41,7 +41,7 @@ class TextPainter {
   PangoLayout* layoutOf(const SKIA_Text& text);
   TextLayout makeLayout(const Key& key) const;
 
-  Fonts fonts;
+  BorrowedFonts fonts;
   LruCache<Key, TextLayout> layouts;
 };
 

@@ -1,0 +1,64 @@
+#include <MW/dialog_new.h>
+
+#include "dialogs/dialog_plays.h"
+
+namespace {
+
+using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+using MW::DialogNew;
+using DialogNewTest = WidgetTest;
+
+struct Open : DialogNew {
+  using DialogNew::buttonMode;
+  using DialogNew::descLast;
+  using DialogNew::DialogNew;
+};
+void setTwoButtons(Open& dialog) { dialog.setbutton("1", "2"); }
+void setHookMode(Open& dialog) { dialog.buttonMode = 13; }
+
+const PlaysOn kDialog = {makes<Open>("Title", 5, 7)};
+const auto kPlays = std::to_array<Play>({
+    kDialog("TwoButtonsLeaveAGap",
+            {call<Open>(setTwoButtons), press(716, 1619), release(), press(719, 1400),
+             press(722, 1400), release(), lookAtLog()},
+            "press+ button1 click+ press- press+ button2 click+ <[DIALOGNEW] btn2 released!!>"),
+    kDialog("AProgressRowAnswersNoTouch",
+            {call<Open>(setTwoButtons), call<Open>(&DialogNew::setProgress, 0U), press(722, 1400),
+             release()},
+            "press- click+"),
+    kDialog("KeysAreToldAndTheHookKeyInItsMode",
+            {keyDown(323), keyDown(5), keyUp(5), plug(17), call<Open>(setHookMode), keyDown(323)},
+            "+ down5+ up5+ plug17+ hook+"),
+});
+using DialogNewPlays = PlayTest;
+TEST_P(DialogNewPlays, TellTheirJournal) { expectJournal(GetParam()); }
+INSTANTIATE_TEST_SUITE_P(, DialogNewPlays, testing::ValuesIn(kPlays), kRowName);
+
+TEST_F(DialogNewTest, TextsEndAtTheFirstNull) {
+  DialogNew dialog(kTooLong.c_str(), 5, 7);
+  dialog.setDesc("a", nullptr, "c");
+  dialog.setbutton(nullptr, "X");
+  EXPECT_EQ(words(shown(dialog)), kTooLong.substr(1) + "|a|");
+  EXPECT_EQ(shown(dialog).at(5).text, (DrawnText{kTooLong.substr(1), 7, 5, 70}));
+}
+
+TEST_F(DialogNewTest, TheBodyChangesItsColourWithTheNextLayout) {
+  DialogNew dialog("Title", 5, 7);
+  dialog.setDescBlink(0);
+  dialog.setDescColor(9);
+  EXPECT_EQ(shown(dialog).at(3).rect.color, MW::kColorBlack);
+  dialog.setProgress(0);
+  EXPECT_EQ(shown(dialog).at(3).rect.color, 9U);
+}
+
+TEST_F(DialogNewTest, NumbersThatNoSetterGivesDrawNothing) {
+  Open dialog("Title", 5, 7);
+  for (const auto& [last, mode] : {Spot{3, 2}, {-1, -1}, {INT_MIN, 5}, {INT_MAX, 13}}) {
+    dialog.descLast = last;
+    dialog.buttonMode = mode;
+    dialog.setRect();
+    EXPECT_EQ(words(shown(dialog)), "Title|") << last;
+  }
+}
+
+}  // namespace

@@ -1,0 +1,43 @@
+/// What the plays of dialogs have in common.
+#pragma once
+
+#include "support/drawings.h"
+#include "support/play.h"
+
+namespace brimol::test {
+
+/// Makes rows of plays on one widget.
+struct PlaysOn {
+  Maker make;
+  Play operator()(const char* name, const Steps& steps, const char* journal) const {
+    return {name, make, steps, journal};
+  }
+};
+
+/// Makes a page or dialog with callbacks of its own in place of the base's, which are heard.
+template <typename Own, typename... Arguments>
+Maker makesOwn(Arguments... arguments) {
+  return [=] {
+    auto made = makes<Own>(arguments...)();
+    auto& own = static_cast<Own&>(*made);
+    own.touchPressCallback = [](MW::mouse_event* mouse) { noteTouch("touch", mouse); };
+    own.touchReleaseCallback = [](MW::mouse_event* mouse) { noteTouch("lift", mouse); };
+    own.keyPressCallback = [](MW::kbd_event* key) { note("down" + std::to_string(key->code)); };
+    own.keyReleaseCallback = [](MW::kbd_event* key) { note("up" + std::to_string(key->code)); };
+    return made;
+  };
+}
+
+/// How many boxes are highlighted.
+inline Step lookAtFaces() {
+  return look([](MW::Widget& widget) {
+    const auto isLit = [](const Drawing& each) { return each.rect.color == MW::kColorHighlight; };
+    return "lit " + std::to_string(std::ranges::count_if(shown(widget), isLit));
+  });
+}
+inline Step lcdOn(int on) { return call(&MW::Widget::lcdOn, on); }
+inline Step hide() { return call(&MW::Widget::hide); }
+
+inline const std::string kTooLong(128, 'x');
+
+}  // namespace brimol::test
