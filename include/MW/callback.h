@@ -19,12 +19,12 @@ namespace MW {
 ///
 /// A word may be assigned on any thread at any time, also while its widget is active: a handler
 /// calls the function before or the function after the assignment. The function before may still
-/// run when the assignment returns.
+/// run when the assignment returns. Only copies, of a const word or as a new word, are plain: no
+/// other thread may assign or call the two meanwhile.
 class Callback {
  public:
   constexpr Callback() = default;
   constexpr Callback(std::nullptr_t) {}  // NOLINT(google-explicit-constructor): assigned from null
-  /// A plain copy: not of a word that another thread may assign meanwhile.
   constexpr Callback(const Callback&) = default;
 
   template <typename Function>
@@ -49,15 +49,14 @@ class Callback {
     return *this;
   }
   /// From a function, a lambda or another word.
-  template <typename Source>
-  requires(std::convertible_to<const Source&, Callback>) Callback& operator=(const Source& source) {
+  // A template, since a copy assignment that is written by hand is not trivial.
+  template <std::convertible_to<Callback> Source>
+  Callback& operator=(Source&& source) {  // NOLINT(misc-unconventional-assign-operator)
     store(source);
     return *this;
   }
-  // A template is no copy assignment, and one that is written by hand would not be trivial. This
-  // one, which no overload resolution prefers, stands for it, so that the class stays trivially
-  // copyable and every assignment goes the atomic way.
-  Callback& operator=(const volatile Callback&) = delete;
+  /// From a word that is const, as in a record: a plain copy.
+  Callback& operator=(const Callback&) = default;
 
   explicit operator bool() const { return load() != nullptr; }
 

@@ -43,7 +43,7 @@ TEST(CallbackTest, TakesEachKindOfFunction) {
   word = [](MW::kbd_event* key) { told += std::to_string(key->code); };
   MW::kbd_event key = {.state = 0, .code = 2};
   word(&key);
-  word = [](int* values) { told += std::to_string(*values); };
+  word = [](int* values) { told += std::to_string((*values)++); };
   int values = 3;
   word(&values);
   EXPECT_EQ(told, "123");
@@ -65,9 +65,9 @@ TEST(CallbackTest, IsAssignedWhileAnotherThreadCallsIt) {
   {
     const std::jthread calling(call);
     bothThere.arrive_and_wait();
-    const Callback next = [](int) { ++other; };
-    word = next;
-    word = [](int) { ++other; };
+    Callback next;
+    word = next = [](int) { ++other; };
+    word = Callback(next);
   }
   EXPECT_EQ(first + other, kCalls);
 }
