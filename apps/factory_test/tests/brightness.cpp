@@ -33,7 +33,7 @@ class BrightnessTest : public PageTest {
       if (code == MW::kKeyDown) Current<BrightnessTest>::get().steps -= 1;
     };
     const SKIA_Rect area = rowOf(screenSize(), 46, 8, kTrackColor);
-    slider.emplace(&area, 0, kLeast, kFull, kFull);
+    slider.emplace(&area, MW::SlideMove::kValueKnob, kLeast, kFull, kFull);
     slider->setActive(1);
   }
 
