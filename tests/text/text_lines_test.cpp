@@ -2,6 +2,8 @@
 
 #include <MW/detail/text_lines.h>
 
+#include <array>
+#include <random>
 #include <string>
 
 #include "support/widget_test.h"
@@ -45,6 +47,24 @@ TEST_P(TextLinesCut, GivesRows) {
   EXPECT_EQ(rowsOf(TextLines(GetParam().text, GetParam().rowBytes, 1)), GetParam().rows);
 }
 INSTANTIATE_TEST_SUITE_P(, TextLinesCut, testing::ValuesIn(kCuts), kRowName);
+
+TEST(TextLines, RowsGiveTheTextBack) {
+  constexpr std::array kPieces = {"word", "\n", "\r\x02\x03", "\xE2\x82\xAC", "\x80\x80\x80\xFF"};
+  std::minstd_rand random(5);
+  for (int round = 0; round < 300; ++round) {
+    std::string text;
+    for (auto i = random() % 200; i > 0; --i) text += kPieces.at(random() % kPieces.size());
+    const std::size_t rowBytes = 1 + random() % 127;
+    const TextLines lines(text + '\n', rowBytes, 1);
+    std::string joined;
+    for (int row = 0; row < lines.count(); ++row) {
+      EXPECT_LE(lines.text(row).size(), rowBytes);
+      (joined += lines.number(row) > 1 ? "\n" : "") += lines.text(row);
+    }
+    std::erase_if(text, [](char byte) { return byte == '\r' || byte == '\x02' || byte == '\x03'; });
+    EXPECT_EQ(joined, text);
+  }
+}
 
 TEST(TextLines, RowsAreFoundByTheirLines) {
   const TextLines lines("ab\nc\nd", 2, 4);  // 1ab +  2c  3d
