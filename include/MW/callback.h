@@ -19,8 +19,8 @@ namespace MW {
 ///
 /// A word may be assigned on any thread at any time, also while its widget is active: a handler
 /// calls the function before or the function after the assignment. The function before may still
-/// run when the assignment returns. Only copies, of a const word or as a new word, are plain: no
-/// other thread may assign or call the two meanwhile.
+/// run when the assignment returns. Only copies of a const or temporary word, and words that are
+/// made as copies, are plain: no other thread may assign or call the two meanwhile.
 class Callback {
  public:
   constexpr Callback() = default;
@@ -55,8 +55,9 @@ class Callback {
     store(source);
     return *this;
   }
-  /// From a word that is const, as in a record: a plain copy.
+  // From a word that is const, as in a record, or temporary: a plain copy.
   Callback& operator=(const Callback&) = default;
+  Callback& operator=(Callback&&) = default;
 
   explicit operator bool() const { return load() != nullptr; }
 
