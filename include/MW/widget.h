@@ -142,8 +142,8 @@ class MW_API Widget {
   /// Takes the widget out of its layer, by its own address and whatever its id, and waits for a
   /// handler of it that runs on another thread. Its counters and the log are not touched.
   void leaveLayers();
-  /// Window::unregisterWidget, with its log line and count, and then leaveLayers(): what removes
-  /// the widget even where another one of the same id was removed.
+  /// The same, and lowers the window's count of widgets and logs it as Window::unregisterWidget
+  /// does.
   void leaveWindow();
 
   /// Whether a pointer event lies in the rectangle, left and top edges in, the others out. `field`
