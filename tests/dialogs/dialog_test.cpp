@@ -60,9 +60,9 @@ INSTANTIATE_TEST_SUITE_P(, DialogPlays, testing::ValuesIn(kPlays), kRowName);
 
 TEST_F(DialogTest, StarsStartAnewAfterTen) {
   Dialog dialog(Dialog::kDoNotTouch);
-  for (const std::size_t stars : {1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 1}) {
+  for (const int stars : {1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 1}) {
     platform().ticks += 101;
-    EXPECT_EQ(shown(dialog).back().text.text.size(), stars);
+    EXPECT_EQ(std::ssize(shown(dialog).back().text.text), stars);
   }
 }
 
