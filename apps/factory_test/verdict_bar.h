@@ -45,6 +45,6 @@ class VerdictBar {
 };
 
 /// The key that leaves a screen.
-inline constexpr unsigned int kKeyBack = 158;
+inline constexpr unsigned int kKeyBack = BRIMOL_CODE_BACK;
 
 }  // namespace factory_test
