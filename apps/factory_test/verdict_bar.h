@@ -3,6 +3,7 @@
 
 #include <MW/button3.h>
 #include <MW/key.h>
+#include <brimol/input.h>
 
 #include <array>
 #include <atomic>

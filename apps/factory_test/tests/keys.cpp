@@ -1,6 +1,7 @@
 // Every key once, and one of them twice and three times in a row.
 #include <MW/key.h>
 #include <MW/primitives.h>
+#include <brimol/input.h>
 
 #include <algorithm>
 #include <array>

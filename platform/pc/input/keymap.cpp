@@ -14,7 +14,7 @@ namespace {
 
 struct KeyRow {
   SDL_Keycode key;
-  uint32_t code;           // what the phone's key reports
+  BrimolKeyCode code;      // what the phone's key reports
   std::string_view label;  // of the key on the PC
   std::string_view plays;  // the phone's key
 };
