@@ -112,6 +112,7 @@ TEST_F(MainListTest, KeysScrollTheirItemIntoView) {
   EXPECT_EQ(menu.move_key_down(0), 21);
   EXPECT_EQ(menu.at(2556), 21);
   EXPECT_EQ(menu.at(2557), -1) << "its gap stands on the list's foot";
+  while (menu.move_key_down(0) >= 0) continue;
   while (menu.move_key_up(0) > 1) continue;
   EXPECT_EQ(menu.at(341), 1) << "exactly at the top";
   EXPECT_EQ(shown(menu).front().text.text, "2") << "where none is drawn";

@@ -161,7 +161,7 @@ TEST_F(MpdWidTest, RowsAreChangedByNumber) {
   results.addIndex(0, true, 4, "head", "name", nullptr);
   results.setBGColor(0, 5);
   EXPECT_EQ(words(cells(results)), "[>]|head|[4]|name||");
-  EXPECT_EQ(cells(results).at(2).rect.color, 5U);
+  EXPECT_EQ(cells(results).at(1).rect.color, 5U);
   EXPECT_EQ(results.position2index({0, 0, 0, 2 * kTop + 1, 0, 0}), 0) << "the top counts twice";
 }
 
