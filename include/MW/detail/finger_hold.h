@@ -7,9 +7,8 @@
 
 namespace MW {
 
-/// The finger that pressed holds until it lifts. Stands on the widget's own selection, which the
-/// window's routing reads as well: 0 while no finger holds, else the finger's number + 1. Any
-/// thread.
+/// Records which finger holds a widget, in the widget's `select`, which event routing reads too: 0
+/// for none, else the finger's number + 1. Safe on any thread.
 class FingerHold {
  public:
   explicit FingerHold(std::atomic<int>& selectionWord) : selection(selectionWord) {}
