@@ -62,7 +62,7 @@ class MW_API StaticText : public TextPanel {
   /// handles events. A viewer that is registered already is drawn and called twice from here on:
   /// unregister it first.
   void init(const SKIA_Rect* area, const SKIA_Text* looks);
-  /// Every fourth motion scrolls by a row, whatever way it went.
+  /// Every fourth motion scrolls by a row, the way that this one goes.
   void onHover(mouse_event mouse);
 
   /// Keeps what is to be searched, cut to 99 bytes at a whole character. Null is the empty text.

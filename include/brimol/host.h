@@ -32,9 +32,8 @@ const char* brimol_host_help(void);
 /* Non-zero once the user has asked to close the window. */
 int brimol_host_close_requested(void);
 
-/* Lights the screen with so many per cent of its full light, 0 to 100 and nothing beyond, from the
- * next frame that ends; a screen opens with 100. Screenshots show it too. Nothing happens where no
- * screen is open. */
+/* Sets the screen's light in per cent, clamped to 0 to 100, from the next frame that ends; a screen
+ * opens with 100. Screenshots show it too. Does nothing where no screen is open. */
 void brimol_host_set_brightness(int percent);
 
 /* Waits until the newest ended frame is painted and writes it as a PNG file in full size. Returns

@@ -31,8 +31,12 @@ Step seen() {
   });
 }
 Steps stepsOfStars(int count) {
-  Steps steps = {runFor(5000), seen()};
-  for (int i = 1; i < count; ++i) steps.insert(steps.end(), {later(101), seen()});
+  Steps steps;
+  steps.push_back(runFor(5000));
+  for (int i = 0; i < count; ++i) {
+    steps.push_back(seen());
+    steps.push_back(later(101));
+  }
   return steps;
 }
 

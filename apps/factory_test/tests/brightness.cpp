@@ -15,7 +15,7 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kLeast = 10;  // per cent: darker, and nobody finds the slider
+constexpr int kLeast = 10;  // per cent; on a darker screen the slider cannot be found
 constexpr int kFull = 100;
 constexpr int kStep = 10;
 constexpr uint32_t kTrackColor = 0xFF2A3344;

@@ -100,7 +100,7 @@ void TurnClock::takePartAsPoller() {
   takePart();
   Participant& me = self();
   if (me.isPoller) return;
-  const std::lock_guard lock(mutex);
+  const Lock lock = lockFor(me);
   for (Participant& each : participants) each.isPoller = &each == &me;
 }
 
@@ -139,6 +139,7 @@ void TurnClock::begin(Participant& announced) {
   Lock lock(mutex);
   sitDown(announced);
   announced.go.wait(lock, [&] { return holder == &announced; });
+  announced.isAtWork = true;
 }
 
 void TurnClock::leave() {
@@ -153,11 +154,13 @@ void TurnClock::leave() {
 void TurnClock::waitForTurn(Lock& lock, Participant& me, uint64_t wake) {
   me.calls = 0;
   me.wake = wake;
+  me.isAtWork = false;
   me.state = Participant::State::Waiting;
   if (me.isOutside) takeBack(me);
   if (holder == &me) holder = nullptr;
   if (holder == nullptr) passOn(lock);
   me.go.wait(lock, [&] { return holder == &me; });
+  me.isAtWork = true;
 }
 
 // Nobody has the turn.

@@ -29,8 +29,8 @@ enum class Speed { Free, Real };
 ///
 /// A thread that blocks while it has the turn, because it waits for one that does not have it,
 /// loses it: it is away until its next call. Before a turn goes on, whatever runs of those that are
-/// away comes to its next call or blocks again. One that blocks for two real seconds, outside of the
-/// process, is named, and time then goes no faster than real time until it is back.
+/// away comes to its next call or blocks again. One that blocks for two real seconds, outside of
+/// the process, is named, and time then goes no faster than real time until it is back.
 ///
 /// Threads other than the process's main one end before the clock is destroyed.
 class TurnClock {

@@ -71,9 +71,12 @@ void TurnClock::keep() {
 
 void TurnClock::watchHolder(Lock& lock) {
   Participant* const watched = holder;
-  if (watched == nullptr || watched->thread == 0 || watched->waitsInside) return;
+  if (watched == nullptr || watched->waitsInside) return;
   const auto now = steady_clock::now();
-  const ThreadState state = lookAt(watched->thread);
+  // What waits for the clock's own lock, or to hear that it has the turn, is no more than slow.
+  const bool isSlow = !watched->isAtWork;
+  const ThreadState looked = isSlow ? ThreadState::Running : lookAt(watched->thread);
+  const ThreadState state = watched->arrives ? ThreadState::Running : looked;
   if (turns != std::exchange(watchedTurn, turns) || state == ThreadState::Running) {
     looksOnThread = 0;
     blockedSince = now;
@@ -90,8 +93,8 @@ bool TurnClock::othersRun() {
   const pid_t self = ::gettid();
   return std::ranges::any_of(threadsOfProcess(), [&](pid_t thread) {
     const bool isOurs = thread == self || std::ranges::any_of(participants, [&](const auto& each) {
-      return each.thread == thread && each.state == Participant::State::Waiting;
-    });
+                          return each.thread == thread && each.state == Participant::State::Waiting;
+                        });
     return !isOurs && lookAt(thread) == ThreadState::Running;
   });
 }

@@ -27,8 +27,8 @@ constexpr std::chrono::seconds kPictureBound{60};
 Session* makeSession() {
   SessionSettings wanted =
       readSessionSettings([](const char* name) -> const char* { return std::getenv(name); });
-  const bool isWanted = wanted.clock != ClockChoice::Real || !wanted.reportFolder.empty() ||
-                        !wanted.error.empty();
+  const bool isWanted =
+      wanted.clock != ClockChoice::Real || !wanted.reportFolder.empty() || !wanted.error.empty();
   return isWanted ? new Session(std::move(wanted)) : nullptr;
 }
 

@@ -47,10 +47,9 @@ void Session::endIfFailed() {
 void Session::endWithFailure(const TraceFailure& failure) {
   isOver = true;
   const TraceLine& line = failure.line;
-  const std::string message =
-      line.number == 0 ? settings.trace + ": " + failure.why
-                       : line.file + ':' + std::to_string(line.number) + ": " + line.text + ": " +
-                             failure.why;
+  const std::string message = line.number == 0 ? settings.trace + ": " + failure.why
+                                               : line.file + ':' + std::to_string(line.number) +
+                                                     ": " + line.text + ": " + failure.why;
   std::cerr << message << "\nTexts on the screen, at " << now() << " ms:\n"
             << textsOf(runner->frame(), screenSize) << keepFailure();
   if (report) {
@@ -62,12 +61,13 @@ void Session::endWithFailure(const TraceFailure& failure) {
 
 // The picture and the items, for who looks for the reason. What is to be said about them.
 std::string Session::keepFailure() {
-  const std::string stem = report ? (report->directory() / "failed").native()
-                                  : settings.trace + ".failed";
+  const std::string stem =
+      report ? (report->directory() / "failed").native() : settings.trace + ".failed";
   std::ofstream items(stem + ".items.txt");
   for (const std::string& each : textOfFrame(runner->frame())) items << each << '\n';
   items.close();
-  if (const CairoSurface picture = open == nullptr ? nullptr : open->copyPicture(std::chrono::seconds(10))) {
+  if (const CairoSurface picture =
+          open == nullptr ? nullptr : open->copyPicture(std::chrono::seconds(10))) {
     (void)writePng(picture.get(), stem + ".png");
   }
   return "Kept as " + stem + ".png and " + stem + ".items.txt\n";

@@ -36,7 +36,9 @@ void addPlace(ordered_json& line, const TraceLine* place) {
   line["line"] = place->number;
 }
 
-ordered_json orNull(const std::string& text) { return text.empty() ? ordered_json() : ordered_json(text); }
+ordered_json orNull(const std::string& text) {
+  return text.empty() ? ordered_json() : ordered_json(text);
+}
 
 std::vector<std::string> argumentsOfProcess() {
   std::ifstream in("/proc/self/cmdline", std::ios::binary);

@@ -23,14 +23,15 @@ struct SessionFrame {
   const std::vector<std::string>& items;
 };
 
-/// Writes into a folder that it makes, each line when it happens. Not guarded: Session is. Times are
-/// milliseconds since the start.
+/// Writes into a folder that it makes, each line when it happens. Not guarded: Session is. Times
+/// are milliseconds since the start.
 class SessionReport {
  public:
   /// `error` says in one line why the folder cannot be used.
   SessionReport(std::filesystem::path where, std::string& error);
 
-  void start(const SessionSettings& settings, Size screen, const char* display, uint32_t clockStart);
+  void start(const SessionSettings& settings, Size screen, const char* display,
+             uint32_t clockStart);
   void step(uint64_t time, const TraceLine& line);
   void event(uint64_t time, const Event& record, const TraceLine* line);
   void close(uint64_t time, const TraceLine* line);

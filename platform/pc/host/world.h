@@ -11,8 +11,8 @@
 
 namespace brimol::pc {
 
-/// Time of day, random numbers and figures of a played or recorded session. Not guarded: Session is.
-/// Times are milliseconds of the session.
+/// Time of day, random numbers and figures of a played or recorded session. Not guarded: Session
+/// is. Times are milliseconds of the session.
 class World {
  public:
   /// Applies a line of a trace.

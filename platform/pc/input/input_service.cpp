@@ -27,9 +27,7 @@ void InputService::close() {
   letGo();
 }
 
-void InputService::post(const Event& record) {
-  diversion ? diversion(record) : deliver(record);
-}
+void InputService::post(const Event& record) { diversion ? diversion(record) : deliver(record); }
 
 void InputService::deliver(const Event& record) {
   {

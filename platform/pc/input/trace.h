@@ -16,8 +16,8 @@ namespace brimol::pc {
 
 struct TraceLine {
   std::string file;
-  int number = 0;   // from 1
-  std::string text; // as it is written, without blanks at its ends
+  int number = 0;    // from 1
+  std::string text;  // as it is written, without blanks at its ends
 };
 
 /// Pixels, or hundredths of per cent of the screen's side.
@@ -34,7 +34,7 @@ struct Place {
   std::optional<TextPattern> text;
 };
 
-struct Area {
+struct SearchArea {
   Coordinate x;
   Coordinate y;
   Coordinate w;
@@ -64,7 +64,7 @@ struct Look {
   enum class Subject { Text, NoText, Pixel, Log, NoLog };
   Subject subject = Subject::Text;
   TextPattern pattern;
-  std::optional<Area> area;
+  std::optional<SearchArea> area;
   Coordinate x;
   Coordinate y;
   uint32_t colour = 0;  // 0x00RRGGBB

@@ -24,7 +24,7 @@ std::string listOf(const std::vector<ShownText>& texts) {
   std::string list;
   for (const ShownText& each : texts) {
     const auto [x, y] = middleOf(each.area);
-    list += "\n  " + quoted(each.text) + " at " + std::to_string(x) + ' ' + std::to_string(y);
+    list += "\n  " + inQuotes(each.text) + " at " + std::to_string(x) + ' ' + std::to_string(y);
   }
   return list.empty() ? " nothing" : list;
 }
@@ -65,7 +65,8 @@ TraceRunner::Outcome TraceRunner::lookAgainUntil(uint64_t deadline, uint64_t now
 }
 
 std::optional<ScreenPoint> TraceRunner::find(const Place& place, std::string& why) const {
-  if (!place.text) return ScreenPoint{place.x.pixels(stage.screen.w), place.y.pixels(stage.screen.h)};
+  if (!place.text)
+    return ScreenPoint{place.x.pixels(stage.screen.w), place.y.pixels(stage.screen.h)};
   const std::vector<ShownText> texts = shownTexts(newest, stage.screen);
   const std::vector<ShownText> found = fitting(texts, *place.text);
   if (found.size() == 1) return middleOf(found.front().area);
@@ -153,10 +154,11 @@ TraceRunner::Outcome TraceRunner::attempt(const Typing& typing, uint64_t now) {
     place = find({.x = {}, .y = {}, .text = TextPattern({"shift"})}, ignored);
     if (place) ++shifts;
   }
-  if (!place) return lookAgainUntil(lookUntil.value_or(now + kFindMs), now, quoted(key) + ": " + why);
+  if (!place)
+    return lookAgainUntil(lookUntil.value_or(now + kFindMs), now, inQuotes(key) + ": " + why);
   lookUntil = std::nullopt;
-  planTouch({.kind = Touch::Kind::Tap, .place = {}, .to = {}, .duration = kTapMs, .finger = 0}, *place,
-            *place, now);
+  planTouch({.kind = Touch::Kind::Tap, .place = {}, .to = {}, .duration = kTapMs, .finger = 0},
+            *place, *place, now);
   plan(now + 2 * kTapMs, [](uint64_t) {});
   return Outcome::Later;
 }
@@ -170,9 +172,9 @@ std::string TraceRunner::whyNot(const Look& look) {
     return colour ? "the pixel is " + hexColour(*colour) : "there is no picture, or no such pixel";
   }
   if (look.subject == Subject::Log || look.subject == Subject::NoLog) {
-    const auto found = std::find_if(
-        log.begin() + static_cast<std::ptrdiff_t>(logRead), log.end(),
-        [&](const std::string& line) { return look.pattern.isFoundIn(line); });
+    const auto found =
+        std::find_if(log.begin() + static_cast<std::ptrdiff_t>(logRead), log.end(),
+                     [&](const std::string& line) { return look.pattern.isFoundIn(line); });
     const bool isFound = found != log.end();
     if (look.subject == Subject::NoLog) return isFound ? "logged: " + *found : "";
     if (isFound) logRead = static_cast<std::size_t>(found - log.begin()) + 1;
@@ -180,7 +182,7 @@ std::string TraceRunner::whyNot(const Look& look) {
   }
   std::vector<ShownText> texts = shownTexts(newest, stage.screen);
   if (look.area) {
-    const Area& area = *look.area;
+    const SearchArea& area = *look.area;
     const Pixels limits = {area.x.pixels(stage.screen.w), area.y.pixels(stage.screen.h),
                            area.w.pixels(stage.screen.w), area.h.pixels(stage.screen.h)};
     std::erase_if(texts, [&](const ShownText& each) { return isEmpty(within(each.area, limits)); });

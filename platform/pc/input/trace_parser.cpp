@@ -78,7 +78,8 @@ std::string TraceParser::readLines(const std::string& path, std::string_view tex
     text = isCut ? std::string_view() : text.substr(end + 1);
     ++line.number;
     line.text = trimmed(written);
-    if (isCut && trace.isRecording && line.number > 1) break;  // the crash came while it was written
+    if (isCut && trace.isRecording && line.number > 1)
+      break;  // the crash came while it was written
     try {
       line.number == 1 ? readHeader(line) : readLine(line);
     } catch (const BadLine& bad) {
@@ -92,7 +93,8 @@ std::string TraceParser::readLines(const std::string& path, std::string_view tex
 
 void TraceParser::readHeader(const TraceLine& line) {
   TraceWords words(line.text);
-  if (!words.takes("brimol-trace")) throw BadLine{"not a trace: its first line is 'brimol-trace 1'"};
+  if (!words.takes("brimol-trace"))
+    throw BadLine{"not a trace: its first line is 'brimol-trace 1'"};
   if (words.peek() != "1") throw BadLine{"this version of the format is not known; 1 is"};
   (void)words.word("a version");
   const bool isRecording = words.takes("recording");
@@ -151,7 +153,12 @@ void TraceParser::readFrame(const TraceLine& line, TraceWords& words, uint64_t t
 // What is about the trace, and no step.
 bool TraceParser::readSetting(const TraceLine& line, TraceWords& words) {
   const auto mustComeFirst = [this] {
-    if (!trace.steps.empty()) throw BadLine{"this must stand before the first step"};
+    const auto isOfWorld = [](const TraceStep& step) {
+      return std::holds_alternative<WorldChange>(step.action);
+    };
+    if (!std::ranges::all_of(trace.steps, isOfWorld)) {
+      throw BadLine{"this must stand before the first step"};
+    }
   };
   if (words.takes("screen")) {
     mustComeFirst();

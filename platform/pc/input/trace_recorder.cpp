@@ -70,7 +70,7 @@ void TraceRecorder::input(uint64_t time, const Event& record) {
 void TraceRecorder::close(uint64_t time) { write(std::to_string(time) + " close"); }
 
 void TraceRecorder::figure(uint64_t time, const std::string& name, const std::string& value) {
-  write(std::to_string(time) + " world figure " + quoted(name) + ' ' + quoted(value));
+  write(std::to_string(time) + " world figure " + inQuotes(name) + ' ' + inQuotes(value));
 }
 
 void TraceRecorder::frame(uint64_t time, const std::vector<std::string>& items) {

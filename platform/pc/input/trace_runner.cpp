@@ -9,8 +9,8 @@ namespace brimol::pc {
 
 namespace {
 
-constexpr uint64_t kRestMs = 100;       // after an input step, before one without a time
-constexpr uint64_t kCloseMs = 10'000;   // from the wish to close to the end
+constexpr uint64_t kRestMs = 100;      // after an input step, before one without a time
+constexpr uint64_t kCloseMs = 10'000;  // from the wish to close to the end
 
 // What leaves a finger or a key down is meant to be followed at once.
 struct RestAfter {
@@ -68,7 +68,9 @@ std::optional<uint64_t> TraceRunner::due(uint64_t soonest) const {
   if (!planned.empty()) {
     consider(planned.front().time);
   } else if (isOver()) {
-    if (!trace.leavesRunning || !closedBy) consider(closedBy.value_or(soonest));
+    if (!trace.leavesRunning || !closedBy) {
+      consider(closedBy.value_or(stepDone.value_or(0) + restMs));
+    }
   } else if (lookUntil) {
     consider(hasSeen ? std::min(soonest, *lookUntil) : *lookUntil);
   } else {
@@ -101,8 +103,8 @@ bool TraceRunner::advance(uint64_t now) {
     return false;
   }
   if (!begin(now)) return false;
-  const auto outcome = std::visit([&](const auto& each) { return attempt(each, now); },
-                                  step().action);
+  const auto outcome =
+      std::visit([&](const auto& each) { return attempt(each, now); }, step().action);
   if (outcome == Outcome::Done && !failed) finishStep(now);
   return outcome == Outcome::Done || !planned.empty();
 }
@@ -128,6 +130,8 @@ void TraceRunner::finishStep(uint64_t now) {
 }
 
 void TraceRunner::finishTrace(uint64_t now) {
+  const uint64_t start = stepDone.value_or(0) + restMs;
+  if (!closedBy && start > now) return;
   if (!closedBy) {
     closedBy = now + kCloseMs;
     if (!trace.leavesRunning) stage.close();
@@ -147,7 +151,8 @@ void TraceRunner::plan(uint64_t time, std::function<void(uint64_t now)> action) 
   planned.push_back({time, std::move(action)});
 }
 
-void TraceRunner::seeFrame(uint64_t now, const Frame& shown, const std::vector<std::string>& items) {
+void TraceRunner::seeFrame(uint64_t now, const Frame& shown,
+                           const std::vector<std::string>& items) {
   if (failed) return;
   newest = shown;
   hasSeen = true;

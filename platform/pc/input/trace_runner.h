@@ -18,11 +18,11 @@ namespace brimol::pc {
 struct TraceStage {
   Size screen;
   std::function<void(const Event& record)> post;
-  std::function<void()> close;                                   // the user asks to close
-  std::function<std::optional<uint32_t>(ScreenPoint)> pixel;     // 0x00RRGGBB; none: no picture
-  std::function<std::string(const std::string& file)> shoot;     // what went wrong, or nothing
+  std::function<void()> close;                                // the user asks to close
+  std::function<std::optional<uint32_t>(ScreenPoint)> pixel;  // 0x00RRGGBB; none: no picture
+  std::function<std::string(const std::string& file)> shoot;  // what went wrong, or nothing
   std::function<void(const WorldChange& change)> changeWorld;
-  std::function<void(const TraceLine& line)> begin;              // a step begins
+  std::function<void(const TraceLine& line)> begin;                          // a step begins
   std::function<void(const TraceLine& line, const std::string& why)> judge;  // empty: it passed
 };
 
@@ -99,16 +99,16 @@ class TraceRunner {
   TraceStage stage;
   ScriptFingers fingers;
 
-  std::size_t next = 0;                // the step that runs, or is to begin
-  std::optional<uint64_t> begun;       // when it did
-  std::optional<uint64_t> lookUntil;   // it looks for something
-  bool hasActed = false;               // all that it does is planned
-  std::size_t typed = 0;               // bytes of a text to type
-  int shifts = 0;                      // taps on the shift key for the same character
+  std::size_t next = 0;               // the step that runs, or is to begin
+  std::optional<uint64_t> begun;      // when it did
+  std::optional<uint64_t> lookUntil;  // it looks for something
+  bool hasActed = false;              // all that it does is planned
+  std::size_t typed = 0;              // bytes of a text to type
+  int shifts = 0;                     // taps on the shift key for the same character
   std::deque<Planned> planned;
-  std::optional<uint64_t> stepDone;    // when the step before was; none before the first frame
-  uint64_t restMs = 0;                 // what passes before a step without a time
-  std::optional<uint64_t> closedBy;    // when the application is to have ended
+  std::optional<uint64_t> stepDone;  // when the step before was; none before the first frame
+  uint64_t restMs = 0;               // what passes before a step without a time
+  std::optional<uint64_t> closedBy;  // when the application is to have ended
 
   Frame newest;
   std::size_t frames = 0;  // seen so far

@@ -85,7 +85,8 @@ TraceStep::Action readKey(TraceWords& words) {
   // "up" and "down" are keys, too, unless a key follows.
   TraceWords ahead = words;
   const std::string first = ahead.word("a key");
-  const bool isHalf = (first == "down" || first == "up") && !ahead.isAtEnd() && ahead.peek() != "for";
+  const bool isHalf =
+      (first == "down" || first == "up") && !ahead.isAtEnd() && ahead.peek() != "for";
   if (isHalf) {
     stroke.kind = first == "down" ? KeyStroke::Kind::Down : KeyStroke::Kind::Up;
     (void)words.word("a key");
@@ -124,7 +125,7 @@ Look readSubject(TraceWords& words) {
   look.subject = isNo ? Subject::NoText : Subject::Text;
   look.pattern = words.pattern();
   if (words.takes("in")) {
-    Area area;
+    SearchArea area;
     for (Coordinate* each : {&area.x, &area.y, &area.w, &area.h}) *each = words.coordinate();
     look.area = area;
   }
@@ -142,7 +143,8 @@ TraceStep::Action readExpect(TraceWords& words) { return readLook(words, kExpect
 TraceStep::Action readWait(TraceWords& words) {
   if (words.takes("until")) return readLook(words, kWaitUntilMs);
   constexpr uint64_t kMostMs = 86'400'000;  // a day
-  return Pause{static_cast<uint32_t>(words.number("'until', or a number of milliseconds", kMostMs))};
+  return Pause{
+      static_cast<uint32_t>(words.number("'until', or a number of milliseconds", kMostMs))};
 }
 
 TraceStep::Action readShot(TraceWords& words) {
@@ -185,7 +187,8 @@ TraceStep::Action readFingerRecord(TraceWords& words) {
 
 template <BrimolEventType kType>
 TraceStep::Action readKeyRecord(TraceWords& words) {
-  return RawRecord{keyRecord(kType, static_cast<uint32_t>(words.number("a key's code", kMostWord)))};
+  return RawRecord{
+      keyRecord(kType, static_cast<uint32_t>(words.number("a key's code", kMostWord)))};
 }
 
 struct StepRow {
@@ -227,18 +230,21 @@ TraceStep::Action readStep(TraceWords& words) {
 
 uint64_t readUtc(const std::string& text) {
   constexpr uint64_t kSecond = 1000;
-  const char* const wanted = "' is not a time as 2026-11-22T10:00:00.000Z";
+  constexpr std::size_t kFractionBytes = 5;  // ".000Z"
+  const BadLine wrong = {"'" + text + "' is not a time as 2026-11-22T10:00:00.000Z"};
   std::tm parts = {};
-  const char* rest = ::strptime(text.c_str(), "%Y-%m-%dT%H:%M:%S", &parts);
-  if (rest == nullptr) throw BadLine{"'" + text + wanted};
-  const std::time_t seconds = ::timegm(&parts);
-  if (seconds < 0) throw BadLine{"'" + text + wanted};
-  uint64_t ms = static_cast<uint64_t>(seconds) * kSecond;
-  if (*rest == '.') ms += TraceWords(std::string(rest + 1, text.c_str() + text.size() - 1)).number("a part of a second", kSecond - 1);
-  const std::string written = utcText(ms);
-  if (text != written && text != written.substr(0, written.size() - 5) + "Z") {
-    throw BadLine{"'" + text + wanted};
-  }
+  const char* const rest = ::strptime(text.c_str(), "%Y-%m-%dT%H:%M:%S", &parts);
+  const std::time_t seconds = rest == nullptr ? -1 : ::timegm(&parts);
+  if (seconds < 0) throw wrong;
+  const uint64_t whole = static_cast<uint64_t>(seconds) * kSecond;
+  std::string written = utcText(whole);
+  if (text == written.erase(written.size() - kFractionBytes) + "Z") return whole;
+  std::string fraction = rest;
+  if (fraction.size() != kFractionBytes || !fraction.ends_with('Z')) throw wrong;
+  fraction.pop_back();
+  const uint64_t ms =
+      whole + TraceWords(fraction.substr(1)).number("a part of a second", kSecond - 1);
+  if (text != utcText(ms)) throw wrong;
   return ms;
 }
 

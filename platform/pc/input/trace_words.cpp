@@ -51,8 +51,8 @@ TraceWords::TraceWords(std::string_view line) {
     line.remove_prefix(static_cast<std::size_t>(first - line.begin()));
     if (line.empty() || isComment(line)) return;
     const auto* const blank = std::ranges::find_if(line, isBlank);
-    const std::size_t length = line.front() == '"' ? endOfText(line)
-                                                   : static_cast<std::size_t>(blank - line.begin());
+    const std::size_t length =
+        line.front() == '"' ? endOfText(line) : static_cast<std::size_t>(blank - line.begin());
     words.emplace_back(line.substr(0, length));
     line.remove_prefix(length);
     if (!line.empty() && !isBlank(line.front())) throw BadLine{"a text that another word touches"};

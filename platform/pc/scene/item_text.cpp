@@ -35,8 +35,8 @@ std::string figureText(const SKIA_Item& item) {
   const SKIA_Text& text = item.text;
   switch (figureOf(item)) {
     case Figure::Text:
-      return ' ' + quoted(shownText(text)) + numbers(text.size, text.align) + colour(text.color);
-    case Figure::Picture: return ' ' + quoted(shownText(text));
+      return ' ' + inQuotes(shownText(text)) + numbers(text.size, text.align) + colour(text.color);
+    case Figure::Picture: return ' ' + inQuotes(shownText(text));
     case Figure::Line:
       return numbers(line.x1, line.y1, line.x2, line.y2, line.width) + colour(line.color);
     case Figure::Arrow: return (line.width == 0 ? " right" : " left") + colour(line.color);

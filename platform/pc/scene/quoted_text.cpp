@@ -47,7 +47,7 @@ std::optional<char> escapeOf(std::string_view& rest) {
 
 }  // namespace
 
-std::string quoted(std::string_view text) {
+std::string inQuotes(std::string_view text) {
   std::string out = "\"";
   for (const char each : text) {
     const auto* const row = std::ranges::find(kEscapes, each, &Escape::plain);

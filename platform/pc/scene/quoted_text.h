@@ -8,7 +8,7 @@
 namespace brimol::pc {
 
 /// `text` in quotes, with \", \\, \n, \t and, for other control characters, \xHH.
-std::string quoted(std::string_view text);
+std::string inQuotes(std::string_view text);
 
 /// What stands between the quotes, with its escapes undone; \* becomes a star. Nothing for a wrong
 /// escape.
