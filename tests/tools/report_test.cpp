@@ -22,6 +22,7 @@ Happening happeningOf(Happening::Kind kind, const char* text) {
   Happening happening;
   happening.kind = kind;
   happening.text = text;
+  if (kind == Happening::Kind::Error) happening.weight = Happening::Weight::Failure;
   return happening;
 }
 

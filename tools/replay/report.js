@@ -146,7 +146,7 @@ function listOf(entries) {
 
 const hidden = new Set(["debug"]);
 const wanted = (entries) => entries.filter((entry) => entry.weight === "failure" || !hidden.has(entry.kind));
-const hasFailed = (entries) => entries.some((entry) => entry.kind === "error" || entry.passed === false);
+const hasFailed = (entries) => entries.some((entry) => (entry.kind === "error" || entry.kind === "check") && entry.weight === "failure");
 const touchesOf = (entries) => entries.filter((entry) => entry.touch).map((entry) => entry.touch);
 
 function card(frame, entries, passed) {

@@ -84,7 +84,8 @@ json entryOf(const Happening& happening, const std::filesystem::path& traces) {
 bool isMotion(const Happening& one) { return one.kind == Kind::Event && one.input == "motion"; }
 
 bool isFailure(const Happening& one) {
-  return one.kind == Kind::Error || (one.kind == Kind::Expectation && !one.passed);
+  const bool isKind = one.kind == Kind::Error || one.kind == Kind::Expectation;
+  return isKind && one.weight == Weight::Failure;
 }
 
 /// The entries of each frame; those at 0 came before the first one.

@@ -168,6 +168,13 @@ bool addHappening(const json& line, const std::string& kind, Session& session) {
   return true;
 }
 
+// What a session went on after did not make it fail.
+void forgiveErrors(Session& session) {
+  for (Happening& happening : session.happenings) {
+    if (happening.kind == Kind::Error) happening.weight = Weight::Warning;
+  }
+}
+
 bool addObject(const json& line, const std::string& kind, Session& session) {
   session.lastTime = std::max(session.lastTime, timeIn(line, "time"));
   if (kind == "start") {
@@ -176,6 +183,7 @@ bool addObject(const json& line, const std::string& kind, Session& session) {
     session.frames.push_back(frameOf(line));
   } else if (kind == "end") {
     session.end = {timeIn(line, "time"), numberIn(line, "exit"), textIn(line, "reason")};
+    if (session.end->reason == "closed") forgiveErrors(session);
   } else {
     return addHappening(line, kind, session);
   }
