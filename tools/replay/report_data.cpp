@@ -170,7 +170,9 @@ json factsOf(const ReportInput& input) {
   const Session& session = input.run.session;
   const auto isEvent = [](const Happening& one) { return one.kind == Kind::Event; };
   json facts = json::array();
-  const auto add = [&](const char* name, std::string value) { facts.push_back({name, value}); };
+  const auto add = [&](const char* name, const std::string& value) {
+    facts.push_back({name, value});
+  };
   add("Expectations", checksText(session));
   add("Frames", std::to_string(session.frames.size()));
   add("Input events", std::to_string(countOf(session, isEvent)));

@@ -226,7 +226,7 @@ Session readSession(const std::string& path) {
   std::ifstream file(path, std::ios::binary);
   SessionReader reader;
   std::array<char, 1 << 16> bytes{};
-  while (file.read(bytes.data(), bytes.size()) || file.gcount() > 0) {
+  while (file.read(bytes.data(), std::ssize(bytes)) || file.gcount() > 0) {
     reader.add({bytes.data(), static_cast<std::size_t>(file.gcount())});
   }
   reader.finish();
