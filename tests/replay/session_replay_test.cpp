@@ -105,7 +105,7 @@ void useTheMenu() {
   std::string drag = at(300, 900) + "mousedown 1 ";
   for (int y = 890; y > 600; y -= 20) drag += at(300, y);
   act(drag + "mouseup 1 sleep 0.5");
-  act("key Down Down Down Return sleep 0.3 key Up Left Escape Escape Escape sleep 0.3");
+  act("key Down Return sleep 0.3 key Up Left Escape Escape sleep 0.3");
   act("key Escape sleep 0.5 key Return");
 }
 
