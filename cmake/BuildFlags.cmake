@@ -1,6 +1,7 @@
 # mw_flags: what every target of the project is built with.
 
 add_library(mw_flags INTERFACE)
+target_compile_features(mw_flags INTERFACE cxx_std_20 c_std_11)
 target_compile_options(
   mw_flags INTERFACE -Wall -Wextra -Wpedantic -Wconversion -Wshadow
                      $<$<BOOL:${BRIMOL_WERROR}>:-Werror>)

@@ -5,20 +5,14 @@
 namespace factory_test {
 
 ButtonRow::ButtonRow(const SKIA_Rect& area, std::span<const Face> faces) {
-  constexpr int kFramed = 2;  // MW::ButtonNew's style
   for (std::size_t i = 0; i < faces.size(); ++i) {
     const SKIA_Rect cell = cellOf(area, static_cast<int>(i), static_cast<int>(faces.size()));
     const SKIA_Text caption = captionOf(faces[i].caption);
-    buttons.push_back(std::make_unique<MW::ButtonNew>(kFramed, &cell, &caption));
+    buttons.push_back(std::make_unique<MW::ButtonNew>(MW::ButtonNew::kFramed, &cell, &caption));
     buttons.back()->clickCallback = faces[i].clicked;
     buttons.back()->setBdColor(MW::kColorBlack);
     buttons.back()->setActive(1);
   }
-}
-
-// The newest first: their numbers are the size of their layer.
-ButtonRow::~ButtonRow() {
-  while (!buttons.empty()) buttons.pop_back();
 }
 
 void ButtonRow::setActive(bool isActive) {

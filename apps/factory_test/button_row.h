@@ -19,9 +19,6 @@ class ButtonRow {
 
   /// Divides `area` among the faces and takes its colour.
   ButtonRow(const SKIA_Rect& area, std::span<const Face> faces);
-  ~ButtonRow();
-  ButtonRow(const ButtonRow&) = delete;
-  ButtonRow& operator=(const ButtonRow&) = delete;
 
   /// Any thread.
   void setActive(bool isActive);

@@ -11,17 +11,16 @@ namespace factory_test {
 /// Runs from construction; destruction ends the command and all that it started. One thread.
 class Command {
  public:
-  /// `line` is for /bin/sh. The command reads nothing, and writes all to one place.
+  /// `line` is for /bin/sh. Its input is empty; read() gives its output and its errors.
   explicit Command(const std::string& line);
   ~Command();
   Command(const Command&) = delete;
   Command& operator=(const Command&) = delete;
 
-  /// What it has written since the last call, at most a few thousand bytes, and less than that only
-  /// when there is no more yet. Never waits.
+  /// What it has written since the last call, at most a few thousand bytes at once. Never waits.
   std::string read();
-  /// How it ended, once it has and all that it wrote is read: "exit code 0", "signal 9", or why it
-  /// could not be started.
+  /// "exit code 0", "signal 9", or why it could not be started; none before it has ended and all
+  /// that it wrote is read.
   std::optional<std::string> outcome();
 
  private:

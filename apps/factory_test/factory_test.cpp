@@ -8,6 +8,7 @@
 #include "complain.h"
 #include "layout.h"
 #include "results/junit.h"
+#include "world.h"
 
 namespace factory_test {
 
@@ -52,9 +53,7 @@ void FactoryTest::updatePrompt() {
 
 void FactoryTest::start(std::size_t entry, uint32_t now) {
   surroundings.log.add(std::string("Test ") + testEntries().at(entry).id);
-  const auto clock = std::chrono::system_clock::now();
-  running = Running{entry, testEntries().at(entry).make(surroundings),
-                    std::chrono::floor<std::chrono::seconds>(clock), now};
+  running = Running{entry, testEntries().at(entry).make(surroundings), presentTime(), now};
   running->test->enter();
   MW::isDisplayUpdate(1);
 }
@@ -69,7 +68,7 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
   }
   if (outcome == Outcome::Pass) keep(*running, Verdict::Pass, now);
   if (outcome == Outcome::Fail) keep(*running, Verdict::Fail, now);
-  // Who only looks at a test does not take back its verdict.
+  // Looking at a test without a verdict keeps the one that it had.
   if (outcome == Outcome::Left && book.find(testEntries().at(entry).id) == nullptr) {
     keep(*running, Verdict::None, now);
   }

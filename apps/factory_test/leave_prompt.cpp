@@ -6,11 +6,7 @@
 
 namespace factory_test {
 
-namespace {
-constexpr int kLeaveKind = 3;  // MW::Dialog's
-}
-
-LeavePrompt::LeavePrompt() : dialog(kLeaveKind) {
+LeavePrompt::LeavePrompt() : dialog(MW::Dialog::kLeaveTest) {
   using Prompt = Current<LeavePrompt>;
   dialog.setTitle("Leave");
   dialog.setDesc("End the factory test?");

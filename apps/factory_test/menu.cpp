@@ -8,9 +8,9 @@
 #include <string>
 
 #include "layout.h"
-#include "results/machine_figures.h"
 #include "test.h"
 #include "verdict_bar.h"
+#include "world.h"
 
 namespace factory_test {
 
@@ -104,7 +104,7 @@ void Menu::update(uint32_t now) {
 }
 
 void Menu::refreshFigures() {
-  const MachineFigures figures = readMachineFigures();
+  const MachineFigures figures = presentFigures();
   const auto put = [this](MW::MainList::StatusText place, const std::string& words) {
     // Of an unknown figure the NUL is given, which empties its place.
     list.setTextOption(place, words.c_str(), std::max(static_cast<int>(words.size()), 1));

@@ -6,13 +6,12 @@
 namespace factory_test {
 
 /// While a widget of the top layer is active, nothing below gets events: what is to be touched then
-/// must stand in the top layer, too. Make and delete it as the newest widget, so that its number in
-/// its layer is its own.
+/// must stand in the top layer, too.
 template <typename Kind>
 class OnTop : public Kind {
  public:
   OnTop() {
-    MW::Window::unregisterWidget(this);
+    this->leaveWindow();
     this->setType(MW::kTopLayer);
     MW::Window::registerWidget(this);
   }

@@ -11,7 +11,7 @@ namespace factory_test {
 namespace {
 
 struct VerdictButton {
-  int position;  // Button3's
+  MW::Button3::Position position;
   const char* caption;
   Outcome outcome;
   void (*clicked)(int);
@@ -21,9 +21,12 @@ using Bar = Current<VerdictBar>;
 
 // From left to right, as keys move over them.
 constexpr auto kVerdicts = std::to_array<VerdictButton>({
-    {1, "PASS", Outcome::Pass, [](int) { Bar::get().choose(Outcome::Pass); }},
-    {5, "RETRY", Outcome::Retry, [](int) { Bar::get().choose(Outcome::Retry); }},
-    {2, "FAIL", Outcome::Fail, [](int) { Bar::get().choose(Outcome::Fail); }},
+    {MW::Button3::kBottomLeft, "PASS", Outcome::Pass,
+     [](int) { Bar::get().choose(Outcome::Pass); }},
+    {MW::Button3::kBottomCentre, "RETRY", Outcome::Retry,
+     [](int) { Bar::get().choose(Outcome::Retry); }},
+    {MW::Button3::kBottomRight, "FAIL", Outcome::Fail,
+     [](int) { Bar::get().choose(Outcome::Fail); }},
 });
 
 constexpr int kMarkWidth = 10;  // pixels around the button

@@ -22,7 +22,8 @@ class VerdictBar {
 
   explicit VerdictBar(Keys keys = Keys::Choose);
 
-  /// Called with the code of every other key that is pressed, on the dispatch thread. Null: nobody.
+  /// Called on the dispatch thread with the code of every other key that is pressed. Null: not
+  /// called.
   void (*otherKey)(unsigned int code) = nullptr;
 
   /// Draws the mark of the chosen button, which stands under the buttons.

@@ -19,7 +19,7 @@ int main() {
   MW::Window::init();
   {
     const SKIA_Rect area = {120, 600, 1200, 300, 0xFFB8C4D6};
-    const SKIA_Text caption = {"Press to end", 12, MW::kColorBlack, 5, 72};
+    const SKIA_Text caption = {"Press to end", 12, MW::kColorBlack, SKIA_ALIGN_CENTRE, 72};
     MW::Button button(&area, &caption);
     button.clickCallback = [](int) { done = true; };
     button.setActive(1);

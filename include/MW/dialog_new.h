@@ -19,8 +19,8 @@ class MW_API DialogNew : public PromptDialog {
  public:
   static constexpr int kLines = 3;
 
-  /// `align`: 1 left, 2 right, 5 centred. `color`: 0xAARRGGBB. `size`: pixels; 0 is 70. With a null
-  /// title there is none, and the other arguments are not used.
+  /// `align`: SKIA_ALIGN_LEFT, SKIA_ALIGN_RIGHT or SKIA_ALIGN_CENTRE. `color`: 0xAARRGGBB. `size`:
+  /// pixels; 0 is 70. With a null title there is none, and the other arguments are not used.
   DialogNew(const char* title, int align, int color, int size);
   DialogNew(const char* title, int align, int color);
   ~DialogNew() override;

@@ -54,7 +54,7 @@ class MW_API DialogSelect : public Widget {
   void setTitle(const char* newTitle);
   /// The caption of choice `index`, 0 to 5 row by row; any other: nothing.
   void setText_str(unsigned int index, const char* caption);
-  /// Choice `index` as above; any other index: nothing.
+  /// Highlight choice `index`, 0 to 5, and let it answer; any other index: nothing.
   void onBtnPressed(mouse_event mouse, int index);
   void onBtnReleased(mouse_event mouse, int index);
   /// The hook key goes to onHookKeyPressed() in variant kHookVariant, and else nowhere.
@@ -69,7 +69,7 @@ class MW_API DialogSelect : public Widget {
   void (*choiceCallback)(mouse_event*) = nullptr;
   void (*keyPressCallback)(kbd_event*) = nullptr;
   void (*keyReleaseCallback)(kbd_event*) = nullptr;
-  /// Any touch, any place.
+  /// Every touch, at any place.
   void (*touchPressCallback)(mouse_event*) = nullptr;
   void (*touchReleaseCallback)(mouse_event*) = nullptr;
 

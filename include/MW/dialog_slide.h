@@ -44,7 +44,7 @@ class MW_API DialogSlide : public Widget {
   using Widget::onReleaseKey;
   using Widget::setDesc;
   using Widget::setRect;
-  /// The number of the layout class: 0, for any kind.
+  /// The number of a kind's layout, as Dialog::isType() gives it: 0 for any kind.
   static int isType(int dialogKind);
   /// Lays it out on the present screen, the same for any kind; the thumb stays until setRect().
   void setRect_init(int dialogKind);
@@ -72,7 +72,7 @@ class MW_API DialogSlide : public Widget {
   void (*rightCallback)(int) = nullptr;
   void (*keyPressCallback)(kbd_event*) = nullptr;
   void (*keyReleaseCallback)(kbd_event*) = nullptr;
-  void (*touchPressCallback)(mouse_event*) = nullptr;  ///< any touch, any place
+  void (*touchPressCallback)(mouse_event*) = nullptr;  ///< every touch, at any place
   void (*touchReleaseCallback)(mouse_event*) = nullptr;
   void (*hoverCallback)(mouse_event*) = nullptr;
 
@@ -81,7 +81,7 @@ class MW_API DialogSlide : public Widget {
   enum SlideState { kBetween = 0, kAtLeft = 1, kAtRight = 2 };
 
   int kind;
-  // Guarded by stateLock, as far as it is not said otherwise.
+  // Guarded by stateLock, except for the flag.
   DialogFrame frame;
   SKIA_Rect messageRect = {};
   SKIA_Text message = {};

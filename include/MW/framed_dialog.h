@@ -16,8 +16,9 @@ namespace MW {
 /// dialog. A null event is not taken.
 ///
 /// A button turns kColorHighlight when a finger presses it and goes back when a finger moves
-/// outside it or lifts. It answers a finger that lifts on it, wherever that finger came from. The
-/// dialog takes all motion from a button's press on until it is hidden.
+/// outside it or lifts. It answers a finger that lifts on it, wherever that finger came from. Of the
+/// touches the dialog takes the press of a button, all motion from there until it is hidden, and
+/// every release.
 ///
 /// Callbacks, null where they are not wanted:
 /// - of one int, called with 0: `button1Callback` (the left button; the dialog stays up until the

@@ -8,23 +8,24 @@
 
 namespace MW {
 
-class MW_API Ime;  // else its TextPanel would not be exported
 struct ImeKey;
-extern template class TextPanel<Ime>;
 
 /// A bar with what was typed and five rows of keys below it, in one of four layouts. See TextPanel
 /// for its life and its callbacks, which are functions of an int and the keyboard.
 ///
 /// A press types at once and calls nothing; so `press_cb` is called by onPress() alone, which no
-/// event reaches. A press on the border of a key hits no key. `release_cb` follows every key, and
-/// is the place to read what enter left in getResultString(): it runs on the thread that types.
+/// event reaches. A press on the border of a key hits no key. `release_cb` is called when a finger
+/// lifts inside the keyboard, on a key or not, and is the place to read what enter left in
+/// getResultString(): it runs on the thread that types. It is not called for a finger that lifts
+/// outside, nor once onShowTimer() was called.
 ///
 /// The "fold" key clears the typed text and sets the fold status, which the application asks for;
 /// the keyboard itself stays. In the layout of digits alone, "fold" first sets the property
 /// "brimol.info_1.ime_flag" to "true".
-class MW_API Ime : public TextPanel<Ime> {
+class MW_API Ime : public TextPanel {
  public:
-  /// What `key_type` says. "shift" leads from each of the first three to the next.
+  /// The layouts, for presskey_set() and keyboard_change(). "shift" leads from each of the first
+  /// three to the next.
   enum KeyType { kSmall = 0, kCapitals = 1, kSpecial = 2, kOnlyDigits = 3 };
 
   /// Copies the records; null ones are all zero. The keys stand where `area` says now, a tenth of
@@ -33,11 +34,15 @@ class MW_API Ime : public TextPanel<Ime> {
   Ime(const SKIA_Rect* area, const SKIA_Text* looks);
   ~Ime() override;
 
-  using TextPanel::onHover;
   using TextPanel::show;
+  using Widget::onHover;
   /// The background, and then 42 button boxes. Returns 1.
   int show(unsigned int ticks) override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
+  void onPress(event_data* event) override;
+  void onRelease(event_data* event) override;
+  void onPressLong(event_data* event) override;
+  void onTouchClickCount() override;
   /// Moves and resizes the background; the keys, the colour and the first argument stay. Null: no
   /// change.
   void setRect(int variant, const SKIA_Rect* newRect) override;
@@ -51,10 +56,11 @@ class MW_API Ime : public TextPanel<Ime> {
   /// Clears the typed text, the result and the bar's bytes, but not the bar's length.
   void typing_reset();
 
-  /// The layout that presses are read by. It relabels nothing; another number than 0 to 3: nothing.
+  /// The layout, a KeyType, that presses are read by. It relabels nothing. Another number: nothing.
   void presskey_set(unsigned int type);
-  /// Relabels the keys, 0 to 2, or greys all but the digits and "back", "fold" and "enter", 3. Only
-  /// 0 takes the grey away. Another number: nothing. Presses are read as before.
+  /// Relabels the keys, or with kOnlyDigits greys all but the digits and "back", "fold" and
+  /// "enter". Only kSmall takes the grey away. Another number: nothing. Presses are read as before:
+  /// a keyboard of digits alone needs presskey_set(kOnlyDigits), too.
   void keyboard_change(unsigned int type);
   bool get_fold_status();
   void set_fold_status(bool folded);
@@ -68,6 +74,11 @@ class MW_API Ime : public TextPanel<Ime> {
   void onPressKey_only_num(event_data* event);
   /// Writes a log line.
   void onHover(mouse_event mouse);
+
+  void (*press_cb)(int zero, Ime* keyboard) = nullptr;
+  void (*release_cb)(int zero, Ime* keyboard) = nullptr;
+  void (*long_press_cb)(int zero, Ime* keyboard) = nullptr;
+  void (*double_tap_cb)(int zero, Ime* keyboard) = nullptr;
 
  protected:
   static constexpr std::size_t kKeys = 42;  // with the bar
@@ -83,6 +94,7 @@ class MW_API Ime : public TextPanel<Ime> {
   bool fold_status = false;
 
  private:
+  void tell(TextTouch what);
   SKIA_Rect& rectOf(std::size_t key);
   void layOutKeys();
   void pressKey(int layout, const event_data* event);

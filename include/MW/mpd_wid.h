@@ -168,7 +168,7 @@ class MW_API MpdWid : public RowList {
     SKIA_Text value = {};
   };
 
-  // Guarded by stateLock, as far as it is not said otherwise.
+  // Guarded by stateLock, unless a field says otherwise.
   std::array<SKIA_Rect, kCells> cell = {};  // of the row being drawn
   SKIA_Rect header_box = {};
   std::array<Item, kItems> item = {};

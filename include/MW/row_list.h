@@ -36,7 +36,7 @@ class MW_API RowList : public Widget {
   void logKeyRelease(const kbd_event& key) const;
   void logHit(int64_t top, const mouse_event& mouse, int64_t bottom) const;
 
-  // Guarded by stateLock, as far as it is not said otherwise.
+  // Guarded by stateLock, unless a field says otherwise.
   SKIA_Text title;  // does not change
   SKIA_Rect listRect = {};
   SKIA_Rect bottomEdge = {};

@@ -9,21 +9,28 @@
 
 namespace MW {
 
-extern template class TextPanel<>;
-
-/// A long text in lines of a fixed number of characters that a finger scrolls, with line numbers in
+/// A long text in rows of a fixed number of characters that a finger scrolls, with line numbers in
 /// blue, a scroll bar, and the lines that a search found in red. It shows "no log" while it has no
 /// text. See TextPanel for its life and its callbacks, which are functions of one int.
 ///
-/// Characters are bytes of UTF-8: a row holds `w_count` of them, and at least 1 and at most 127;
-/// one of several bytes that a row cannot take whole begins the next row. A font size under 1 or an
-/// area of fewer than three rows shows no row.
+/// Characters are bytes of UTF-8. A row holds w / size * 100 / 63 of them, in integers and rounded
+/// down to an even number, and 8 more without line numbers; 1 at least and 127 at most. A viewer
+/// with line numbers has the 8 more, too, until setRect() and the setText() behind it: its rows may
+/// stand out at the right. Where the property "brimol.info.type" is "cpu" at construction, rows
+/// hold 88 until setRect(). A character of several bytes that a row cannot take whole begins the
+/// next row. h / size - 2 rows are in view; a font size under 1 shows none.
 ///
 /// The application may set texts and search on one thread while another one draws. A text, or a
 /// text to be searched, counts up to 2 GiB; null is the empty text. Where there is no memory for
 /// one, "no log" stays, and a search finds nothing.
-class MW_API StaticText : public TextPanel<> {
+class MW_API StaticText : public TextPanel {
  public:
+  /// Where line_search_point() goes.
+  enum SearchDirection {
+    kPrevious = 0,  ///< to the last found line above the top row
+    kNext = 1       ///< to the first one below it
+  };
+
   /// Copies the records; null ones are all zero. `looks`' text, of at most 127 bytes, is the first
   /// text. `numbers`: with line numbers. `scroll`: with a scroll bar; without it all events are
   /// taken and nothing happens. `mark`: with found lines in red.
@@ -32,37 +39,49 @@ class MW_API StaticText : public TextPanel<> {
   StaticText(const SKIA_Rect* area, const SKIA_Text* looks);
   ~StaticText() override;
 
-  using TextPanel::onHover;
   using TextPanel::show;
+  using Widget::onHover;
   /// Draws what is in view. Returns 1.
   int show(unsigned int ticks) override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
+  void onPress(event_data* event) override;
+  void onRelease(event_data* event) override;
   /// A long press in the column of the scroll bar scrolls there.
   void onPressLong(event_data* event) override;
-  /// Replaces the text; the place to which it is scrolled stays. Until the new text is ready, and
-  /// with an empty one for good, "no log" is shown.
+  void onTouchClickCount() override;
+  /// Replaces the text. Until the new one is ready, and with an empty one for good, "no log" is
+  /// shown. The row that it is scrolled to stays, so a shorter text may lie above the view, which
+  /// is blank until a finger or a search scrolls back. Marks stay with the numbers of the lines
+  /// that the last search found, whatever these say now.
   void setText(const char* newText) override;
   /// Moves and resizes it; the colour and the first argument are not read. The text is cut anew by
   /// the next setText only. Null: no change.
   void setRect(int variant, const SKIA_Rect* newRect) override;
 
   /// What the constructors do first: an empty viewer without callbacks, registered. Not while it
-  /// handles events.
+  /// handles events. A viewer that is registered already is drawn and called twice from here on:
+  /// unregister it first.
   void init(const SKIA_Rect* area, const SKIA_Text* looks);
-  /// Every fourth motion scrolls by a row.
+  /// Every fourth motion scrolls by a row, the way that this one goes.
   void onHover(mouse_event mouse);
 
   /// Keeps what is to be searched, cut to 99 bytes at a whole character. Null is the empty text.
   void get_ime_result(const char* wanted);
   /// Searches a text, the one that was given to setText, and scrolls to the first line found. A
-  /// wanted text of fewer than two bytes is found nowhere: meant so.
+  /// wanted text of a single byte is found nowhere. Without line numbers, marked rows stay red down
+  /// to the text's end, and from the next frame on all rows are red.
   void line_search(const char* source);
-  /// Scrolls to the last found line above the top row (0), or to the first one below it (1). At the
-  /// end of the text the line stands where it can. Any other direction: nothing.
+  /// Scrolls to a found line; see SearchDirection. At the end of the text the line stands where it
+  /// can. Any other direction: nothing.
   void line_search_point(unsigned int direction);
   /// The top row that brings line `real`, from 1, into view; the present one if there is no such
   /// line.
   int find_real_num(int real);
+
+  void (*press_cb)(int zero) = nullptr;
+  void (*release_cb)(int zero) = nullptr;
+  void (*long_press_cb)(int zero) = nullptr;
+  void (*double_tap_cb)(int zero) = nullptr;
 
  protected:
   static constexpr int kInfoBytes = 100;
@@ -91,6 +110,7 @@ class MW_API StaticText : public TextPanel<> {
  private:
   enum class Column { Number, Words };
 
+  void tell(TextTouch what) const;
   void measure();
   void logRows(std::size_t needed) const;
   bool jumpTo(const mouse_event& mouse);

@@ -2,7 +2,7 @@
 #pragma once
 
 #include <MW/detail/delayed_show.h>
-#include <MW/detail/double_tap.h>
+#include <MW/detail/text_gesture.h>
 #include <MW/widget.h>
 
 #include <array>
@@ -13,19 +13,22 @@ namespace MW {
 using ShortText = std::array<char, 100>;
 
 /// A rectangle with a text record that a finger presses, holds and taps. StaticText and Ime say
-/// what stands in it; this class is not used by itself.
+/// what stands in it and call their callbacks; this class is not used by itself.
 ///
 /// A panel enters the base layer when it is constructed, inactive, and stays there until it is
 /// deleted or unregistered. Handlers run on the dispatch thread, drawing on the application's; what
-/// the panel shows may be set on any thread.
+/// the panel shows may be set on any thread. While a finger holds it, it takes the events of all
+/// fingers, wherever they are.
 ///
-/// `Self` is what the callbacks are given behind their 0: nothing, or the panel's own class.
-template <typename... Self>
+/// Callbacks are functions of the application, called with 0 on the dispatch thread; null: not
+/// wanted. Assign them before the panel becomes active:
+///
+/// - press_cb: pressed inside.
+/// - release_cb: released inside.
+/// - long_press_cb: held for long inside.
+/// - double_tap_cb: the second of two taps of which each step took under 500 ms.
 class MW_API TextPanel : public Widget {
  public:
-  /// A function of the application, called on the dispatch thread. Null: not wanted.
-  using PanelCallback = void (*)(int zero, Self*... panel);
-
   using Widget::show;
   /// show(0).
   int show() override;
@@ -33,6 +36,7 @@ class MW_API TextPanel : public Widget {
   void updateTimer(unsigned int ticks) override;
   /// Makes it inactive and free. Asks for no redraw. Returns 1.
   int hide() override;
+  /// StaticText: the text that its constructor was given, whatever setText() set. Ime: none.
   char* getText() override;
   unsigned int getBgColor() override;
   unsigned int getTextColor() override;
@@ -42,24 +46,15 @@ class MW_API TextPanel : public Widget {
   void setFontSize(int pixels) override;
   void setTextColor(unsigned int color) override;
   void setBgColor(unsigned int color) override;
-  /// Makes it active and has it redrawn from `ms` milliseconds on. It takes no events any more:
-  /// meant so.
+  /// Makes it active and has it redrawn from `ms` milliseconds on. From this call on it takes no
+  /// events any more, for good.
   void onShowTimer(int ms) override;
-  void onPress(event_data* event) override;
-  void onRelease(event_data* event) override;
-  void onPressLong(event_data* event) override;
-  void onTouchClickCount() override;
   /// Back to the background of its construction, and asks for a redraw if it had another.
   void restoreColor() override;
 
-  PanelCallback press_cb = nullptr;
-  PanelCallback release_cb = nullptr;  ///< released inside
-  PanelCallback long_press_cb = nullptr;
-  PanelCallback double_tap_cb =
-      nullptr;  ///< the second of two taps of which each step took under 500 ms
-
  protected:
-  /// `logWord` speaks in the log and is a literal. The panel is not registered yet.
+  /// `logWord` stands in every log line and outlives the panel, as a literal does. The panel is not
+  /// registered yet.
   explicit TextPanel(const char* logWord);
 
   /// Takes the place, the background, and of the text record its colour, alignment and size. Null
@@ -69,14 +64,18 @@ class MW_API TextPanel : public Widget {
   /// onShowTimer was called.
   bool follows(const event_data* event) const;
 
+  // What the handlers do before they call back. Each logs, and answers what happened.
+
+  TextTouch takePress(const event_data& event);
+  TextTouch takeRelease(const event_data* event);
+  TextTouch takeLongPress();
+  TextTouch takeTap();
+
   unsigned int saved_bg_color = 0;  // 0xAARRGGBB; guarded by stateLock
   DelayedShow showTimer;            // guarded by stateLock; never runs out
-  DoubleTap taps;                   // dispatch thread
+  TextGesture gesture;              // dispatch thread
 
  private:
-  void call(PanelCallback callback);
-  bool isInside(const event_data* event) const;
-
   const char* word;
 };
 

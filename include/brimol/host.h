@@ -6,6 +6,8 @@
  */
 #pragma once
 
+#include <stdint.h>
+
 #ifdef __cplusplus
 extern "C" {
 #endif
@@ -30,15 +32,29 @@ const char* brimol_host_help(void);
 /* Non-zero once the user has asked to close the window. */
 int brimol_host_close_requested(void);
 
-/* Lights the screen with so many per cent of its full light, 0 to 100 and nothing beyond, from the
- * next frame that ends; a screen opens with 100. Screenshots show it too. Nothing happens where no
- * screen is open. */
+/* Sets the screen's light in per cent, clamped to 0 to 100, from the next frame that ends; a screen
+ * opens with 100. Screenshots show it too. Does nothing where no screen is open. */
 void brimol_host_set_brightness(int percent);
 
 /* Waits until the newest ended frame is painted and writes it as a PNG file in full size. Returns
  * 1, or 0 when there is no open screen or the file cannot be written; brimol_host_error() says why.
  */
 int brimol_host_screenshot(const char* path);
+
+/* What the world says. The real world answers, unless a session is recorded or played (see
+ * docs/traces.md): a recording keeps the answers, and a played trace gives them, so that the same
+ * run has the same results. Any thread. */
+
+/* Milliseconds since 1970 in universal time. */
+int64_t brimol_host_utc_ms(void);
+
+/* A random number. */
+uint32_t brimol_host_random(void);
+
+/* Stores what the figure of that name is, such as a battery's charge, as a text that is cut to the
+ * room of `bytes` with its NUL: `real_value` as the application has read it, or what the trace says
+ * instead, an empty text where it says nothing. Returns the text's whole length. */
+int brimol_host_figure(const char* name, const char* real_value, char* value, int bytes);
 
 #pragma GCC visibility pop
 #ifdef __cplusplus

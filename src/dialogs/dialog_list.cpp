@@ -19,10 +19,10 @@ constexpr int kNotAdded = -1;
 constexpr int kBoxSide = 100;  // pixels, and so the rest
 constexpr int kMarkInset = 2;
 constexpr int kTextGap = 150;     // from the box's left to the text's
-constexpr int kTextMargin = 200;  // what the text's width lacks of the body's
+constexpr int kTextMargin = 200;  // by which the text is narrower than the body
 constexpr int kRowTextSize = 75;
 
-// Six rows fill what the frame's rows for title and buttons leave of the shorter side.
+// Six rows fill what title and buttons leave of the screen's shorter side.
 constexpr int64_t rowPitch(ScreenSize screen) {
   constexpr int kRowsThatFit = 6;
   const int64_t row = rowHeight(screen);

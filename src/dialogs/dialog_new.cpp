@@ -12,10 +12,10 @@ namespace {
 
 constexpr int kFewRows = 2;  // of the frame without buttons
 constexpr int kAllRows = 3;
-constexpr int kSingleLineParts = 3;  // of the body's height, of which one line takes one
+constexpr int kSingleLineParts = 3;  // of the body's height; a single line takes one of them
 constexpr int64_t kFaceGap = 5;      // pixels
 
-// The box of the body that holds the lines is divided evenly.
+// How the lines divide the body's height.
 struct LineGrid {
   int64_t pitch;
   int64_t gap;

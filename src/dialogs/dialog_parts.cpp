@@ -11,7 +11,7 @@ constexpr int64_t kTitleMarginX = 20;  // pixels, and so the rest
 constexpr int64_t kTitleMarginY = 10;
 constexpr int64_t kFaceMarginX = 10;
 constexpr int64_t kFaceMarginY = 5;
-constexpr int kFaceLoss = 15;  // what margins take from half of the width
+constexpr int kFaceLoss = 15;  // what the margins take from half of the width
 constexpr int kCaptionPercent = 35;
 constexpr int64_t kTextMargin = 10;
 }  // namespace

@@ -40,7 +40,7 @@ constexpr int64_t rowHeight(ScreenSize screen) {
   return dialogWidth(screen) * kTenths / kRowTenths;
 }
 
-/// With a body of that height, and so many rows above and below it.
+/// The grid of a dialog with a body of `body` pixels and `otherRows` rows above and below it.
 constexpr DialogGrid layOutAround(ScreenSize screen, int64_t body, int otherRows) {
   const int64_t w = dialogWidth(screen);
   const int64_t row = rowHeight(screen);
@@ -48,45 +48,47 @@ constexpr DialogGrid layOutAround(ScreenSize screen, int64_t body, int otherRows
   return {(screen.w - w) / 2, (screen.h - height) / 2, w, row, body, height};
 }
 
-/// With a body of one row. `rows`: 3 with buttons, 2 without.
+/// The grid of a dialog with a body of one row. `rows`: 3 with buttons, 2 without.
 constexpr DialogGrid layOutGrid(ScreenSize screen, int rows) {
   return layOutAround(screen, rowHeight(screen), rows - 1);
 }
 static_assert(layOutGrid({1440, 2560}, 3).w == 1152 && layOutGrid({1440, 2560}, 3).row == 230);
 static_assert(layOutGrid({1440, 2560}, 3).x == 144 && layOutGrid({1440, 2560}, 3).y == 935);
 
-/// The frame, a title's place in it and a black body; the title and the backdrop's colour are kept.
+/// Places the frame, the title and a black body. The title's text and look and the backdrop's
+/// colour stay.
 void layOutFrame(DialogFrame& dialog, ScreenSize screen, const DialogGrid& grid);
-/// The look of a text, which is kept.
+/// Gives a text its look; what it says stays.
 constexpr void style(SKIA_Text& words, uint32_t color, int align, int size) {
   words.color = color;
   words.align = align;
   words.size = size;
 }
-/// The standard look of a title; its text is kept.
+/// Gives a title the standard look.
 void styleTitle(SKIA_Text& title, int align);
 
-/// Where a message stands that has the body for itself.
+/// The place of a message that is alone in the body.
 SKIA_Rect messageArea(const DialogGrid& grid);
 
-/// Puts the face where it is told, in white, and the border a pixel around it.
+/// Gives a button its face, a border one pixel around it, and its caption's look.
 void placeButton(DialogButton& button, const DialogGrid& grid, const SKIA_Rect& face);
-/// The size of what stands in the lowest row.
+/// The text size of captions.
 int captionSize(const DialogGrid& grid);
 
-/// The faces of two buttons side by side, and of one as wide as both.
+/// White faces of two buttons side by side, and of one as wide as both.
 SKIA_Rect leftFace(const DialogGrid& grid);
 SKIA_Rect rightFace(const DialogGrid& grid);
 SKIA_Rect wideFace(const DialogGrid& grid);
 
-/// The frame's boxes and its line, up to the title, in their order.
+/// Draws everything up to the title.
 void drawFrame(const DialogFrame& dialog);
 void drawButton(const DialogButton& button);
 
-/// Most bytes of a line that the dialogs take as a whole or not at all.
+/// The most bytes of a line in a list or a console. A longer one is refused as a whole.
 inline constexpr std::size_t kLongestLine = kTextMax - 1;
 
-/// A C string of at most `limit` bytes. None: it is longer, or null. No byte beyond is read.
+/// A C string of at most `limit` bytes. None: it is longer, or null. No byte behind the first
+/// `limit` + 1 is read.
 std::optional<std::string_view> wholeText(const char* given, std::size_t limit);
 
 }  // namespace MW

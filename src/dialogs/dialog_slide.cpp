@@ -15,7 +15,7 @@ constexpr int kLastRepeatKind = 5;
 constexpr int kFrameRows = 3;
 constexpr int kMessageSize = 70;  // pixels, and so the rest
 constexpr int kParts = 3;         // of the slide row
-constexpr int kPartLoss = 4;      // what gaps take from each of them
+constexpr int kPartLoss = 4;      // what the gaps take from each of them
 
 void answer(const char* side, void (*call)(int)) {
   kLog.print(LogLevel::Debug, "%s", side);

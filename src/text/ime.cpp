@@ -1,5 +1,6 @@
 #include <MW/ime.h>
 #include <MW/window.h>
+#include <brimol/input.h>
 #include <brimol/properties.h>
 
 #include <algorithm>
@@ -7,6 +8,8 @@
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
+#include "core/hit_test.h"
+#include "core/life_guard.h"
 #include "text/ime_keys.h"
 #include "text/text_parts.h"
 
@@ -19,7 +22,6 @@ constexpr std::size_t kBar = 0;
 constexpr std::size_t kFoldKey = 39;
 constexpr std::size_t kNoKey = kImeKeys.size();
 constexpr std::size_t kMostTyped = 15;  // bytes
-constexpr uint32_t kGrey = 0xFF7F7F7F;
 constexpr const char* kFoldProperty = "brimol.info_1.ime_flag";
 static_assert(kImeKeys[kFoldKey].role == KeyRole::Fold);
 
@@ -51,7 +53,7 @@ std::string_view typedBy(const ImeKey& key, int layout) {
 Ime::Ime(const SKIA_Rect* area, const SKIA_Text* looks) : TextPanel("IME") {
   takeLooks(area, looks);
   layOutKeys();
-  std::ranges::fill(text.text, '\0');  // of the text, the length alone is kept: meant so
+  std::ranges::fill(text.text, '\0');  // of the text, the length alone is kept
   Window::registerWidget(this);
 }
 
@@ -107,7 +109,7 @@ void Ime::keyboard_change(unsigned int type) {
     if (!isGreyed(row.role)) continue;
     if (type < row.labels.size()) putText(key_text.at(key), row.labels.at(type));
     if (type == kSmall) rectOf(key).color = kColorWhite;
-    if (type == kOnlyDigits) rectOf(key).color = kGrey;
+    if (type == kOnlyDigits) rectOf(key).color = kPanelGrey;
   }
 }
 
@@ -118,7 +120,7 @@ bool Ime::onRecvEvent(event_data* event, unsigned int) {
   if (!follows(event)) return false;
   switch (event->type) {
     case kEventMotion:
-      if (select == 0) return false;
+      if (!hold.isHeld()) return false;
       onHover(event->mouse);
       return true;
     case kEventPress: pressKey(read(key_type), event); return true;
@@ -127,6 +129,35 @@ bool Ime::onRecvEvent(event_data* event, unsigned int) {
     default: return false;
   }
 }
+
+void Ime::tell(TextTouch what) {
+  void (*called)(int, Ime*) = nullptr;
+  switch (what) {
+    case TextTouch::None: return;
+    case TextTouch::Press: called = press_cb; break;
+    case TextTouch::Release: called = release_cb; break;
+    case TextTouch::LongPress: called = long_press_cb; break;
+    case TextTouch::DoubleTap: called = double_tap_cb; break;
+  }
+  if (called != nullptr) called(0, this);
+}
+
+void Ime::onPress(event_data* event) {
+  if (event == nullptr) return;
+  const LifeGuard self(this);
+  tell(takePress(*event));
+  if (self.isAlive() && double_tap_cb != nullptr) gesture.awaitTap(GetTicks());
+}
+
+void Ime::onRelease(event_data* event) {
+  const LifeGuard self(this);
+  tell(takeRelease(event));
+  if (self.isAlive() && double_tap_cb != nullptr && gesture.endedTap()) onTouchClickCount();
+  kLog.print(LogLevel::Debug, "released!!");
+}
+
+void Ime::onPressLong(event_data*) { tell(takeLongPress()); }
+void Ime::onTouchClickCount() { tell(takeTap()); }
 
 // NOLINTNEXTLINE(readability-convert-member-functions-to-static): an operation of the keyboard
 void Ime::onHover(mouse_event) { kLog.print(LogLevel::Debug, "onHover!!"); }
@@ -168,7 +199,7 @@ int Ime::showTyped() {
 std::size_t Ime::keyAt(const mouse_event& mouse) {
   const std::lock_guard guard(stateLock);
   std::size_t key = 0;
-  while (key < kNoKey && !isWithin(rectOf(key), mouse)) ++key;
+  while (key < kNoKey && !containsInside(rectOf(key), positionOf(mouse))) ++key;
   return key;
 }
 
@@ -202,7 +233,7 @@ void Ime::fold(int layout) {
   temp_searched.fill('\0');
 }
 
-// The typed text stays, and so does the tail of a longer result: meant so.
+// The typed text stays, and so does the tail of a longer result.
 void Ime::enter() {
   const auto typed = read(temp_searched);
   {

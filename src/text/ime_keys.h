@@ -89,12 +89,6 @@ static_assert(keyRect(kImeKeys[29], {0, 0, 720, 600, 0}).x == 612);  // l
 static_assert(keyRect(kImeKeys[38], {0, 0, 725, 600, 0}).w == 108);  // back
 static_assert(keyRect(kImeKeys[41], {0, 0, 720, 600, 0}).x == 540);  // enter
 
-/// Left and right, upper and lower edges are all outside: meant so.
-constexpr bool isWithin(const SKIA_Rect& key, const mouse_event& at) {
-  return at.x > key.x && at.x < int64_t{key.x} + key.w && at.y > key.y &&
-         at.y < int64_t{key.y} + key.h;
-}
-
 /// What the layout of digits alone greys, and does not take.
 constexpr bool isGreyed(KeyRole role) {
   return role == KeyRole::Letter || role == KeyRole::Shift || role == KeyRole::Space;

@@ -1,5 +1,6 @@
 #include <MW/static_text.h>
 #include <MW/window.h>
+#include <brimol/input.h>
 #include <brimol/properties.h>
 
 #include <algorithm>
@@ -64,7 +65,7 @@ void StaticText::init(const SKIA_Rect* area, const SKIA_Text* looks) {
   setType(kBaseLayer);
   takeLooks(area, looks);
   press_cb = release_cb = long_press_cb = double_tap_cb = nullptr;
-  taps.reset();
+  gesture.reset();
   Window::registerWidget(this);
   info_type.fill('\0');
   property_get(kInfoProperty, info_type.data(), "");
@@ -75,7 +76,7 @@ void StaticText::init(const SKIA_Rect* area, const SKIA_Text* looks) {
   showTimer = {};
   num_text = text;
   num_text.color = kColorBlue;
-  // The constructor has not stored its flags yet: without numbers, whatever it was told. Meant so.
+  // The constructor has not stored its flags yet: rows are as long as without numbers.
   measure();
   if (isCpu) w_count = kCpuBytes + (is_line_num ? 0 : kBytesForNumbers);
   is_setting = highlight = top_index = line_count = last_index = 0;
@@ -140,7 +141,7 @@ bool StaticText::onRecvEvent(event_data* event, unsigned int) {
   if (!follows(event)) return false;
   switch (event->type) {
     case kEventMotion:
-      if (select == 0) return false;
+      if (!hold.isHeld()) return false;
       onHover(event->mouse);
       return true;
     case kEventPress: onPress(event); return true;
@@ -149,6 +150,34 @@ bool StaticText::onRecvEvent(event_data* event, unsigned int) {
     default: return false;
   }
 }
+
+void StaticText::tell(TextTouch what) const {
+  void (*called)(int) = nullptr;
+  switch (what) {
+    case TextTouch::None: return;
+    case TextTouch::Press: called = press_cb; break;
+    case TextTouch::Release: called = release_cb; break;
+    case TextTouch::LongPress: called = long_press_cb; break;
+    case TextTouch::DoubleTap: called = double_tap_cb; break;
+  }
+  if (called != nullptr) called(0);
+}
+
+void StaticText::onPress(event_data* event) {
+  if (event == nullptr) return;
+  const LifeGuard self(this);
+  tell(takePress(*event));
+  if (self.isAlive() && double_tap_cb != nullptr) gesture.awaitTap(GetTicks());
+}
+
+void StaticText::onRelease(event_data* event) {
+  const LifeGuard self(this);
+  tell(takeRelease(event));
+  if (self.isAlive() && double_tap_cb != nullptr && gesture.endedTap()) onTouchClickCount();
+  kViewerLog.print(LogLevel::Debug, "released!!");
+}
+
+void StaticText::onTouchClickCount() { tell(takeTap()); }
 
 void StaticText::onHover(mouse_event mouse) {
   kViewerLog.print(LogLevel::Debug, "onHover!!");
@@ -164,7 +193,7 @@ void StaticText::onHover(mouse_event mouse) {
 
 void StaticText::onPressLong(event_data* event) {
   const LifeGuard self(this);
-  TextPanel::onPressLong(event);
+  tell(takeLongPress());
   if (!self.isAlive() || event == nullptr || jumpTo(event->mouse)) return;
   kViewerLog.print(LogLevel::Debug, "onPressLong is not correct!!");
 }

@@ -4,13 +4,13 @@
 
 #include "core/bounded_text.h"
 #include "core/geometry.h"
+#include "text/text_parts.h"
 
 namespace MW {
 
 namespace {
 
 constexpr uint32_t kMatchColor = kColorRed;
-constexpr uint32_t kBarColor = 0xFF7F7F7F;
 constexpr int kMarginParts = 35;     // of the width and the height
 constexpr int kNumberWidth = 4;      // font sizes
 constexpr int kBarWidthParts = 25;   // of the width
@@ -60,7 +60,7 @@ void StaticText::drawRows() {
       drawNumber(number, down);
       highlight = 0;
     }
-    // Only a line number ends the red: without numbers it goes on, in later frames too. Meant so.
+    // Only a line number ends the red: without numbers it goes on, in later frames too.
     if (is_search_mark && std::ranges::binary_search(found_lines, number)) highlight = 1;
     words.color = is_search_mark && highlight == 1 ? kMatchColor : text.color;
     putText(words, lines.text(row));
@@ -81,7 +81,7 @@ void StaticText::drawScrollBar() {
       toPixels(std::max(int64_t{rect.h} * h_count / line_count, int64_t{rect.h / kBarHeightParts}));
   const int64_t down = (rect.h - height) * top_index / rowsBeyondView();
   scroll_bar = makeRect(int64_t{rect.x} + rect.w - int64_t{width} * 3 / 2, rect.y + down, width,
-                        height, kBarColor);
+                        height, kPanelGrey);
   skia_add_box_c(scroll_bar);
 }
 

@@ -1,23 +1,16 @@
 #include <MW/c_api.h>
-#include <MW/event_service.h>
-#include <MW/ime.h>
-#include <MW/static_text.h>
+#include <MW/text_panel.h>
 #include <brimol/input.h>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
-#include "core/life_guard.h"
 #include "core/redraw.h"
 
 namespace MW {
 
-template <typename... Self>
-TextPanel<Self...>::TextPanel(const char* logWord) : word(logWord) {
-  type_ = kBaseLayer;
-}
+TextPanel::TextPanel(const char* logWord) : word(logWord) { type_ = kBaseLayer; }
 
-template <typename... Self>
-void TextPanel<Self...>::takeLooks(const SKIA_Rect* area, const SKIA_Text* looks) {
+void TextPanel::takeLooks(const SKIA_Rect* area, const SKIA_Text* looks) {
   const SKIA_Rect place = area != nullptr ? *area : SKIA_Rect{};
   {
     const std::lock_guard guard(stateLock);
@@ -27,71 +20,33 @@ void TextPanel<Self...>::takeLooks(const SKIA_Rect* area, const SKIA_Text* looks
   setRect(0, &place);
 }
 
-template <typename... Self>
-int TextPanel<Self...>::show() {
-  return show(0);
-}
+int TextPanel::show() { return show(0); }
 
-// The time is never taken back, so that every pass behind it asks: meant so.
-template <typename... Self>
-void TextPanel<Self...>::updateTimer(unsigned int ticks) {
+// The time is never taken back, so that every later pass asks, too.
+void TextPanel::updateTimer(unsigned int ticks) {
   if (read(showTimer).isDue(ticks)) isDisplayUpdate_c(1);
 }
 
-template <typename... Self>
-int TextPanel<Self...>::hide() {
+int TextPanel::hide() {
   setActive(0);
   return 1;
 }
 
-template <typename... Self>
-bool TextPanel<Self...>::follows(const event_data* event) const {
+bool TextPanel::follows(const event_data* event) const {
   if (event == nullptr || read(showTimer).isPending()) return false;
-  return select != 0 || isInside(event);
+  return hold.isHeld() || isUnder(rect, event);
 }
 
-template <typename... Self>
-char* TextPanel<Self...>::getText() {
-  return text.text;
-}
+char* TextPanel::getText() { return text.text; }
+unsigned int TextPanel::getBgColor() { return read(rect.color); }
+unsigned int TextPanel::getTextColor() { return read(text.color); }
+int TextPanel::getFontSize() { return read(text.size); }
+SKIA_Rect* TextPanel::getPositionAndSize() { return &rect; }
+void TextPanel::setFontSize(int pixels) { write(text.size, pixels); }
+void TextPanel::setTextColor(unsigned int color) { write(text.color, color); }
+void TextPanel::setBgColor(unsigned int color) { write(rect.color, color); }
 
-template <typename... Self>
-unsigned int TextPanel<Self...>::getBgColor() {
-  return read(rect.color);
-}
-
-template <typename... Self>
-unsigned int TextPanel<Self...>::getTextColor() {
-  return read(text.color);
-}
-
-template <typename... Self>
-int TextPanel<Self...>::getFontSize() {
-  return read(text.size);
-}
-
-template <typename... Self>
-SKIA_Rect* TextPanel<Self...>::getPositionAndSize() {
-  return &rect;
-}
-
-template <typename... Self>
-void TextPanel<Self...>::setFontSize(int pixels) {
-  write(text.size, pixels);
-}
-
-template <typename... Self>
-void TextPanel<Self...>::setTextColor(unsigned int color) {
-  write(text.color, color);
-}
-
-template <typename... Self>
-void TextPanel<Self...>::setBgColor(unsigned int color) {
-  write(rect.color, color);
-}
-
-template <typename... Self>
-void TextPanel<Self...>::onShowTimer(int ms) {
+void TextPanel::onShowTimer(int ms) {
   const unsigned int now = GetTicks();
   setActive(1);
   {
@@ -101,44 +56,7 @@ void TextPanel<Self...>::onShowTimer(int ms) {
   askForRedraw();
 }
 
-template <typename... Self>
-void TextPanel<Self...>::onPress(event_data* event) {
-  if (event == nullptr) return;
-  ClassLog(word).print(LogLevel::Debug, "pressed!!");
-  select = static_cast<int>(event->mouse.finger + 1);
-  const LifeGuard self(this);
-  call(press_cb);
-  if (self.isAlive() && double_tap_cb != nullptr) taps.press(GetTicks());
-}
-
-template <typename... Self>
-void TextPanel<Self...>::onRelease(event_data* event) {
-  const ClassLog log(word);
-  select = 0;
-  if (isInside(event)) {
-    const LifeGuard self(this);
-    call(release_cb);
-    if (self.isAlive() && double_tap_cb != nullptr && taps.isRunning()) onTouchClickCount();
-  }
-  log.print(LogLevel::Debug, "released!!");
-}
-
-template <typename... Self>
-void TextPanel<Self...>::onPressLong(event_data*) {
-  ClassLog(word).print(LogLevel::Debug, "long pressed!!");
-  call(long_press_cb);
-}
-
-template <typename... Self>
-void TextPanel<Self...>::onTouchClickCount() {
-  const int count = taps.tap(GetTicks());
-  if (count == 0) return;
-  ClassLog(word).print(LogLevel::Debug, "onTouchClickCount!! %d", count);
-  if (count == DoubleTap::kDouble) call(double_tap_cb);
-}
-
-template <typename... Self>
-void TextPanel<Self...>::restoreColor() {
+void TextPanel::restoreColor() {
   {
     const std::lock_guard guard(stateLock);
     if (rect.color == saved_bg_color) return;
@@ -147,18 +65,27 @@ void TextPanel<Self...>::restoreColor() {
   askForRedraw();
 }
 
-template <typename... Self>
-void TextPanel<Self...>::call(PanelCallback callback) {
-  if (callback != nullptr) callback(0, static_cast<Self*>(this)...);
+TextTouch TextPanel::takePress(const event_data& event) {
+  ClassLog(word).print(LogLevel::Debug, "pressed!!");
+  hold.press(event.mouse);
+  return gesture.press();
 }
 
-template <typename... Self>
-bool TextPanel<Self...>::isInside(const event_data* event) const {
-  const SKIA_Rect area = read(rect);
-  return EventService::isMouseEventForMe(&area, event);
+TextTouch TextPanel::takeRelease(const event_data* event) {
+  hold.letGo();
+  return gesture.release(isUnder(rect, event));
 }
 
-template class TextPanel<>;
-template class TextPanel<Ime>;
+TextTouch TextPanel::takeLongPress() {
+  ClassLog(word).print(LogLevel::Debug, "long pressed!!");
+  return gesture.longPress();
+}
+
+TextTouch TextPanel::takeTap() {
+  const TextTouch what = gesture.tap(GetTicks());
+  const int number = gesture.tapNumber();
+  if (number != 0) ClassLog(word).print(LogLevel::Debug, "onTouchClickCount!! %d", number);
+  return what;
+}
 
 }  // namespace MW

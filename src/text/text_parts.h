@@ -13,6 +13,9 @@
 
 namespace MW {
 
+/// The scroll bar and the keys that a layout takes away.
+inline constexpr uint32_t kPanelGrey = 0xFF7F7F7F;
+
 inline constexpr ClassLog kViewerLog("STATICTEXT");
 
 /// An application's text of any length, cut where ints no longer count its lines. Null is empty.

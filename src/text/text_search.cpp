@@ -12,13 +12,11 @@ namespace MW {
 
 namespace {
 
-constexpr unsigned int kPrevious = 0;
-constexpr unsigned int kNext = 1;
 constexpr int kNoRow = -1;
-constexpr std::size_t kShortestWanted = 2;  // bytes; a single one is found nowhere: meant so
+constexpr std::size_t kShortestWanted = 2;  // bytes; a single one is found nowhere
 
-// The line of every match, in the text's order; a line with two is listed twice: meant so. The end
-// of a line is not counted where the wanted text begins with one: meant so.
+// The line of every match, in the text's order; a line with two is listed twice. Where the wanted
+// text begins with the end of a line, all matches are of line 1.
 std::vector<int> findLines(std::string_view source, std::string_view wanted) {
   std::vector<int> found;
   if (wanted.size() < kShortestWanted) return found;
@@ -66,7 +64,7 @@ void StaticText::line_search(const char* source) {
 }
 
 // One walk over the rows: matches and rows both ascend. The last row is not looked at, and a line
-// that is not met counts as row 0: meant so.
+// that is not met counts as row 0.
 void StaticText::takeMatches(std::vector<int>& numbers, std::vector<int>& rows) {
   const std::lock_guard guard(stateLock);
   const int end = line_count - 1;

@@ -6,14 +6,6 @@
 
 namespace brimol::test {
 
-/// Makes rows of plays on one widget.
-struct PlaysOn {
-  Maker make;
-  Play operator()(const char* name, const Steps& steps, const char* journal) const {
-    return {name, make, steps, journal};
-  }
-};
-
 /// Makes a page or dialog with callbacks of its own in place of the base's, which are heard.
 template <typename Own, typename... Arguments>
 Maker makesOwn(Arguments... arguments) {

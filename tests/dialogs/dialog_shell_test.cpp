@@ -9,12 +9,12 @@ using MW::DialogShell;
 using DialogShellTest = WidgetTest;
 
 TEST_F(DialogShellTest, OtherFingersNeitherPressNorMoveButMayLift) {
-  const Play play = {"",
-                     makes<DialogShell>("Title", 3),
-                     {finger(1), press(154, 1774), finger(0), press(), drag(1, 0),
-                      release(1285, 1993), lookAtHold(), release(0, 0), keyDown(323), plug(17)},
-                     "press+ - - button1 click+ <held 2> click+ down323+ -"};
-  expectJournal(play);
+  const Maker shell = makes<DialogShell>("Title", 3);
+  const Steps steps = {
+      finger(1),           press(154, 1774), finger(0),     press(),      drag(1, 0),
+      release(1285, 1993), lookAtHold(),     release(0, 0), keyDown(323), plug(17)};
+  EXPECT_EQ(played(shell, steps), "press+ - - button1 click+ <held 2> click+ down323+ -");
+  expectCallbacksMayDelete(shell, steps);
 }
 
 struct RoomCase : Row {

@@ -26,7 +26,7 @@ const auto kDialogs = std::to_array<DialogCase>({
     {"DialogList", twoRows, "538,659 417x162|964,658 419x164|965,659 417x162|"},
     {"DialogShell", makes<MW::DialogShell>("Title"), "538,907 844x162|0,0 0x0|0,0 0x0|"},
     {"DialogSlide", makes<MW::DialogSlide>(3), "529,627 284x170|1099,627 284x170|814,627 284x170|"},
-    {"DialogSelect", makes<MW::DialogSelect>(0U), ""},
+    {"DialogSelect", makes<MW::DialogSelect>(0U), "384,564 384x384|1152,564 384x384|"},
     {"DialogWarn", makes<MW::DialogWarn>(MW::kColorRed), "0,0 1921x1081|"},
     {"AutoCapScreen", makes<MW::AutoCapScreen>(0U), "0,0 1921x1081|"},
 });

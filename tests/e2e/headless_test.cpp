@@ -4,11 +4,9 @@
 
 #include <unistd.h>
 
-#include <chrono>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
-#include <thread>
 
 #include "application.h"
 #include "e2e/app_screens.h"
@@ -50,8 +48,7 @@ TEST_F(HeadlessApplication, IsDoneByTouchAlone) {
     for (const uint32_t colour : {0xFFFFFFFF, 0xFFFF0000, 0xFF00FF00}) {
       EXPECT_TRUE(User::sees(kCentre, colour));
       if (colour != 0xFF00FF00) User::click(kCentre);
-      // A tap that follows at once would be a double tap.
-      std::this_thread::sleep_for(std::chrono::milliseconds(600));
+      User::later(600);  // a tap that follows at once would be a double tap
     }
     User::click(kCentre);
     User::click(kCentre);

@@ -96,6 +96,13 @@ void User::key(SDL_Keycode key) {
   });
 }
 
+void User::later(uint32_t ms) {
+  brimol::pc::InputService& service = brimol::pc::inputService();
+  service.takeHand(service.now());
+  service.advance(ms);
+  service.letGo();
+}
+
 void User::start(std::string_view test) {
   const auto& entries = testEntries();
   const auto place = std::ranges::find(entries, test, &TestEntry::id) - entries.begin();

@@ -25,6 +25,8 @@ class User {
   static void click(const SKIA_Rect& area);
   static void dragFrom(const SKIA_Rect& area, int byX);
   static void key(SDL_Keycode key);
+  /// Lets so many milliseconds of the application's time pass at once.
+  static void later(uint32_t ms);
   /// Starts the test of this name from the menu, by keys.
   static void start(std::string_view test);
   /// Whether the area comes to have the colour, near its corner, where no text stands.

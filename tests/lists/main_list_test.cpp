@@ -1,56 +1,111 @@
 #include <MW/main_list.h>
 
 #include <array>
-#include <memory>
 
 #include "support/drawings.h"
+#include "support/play.h"
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+using MainListPlays = PlayTest;
+using MainListTest = WidgetTest;
 
-struct Head {
-  int w, h;
-  const char* places;  // brightness, address, signal, BLE, the edge at the foot
-};
-
-constexpr auto kHeads = std::to_array<Head>({
-    {1440, 2560, "864,17 576x130|475,340 475x65|950,340 475x65|576,425 576x65|0,2560 1440x2|"},
-    {1080, 1920, "648,17 432x130|356,340 356x65|712,340 356x65|432,425 432x65|0,1920 1080x2|"},
-    {720, 1280, "432,17 288x130|237,340 237x65|474,340 237x65|288,425 288x65|0,1280 720x2|"},
-    {2560, 1440, "1536,17 1024x130|844,340 844x65|1688,340 844x65|1024,425 1024x65|0,1440 2560x2|"},
-    {1081, 1921, "648,17 433x130|356,340 356x65|712,340 356x65|432,425 432x65|0,1921 1081x2|"},
-});
-
-// On the default screen of 1440 x 2560 the list begins at 340 and is 2220 high.
-struct List : MW::MainList {
+// Items 100 high, captioned by their numbers. On the default screen of 1440 x 2560 the list begins
+// at 340 and is 2220 high.
+struct Menu : MW::MainList {
   using MainList::items;
-  // Items 100 high, captioned by their numbers.
-  explicit List(const std::vector<int>& kinds, int listMode = 0) : MainList("Menu", listMode) {
-    for (const int kind : kinds) {
-      EXPECT_EQ(add(kind), filled < 64 ? filled : -1);
-      ++filled;
-    }
+  explicit Menu(const std::vector<int>& kinds, int listMode = kPlain) : MainList("Menu", listMode) {
+    for (const int kind : kinds) add(kind);
     initFinish();
   }
   int add(int kind) {
-    const SKIA_Text caption = textRecord(std::to_string(filled), 7, 1, 50);
+    const SKIA_Text caption = textRecord(std::to_string(count), 7, 1, 50);
     return addIndex(kind, &caption, 100);
   }
-  void scrollBy(int by) { onHover({0, 0, 0, 0, 0, by}); }
   int at(int y) { return position2index({0, 0, 9, y, 0, 0}); }
-  int filled = 0;
 };
 
-using MainListTest = WidgetTest;
+std::unique_ptr<Menu> heardMenu(const std::vector<int>& kinds) {
+  auto menu = std::make_unique<Menu>(kinds);
+  menu->setActive(1);
+  menu->pressCallback = [](auto* mouse, auto*) { noteTouch("press", mouse); };
+  menu->clickCallback = [](auto* mouse, auto*) { noteTouch("click", mouse); };
+  menu->releaseCallback = [](auto* mouse, auto*) { noteTouch("release", mouse); };
+  menu->scrollCallback = [](auto* mouse, auto*) { noteTouch("scroll", mouse); };
+  menu->keyPressCallback = [](auto* key, auto*) { note("down" + std::to_string(key->code)); };
+  menu->keyReleaseCallback = [](auto* key, auto*) { note("up" + std::to_string(key->code)); };
+  return menu;
+}
+Maker menuOf(const std::vector<int>& kinds) {
+  return [=] { return heardMenu(kinds); };
+}
+const Maker kShort = menuOf({1, 1, 2});
+const Maker kLong = menuOf(std::vector<int>(30, 1));  // 3087 high, 867 too many
+// Where the first item that is drawn stands.
+Step top() {
+  return look([](MW::Widget& menu) { return shown(menu).front().rect.y; });
+}
+Step moveDown() {
+  return look<Menu>([](Menu& menu) { return menu.move_key_down(0); });
+}
+Step moveUp() {
+  return look<Menu>([](Menu& menu) { return menu.move_key_up(0); });
+}
 
-TEST_F(MainListTest, StatusTextsStandByTheScreensWidth) {
-  for (const Head& row : kHeads) {
-    setScreen(row.w, row.h);
-    List list({}, 1);
-    const std::vector<Drawing> all = shown(list);
-    EXPECT_EQ(places({all.at(2), all.at(6), all.at(7), all.at(9), all.at(10)}), row.places);
-  }
+const std::vector<Play> kPlays = {
+    {"ClicksTheItemThatWasPressed",
+     kShort,
+     {press(9, 341), release(9, 439)},
+     "press+ click release+"},
+    {"AnotherItemIsNotClicked", kShort, {press(9, 500), release(9, 400)}, "press+ release+"},
+    {"AnItemThatIsNotSelectable", kShort, {press(9, 600), release()}, "press+ release+"},
+    {"ALongerOneDoesNot",
+     kShort,
+     {press(9, 500), drag(0, 29), drag(0, -29), release()},
+     "press+ + + release+"},
+    {"OneFingerHoldsItAndIsFollowed",
+     kShort,
+     {finger(2), press(9, 339), press(9, 340), lookAtHold(), finger(1), press(9, 400), drag(0, 5),
+      release(), lookAtLog(), finger(2), longPress(), release(9, 10), lookAtHold()},
+     "- press+ <held 3> - - - <[MAINLIST] onRecvEvent-> T:2, F:1> - release+ <held 0>"},
+    {"KeysAreToldAndMoveNothing",
+     kShort,
+     {keyDown(274), lookAtLog(), keyUp(274), lookAtLog(), plug(1), moveUp()},
+     "down274+ <[MAINLIST] key pressed sym = 274> up274+ "
+     "<[MAINLIST] key onReleaseKey sym = 274> - <-100>"},
+    {"ADarkPanelLetsTheFingerGo",
+     kShort,
+     {press(9, 400), lookAtLog(), call(&MW::Widget::lcdOn, 1), lookAtHold(),
+      call(&MW::Widget::lcdOn, 0), lookAtHold()},
+     "press+ <[MAINLIST] position2index= 0340 < 0400 > 0440> <held 1> <held 0>"},
+    {"LogsOnceThatItIsShownAndHidden",
+     kShort,
+     {draw(), lookAtLog(), draw(), lookAtLog(), call(&MW::Widget::hide), lookAtLog(),
+      call(&MW::Widget::hide), lookAtLog()},
+     "<[MAINLIST] SHOW->Menu> <> <[MAINLIST] HIDE<-Menu> <>"},
+    {"ScrollsBetweenItsEnds",
+     kLong,
+     {press(9, 400), drag(0, 50), top(), drag(0, -10), top(), drag(0, INT_MIN), top()},
+     "press+ scroll+ <443> scroll+ <433> scroll+ <400>"},
+    {"KeysFindSelectableItems",
+     menuOf({2, 1, 1, 2, 3, 1, 2}),
+     {moveUp(), moveDown(), moveDown(), moveDown(), moveUp(), moveUp(), moveUp()},
+     "<-100> <2> <5> <-100> <2> <1> <-100>"},
+};
+TEST_P(MainListPlays, TellTheirJournal) { expectJournal(GetParam()); }
+INSTANTIATE_TEST_SUITE_P(, MainListPlays, testing::ValuesIn(kPlays), kRowName);
+
+TEST_F(MainListTest, KeysScrollTheirItemIntoView) {
+  Menu menu(std::vector<int>(30, 1));
+  while (menu.move_key_down(0) < 20) EXPECT_EQ(menu.at(341), 0) << "still at the top";
+  EXPECT_EQ(menu.move_key_down(0), 21);
+  EXPECT_EQ(menu.at(2556), 21);
+  EXPECT_EQ(menu.at(2557), -1) << "its gap stands on the list's foot";
+  while (menu.move_key_down(0) >= 0) continue;
+  while (menu.move_key_up(0) > 1) continue;
+  EXPECT_EQ(menu.at(341), 1) << "exactly at the top";
+  EXPECT_EQ(shown(menu).front().text.text, "2") << "where none is drawn";
 }
 
 TEST_F(MainListTest, IsFullAtSixtyFourItemsAndRefusesLongTexts) {
@@ -59,58 +114,66 @@ TEST_F(MainListTest, IsFullAtSixtyFourItemsAndRefusesLongTexts) {
   EXPECT_TRUE(shown(open).empty()) << "not even a title before it is finished";
   EXPECT_EQ(open.addIndex(1, &tooLong, 1), -1);
   EXPECT_EQ(open.addIndex(1, nullptr, 1), -1);
-  List list(std::vector<int>(65, 1));
-  EXPECT_EQ(list.Max_height(), 64 * 103 - 3);
-  list.scrollBy(INT_MIN);
-  EXPECT_EQ(list.at(2559), 63);
-  EXPECT_EQ(list.at(2560), -100) << "below the last one of them";
+  Menu menu(std::vector<int>(65, 1));
+  EXPECT_EQ(menu.Max_height(), 64 * 103 - 3);
+  EXPECT_EQ(menu.add(1), -1);
+  menu.onHover({0, 0, 0, 0, 0, INT_MIN});
+  EXPECT_EQ(menu.at(2559), 63);
+  EXPECT_EQ(menu.at(2560), -100) << "below the last one of them";
+}
+
+TEST_F(MainListTest, AnEndTakesTheItemsBehindItAway) {
+  Menu menu({1, 1, 1});
+  menu.setListType(1, MW::MainList::kEnd);
+  EXPECT_EQ(words(shown(menu)), "Menu||||") << "the first one is not drawn at rest";
+  EXPECT_EQ(menu.at(500), -1);
+  EXPECT_EQ(menu.Max_height(), 203);
+  menu.initIndex();
+  EXPECT_EQ(menu.add(1), -1) << "it is finished";
 }
 
 TEST_F(MainListTest, TextsAreChangedByNumber) {
-  List list({1, 1}, 1);
+  Menu menu({1, 1}, MW::MainList::kExtended);
   for (const int item : {1, 2, 63, 64, -1, INT_MIN, INT_MAX}) {
-    list.setText(item, "Keys and more", 4);
-    list.setTextOption(item, "8 bit and more", 5);
+    menu.setText(item, "Keys and more", 4);
+    menu.setTextOption(item, "8 bit and more", 5);
   }
-  EXPECT_EQ(list.add(1), -1) << "it is finished";
-  list.setText(1, "Led", 3);
-  for (const unsigned int length : {0U, 127U, UINT_MAX}) list.setText(1, "never", length);
-  list.setText(1, nullptr, 3);
-  list.setTextBattery("80 %", 4);
-  EXPECT_STREQ(list.items[1].text.text, "Leds") << "the old tail";
-  EXPECT_EQ(words(shown(list)),
+  menu.setText(1, "Led", 3);
+  for (const unsigned int length : {0U, 127U, UINT_MAX}) menu.setText(1, "never", length);
+  menu.setText(1, nullptr, 3);
+  menu.setTextBattery("80 %", 4);
+  EXPECT_STREQ(menu.items[1].text.text, "Leds") << "the old tail";
+  EXPECT_EQ(words(shown(menu)),
             "Led|Menu||80 %|8 bit|8 bit|192.168.100.1|-120 dbm|Testmode: |BLE: |");
+  menu.setText(1, "", 1);
+  menu.setTextBattery("", 1);
+  menu.setTextOption(MW::MainList::kAddress, "", 9);
+  EXPECT_EQ(words(shown(menu)), "|Menu|||8 bit|8 bit||-120 dbm|Testmode: |BLE: |");
 }
 
-TEST_F(MainListTest, ScrollsBetweenItsEnds) {
-  List list(std::vector<int>(30, 1));  // 3087 high, 867 too many
-  list.scrollBy(50);
-  EXPECT_EQ(shown(list).front().rect.y, 443) << "an item whose top is the list's edge is not drawn";
-  list.scrollBy(-10);
-  EXPECT_EQ(shown(list).front().rect.y, 433);
-  list.scrollBy(INT_MIN);
-  EXPECT_EQ(shown(list).front().rect.y, 340 - 867 + 9 * 103);
-  setScreen(1440, 546);
-  EXPECT_EQ(shown(*std::make_unique<List>(std::vector(3, 1))).at(1).call, Call::Box) << "the foot";
-  setScreen(1440, 542);
-  List tight({1, 1});
-  tight.scrollBy(-10);
-  EXPECT_EQ(tight.at(340), 0) << "a pixel too high";
+TEST_F(MainListTest, TheHeadStandsByTheScreensWidth) {
+  setScreen(1081, 1921);
+  Menu menu({}, MW::MainList::kExtended);
+  const std::vector<Drawing> all = shown(menu);
+  EXPECT_EQ(places({all.at(2), all.at(6), all.at(7), all.at(9), all.at(10)}),
+            "648,17 433x130|356,340 356x65|712,340 356x65|432,425 432x65|0,1921 1081x2|");
 }
 
-TEST_F(MainListTest, KeysMoveOverSelectableItemsIntoView) {
-  std::vector<int> kinds(30, 1);
-  kinds[0] = kinds[3] = kinds[29] = 2;
-  List list(kinds);
-  EXPECT_EQ(list.move_key_up(0), -100) << "the first selectable one";
-  for (const int expected : {2, 4}) EXPECT_EQ(list.move_key_down(9), expected);
-  while (list.move_key_down(0) < 20) EXPECT_EQ(list.at(341), 0) << "still at the top";
-  EXPECT_EQ(list.move_key_down(0), 21);
-  EXPECT_EQ(list.at(2556), 21);
-  EXPECT_EQ(list.at(2557), -1) << "its gap stands on the list's foot";
-  for (int i = 0; i < 30; ++i) list.move_key_down(0);
-  for (int i = 0; i < 30; ++i) list.move_key_up(0);
-  EXPECT_EQ(list.at(341), 1) << "the topmost selectable one";
+// Screens that no machine has, and an item as high.
+TEST_F(MainListTest, TakesAnyScreenAndHeight) {
+  const SKIA_Text endless = {};
+  for (const int w : {1, 7, -1, INT_MIN, INT_MAX}) {
+    for (const int h : {1, 341, -1, INT_MIN, INT_MAX}) {
+      setScreen(w, h);
+      MW::MainList menu("Menu");
+      for (int i = 0; i < 3; ++i) menu.addIndex(1, &endless, h);
+      menu.initFinish();
+      for (const int by : {INT_MIN, INT_MAX}) menu.onHover({0, 0, 0, INT_MAX, by, by});
+      menu.move_key_down(0);
+      menu.move_key_up(0);
+      EXPECT_EQ(shown(menu).back().rect.y, h) << "the foot";
+    }
+  }
 }
 
 }  // namespace

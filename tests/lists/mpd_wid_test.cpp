@@ -1,105 +1,178 @@
 #include <MW/mpd_wid.h>
 
 #include "support/drawings.h"
+#include "support/play.h"
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
-using std::pair;
+using MpdWidPlays = PlayTest;
 using MpdWidTest = WidgetTest;
 
-struct List : MW::MpdWid {
-  explicit List(const std::string& lines) : MpdWid(nullptr) { read(lines); }
+constexpr int kTop = 561;  // of the list on the default screen; it is 1999 high
+
+struct Results : MW::MpdWid {
+  explicit Results(const std::string& lines) : MpdWid(nullptr) { read(lines); }
   void read(const std::string& lines) { cal_line(lines.data(), static_cast<int>(lines.size())); }
 };
-// What stands in so many cells of the rows, and behind the first how far below the list's top: on
-// the default screen of 1440 x 2560 that is 561, and the list is 1999 high.
-std::string rows(List& list, std::size_t cells = 1) {
-  std::ostringstream found;
-  const std::vector<Drawing> all = shown(list);
-  for (std::size_t i = 0; i + 2 < all.size(); ++i) {
-    if (i % 5 < cells) found << all[i].text.text << '|';
-    if (i % 5 == 0) found << all[i].rect.y - 561 << ' ';
-  }
-  return found.str();
+
+// Five cells for each row; the header and the foot behind them.
+std::vector<Drawing> cells(MW::Widget& results) {
+  std::vector<Drawing> all = shown(results);
+  all.resize(all.size() - 2);
+  return all;
 }
+// The markers of the rows.
+Step markers() {
+  return look([](MW::Widget& results) {
+    std::string found;
+    const std::vector<Drawing> all = cells(results);
+    for (std::size_t i = 0; i < all.size(); i += 5) found += all[i].text.text;
+    return found;
+  });
+}
+// How far below the list's top the first row stands.
+Step top() {
+  return look([](MW::Widget& results) {
+    const std::vector<Drawing> all = cells(results);
+    return all.empty() ? "none" : std::to_string(all[0].rect.y - kTop);
+  });
+}
+
+Maker resultsOf(const std::string& lines, int listType = MW::MpdWid::kRow) {
+  return [=] {
+    auto results = std::make_unique<Results>(lines);
+    results->setListType(0, listType);
+    results->press_cb = [](auto* mouse, auto*) { noteTouch("press", mouse); };
+    results->click_cb = [](auto* mouse, auto*) { noteTouch("click", mouse); };
+    results->release_cb = [](auto* mouse, auto*) { noteTouch("release", mouse); };
+    results->hover_cb = [](auto* mouse, auto*) { noteTouch("hover", mouse); };
+    results->key_press_cb = [](auto* key, auto*) { note("down" + std::to_string(key->code)); };
+    results->key_release_cb = [](auto* key, auto*) { note("up" + std::to_string(key->code)); };
+    return results;
+  };
+}
+// Drawn once, so that its rows are where they are seen.
+std::unique_ptr<MW::Widget> tree() {
+  auto results = std::make_unique<Results>("[1]\n[2]\n[3]\n[2]\n[1]\n[2]\n[3]\n");
+  shown(*results);
+  return results;
+}
+const Maker kTree = tree;
+const Maker kTwenty = resultsOf(std::string(21, '\n'));  // 2839 high, 840 too many
+const Maker kClickable = resultsOf("a\nb\n", MW::MpdWid::kHitEnd);
+
+// A tap on so many pixels below the list's top.
+struct Tap {
+  unsigned int ms;
+  int y;
+};
+Play tapped(const char* name, std::initializer_list<Tap> taps, const char* journal) {
+  Steps steps;
+  for (const auto& [ms, y] : taps) {
+    steps.insert(steps.end(), {at(kStartTicks + ms), press(30, kTop + y), release()});
+  }
+  steps.push_back(markers());
+  return {name, kTree, steps, journal};
+}
+
+const std::vector<Play> kPlays = {
+    {"TheLastRowIsNeverHidden", kTree, {markers()}, "<[>][>][*]>"},
+    tapped("ADoubleTapOpensARow", {{0, 1}, {499, 141}}, "+ + + + <[V][>][*][>][*]>"),
+    tapped("TheSecondTapSaysWhichRow", {{0, 1}, {1, 143}}, "+ + + + <[>][V][>][*]>"),
+    tapped("AnEdgeIsNoRows", {{0, 142}, {1, 142}}, "+ + + + <[>][>][*]>"),
+    tapped("TheLastRowDoesNotChange", {{0, 285}, {1, 285}}, "+ + + + <[>][>][*]>"),
+    {"ScrollsBetweenItsEnds",
+     kTwenty,
+     {draw(), press(30, kTop), drag(0, -143), top(), drag(0, 93), top(), drag(0, INT_MAX), top(),
+      drag(0, INT_MIN), top()},
+     "press+ hover+ <-1> hover+ <-50> hover+ <0> hover+ <-130>"},
+    {"FewRowsComeBackFromAboveAtOnceOrNotAtAll",
+     kTwenty,
+     {draw(), press(30, kTop), drag(0, -500),
+      call<Results>([](Results& results) { results.read("a\nb\n"); }), top(), drag(0, 499), top(),
+      drag(0, 500), top()},
+     "press+ hover+ <none> hover+ <none> hover+ <0>"},
+    {"OnlyBeforeAnEndOfHitsItIsClicked",
+     kClickable,
+     {press(30, kTop), release(30, 0)},
+     "press+ click release+"},
+    {"ARowIsNotClicked", resultsOf("a\n"), {press(30, kTop), release()}, "press+ release+"},
+    {"ALongerOneDoesNot",
+     kClickable,
+     {press(30, kTop), drag(0, -29), drag(0, 29), release()},
+     "press+ hover+ hover+ release+"},
+    {"OneFingerHoldsItAndIsFollowed",
+     kClickable,
+     {finger(3), press(30, kTop - 1), press(30, kTop), lookAtHold(), finger(1), drag(1, 1),
+      longPress(), lookAtLog(), finger(3), longPress(), release(0, 0), lookAtHold()},
+     "- press+ <held 4> - - <[MPDWID] onRecvEvent-> T:3, F:1> - click release+ <held 0>"},
+    {"KeysAreTold", kClickable, {keyDown(9), keyUp(9), plug(9)}, "down9+ up9+ -"},
+};
+TEST_P(MpdWidPlays, TellTheirJournal) { expectJournal(GetParam()); }
+INSTANTIATE_TEST_SUITE_P(, MpdWidPlays, testing::ValuesIn(kPlays), kRowName);
 
 const std::string kWide = "\u00e4\u00e4\u00e4\u00e4\u00e4\u00e4\u00e4";
 const std::string kLong(300, 'x');
-// With the rows that they become: marker and place, head, level, name, value.
-const std::vector<pair<std::string, std::string>> kTexts = {
-    {"12 [2] [MPDIA] Wi-Fi]ok]\nend", "[*]|0 12 [2] [MPDIA] Wi-|[2]|Wi-Fi|ok]|"},
-    {"[1]" + kWide + "\u00e4[MPDIA]:v\n", "[*]|0 [1]" + kWide + "|[1]|no name|:v|"},
-    {"\n[ -5][MPDIA]]]x\n", "[*]|0 \n[ -5][MPDIA]]]x|[-5]||x|"},
-    {"[+-7][MPDIA]\n", "[*]|0 [+-7][MPDIA]|[1]|no name||"},
-    {"]2\n[2147483648][MPDIA]\n\n[MPDIA]", "[>]|0 ]2|[1]|no name|]2|[*]|142 |[1]|no name||"},
-    {"[0] [MPDIA] " + kLong + ']' + kLong + '\n',
-     "[*]|0 [0] [MPDIA] xxxxxx|[1]|" + kLong.substr(173) + '|' + kLong.substr(173) + '|'},
-};
 
-TEST_F(MpdWidTest, ReadsAnyText) {
-  List list("");
-  for (const auto& [lines, drawn] : kTexts) {
-    list.read(lines);
-    list.init_mpd_buf();  // the rows do not need it
-    EXPECT_EQ(rows(list, 5), drawn);
-  }
-  for (const int index : {-1, 64, INT_MAX}) list.setListType(index, 0);
-  for (const int index : {-1, 64, INT_MAX}) list.addIndex(index, true, 1, "", "", nullptr);
-  for (const auto& [length, count] : {pair(99, 3U), pair(3, 2U), pair(0, 0U), pair(INT_MIN, 0U)}) {
-    list.cal_line("a\nb\nc\n\0d\n", length);
-    EXPECT_EQ(shown(list).size(), 5 * count + 2) << "to the NUL, or the byte of that number";
-  }
-  list.read(std::string(99, '\n'));
+struct Line : Row {
+  std::string text;
+  std::string cells;  // of the first row: marker, head, level, name, value
+};
+const auto kLines = std::to_array<Line>({
+    {"NameAndValue", "12 [2] [MPDIA] Wi-Fi]ok]\nend", "[*]|12 [2] [MPDIA] Wi-|[2]|Wi-Fi|ok]|"},
+    {"ValueAlone", "[1]" + kWide + "\u00e4[MPDIA]:v\n", "[*]|[1]" + kWide + "|[1]|no name|:v|"},
+    {"EmptyName", "\n[ -5][MPDIA]]]x\n", "[*]|\n[ -5][MPDIA]]]x|[-5]||x|"},
+    {"NoNumber", "[+-7][MPDIA]\n", "[*]|[+-7][MPDIA]|[1]|no name||"},
+    {"NoBracket", "]2\n[2147483648][MPDIA]\n\n[MPDIA]", "[>]|]2|[1]|no name|]2|"},
+    {"LongTexts", "[0] [MPDIA] " + kLong + ']' + kLong + '\n',
+     "[*]|[0] [MPDIA] xxxxxx|[1]|" + kLong.substr(173) + '|' + kLong.substr(173) + '|'},
+});
+class MpdLine : public WidgetTest, public testing::WithParamInterface<Line> {};
+
+TEST_P(MpdLine, IsTakenApart) {
+  Results results(GetParam().text);
+  results.init_mpd_buf();  // the rows do not need it
+  std::vector<Drawing> row = cells(results);
+  row.resize(5);
+  EXPECT_EQ(words(row), GetParam().cells);
+}
+INSTANTIATE_TEST_SUITE_P(, MpdLine, testing::ValuesIn(kLines), kRowName);
+
+TEST_F(MpdWidTest, CountsLinesUpToTheNulOrTheLength) {
+  Results results("");
+  const auto count = [&results](int length) {
+    results.cal_line("a\nb\nc\n\0d\n", length);
+    return cells(results).size() / 5;
+  };
+  EXPECT_EQ(count(99), 3U);
+  EXPECT_EQ(count(3), 2U) << "the byte of that number, too";
+  EXPECT_EQ(count(0), 0U);
+  EXPECT_EQ(count(INT_MIN), 0U);
+  results.cal_line(nullptr, 9);
+  EXPECT_TRUE(cells(results).empty());
+  results.read(std::string(99, '\n'));
   EXPECT_EQ(platform().takeLog().back().message, "[MPDWID] addIndex, index : 63");
 }
 
-TEST_F(MpdWidTest, RowsOpenAndCloseByDoubleTaps) {
-  List list("[1]\n[2]\n[3]\n[2]\n[1]\n[2]\n[3]\n");
-  EXPECT_EQ(rows(list), "[>]|0 [>]|142 [*]|284 ") << "the last row is never hidden";
-  // The third tap, one that comes too late, one on an edge, and one on another row count for none.
-  std::istringstream taps("0 141 0 1 1 1 501 143 502 143 503 142 2000 9 2001 143 4000 1 4499 1");
-  std::string seen;
-  for (int time = 0, y = 0; taps >> time >> y;) {
-    platform().ticks = 1000 + static_cast<unsigned int>(time);
-    press(list, {30, 561 + y});
-    release(list, {30, 561 + y});
-    seen += std::to_string(shown(list).size() / 5);
+TEST_F(MpdWidTest, RowsAreChangedByNumber) {
+  Results results("a\n");
+  for (const int index : {-1, 1, 64, INT_MAX}) {
+    results.setListType(index, 0);
+    results.setBGColor(index, 5);
   }
-  EXPECT_EQ(seen, "3555555663");
-  EXPECT_EQ(rows(list) + std::to_string(list.Max_height()), "[>]|0 [>]|142 [*]|284 425");
-}
-
-TEST_F(MpdWidTest, ScrollsBetweenItsEnds) {
-  List list(std::string(21, '\n'));  // 20 rows, 2839 high, 840 too many
-  std::string seen;
-  for (const int by : {0, -143, 1, INT_MIN, INT_MAX, -500, 499, 500}) {
-    if (by == 499) list.read("a\nb\n");  // few rows come back from above at once or not at all
-    rows(list);
-    list.onHover({0, 0, 0, 0, 0, by});
-    seen += rows(list).substr(0, 8);
-  }
-  EXPECT_EQ(seen, "[*]|0 [*[*]|-1 [[*]|-142[*]|-130[*]|0 [*[*]|-74 [*]|0 [*");
-  EXPECT_EQ(list.position2index({0, 0, 0, 2 * 561 + 1, 0, 0}), 0) << "the top counts twice";
-}
-
-std::string told;
-
-TEST_F(MpdWidTest, TellsClicksFromDragsAndMayBeDeleted) {
-  for (const auto& [slip, expected] : {pair(28, "pcr"), pair(-29, "pr"), pair(0, "pr")}) {
-    auto* const list = new List("a\nb\n");
-    list->setListType(0, slip == 0 ? 1 : 0);
-    list->press_cb = [](auto*, auto*) { told += 'p'; };
-    list->click_cb = [](auto*, auto*) { told += 'c'; };
-    list->release_cb = [](auto*, auto* sender) { told += 'r', delete sender; };
-    EXPECT_FALSE(press(*list, {30, 560}));
-    press(*list, {30, 561});
-    for (const int by : {slip, -slip}) list->inClick(0, by);
-    offer(*list, {MW::kEventLongPress, {{0, 1, 30, 561, 0, 0}}});
-    EXPECT_EQ(platform().takeLog().back().message, "[MPDWID] onRecvEvent-> T:3, F:1");
-    release(*list, {30, 0});
-    EXPECT_EQ(std::exchange(told, ""), expected);
-  }
+  for (const int index : {-1, 64, INT_MAX}) results.addIndex(index, true, 1, "", "", nullptr);
+  EXPECT_EQ(results.Max_height(), -1) << "before the first drawing";
+  EXPECT_EQ(cells(results).at(2).rect.color, 0xFFBFBFBF);
+  EXPECT_EQ(results.Max_height(), 141);
+  results.addIndex(0, true, 4, "head", "name", nullptr);
+  results.setBGColor(0, 5);
+  const std::vector<Drawing> row = cells(results);
+  EXPECT_EQ(words(row), "[>]|head|[4]|name||");
+  EXPECT_EQ(row.at(0).rect.color, 0xFFFFFF00);
+  EXPECT_EQ(row.at(1).rect.color, 5U);
+  EXPECT_EQ(results.position2index({0, 0, 0, 2 * kTop + 1, 0, 0}), 0) << "the top counts twice";
+  EXPECT_EQ(results.position2index({0, 0, 0, 2 * kTop, 0, 0}), -100);
 }
 
 }  // namespace

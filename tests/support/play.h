@@ -199,6 +199,13 @@ struct Play : Row {
   Steps steps;
   std::string journal;
 };
+/// Makes rows of plays on one widget.
+struct PlaysOn {
+  Maker make;
+  Play operator()(const char* name, const Steps& steps, const char* journal) const {
+    return {name, make, steps, journal};
+  }
+};
 /// Plays a row, and again for each of its callbacks, which then deletes the widget.
 inline void expectJournal(const Play& play) {
   EXPECT_EQ(played(play.make, play.steps), play.journal);

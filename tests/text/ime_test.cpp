@@ -3,42 +3,93 @@
 #include <array>
 
 #include "support/drawings.h"
+#include "support/play.h"
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+using ImePlays = PlayTest;
 using ImeTest = WidgetTest;
+using MW::Ime;
 
-struct Keyboard : MW::Ime {
-  explicit Keyboard(SKIA_Rect area = {0, 0, 720, 600, 5}) : Ime(&area, nullptr) {}
-  void touch(const char* labels) {
+constexpr SKIA_Rect kArea = {0, 0, 720, 600, 5};  // keys of 72 x 100
+
+struct Keyboard : Ime {
+  explicit Keyboard(SKIA_Rect area = kArea) : Ime(&area, nullptr) {}
+  // Presses the keys of these labels.
+  void touch(const std::string& labels) {
     std::istringstream each(labels);
     for (std::string label; each >> label;) {
-      const SKIA_Rect at = placeOf(shown(*this), label);
-      EXPECT_TRUE(press(*this, {at.x + at.w / 2, at.y + at.h / 2})) << label;
+      const SKIA_Rect key = placeOf(shown(*this), label);
+      EXPECT_TRUE(press(*this, {key.x + key.w / 2, key.y + key.h / 2})) << label;
     }
   }
   std::string bar() { return shown(*this).at(1).text.text; }
 };
 
-TEST_F(ImeTest, TypesWhatTheTouchedKeysSay) {
-  static constexpr auto kTypings = std::to_array<std::array<const char*, 3>>({
-      {"back fold a space b enter", "a b", "a b"},
-      {"1 shift 1 Q shift 1 \\ ? shift 1 q enter", "11Q1\\?1q", "11Q1\\?1q"},
-      {"q w e r t y u i o p a s d f g h enter space", "qwertyuiopasdfg", "qwertyuiopasdfg"},
-      {"q w e r t y u i o p a s d f g back z back back", "qwertyuiopasd", ""},
-      {"a b c d enter fold x y enter", "xy", "xycd"},  // the old tail
-  });
-  for (const auto& [touches, bar, result] : kTypings) {
-    Keyboard keyboard;
-    keyboard.touch(touches);
-    EXPECT_EQ(keyboard.bar(), bar);
-    EXPECT_STREQ(keyboard.getResultString(), result);
-    keyboard.typing_reset();
-    keyboard.touch("7 enter");
-    EXPECT_STREQ(keyboard.getResultString(), "7");
-  }
+struct Typing : Row {
+  const char* touches;
+  const char* bar;
+  const char* result;
+};
+constexpr auto kTypings = std::to_array<Typing>({
+    {"FoldTakesTheTextAway", "back a fold a space b enter", "a b", "a b"},
+    {"ShiftGoesThroughTheLayouts", "1 shift 1 Q shift 1 \\ ? shift 1 q enter", "11Q1\\?1q",
+     "11Q1\\?1q"},
+    {"FifteenBytesAreKept", "q w e r t y u i o p a s d f g h enter space", "qwertyuiopasdfg",
+     "qwertyuiopasdfg"},
+    {"BackInAFullBar", "q w e r t y u i o p a s d f g back z back back", "qwertyuiopasd", ""},
+    {"AShorterResultKeepsTheOldTail", "a b c d enter fold x y enter", "xy", "xycd"},
+});
+class ImeTyping : public WidgetTest, public testing::WithParamInterface<Typing> {};
+
+TEST_P(ImeTyping, TypesWhatTheTouchedKeysSay) {
+  Keyboard keyboard;
+  keyboard.touch(GetParam().touches);
+  EXPECT_EQ(keyboard.bar(), GetParam().bar);
+  EXPECT_STREQ(keyboard.getResultString(), GetParam().result);
+  keyboard.typing_reset();
+  keyboard.touch("7 enter");
+  EXPECT_STREQ(keyboard.getResultString(), "7");
 }
+INSTANTIATE_TEST_SUITE_P(, ImeTyping, testing::ValuesIn(kTypings), kRowName);
+
+std::unique_ptr<MW::Widget> keyboard() {
+  auto keyboard = std::make_unique<Keyboard>();
+  keyboard->press_cb = [](int zero, Ime*) { noteZero("press", zero); };
+  keyboard->release_cb = [](int zero, Ime* sender) {
+    noteZero(sender == stage.widget.get() ? "release" : "stranger", zero);
+  };
+  keyboard->long_press_cb = [](int zero, Ime*) { noteZero("long", zero); };
+  keyboard->double_tap_cb = [](int zero, Ime*) { noteZero("double", zero); };
+  return keyboard;
+}
+// What no event reaches.
+Step pressByHand() {
+  return call([](MW::Widget& keyboard) {
+    MW::event_data event = pointerEvent(MW::kEventPress, {9, 9});
+    keyboard.onPress(&event);
+  });
+}
+
+const std::vector<Play> kPlays = {
+    {"ReleaseFollowsAKey",
+     keyboard,
+     {press(9, 150), lookAtHold(), release()},
+     "+ <held 0> release+"},
+    {"ReleaseOutsideIsNotTold", keyboard, {press(9, 150), release(9, 600)}, "+ -"},
+    {"ALongPressIsTold", keyboard, {longPress(9, 150), moveTo(9, 151)}, "long+ -"},
+    {"APressByHandHoldsAndCountsTaps",
+     keyboard,
+     {pressByHand(), lookAtHold(), moveTo(900, 900), release(9, 9), pressByHand(), release()},
+     "press <held 1> + release+ press release double+"},
+    {"TakesNothingOnceItHasATime",
+     keyboard,
+     {call(&MW::Widget::onShowTimer, 5), press(9, 150), later(9), release()},
+     "- -"},
+};
+TEST_P(ImePlays, TellTheirJournal) { expectJournal(GetParam()); }
+INSTANTIATE_TEST_SUITE_P(, ImePlays, testing::ValuesIn(kPlays), kRowName);
 
 TEST_F(ImeTest, DigitsAloneGreyTheRest) {
   Keyboard keyboard;
@@ -52,7 +103,7 @@ TEST_F(ImeTest, DigitsAloneGreyTheRest) {
   keyboard.touch("fold");
   EXPECT_TRUE(keyboard.get_fold_status());
   EXPECT_EQ(platform().properties["brimol.info_1.ime_flag"], "true");
-  keyboard.keyboard_change(0);
+  keyboard.keyboard_change(Ime::kSmall);
   EXPECT_EQ(placeOf(shown(keyboard), "q").color, MW::kColorWhite);
 }
 

@@ -2,20 +2,22 @@
 
 #include <algorithm>
 #include <array>
-#include <random>
 
 #include "support/drawings.h"
+#include "support/play.h"
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+using StaticTextPlays = PlayTest;
 using StaticTextTest = WidgetTest;
 
 constexpr SKIA_Rect kFourRows = {0, 0, 20, 60, 3};  // of ten bytes
+const SKIA_Text kLooks = textRecord("", 7, 1, 10);
 
 struct Viewer : MW::StaticText {
   using StaticText::top_index, StaticText::w_count;
-  explicit Viewer(SKIA_Rect area, SKIA_Text looks = textRecord("", 7, 1, 10), bool numbers = true)
+  explicit Viewer(SKIA_Rect area, SKIA_Text looks = kLooks, bool numbers = true)
       : StaticText(&area, &looks, numbers, true, true) {}
   std::string rows(int top) {
     top_index = top;
@@ -27,7 +29,7 @@ struct Viewer : MW::StaticText {
     get_ime_result(wanted.c_str());
     line_search(log.c_str());
     std::string tops = std::to_string(top_index);
-    for (const unsigned int direction : {1U, 1U, 0U, 0U}) {
+    for (const unsigned int direction : {kNext, kNext, kPrevious, kPrevious}) {
       line_search_point(direction);
       tops += std::to_string(top_index);
     }
@@ -35,58 +37,60 @@ struct Viewer : MW::StaticText {
   }
 };
 
-// Behind a text of several rows an empty one is drawn.
-TEST_F(StaticTextTest, CutsTextsAndFindsTheirLines) {
-  const std::string x(1000, 'x');
-  const std::array<std::array<std::string, 4>, 9> searches = {{
-      {"", "ab", "00000", "00001: |no log|"},
-      {"0123456789\nx", "6", "00000", "00001:|0123456789||00002:|x||"},
-      {"12345678\xE2\x82\xACx", "89", "00000", "00001:|12345678|\xE2\x82\xACx||"},
-      {"a\nab and more\nc\nd", "ab", "11111", "00001:|a|00002:|!ab and mor|!e|00003:|c|"},
-      {"a\nb\nab\nd\nab\nf\n\n\nz", "ab", "24422", "00001:|a|00002:|b|00003:|!ab|00004:|d|"},
-      // No further than the last page; the last row counts as the first; no line is counted.
-      {"ab\nb\nc\nd\ne\nab\nz", "ab", "03300", "00001:|!ab|00002:|b|00003:|c|00004:|d|"},
-      {"a\nab\nb\nc\nab", "ab", "11100", "00001:|a|00002:|!ab|00003:|b|00004:|c|"},
-      {"a\nb\nc\nb", "\nb", "00000", "00001:|!a|00002:|b|00003:|c|00004:|b|"},
-      {"b\n" + x.substr(901), x, "11111", "00001:|b|00002:|!xxxxxxxxxx|!xxxxxxxxxx|!xxxxxxxxxx|"},
-  }};
+const std::string kLong(1000, 'x');
+
+struct Search : Row {
+  std::string text, wanted, tops;
+  std::string rows;  // from the top on; behind a text of several rows an empty one is drawn
+};
+const auto kSearches = std::to_array<Search>({
+    {"NoText", "", "ab", "00000", "00001: |no log|"},
+    {"ASingleByteIsNotFound", "0123456789\nx", "6", "00000", "00001:|0123456789||00002:|x||"},
+    {"AcrossRowsOfALine", "12345678\xE2\x82\xACx", "89", "00000",
+     "00001:|12345678|\xE2\x82\xACx||"},
+    {"AllRowsOfALineAreMarked", "a\nab and more\nc\nd", "ab", "11111",
+     "00001:|a|00002:|!ab and mor|!e|00003:|c|"},
+    {"StepsForthAndBack", "a\nb\nab\nd\nab\nf\n\n\nz", "ab", "24422",
+     "00001:|a|00002:|b|00003:|!ab|00004:|d|"},
+    {"NoFurtherThanTheLastPage", "ab\nb\nc\nd\ne\nab\nz", "ab", "03300",
+     "00001:|!ab|00002:|b|00003:|c|00004:|d|"},
+    {"TheLastRowCountsAsTheFirst", "a\nab\nb\nc\nab", "ab", "11100",
+     "00001:|a|00002:|!ab|00003:|b|00004:|c|"},
+    {"WithAnEndNoLineIsCounted", "a\nb\nc\nb", "\nb", "00000",
+     "00001:|!a|00002:|b|00003:|c|00004:|b|"},
+    {"NinetyNineBytesAreWanted", "b\n" + kLong.substr(901), kLong, "11111",
+     "00001:|b|00002:|!xxxxxxxxxx|!xxxxxxxxxx|!xxxxxxxxxx|"},
+});
+class StaticTextSearch : public WidgetTest, public testing::WithParamInterface<Search> {};
+
+TEST_P(StaticTextSearch, FindsAndMarksLines) {
   Viewer viewer(kFourRows);
-  for (const auto& [text, wanted, tops, rows] : searches) {
-    EXPECT_EQ(viewer.found(text, wanted), tops);
-    EXPECT_EQ(viewer.rows(0), rows);
-  }
-  viewer.setText(std::string(123456, '\n').c_str());
-  EXPECT_EQ(viewer.rows(viewer.find_real_num(123456)), "99999:||99999:||99999:||99999:||");
-  Viewer plain(kFourRows, textRecord("", 7, 1, 10), false);
+  EXPECT_EQ(viewer.found(GetParam().text, GetParam().wanted), GetParam().tops);
+  EXPECT_EQ(viewer.rows(0), GetParam().rows);
+}
+INSTANTIATE_TEST_SUITE_P(, StaticTextSearch, testing::ValuesIn(kSearches), kRowName);
+
+TEST_F(StaticTextTest, WithoutNumbersTheRedGoesOn) {
+  Viewer plain(kFourRows, kLooks, false);
   plain.found("a\nab\nc\nd", "ab");
   EXPECT_EQ(plain.rows(0), "a|!ab|!c|!d|");
-  EXPECT_EQ(plain.rows(2), "!c|!d|!|") << "in the next frame too";
+  EXPECT_EQ(plain.rows(0), "!a|!ab|!c|!d|") << "in the next frame everywhere";
 }
 
-TEST_F(StaticTextTest, DrawnRowsGiveTheTextBack) {
-  constexpr std::array kPieces = {"word", "\n", "\r\x02\x03", "\xE2\x82\xAC", "\x80\x80\x80\xFF"};
-  Viewer viewer({0, 0, 0, 10'000, 0});
-  std::minstd_rand random(5);
-  for (int round = 0; round < 300; ++round) {
-    std::string text;
-    for (auto i = random() % 200; i > 0; --i) text += kPieces.at(random() % 5);
-    viewer.w_count = static_cast<int>(random() % 140) - 5;
-    viewer.setText((text + '\n').c_str());
-    std::string joined;
-    for (const Drawing& each : shown(viewer)) {
-      joined += each.text.color == MW::kColorBlue ? "\n" : each.text.text;
-      EXPECT_LE(each.text.text.size(), std::clamp(viewer.w_count, 6, 127));
-    }
-    std::erase_if(text, [](char c) { return c == '\r' || c == '\x02' || c == '\x03'; });
-    EXPECT_EQ(joined, '\n' + text);
-  }
+TEST_F(StaticTextTest, FindsALineByItsNumber) {
+  Viewer viewer(kFourRows);
+  viewer.setText(std::string(123456, '\n').c_str());
+  EXPECT_EQ(viewer.rows(viewer.find_real_num(123456)), "99999:||99999:||99999:||99999:||");
+  viewer.top_index = 7;
+  EXPECT_EQ(viewer.find_real_num(123457), 7) << "no such line";
 }
 
 TEST_F(StaticTextTest, ALongPressOnTheBarScrollsAClock) {
   platform().properties["brimol.info.type"] = "cpu";
-  Viewer viewer({100, 50, 350, 700, 5}, textRecord("", 7, 2, 20));
+  Viewer viewer({100, 50, 350, 700, 5}, textRecord("first", 7, 2, 20));
   EXPECT_EQ(viewer.w_count, 88);
   viewer.setText(std::string(66, '\n').c_str());  // of which 33 are in view
+  EXPECT_STREQ(viewer.getText(), "first");
   EXPECT_EQ(places(shown(viewer)).substr(0, 46), "100,50 350x700|110,70 350x20|190,70 350x20|110");
   for (const auto& [y, top] : {std::pair(224, 50), {225, 166}, {400, 283}, {749, 400}, {60, 50}}) {
     longPress(viewer, {422, y});
@@ -96,22 +100,45 @@ TEST_F(StaticTextTest, ALongPressOnTheBarScrollsAClock) {
   EXPECT_EQ(viewer.w_count, 0) << "it knows of its numbers by now";
 }
 
-TEST_F(StaticTextTest, AFingerScrollsAndTaps) {
-  static int doubles = 0;
-  Viewer viewer(kFourRows);
-  viewer.setText("1\n2\n3\n4\n5\n6");
-  viewer.double_tap_cb = [](int zero) { doubles += zero + 1; };
-  for (const unsigned int ticks : {1000U, 1400U, 1800U, 2300U, 2500U}) {
-    platform().ticks = ticks;
-    press(viewer, {5, 5});
-    for (int i = 0; i < 3; ++i) offer(viewer, {MW::kEventMotion, {{0, 0, 5, 5, 0, -9}}});
-    EXPECT_EQ(viewer.top_index, std::min((ticks - 1000) / 400, 2U)) << "by every fourth motion";
-    release(viewer, {5, 5});
-    EXPECT_EQ(doubles, ticks < 1400 ? 0 : 1) << "not a third, nor one that comes late";
-  }
-  viewer.onShowTimer(100);
-  EXPECT_FALSE(press(viewer, {5, 5})) << "for good";
+std::unique_ptr<MW::Widget> sixRows() {
+  auto viewer = std::make_unique<Viewer>(kFourRows);
+  viewer->setText("1\n2\n3\n4\n5\n6");
+  viewer->press_cb = [](int zero) { noteZero("press", zero); };
+  viewer->release_cb = [](int zero) { noteZero("release", zero); };
+  viewer->long_press_cb = [](int zero) { noteZero("long", zero); };
+  viewer->double_tap_cb = [](int zero) { noteZero("double", zero); };
+  return viewer;
 }
+std::unique_ptr<MW::Widget> withoutScroll() {
+  return std::make_unique<MW::StaticText>(&kFourRows, &kLooks, true, false, true);
+}
+Step top() {
+  return look<Viewer>([](Viewer& viewer) { return viewer.top_index; });
+}
+
+const std::vector<Play> kPlays = {
+    {"EveryFourthMotionScrolls",
+     sixRows,
+     {press(5, 5), drag(0, -9), drag(0, -9), drag(0, -9), top(), drag(0, -9), top(), drag(0, -9),
+      drag(0, -9), drag(0, -9), drag(0, 1), top()},
+     "press+ + + + <0> + <1> + + + + <0>"},
+    {"TellsTheSecondOfTwoTaps",
+     sixRows,
+     {press(5, 5), release(), press(), release(), press(), release(), lookAtLog()},
+     "press+ release+ press+ release double+ press+ release+ <[STATICTEXT] released!!>"},
+    {"ALongPressIsTold", sixRows, {longPress(5, 5), moveTo(6, 6)}, "long+ -"},
+    {"TakesNothingOnceItHasATime",
+     sixRows,
+     {call(&MW::Widget::onShowTimer, 100), lookAtRedraw(), press(5, 5), later(100), timer(),
+      lookAtRedraw(), timer(), lookAtRedraw()},
+     "<redraw> - <redraw> <redraw>"},
+    {"WithoutScrollItTakesAllAndDoesNothing",
+     withoutScroll,
+     {press(900, 900), lookAtHold(), keyDown(5)},
+     "+ <held 0> +"},
+};
+TEST_P(StaticTextPlays, TellTheirJournal) { expectJournal(GetParam()); }
+INSTANTIATE_TEST_SUITE_P(, StaticTextPlays, testing::ValuesIn(kPlays), kRowName);
 
 TEST_F(StaticTextTest, NoSizeLeadsOutOfBounds) {
   SKIA_Text looks = {};
@@ -121,9 +148,9 @@ TEST_F(StaticTextTest, NoSizeLeadsOutOfBounds) {
       looks.size = size;
       Viewer viewer({INT_MAX, INT_MIN, length, length, 0}, looks);
       viewer.line_search(nullptr);
-      viewer.found(std::string(1'000'000, 'y'), "yyy");
+      viewer.found(std::string(10'000, 'y'), "yyy");
       for (const int y : {INT_MIN, INT_MAX}) longPress(viewer, {INT_MAX, y});
-      EXPECT_EQ(viewer.rows(99).find("outside"), std::string::npos);
+      EXPECT_EQ(shown(viewer).front().rect.h, length);
     }
   }
 }

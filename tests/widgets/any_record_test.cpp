@@ -1,4 +1,4 @@
-// What every widget of this room bears: records and screens that no machine has, no records at all,
+// What every widget of this room bears: screens and records that no machine has, no records at all,
 // and being shown without a time.
 
 #include <MW/MW.h>
@@ -13,75 +13,50 @@ namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 
-enum class Untimed { Drawn, Nothing };
+using Made = std::unique_ptr<MW::Widget>;
+using Area = const SKIA_Rect*;
+using Text = const SKIA_Text*;
 
 struct Kind : Row {
-  std::unique_ptr<MW::Widget> (*make)(const SKIA_Rect* area, const SKIA_Text* text);
-  std::ptrdiff_t texts;  // how many of the constructor's and the setters' texts it draws
-  Untimed untimed = Untimed::Drawn;
-};
-class AnyRecord : public WidgetTest, public testing::WithParamInterface<Kind> {
- protected:
-  void TearDown() override {
-    stage.widget.reset();
-    WidgetTest::TearDown();
+  Made (*construct)(Area area, Text text);
+  std::ptrdiff_t texts;  // that it draws of those that it was given
+  bool isDrawnUntimed = true;
+
+  Made make(Area area, Text text) const {
+    auto made = construct(area, text);
+    made->onHideTimer(INT_MAX);
+    made->onProgressbar(INT_MAX);
+    return made;
   }
 };
+class AnyRecord : public WidgetTest, public testing::WithParamInterface<Kind> {};
 
-std::unique_ptr<MW::Widget> shownForAWhile(std::unique_ptr<MW::Widget> widget) {
-  widget->onHideTimer(INT_MAX);
-  widget->onProgressbar(INT_MAX);
-  return widget;
+template <typename Widget, typename... Arguments>
+Made make(Arguments... arguments) {
+  return std::make_unique<Widget>(arguments...);
 }
-
-template <typename Widget>
-std::unique_ptr<MW::Widget> of(const SKIA_Rect* area, const SKIA_Text* text) {
-  return std::make_unique<Widget>(area, text);
-}
-template <typename Widget, int number>
-std::unique_ptr<MW::Widget> numbered(const SKIA_Rect* area, const SKIA_Text* text) {
-  return std::make_unique<Widget>(number, area, text);
-}
-template <typename Widget>
-std::unique_ptr<MW::Widget> sliding(const SKIA_Rect* area, const SKIA_Text* text) {
-  return std::make_unique<Widget>(0, area, text, text);
-}
+int bottomOf(Area area) { return area != nullptr ? area->y : 0; }
 
 const std::vector<Kind> kKinds = {
-    {"Button", of<MW::Button>, 1},
-    {"Button3",
-     [](const SKIA_Rect* area, const SKIA_Text* text) -> std::unique_ptr<MW::Widget> {
-       return std::make_unique<MW::Button3>(5, text, text, area != nullptr ? area->y : 0);
-     },
-     2},
-    {"ButtonS", of<MW::ButtonS>, 1},
-    {"ButtonNew", numbered<MW::ButtonNew, 2>, 1},
-    {"Button8", numbered<MW::Button8, 3>, 0},
-    {"Screen",
-     [](auto*, auto*) -> std::unique_ptr<MW::Widget> { return std::make_unique<MW::Screen>(); }, 0},
-    {"FullScreen",
-     [](auto*, auto*) -> std::unique_ptr<MW::Widget> {
-       return std::make_unique<MW::FullScreen>(1);
-     },
-     0},
-    {"Slide", sliding<MW::Slide>, 2},
-    {"SlideV", sliding<MW::SlideV>, 2},
-    {"SlideE", sliding<MW::SlideE>, 1},
-    {"SlideMove",
-     [](const SKIA_Rect* area, const SKIA_Text*) -> std::unique_ptr<MW::Widget> {
-       return std::make_unique<MW::SlideMove>(area, 20, 0, 100, 50);
-     },
-     0},
-    {"Key", [](auto*, auto*) -> std::unique_ptr<MW::Widget> { return std::make_unique<MW::Key>(); },
-     0},
-    {"Toastbox",
-     [](const SKIA_Rect* area, const SKIA_Text* text) -> std::unique_ptr<MW::Widget> {
-       return std::make_unique<MW::Toastbox>(area, text, text);
-     },
-     2, Untimed::Nothing},
-    {"Progressbar", numbered<MW::Progressbar, 0>, 1, Untimed::Nothing},
+    {"Button", make<MW::Button>, 1},
+    {"Button3", [](Area a, Text t) { return make<MW::Button3>(5, t, t, bottomOf(a)); }, 2},
+    {"ButtonS", make<MW::ButtonS>, 1},
+    {"ButtonNew", [](Area a, Text t) { return make<MW::ButtonNew>(2, a, t); }, 1},
+    {"Button8", [](Area a, Text t) { return make<MW::Button8>(5, a, t); }, 0},
+    {"Screen", [](Area, Text) { return make<MW::Screen>(); }, 0},
+    {"FullScreen", [](Area, Text) { return make<MW::FullScreen>(1); }, 0},
+    {"Slide", [](Area a, Text t) { return make<MW::Slide>(0, a, t, t); }, 2},
+    {"SlideV", [](Area a, Text t) { return make<MW::SlideV>(0, a, t, t); }, 2},
+    {"SlideE", [](Area a, Text t) { return make<MW::SlideE>(0, a, t, t); }, 1},
+    {"SlideMove", [](Area a, Text) { return make<MW::SlideMove>(a, 20, 0, 100, 50); }, 0},
+    {"Key", [](Area, Text) { return make<MW::Key>(); }, 0},
+    {"Toastbox", [](Area a, Text t) { return make<MW::Toastbox>(a, t, t); }, 2, false},
+    {"Progressbar", [](Area a, Text t) { return make<MW::Progressbar>(0, a, t); }, 1, false},
 };
 INSTANTIATE_TEST_SUITE_P(, AnyRecord, testing::ValuesIn(kKinds), kRowName);
+
+const std::string kLongest(127, 'x');
+constexpr auto kHostile = {0, 1, 7, -1, -1080, INT_MIN, INT_MAX};
 
 const Steps kTouches = {press(9, INT_MAX),
                         drag(INT_MIN, INT_MAX),
@@ -92,48 +67,35 @@ const Steps kTouches = {press(9, INT_MAX),
                         keyUp(5),
                         plug(2)};
 
-TEST_P(AnyRecord, IsDrawnCutAndTouchedOnAnyScreen) {
+// Touches a widget of such an area, and says how many of its texts fill their record.
+std::ptrdiff_t longTexts(const Kind& kind, const SKIA_Rect& area) {
   SKIA_Text endless = {};
   std::ranges::fill(endless.text, 'x');
   endless.string_len = endless.size = INT_MAX;
-  const std::string longest(127, 'x');
-  const auto isLongest = [&](const Drawing& each) { return each.text.text == longest; };
-  for (const int w : {0, 1, 7, -1, -1080, INT_MIN, INT_MAX}) {
-    for (const int h : {0, 1, 7, -1, -1080, INT_MIN, INT_MAX}) {
+  played([&] { return kind.make(&area, &endless); }, kTouches);
+  const Made made = kind.make(&area, &endless);
+  made->setText(std::string(300, 'x').c_str());
+  made->setMsg(std::string(300, 'x').c_str());
+  const auto isLongest = [](const Drawing& each) { return each.text.text == kLongest; };
+  return std::ranges::count_if(shown(*made), isLongest);
+}
+
+TEST_P(AnyRecord, IsDrawnCutAndTouchedOnAnyScreen) {
+  for (const int w : kHostile) {
+    for (const int h : kHostile) {
       setScreen(w, h);
-      const SKIA_Rect area = {w, h, w, h, 0};
-      played([&] { return shownForAWhile(GetParam().make(&area, &endless)); }, kTouches);
-      stage.widget = shownForAWhile(GetParam().make(&area, &endless));
-      stage.widget->setText(std::string(300, 'x').c_str());
-      stage.widget->setMsg(std::string(300, 'x').c_str());
-      EXPECT_EQ(std::ranges::count_if(shown(*stage.widget), isLongest), GetParam().texts);
+      EXPECT_EQ(longTexts(GetParam(), {w, h, w, h, 0}), GetParam().texts);
     }
   }
 }
 
-// A second caption that is absent is left out.
-TEST_P(AnyRecord, AnAbsentRecordIsAnEmptyOne) {
-  const SKIA_Rect nowhere = {};
-  const SKIA_Text nothing = {};
-  std::vector<Drawing> empty = shown(*shownForAWhile(GetParam().make(&nowhere, &nothing)));
-  stage.widget = shownForAWhile(GetParam().make(nullptr, nullptr));
-  stage.widget->setRect(0, nullptr);
-  stage.widget->setText(nullptr);
-  EXPECT_FALSE(stage.widget->onRecvEvent(nullptr, 0));
-  const std::vector<Drawing> absent = shown(*stage.widget);
-  ASSERT_LE(absent.size(), empty.size());
-  empty.resize(absent.size());
-  EXPECT_EQ(absent, empty);
-}
-
-TEST_P(AnyRecord, ShownWithoutATimeItIsDrawnAsAtZero) {
-  const SKIA_Rect area = {10, 20, 400, 100, 5};
-  const SKIA_Text text = textRecord("text");
-  stage.widget = shownForAWhile(GetParam().make(&area, &text));
-  stage.widget->show();
+TEST_P(AnyRecord, WithoutRecordsItIsShownWithoutATimeAsAtZero) {
+  const Made made = GetParam().make(nullptr, nullptr);
+  made->setRect(0, nullptr);
+  EXPECT_FALSE(made->onRecvEvent(nullptr, 0));
+  made->show();
   const std::vector<Drawing> untimed = platform().takeDrawings();
-  const bool draws = GetParam().untimed == Untimed::Drawn;
-  EXPECT_EQ(untimed, draws ? shown(*stage.widget) : std::vector<Drawing>());
+  EXPECT_EQ(untimed, GetParam().isDrawnUntimed ? shown(*made) : std::vector<Drawing>());
 }
 
 }  // namespace

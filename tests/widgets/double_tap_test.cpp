@@ -1,41 +1,36 @@
 #include <MW/detail/double_tap.h>
 
-#include "support/widget_test.h"
+#include <initializer_list>
 
 namespace {
-
-using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 
 struct Tap {
   uint32_t pressed, released;
 };
-struct Taps : Row {
-  std::vector<Tap> taps;
-  std::vector<int> counts;  // 0: not counted
-};
-class DoubleTap : public testing::TestWithParam<Taps> {};
 
-TEST_P(DoubleTap, CountsTapsInARow) {
+// The count of each tap as a digit; 0: it does not count.
+constexpr int counts(std::initializer_list<Tap> taps) {
   MW::DoubleTap doubleTap;
-  std::vector<int> counts;
-  for (const Tap& tap : GetParam().taps) {
+  int digits = 0;
+  for (const Tap& tap : taps) {
     doubleTap.press(tap.pressed);
-    counts.push_back(doubleTap.isRunning() ? doubleTap.tap(tap.released) : 0);
+    digits = digits * 10 + (doubleTap.isRunning() ? doubleTap.tap(tap.released) : 0);
   }
-  EXPECT_EQ(counts, GetParam().counts);
+  return digits;
 }
+static_assert(counts({{1000, 1100}, {1200, 1300}, {1400, 1500}}) == 123);
 
-const std::vector<Taps> kTaps = {
-    {"EveryQuickTap", {{1000, 1100}, {1200, 1300}, {1400, 1500}}, {1, 2, 3}},
-    {"LastTickOfATap", {{1000, 1499}, {1600, 1700}}, {1, 2}},
-    {"ATapThatLastsTooLong", {{1000, 1500}, {1600, 1700}}, {0, 1}},
-    {"LastTickBetweenReleases", {{1000, 1100}, {1200, 1599}}, {1, 2}},
-    {"ALateRelease", {{1000, 1100}, {1200, 1600}}, {1, 0}},
-    {"APressThatIsNotYetStale", {{1000, 1100}, {1600, 1601}}, {1, 0}},
-    {"AStalePress", {{1000, 1100}, {1601, 1650}}, {1, 1}},
-    {"TickZeroStandsForNone", {{0, 0}, {900, 1000}, {1100, 1200}}, {0, 1, 2}},
-    {"TheWrapCutsASeriesShort", {{~15U, ~7U}, {2, 10}, {1000, 1100}, {1200, 1300}}, {0, 1, 1, 2}},
-};
-INSTANTIATE_TEST_SUITE_P(, DoubleTap, testing::ValuesIn(kTaps), kRowName);
+// The last tick of a tap, and of the time between two releases.
+static_assert(counts({{1000, 1499}, {1600, 1998}}) == 12);
+static_assert(counts({{1000, 1500}, {1600, 1700}}) == 1);
+static_assert(counts({{1000, 1100}, {1200, 1600}, {1700, 1800}}) == 101);
+
+// A press forgets a tap that is older than the time, and no younger one.
+static_assert(counts({{1000, 1100}, {1601, 1650}}) == 11);
+static_assert(counts({{1000, 1100}, {1600, 1601}}) == 10);
+
+// Tick 0 stands for none, and the wrap cuts a series short.
+static_assert(counts({{0, 0}, {900, 1000}, {1100, 1200}}) == 12);
+static_assert(counts({{~15U, ~7U}, {2, 10}, {1000, 1100}, {1200, 1300}}) == 112);
 
 }  // namespace

@@ -199,6 +199,8 @@ TEST_F(WidgetListTest, ChangesAnItemWithinItsRecord) {
   EXPECT_EQ(drawn(), std::vector{changed});
   List::setText(1, std::string(300, 'x').c_str(), 300);
   EXPECT_EQ(drawn()[0].text.text, std::string(127, 'x'));
+  List::setText(1, "ab\0cd", 5);
+  EXPECT_EQ(drawn()[0].text.text, std::string("ab\0cd", 5)) << "the count counts";
   SKIA_Text endless = {{}, INT_MAX, 0, 0, 0};
   endless.text[127] = 'y';
   List::addQueue(SKIA_LABEL, nullptr, nullptr, &endless);

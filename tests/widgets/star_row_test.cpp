@@ -1,49 +1,39 @@
 #include <MW/detail/star_row.h>
 
-#include <array>
+#include <initializer_list>
 
 #include "support/widget_test.h"
 
 namespace {
 
-using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
-
-// The steps that a row has taken after each of these ticks.
-template <std::size_t size>
-constexpr std::array<uint32_t, size> countsAfter(MW::StarRow row,
-                                                 std::array<uint32_t, size> ticks) {
-  for (uint32_t& tick : ticks) {
-    row.step(tick);
-    tick = row.count();
-  }
-  return ticks;
-}
-constexpr MW::StarRow startedAt(uint32_t tick) {
+// The steps after each of these ticks, as digits.
+constexpr uint32_t counts(uint32_t start, std::initializer_list<uint32_t> ticks) {
   MW::StarRow row;
-  row.restart(tick);
-  return row;
+  row.restart(start);
+  uint32_t digits = 0;
+  for (const uint32_t now : ticks) {
+    row.step(now);
+    digits = digits * 10 + row.count();
+  }
+  return digits;
 }
-static_assert(countsAfter(startedAt(1000), std::array{1100U, 1101U, 1201U, 1202U}) ==
-              std::array{0U, 1U, 1U, 2U});
-static_assert(countsAfter(startedAt(2000), std::array{1000U, 1100U, 1101U}) ==
-              std::array{1U, 1U, 2U});  // a start in the future
-static_assert(countsAfter(startedAt(~49U), std::array{50U, 51U, 151U}) == std::array{0U, 1U, 1U});
+static_assert(counts(1000, {1100, 1101, 1201, 1202}) == 112);
+static_assert(counts(2000, {1000, 1100, 1101}) == 112);  // a start in the future
+static_assert(counts(~49U, {50, 51, 151, 152}) == 112);  // over the wrap
 
-constexpr MW::StarRow delayedTo(MW::StarRow row, uint32_t tick) {
-  row.delay(tick);
-  return row;
+constexpr bool isDueAfterDelay(uint32_t delayedTo, uint32_t now) {
+  MW::StarRow row;
+  row.delay(delayedTo);
+  return row.isDue(now);
 }
-static_assert(!delayedTo(startedAt(1000), 1101).isDue(1201));
-static_assert(delayedTo(startedAt(1000), 1101).isDue(1202));
+static_assert(!isDueAfterDelay(1101, 1201) && isDueAfterDelay(1101, 1202));
 
-TEST(StarRow, ATextHasAtLeastOneStarAndAtMostWhatItsRecordHolds) {
-  const std::vector<std::pair<uint32_t, std::size_t>> lengths = {
-      {0, 1}, {1, 1}, {9, 9}, {127, 127}, {128, 127}, {~0U, 127}};
-  for (const auto& [stars, length] : lengths) {
+TEST(StarRow, TextsHaveAtLeastOneStarAndAtMostWhatTheirRecordHolds) {
+  for (const auto& [stars, length] : {std::pair(0U, 1), {1, 1}, {127, 127}, {~0U, 127}}) {
     SKIA_Text record = {};
     MW::putStars(record, stars);
-    EXPECT_EQ(std::string(record.text), std::string(length, '*'));
-    EXPECT_EQ(record.string_len, static_cast<int>(length));
+    EXPECT_EQ(record.text, std::string(static_cast<std::size_t>(length), '*'));
+    EXPECT_EQ(record.string_len, length);
   }
 }
 

@@ -15,7 +15,7 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kLeast = 10;  // per cent: darker, and nobody finds the slider
+constexpr int kLeast = 10;  // per cent; on a darker screen the slider cannot be found
 constexpr int kFull = 100;
 constexpr int kStep = 10;
 constexpr uint32_t kTrackColor = 0xFF2A3344;
@@ -33,7 +33,7 @@ class BrightnessTest : public PageTest {
       if (code == MW::kKeyDown) Current<BrightnessTest>::get().steps -= 1;
     };
     const SKIA_Rect area = rowOf(screenSize(), 46, 8, kTrackColor);
-    slider.emplace(&area, 0, kLeast, kFull, kFull);
+    slider.emplace(&area, MW::SlideMove::kValueKnob, kLeast, kFull, kFull);
     slider->setActive(1);
   }
 

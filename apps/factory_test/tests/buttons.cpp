@@ -37,7 +37,7 @@ class ButtonTest : public PageTest {
   }
 
   void leave() override {
-    for (std::size_t i = buttons.size(); i > 0; --i) buttons.at(i - 1).reset();
+    for (auto& button : buttons) button.reset();
     MW::WidgetList::destroy();
     page.endAsking();
   }

@@ -14,7 +14,7 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kColours = 5;  // of MW::FullScreen
+constexpr int kColours = MW::FullScreen::kGrey + 1;
 
 /// A tap, or the right key, shows the next colour. A double tap, or the select key, ends the look,
 /// and the verdict is asked for.
@@ -24,7 +24,7 @@ class ColourTest : public LookTest {
 
  protected:
   void beginLook() override {
-    colour.emplace(0).setActive(1);
+    colour.emplace(MW::FullScreen::kWhite).setActive(1);
     touch.emplace();
     touch->clickCallback = [](MW::mouse_event*) { Current<ColourTest>::get().next(); };
     touch->doubleClickCallback = [](int) { Current<ColourTest>::get().finishLook(); };

@@ -1,4 +1,5 @@
 // A page that is nothing but data: every item and widget on it is built from a descriptor.
+#include <MW/dialog.h>
 #include <MW/widget_list.h>
 #include <MW/widget_rcui.h>
 #include <MW/window.h>
@@ -19,27 +20,7 @@ namespace factory_test {
 
 namespace {
 
-// MW::ref_t's kinds; the pictures are named after what they show.
-enum Kind {
-  kTextbox = 0,
-  kBox = 2,
-  kLine = 4,
-  kNextInColumn = 7,
-  kFirstInColumn = 8,
-  kLabel = 9,
-  kDialog = 10,
-  kDialogNew = 14,
-  kButton = 15,
-  kLeftSquare = 17,
-  kCentreSquare = 18,
-  kRightSquare = 19,
-  kSlideFromLeft = 21,
-  kSlideFromRight = 22,
-  kToast = 23,
-  kFullScreen = 24,
-  kProgress = 25,
-  kKey = 26
-};
+using enum MW::RcuiKind;
 
 constexpr int kShowMs = 2000;
 constexpr int kWhiteMs = 700;
@@ -57,7 +38,7 @@ class DescriptorTest : public Test {
   }
 
   void leave() override {
-    while (!built.empty()) built.pop_back();
+    built.clear();
     MW::WidgetList::destroy();
   }
 
@@ -66,14 +47,14 @@ class DescriptorTest : public Test {
   void draw() override { MW::WidgetList::show(); }
 
   void update(uint32_t now) override {
-    if (!find(kFullScreen).isActive() || now - whiteSince < kWhiteMs) return;
-    find(kFullScreen).hide();
+    if (!find(kRcuiFullScreen).isActive() || now - whiteSince < kWhiteMs) return;
+    find(kRcuiFullScreen).hide();
     MW::isDisplayUpdate(1);
   }
 
  private:
   struct Entry {
-    Kind kind;
+    MW::RcuiKind kind;
     bool isShown;
     SKIA_Rect place;  // x and w in columns of ten, y and h in per cent of the screen's height
     const char* words;
@@ -85,7 +66,7 @@ class DescriptorTest : public Test {
   static const std::vector<Entry> kEntries;
 
   /// The only widget of its kind.
-  static MW::Widget& find(Kind kind) {
+  static MW::Widget& find(MW::RcuiKind kind) {
     const auto entry = std::ranges::find(kEntries, kind, &Entry::kind);
     return *Self::get().built.at(static_cast<std::size_t>(entry - kEntries.begin()))->getPointer();
   }
@@ -95,25 +76,25 @@ class DescriptorTest : public Test {
     Self::get().chosen = outcome;
   }
 
-  static void open(Kind kind) {
+  static void open(MW::RcuiKind kind) {
     find(kind).setActive(1);
     MW::isDisplayUpdate(1);
   }
 
   static void whiten(int) {
     Self::get().whiteSince = GetTicks();
-    open(kFullScreen);
+    open(kRcuiFullScreen);
   }
 
   static void showTimed(int) {
-    find(kToast).onHideTimer(kShowMs);
-    find(kProgress).onProgressbar(kShowMs);
+    find(kRcuiToastbox).onHideTimer(kShowMs);
+    find(kRcuiProgressbar).onProgressbar(kShowMs);
   }
 
   // Button 1 leaves a dialog where it is.
   static void closeDialogs(int) {
-    find(kDialog).hide();
-    find(kDialogNew).hide();
+    find(kRcuiDialog).hide();
+    find(kRcuiDialogNew).hide();
     MW::isDisplayUpdate(1);
   }
 
@@ -133,7 +114,7 @@ class DescriptorTest : public Test {
     });
     MW::ref_t ref;
     ref.kind = entry.kind;
-    ref.dialogKind = 2;
+    ref.dialogKind = MW::Dialog::kRetryTest;
     ref.visible = entry.isShown ? 1 : 0;
     ref.cbIndex = 1;
     ref.rect = {percentOf(screen.width, left * kColumnPercent), percentOf(screen.height, top),
@@ -154,41 +135,49 @@ class DescriptorTest : public Test {
 
 // Widgets come after the pictures, dialogs last.
 const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
-    {kTextbox, true, {0, 0, 10, 100, kGroundColor}, ""},
-    {kBox, true, {0, 2, 10, 7, kTitleColor}, ""},
-    {kLabel, true, {0, 2, 10, 7, 0}, "Built from descriptors"},
-    {kLine, true, {1, 10, 9, 10, kBarColor}, ""},
-    {kFirstInColumn, true, {1, 11, 8, 4, kBarColor}, "A column of text boxes:"},
-    {kNextInColumn, true, kNoPlace, "each stands below the one before,"},
-    {kNextInColumn, true, kNoPlace, "wherever its own rectangle is."},
-    {kButton, true, {1, 25, 3, 7, kBarColor}, "Toast", {.cbClick = showTimed}},
-    {kButton, true, {6, 25, 3, 7, kBarColor}, "White", {.cbClick = whiten}},
-    {kButton, true, {1, 34, 3, 7, kBarColor}, "Dialog", {.cbClick = [](int) { open(kDialog); }}},
-    {kButton, true, {6, 34, 3, 7, kBarColor}, "Words", {.cbClick = [](int) { open(kDialogNew); }}},
-    {kSlideFromLeft,
+    {kRcuiTextbox, true, {0, 0, 10, 100, kGroundColor}, ""},
+    {kRcuiBox, true, {0, 2, 10, 7, kTitleColor}, ""},
+    {kRcuiLabel, true, {0, 2, 10, 7, 0}, "Built from descriptors"},
+    {kRcuiLine, true, {1, 10, 9, 10, kBarColor}, ""},
+    {kRcuiFirstInColumn, true, {1, 11, 8, 4, kBarColor}, "A column of text boxes:"},
+    {kRcuiNextInColumn, true, kNoPlace, "each stands below the one before,"},
+    {kRcuiNextInColumn, true, kNoPlace, "wherever its own rectangle is."},
+    {kRcuiButton, true, {1, 25, 3, 7, kBarColor}, "Toast", {.cbClick = showTimed}},
+    {kRcuiButton, true, {6, 25, 3, 7, kBarColor}, "White", {.cbClick = whiten}},
+    {kRcuiButton,
+     true,
+     {1, 34, 3, 7, kBarColor},
+     "Dialog",
+     {.cbClick = [](int) { open(kRcuiDialog); }}},
+    {kRcuiButton,
+     true,
+     {6, 34, 3, 7, kBarColor},
+     "Words",
+     {.cbClick = [](int) { open(kRcuiDialogNew); }}},
+    {kRcuiSlideFromLeft,
      true,
      {1, 44, 8, 6, kBarColor},
      "Slide to pass",
      {.cbTouchRelease = choose<Outcome::Pass>}},
-    {kSlideFromRight,
+    {kRcuiSlideFromRight,
      true,
      {1, 52, 8, 6, kBarColor},
      "Slide to leave",
      {.cbTouchRelease = choose<Outcome::Left>}},
-    {kLeftSquare, true, kNoPlace, "PASS", {.cbClick = choose<Outcome::Pass>}},
-    {kCentreSquare, true, kNoPlace, "RETRY", {.cbClick = choose<Outcome::Retry>}},
-    {kRightSquare, true, kNoPlace, "FAIL", {.cbClick = choose<Outcome::Fail>}},
-    {kToast, false, {1, 60, 8, 8, kTitleColor}, "A toast", {}, {"with a second line"}},
-    {kProgress, false, {1, 70, 8, 5, kTitleColor}, "Two seconds"},
-    {kKey, true, {}, "", {.cbKeyPress = followKey}},
-    {kDialog, false, {}, "", {.cbTouchRelease = closeDialogs}},
-    {kDialogNew,
+    {kRcuiButton3Left, true, kNoPlace, "PASS", {.cbClick = choose<Outcome::Pass>}},
+    {kRcuiButton3Centre, true, kNoPlace, "RETRY", {.cbClick = choose<Outcome::Retry>}},
+    {kRcuiButton3Right, true, kNoPlace, "FAIL", {.cbClick = choose<Outcome::Fail>}},
+    {kRcuiToastbox, false, {1, 60, 8, 8, kTitleColor}, "A toast", {}, {"with a second line"}},
+    {kRcuiProgressbar, false, {1, 70, 8, 5, kTitleColor}, "Two seconds"},
+    {kRcuiKey, true, {}, "", {.cbKeyPress = followKey}},
+    {kRcuiDialog, false, {}, "", {.cbTouchRelease = closeDialogs}},
+    {kRcuiDialogNew,
      false,
      {},
      "Words of its own",
      {.cbTouchRelease = closeDialogs},
      {"from a descriptor", "in two lines", "", "OK", ""}},
-    {kFullScreen, false, {}, ""},
+    {kRcuiFullScreen, false, {}, ""},
 };
 
 const TestRegistration kRegistration({Group::Widgets, 5, "descriptors", "Descriptors",

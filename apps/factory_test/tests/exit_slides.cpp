@@ -11,8 +11,6 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kFromLeft = 0;  // MW::SlideE's states
-constexpr int kFromRight = 1;
 constexpr uint32_t kBarColor = 0xFFC8D2E0;
 
 /// One slide passes the test, the other leaves it.
@@ -24,8 +22,8 @@ class ExitSlideTest : public PageTest {
 
   void enter() override {
     page.ask();
-    place(passing, 38, kFromLeft, "Slide to pass");
-    place(leaving, 56, kFromRight, "Slide to leave");
+    place(passing, 38, MW::SlideE::kFromLeft, "Slide to pass");
+    place(leaving, 56, MW::SlideE::kFromRight, "Slide to leave");
     passing->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Pass; };
     leaving->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Left; };
   }
@@ -42,7 +40,8 @@ class ExitSlideTest : public PageTest {
   }
 
  private:
-  static void place(std::optional<MW::SlideE>& slide, int top, int state, const char* words) {
+  static void place(std::optional<MW::SlideE>& slide, int top, MW::SlideE::State state,
+                    const char* words) {
     const SKIA_Rect area = rowOf(screenSize(), top, 10, kBarColor);
     const SKIA_Text caption = captionOf(words);
     slide.emplace(state, &area, &caption, "");

@@ -67,8 +67,7 @@ class FreeFormTest : public StepTest {
   }
 
   void putSlide() {
-    constexpr int kWarning = 3;  // MW::DialogSlide's kind
-    auto made = std::make_unique<MW::DialogSlide>(kWarning);
+    auto made = std::make_unique<MW::DialogSlide>(MW::DialogSlide::kRepeatPassedTest);
     made->leftCallback = [](int) { self().move(1); };
     made->rightCallback = [](int) { self().move(1); };
     made->keyPressCallback = follow;

@@ -46,7 +46,7 @@ class KeyboardTest : public PageTest {
 
  private:
   // By the numbers of MW::Ime's layouts.
-  static constexpr std::size_t kLayoutCount = 4;
+  static constexpr std::size_t kLayoutCount = MW::Ime::kOnlyDigits + 1;
   static const std::array<ButtonRow::Face, kLayoutCount> kFaces;
 
   static KeyboardTest& self() { return Current<KeyboardTest>::get(); }
@@ -54,7 +54,7 @@ class KeyboardTest : public PageTest {
   void change(std::size_t number) {
     layout = number % kLayoutCount;
     const auto type = static_cast<unsigned int>(layout);
-    keyboard->keyboard_change(0);  // takes the grey of the digits away
+    keyboard->keyboard_change(MW::Ime::kSmall);  // takes the grey of the digits away
     keyboard->keyboard_change(type);
     keyboard->presskey_set(type);
     page.say(kFaces.at(type).caption);
@@ -76,10 +76,10 @@ class KeyboardTest : public PageTest {
 };
 
 const std::array<ButtonRow::Face, KeyboardTest::kLayoutCount> KeyboardTest::kFaces = {{
-    {"abc", [](int) { self().change(0); }},
-    {"ABC", [](int) { self().change(1); }},
-    {"#+=", [](int) { self().change(2); }},
-    {"123", [](int) { self().change(3); }},
+    {"abc", [](int) { self().change(MW::Ime::kSmall); }},
+    {"ABC", [](int) { self().change(MW::Ime::kCapitals); }},
+    {"#+=", [](int) { self().change(MW::Ime::kSpecial); }},
+    {"123", [](int) { self().change(MW::Ime::kOnlyDigits); }},
 }};
 
 const TestRegistration kRegistration({Group::Input, 3, "keyboard", "Keyboard",

@@ -17,7 +17,7 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kLayouts = 6;  // of MW::Button8
+constexpr int kLayouts = MW::Button8::kTwoByFour + 1;
 constexpr uint32_t kPadColor = 0xFF3C4A60;
 
 /// Tells which cells are held. The button, or the up key, changes the layout.
@@ -69,8 +69,7 @@ class PadTest : public PageTest {
   }
 
   void tell(uint32_t mask) {
-    constexpr int kCells = 8;
-    const std::string cells = std::bitset<kCells>(mask).to_string();
+    const std::string cells = std::bitset<MW::Button8::kCells>(mask).to_string();
     page.say(("Layout " + std::to_string(layout) + ", held " + cells).c_str());
   }
 

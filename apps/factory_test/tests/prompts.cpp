@@ -11,8 +11,6 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kLastKind = 39;
-
 /// A touch, too, shows the next kind, and the right button ends the look.
 class PromptTest : public StepTest {
  public:
@@ -20,7 +18,7 @@ class PromptTest : public StepTest {
 
  protected:
   std::string question() const override { return "Did all dialogs look right?"; }
-  int lastStep() const override { return kLastKind; }
+  int lastStep() const override { return MW::Dialog::kLeaveLightSensor; }
 
   void showStep(int kind) override {
     dialog.reset();

@@ -16,8 +16,6 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kPlain = 1;  // MW::ButtonS's style
-
 enum Level { kGroup = 1, kTest = 2, kDetail = 3 };
 
 // A line of the list's text.
@@ -81,7 +79,7 @@ class ResultListTest : public LookTest {
     const SKIA_Rect header = rowOf(screenSize(), 10, 10, MW::kColorWhite);
     const SKIA_Rect left = cellOf(header, 0, 2);
     const SKIA_Text hint = captionOf("Tap a line twice");
-    heading.emplace(kPlain, &left, &hint).setActive(1);
+    heading.emplace(MW::ButtonS::kTextBox, &left, &hint).setActive(1);
     done.emplace(cellOf(header, 1, 2), kFaces);
   }
 

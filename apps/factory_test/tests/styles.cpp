@@ -39,12 +39,12 @@ struct StyleRow {
 
 // Events come to the last but one first, and it lets the last one have them, too.
 constexpr auto kStyles = std::to_array<StyleRow>({
-    {"Button box", 36, 9, 0, 2, kButtonColor, makeStyled<MW::ButtonS, 0>},
-    {"Text box", 36, 9, 1, 2, kButtonColor, makeStyled<MW::ButtonS, 1>},
-    {"Box", 49, 9, 0, 3, kButtonColor, makeStyled<MW::ButtonNew, 0>},
-    {"Text", 49, 9, 1, 3, kButtonColor, makeStyled<MW::ButtonNew, 1>},
-    {"Framed", 49, 9, 2, 3, kButtonColor, makeStyled<MW::ButtonNew, 2>},
-    {"Both", 62, 17, 0, 1, kButtonColor, makeStyled<MW::ButtonS, 2>},
+    {"Button box", 36, 9, 0, 2, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kButtonBox>},
+    {"Text box", 36, 9, 1, 2, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kTextBox>},
+    {"Box", 49, 9, 0, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kButtonBox>},
+    {"Text", 49, 9, 1, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kTextBox>},
+    {"Framed", 49, 9, 2, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kFramed>},
+    {"Both", 62, 17, 0, 1, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kPassOn>},
     {"One", 72, 6, 1, 3, MW::kColorWhite, makePlain},
 });
 
@@ -61,7 +61,7 @@ class StyleTest : public PageTest {
   }
 
   void leave() override {
-    for (std::size_t i = buttons.size(); i > 0; --i) buttons.at(i - 1).reset();
+    for (auto& button : buttons) button.reset();
     page.endAsking();
   }
 

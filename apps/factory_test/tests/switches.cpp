@@ -11,9 +11,7 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kFullTravel = 0;  // MW::Slide's states
-constexpr int kHalfTravel = 2;
-constexpr int kRightBit = 1;
+constexpr int kRightBit = MW::Slide::kFullLeft ^ MW::Slide::kFullRight;
 
 /// Tells every change. A double tap unlocks the third switch; the up key moves the others.
 class SwitchTest : public PageTest {
@@ -27,9 +25,9 @@ class SwitchTest : public PageTest {
     page.ask().otherKey = [](unsigned int code) {
       if (code == MW::kKeyUp) Current<SwitchTest>::get().moveAll();
     };
-    place(full, 0, kFullTravel, "Full way");
-    place(half, 1, kHalfTravel, "Half way");
-    place(locked, 2, kFullTravel, "Locked");
+    place(full, 0, MW::Slide::kFullLeft, "Full way");
+    place(half, 1, MW::Slide::kHalfLeft, "Half way");
+    place(locked, 2, MW::Slide::kFullLeft, "Locked");
     locked->Lock();
     locked->doubleClickCallback = [](MW::mouse_event*) { Current<SwitchTest>::get().unlock(); };
   }
@@ -43,7 +41,8 @@ class SwitchTest : public PageTest {
 
  private:
   template <typename Kind>
-  static void place(std::optional<Kind>& slide, int row, int state, const char* words) {
+  static void place(std::optional<Kind>& slide, int row, MW::Slide::State state,
+                    const char* words) {
     constexpr int kPitch = 13;  // per cent of the screen's height, and so the next
     constexpr int kHeight = 9;
     const ScreenSize screen = screenSize();

@@ -6,8 +6,8 @@
 
 namespace MW {
 
-/// A dimmed screen, a frame on it, a black title bar, a line under it and a black body. The
-/// holder's lock guards it.
+/// A dimmed screen, a frame on it, a black title bar with the title, a line below it and a black
+/// body. The dialog's lock guards it.
 struct DialogFrame {
   SKIA_Rect backdrop = {0, 0, 0, 0, kColorShadow};
   SKIA_Rect frame = {};
@@ -18,7 +18,7 @@ struct DialogFrame {
   SKIA_Text title = {};
 };
 
-/// A button of a dialog. The holder's lock guards it.
+/// A button of a dialog. The dialog's lock guards it.
 struct DialogButton {
   SKIA_Rect face = {};
   SKIA_Rect border = {};

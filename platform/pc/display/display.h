@@ -15,7 +15,7 @@
 namespace brimol::pc {
 
 enum class DisplayChoice {
-  Window,            ///< a window; that none can be opened is an error
+  Window,            ///< a window; an error where none can be opened
   WindowIfPossible,  ///< a window where SDL finds a video driver, headless otherwise
   Headless,
 };
@@ -33,11 +33,11 @@ class Display {
   /// stays the caller's; it must live, at the same address, until the last wait() has returned.
   virtual void present(cairo_surface_t* picture, const Region& changed) = 0;
 
-  /// Sleeps until the user does something, wake() was called, or `ms` milliseconds have passed;
-  /// without `ms` it has no end of its own. What the user did is told to the input.
+  /// Sleeps until the user does something, wake() was called, or `ms` milliseconds have passed,
+  /// where they are given. Tells the input what the user did.
   virtual void wait(std::optional<uint32_t> ms) = 0;
 
-  /// Ends the wait that runs, or the next one where none does.
+  /// Ends the wait that is under way, or else the next one.
   virtual void wake() = 0;
 
   /// True once the user has asked to close the window.

@@ -10,9 +10,10 @@
 
 namespace brimol::pc {
 
-/// What the pixels along one side of a smaller picture take of those of the larger one.
+/// Which pixels of the larger picture make up each pixel along one side of the smaller one.
 struct Shares {
-  /// What one pixel takes: the pixels from `first` on, by the weights from `weight` on.
+  /// One pixel: the larger picture's `count` pixels from `first` on, by the weights from `weight`
+  /// on.
   struct Share {
     int first;
     int count;
@@ -26,18 +27,16 @@ struct Shares {
   std::vector<std::uint32_t> weights;
 };
 
-/// Scales pictures down. Each pixel is the average of the area that it covers, and depends on
-/// nothing else: a part is the same whether it is scaled alone or with the rest. In full size the
-/// pixels stay as they are.
+/// Scales pictures down. Each pixel is the average of the area that it covers, so a part comes out
+/// the same whether it is scaled alone or with the rest. In full size the pixels stay as they are.
 class Downscaler {
  public:
   /// Each side of `target` is 1 to that of `source`.
   Downscaler(Size source, Size target);
 
-  /// Scales what belongs to `part` of the smaller picture, which lies within it, and puts it at the
-  /// same place of `to`, counted from `origin`, the address of the picture's first pixel there; a
-  /// line of `to` is `stride` bytes. `from` is CAIRO_FORMAT_RGB24 of the source's size, `to` is
-  /// too.
+  /// Writes `part` of the smaller picture, which lies within it. `from` is the larger picture, of
+  /// the source's size. `origin` is where the smaller picture's first pixel stands, and its lines
+  /// are `stride` bytes apart. Both are CAIRO_FORMAT_RGB24.
   void scale(cairo_surface_t* from, const cairo_rectangle_int_t& part, unsigned char* origin,
              int stride);
 

@@ -1,4 +1,4 @@
-/// A display that nobody sees.
+/// The display of a platform without a window.
 #pragma once
 
 #include <condition_variable>
@@ -8,7 +8,7 @@
 
 namespace brimol::pc {
 
-/// Shows nothing and has no user: all that happens to it is wake().
+/// Shows nothing and has no user. Only wake() and the time end its waits.
 class HeadlessDisplay : public Display {
  public:
   void present(cairo_surface_t*, const Region&) override {}

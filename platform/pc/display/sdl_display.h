@@ -21,7 +21,7 @@ struct SdlSurfaceDeleter {
   void operator()(SDL_Surface* surface) const { SDL_FreeSurface(surface); }
 };
 
-/// SDL's video part, which the platform has to itself: begun with the object, ended with it.
+/// SDL's video part, begun with the object and ended with it. Nothing else in the process uses it.
 class SdlVideo {
  public:
   SdlVideo();
@@ -32,13 +32,14 @@ class SdlVideo {
   bool isOpen;  // SDL says why not
 };
 
-/// A window that the user cannot size, with the whole screen in it, scaled down by one factor where
-/// the desktop has less room. Where something else gives it another size, the picture is fitted
-/// into that one. What the user does in it becomes input; when it loses the focus or is to be
-/// closed, all fingers and keys are released.
+/// A window that the user cannot size. It shows the whole screen, scaled down by one factor where
+/// the desktop has less room, and fitted in where something else changes the window's size. What
+/// the user does in it becomes input. When it loses the focus or is to be closed, all fingers and
+/// keys are released.
 class SdlDisplay : public Display {
  public:
-  /// Without a video driver that a user can see: an error. SDL_VIDEODRIVER names another one.
+  /// An error where SDL has no video driver whose pictures a user can see. SDL_VIDEODRIVER chooses
+  /// any other driver.
   static OpenedDisplay open(Size screen, InputTranslator& input, const InputService& service);
 
   void present(cairo_surface_t* picture, const Region& changed) override;

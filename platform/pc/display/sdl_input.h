@@ -8,9 +8,9 @@
 
 namespace brimol::pc {
 
-/// Passes on the left button, touches and keys; every other event is ignored, and so are a mouse's
-/// touches and a touch's mouse that SDL makes up. `now` is when the event
-/// happened, in the input's milliseconds: SDL has a clock of its own.
+/// Passes on the left button, touches and keys. All other events are ignored, and so are the
+/// touches that SDL derives from a mouse and the mouse events that it derives from touches. `now`
+/// is when the event happened, in the input's milliseconds: SDL's clock is another one.
 void passOn(const SDL_Event& event, const WindowFit& fit, uint32_t now, InputTranslator& input);
 
 }  // namespace brimol::pc

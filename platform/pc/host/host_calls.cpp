@@ -7,8 +7,11 @@
 #include <chrono>
 #include <string>
 
+#include "clock/inside_wait.h"
+#include "clock/process_clock.h"
 #include "host/open_platform.h"
 #include "host/png_file.h"
+#include "host/session.h"
 #include "host/settings.h"
 #include "input/keymap.h"
 
@@ -33,6 +36,7 @@ std::string writeScreenshot(const char* path) {
   if (path == nullptr || *path == '\0') return "a screenshot needs a file name";
   const auto platform = openedPlatform();
   if (!platform) return "no screen is open";
+  const InsideWait wait(turnClock());
   const CairoSurface picture = platform->copyPicture(kPictureBound);
   if (!picture) return "the screen was closed or took over 10 seconds to paint";
   return writePng(picture.get(), path);
@@ -65,6 +69,9 @@ void brimol_host_set_brightness(int percent) {
 }
 
 int brimol_host_close_requested() {
+  if (const auto* const played = brimol::pc::session()) {
+    if (const auto isAsked = played->isCloseRequested()) return *isAsked ? 1 : 0;
+  }
   const auto platform = openedPlatform();
   return platform && platform->isCloseRequested() ? 1 : 0;
 }

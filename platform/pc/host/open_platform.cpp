@@ -3,6 +3,9 @@
 #include <mutex>
 #include <utility>
 
+#include "clock/inside_wait.h"
+#include "clock/process_clock.h"
+#include "host/session.h"
 #include "host/settings.h"
 #include "input/input_service.h"
 #include "scene/frame_sink.h"
@@ -23,14 +26,23 @@ void setOpened(std::shared_ptr<Platform> platform) {
 }  // namespace
 
 std::string openPlatform() {
+  if (auto* const clock = turnClock()) clock->takePart();
+  const InsideWait wait(turnClock());
   const std::lock_guard<std::mutex> turn(turnMutex);
   if (openedPlatform()) return {};
-  const SettingsResult wanted = readSettings();
+  SettingsResult wanted = readSettings();
+  Session* const played = session();
+  if (played != nullptr) {
+    std::string problem = played->prepare();
+    if (!problem.empty()) return problem;
+    wanted.settings.screen = played->screen();
+  }
   if (!wanted.error.empty()) return wanted.error;
   InputService& input = inputService();
   input.open();
   std::string error;
   if (auto platform = Platform::open(wanted.settings, input, error)) {
+    if (played != nullptr) played->begin(*platform);
     setOpened(std::move(platform));
   } else {
     input.close();
@@ -39,9 +51,12 @@ std::string openPlatform() {
 }
 
 void closePlatform() {
+  if (auto* const clock = turnClock()) clock->takePart();
+  const InsideWait wait(turnClock());
   const std::lock_guard<std::mutex> turn(turnMutex);
   const std::shared_ptr<Platform> platform = openedPlatform();
   if (!platform) return;
+  if (Session* const played = session()) played->close();
   setOpened(nullptr);
   platform->close();
   inputService().close();
@@ -53,7 +68,11 @@ std::shared_ptr<Platform> openedPlatform() {
 }
 
 void submitFrame(Frame&& frame) {
-  if (const auto platform = openedPlatform()) platform->submit(std::move(frame));
+  Session* const played = session();
+  const auto platform = openedPlatform();
+  if (!platform) return;
+  played != nullptr ? played->frame(*platform, std::move(frame))
+                    : platform->submit(std::move(frame));
 }
 
 }  // namespace brimol::pc

@@ -15,8 +15,8 @@ std::string openPlatform();
 /// Closes it and its input: whoever waits for either goes on. None is open: nothing. Any thread.
 void closePlatform();
 
-/// The open platform, null where none is. Any thread. Who keeps the pointer over closePlatform()
-/// has a closed platform.
+/// The open platform, null where none is. Any thread. After closePlatform() a pointer that was kept
+/// is to a closed platform.
 std::shared_ptr<Platform> openedPlatform();
 
 }  // namespace brimol::pc

@@ -4,6 +4,8 @@
 #include <cstdlib>
 #include <utility>
 
+#include "clock/process_clock.h"
+#include "host/session.h"
 #include "painter/painter.h"
 
 namespace brimol::pc {
@@ -111,6 +113,7 @@ void Platform::setDisplay(Display* display) {
 
 void Platform::run(std::promise<std::string> opened) {
   isPlatformThread = true;
+  if (auto* const clock = turnClock()) clock->stayOutside();
   InputTranslator input(settings.screen, service);
   const OpenedDisplay outcome = openDisplay(settings.display, settings.screen, input, service);
   if (!outcome.display) {
@@ -136,7 +139,9 @@ void Platform::serve(Display& display, InputTranslator& input) {
     for (auto& picture : work->pictures) picture.set_value(copyOf(painter.picture()));
     input.tick(service.now());
     display.wait(input.msToLongPress(service.now()));
-    closeRequested = display.isCloseRequested();
+    if (display.isCloseRequested() && !closeRequested.exchange(true)) {
+      if (Session* const recorded = session()) recorded->userCloses();
+    }
   }
 }
 

@@ -37,25 +37,26 @@ class Platform {
   Platform(const Platform&) = delete;
   Platform& operator=(const Platform&) = delete;
 
-  /// Closes the display and ends the thread. Who waits for a picture gets none. One of the other
-  /// threads at a time may close; a second time does nothing.
+  /// Closes the display and ends the thread. A thread that waits in copyPicture() gets null. Not to
+  /// be called on the platform's own thread, nor by two threads at once; a second call does
+  /// nothing.
   void close();
 
   Size screen() const { return settings.screen; }
 
-  /// Has `frame` shown in place of one that still waits. Never waits itself.
+  /// Shows `frame` soon, instead of one that still waits to be shown. Never waits itself.
   void submit(Frame&& frame);
 
-  /// Darkens the frames that are submitted from now on. Full light is 100 per cent, none is 0, and
-  /// what lies beyond is taken for the nearest.
+  /// Darkens the frames that are submitted from now on. `percent` is clamped to 0, dark, to 100,
+  /// full light.
   void setBrightness(int percent) { brightness = std::clamp(percent, 0, kFullLight); }
 
-  /// A copy of the picture as it is once the newest frame is painted and all actions are done. Null
-  /// when that takes longer than `bound`, or when the platform closes.
+  /// Waits until the newest frame is painted and all actions are done, and returns a copy of the
+  /// picture. Null when that takes longer than `bound`, or when the platform closes.
   CairoSurface copyPicture(std::chrono::milliseconds bound);
 
-  /// Has `action` done soon, and all actions in their order, as if the display had seen them.
-  /// False: the platform is closed, or is about to.
+  /// Runs `action` soon on the platform's thread, as if the display had reported it. Actions keep
+  /// their order. False where the platform is closed or about to close.
   bool act(Action action);
 
   bool isCloseRequested() const { return closeRequested; }

@@ -1,4 +1,16 @@
-/// What the environment asks of the platform.
+/// What the environment asks of the platform. These are all of its variables; an empty value is no
+/// value, and a wrong one keeps the platform from opening.
+///
+/// | variable | value | without it |
+/// |---|---|---|
+/// | BRIMOL_DISPLAY | window or headless | a window where there is a desktop or SDL finds a driver
+/// | | BRIMOL_SCREEN | WIDTHxHEIGHT in pixels, each 1 to 16384 | 1440x2560 | | BRIMOL_TRACE | the
+/// trace that is played | none is | | BRIMOL_RECORD | the file that the session is recorded into |
+/// it is not | | BRIMOL_CLOCK | real, simulated or paced | what the session asks for, else real |
+/// | BRIMOL_CLOCK_START | GetTicks() at the start, in milliseconds | 0 |
+/// | BRIMOL_REPORT_DIR | the folder of a session's report and pictures | none is written |
+///
+/// The last five are read by host/session_settings.h; docs/traces.md tells what they do.
 #pragma once
 
 #include <functional>
@@ -18,15 +30,15 @@ struct Settings {
 };
 
 struct SettingsResult {
-  Settings settings;  ///< what is wrong stands at its default
+  Settings settings;  ///< a wrong value leaves its default
   std::string error;  ///< one line about the first wrong value; empty: none is wrong
 };
 
 /// Gives the value of a variable, or null where it is not set.
 using VariableLookup = std::function<const char*(const char* name)>;
 
-/// Reads BRIMOL_DISPLAY and BRIMOL_SCREEN; an empty value is no value. Without BRIMOL_DISPLAY, a
-/// desktop (DISPLAY or WAYLAND_DISPLAY) gets a window. Opens nothing.
+/// Reads BRIMOL_DISPLAY and BRIMOL_SCREEN. DISPLAY or WAYLAND_DISPLAY tell of a desktop. Opens
+/// nothing.
 SettingsResult readSettings(const VariableLookup& lookup);
 
 /// The same from the process's own environment.

@@ -10,11 +10,10 @@ namespace brimol::pc {
 
 /// Records in the order of their arrival, at most `capacity` of them. Not guarded: InputService is.
 ///
-/// A record that arrives when the queue is full is taken all the same, and another one leaves: the
-/// oldest motion of the same finger; else the oldest motion; else the oldest record that is neither
-/// a down nor an up; else the oldest press together with its release. So nobody ever misses the
-/// release of a press that was seen. The relative motion of what leaves is added to the finger's
-/// next motion.
+/// A full queue takes a record all the same and drops another one: the oldest motion of the same
+/// finger; else the oldest motion; else the oldest record that is neither a down nor an up; else
+/// the oldest press together with its release. So the release of a press that was seen always
+/// arrives. The relative motion of a dropped record is added to the finger's next motion.
 class InputQueue {
  public:
   static constexpr std::size_t kCapacity = 1024;

@@ -27,7 +27,9 @@ void InputService::close() {
   letGo();
 }
 
-void InputService::post(const Event& record) {
+void InputService::post(const Event& record) { diversion ? diversion(record) : deliver(record); }
+
+void InputService::deliver(const Event& record) {
   {
     const std::lock_guard lock(mutex);
     if (!isOpen) return;
@@ -43,6 +45,7 @@ bool InputService::poll(Event& record) {
 }
 
 uint32_t InputService::now() const {
+  if (followed != nullptr) return followed->ticksNow();
   const std::lock_guard lock(mutex);
   return clock.now();
 }

@@ -8,6 +8,7 @@
 #include <thread>
 
 #include "clock/clock.h"
+#include "clock/turn_clock.h"
 #include "input/input_queue.h"
 
 namespace brimol::pc {
@@ -28,6 +29,12 @@ class InputService {
 
   /// Adds a record and ends the polling thread's pause.
   void post(const Event& record);
+  /// From here on post() hands its records to `taker` instead, and deliver() is what adds them. To
+  /// be called before others use the service.
+  void divert(std::function<void(const Event& record)> taker) { diversion = std::move(taker); }
+  void deliver(const Event& record);
+  /// From here on now() is what `turns` says, which outlives the service.
+  void follow(const TurnClock* turns) { followed = turns; }
   /// Moves the next record to `record` and returns true, or returns false when none waits. The
   /// calling thread is the polling thread from here on.
   bool poll(Event& record);
@@ -57,6 +64,10 @@ class InputService {
   bool isOpen = false;
   uint32_t handChanges = 0;  // how often the hand was put on or taken off
   std::thread::id poller;
+
+  // Set before other threads come.
+  std::function<void(const Event&)> diversion;
+  const TurnClock* followed = nullptr;
 
   std::mutex watcherMutex;  // guards timeWatcher, and is held while it runs
   std::function<void()> timeWatcher;

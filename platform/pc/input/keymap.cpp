@@ -59,6 +59,18 @@ std::optional<uint32_t> phoneKey(SDL_Keycode key) {
   return row->code;
 }
 
+std::optional<uint32_t> phoneKeyNamed(std::string_view name) {
+  const auto isNamed = [name](const KeyRow& row) {
+    const auto isSame = [](char written, char shown) {
+      return written == shown || (written == '-' && shown == ' ');
+    };
+    return std::ranges::equal(name, row.plays, isSame);
+  };
+  const auto* const row = std::ranges::find_if(kKeyTable, isNamed);
+  if (row == kKeyTable.end()) return std::nullopt;
+  return row->code;
+}
+
 std::string helpText() {
   std::string text;
   for (const KeyRow& row : kKeyTable) {

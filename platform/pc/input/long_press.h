@@ -8,9 +8,9 @@
 
 namespace brimol::pc {
 
-/// Watches one finger: held for kHoldMs without having been further than kSlopPercent of the
-/// screen's width from where it was pressed, it is a long press, once. Times are milliseconds and
-/// may wrap.
+/// Watches one finger. It becomes a long press, once, when it was held for kHoldMs and never moved
+/// further than kSlopPercent of the screen's width from where it was pressed. Times are
+/// milliseconds and may wrap.
 class LongPress {
  public:
   static constexpr uint32_t kHoldMs = 500;

@@ -12,7 +12,7 @@ namespace brimol::pc {
 /// no clip outside a drawing call. One thread uses it.
 class Canvas {
  public:
-  /// A size that no memory can be had for makes a canvas of no size.
+  /// Where there is no memory for `size`, the canvas has no size.
   explicit Canvas(Size size);
 
   Size size() const { return extent; }
@@ -22,10 +22,10 @@ class Canvas {
 
   /// Colours `area`, which lies within the canvas: 0xAARRGGBB, laid over what is there.
   void fill(const Pixels& area, uint32_t color) const;
-  /// Colours one pixel of the canvas as far as `coverage`, 0 to 255, says.
+  /// Colours one pixel of the canvas by `coverage`, 0 to 255.
   void cover(int x, int y, uint32_t color, int coverage) const;
-  /// Colours the pixels in `area`, each as far as the CAIRO_FORMAT_A8 picture `mask` says, whose
-  /// upper left corner lies on `corner`'s. `area` lies within both.
+  /// Colours the pixels in `area` by their coverage in `mask`, a CAIRO_FORMAT_A8 picture that
+  /// covers `corner`. `area` lies within it and within the canvas.
   void cover(const Pixels& area, const Pixels& corner, cairo_surface_t* mask, uint32_t color) const;
 
  private:

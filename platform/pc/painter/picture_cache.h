@@ -18,8 +18,8 @@ class PictureCache {
 
   /// The picture of the file `name`, CAIRO_FORMAT_ARGB32 in size `size`, owned by the cache and
   /// valid until the next call. Null where the file is missing or no PNG file, or where it or
-  /// `size` has more than kMostSide pixels on a side or kMostPixels in all. What failed is tried
-  /// anew by the next call.
+  /// `size` has more than kMostSide pixels on a side or kMostPixels in all. The next call tries a
+  /// file that failed once more.
   cairo_surface_t* scaled(std::string_view name, Size size);
 
   /// Bytes of the pictures kept, bounded by kMostBytes.

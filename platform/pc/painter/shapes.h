@@ -6,8 +6,8 @@
 
 namespace brimol::pc {
 
-/// A colour, and the part of a canvas that it may touch. What a shape colours of a pixel does not
-/// depend on `clip`, so that a picture painted in parts equals one painted at once.
+/// A colour, and the part of a canvas that it may touch. How much of a pixel a shape colours does
+/// not depend on `clip`, so that a picture painted in parts equals one painted at once.
 struct Brush {
   const Canvas& canvas;
   Pixels clip;  // within the canvas

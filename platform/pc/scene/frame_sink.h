@@ -5,8 +5,8 @@
 
 namespace brimol::pc {
 
-/// Hands an ended frame to the platform's own thread, in place of one that still waits there.
-/// Never waits for painting. While the platform is closed the frame is dropped. Any thread.
+/// Hands an ended frame to the platform's own thread, where it replaces one that still waits. Never
+/// waits for painting. While the platform is closed the frame is dropped. Any thread.
 void submitFrame(Frame&& frame);
 
 }  // namespace brimol::pc

@@ -16,7 +16,7 @@ enum class Ground : uint8_t { None, Square, Round };
 /// What an item draws besides its ground.
 enum class Figure : uint8_t { None, Text, Picture, Line, Arrow };
 
-/// What a text record with a size of 0 is.
+/// What a text record with a size of 0 means.
 enum class Unsized : uint8_t { Nothing, PictureName };
 
 struct ItemKind {

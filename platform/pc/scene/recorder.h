@@ -5,7 +5,7 @@
 
 namespace brimol::pc {
 
-/// What an added item gets when it is not taken; taken ones are numbered from 0 in each frame.
+/// Returned for an item that is not taken. Those that are taken are numbered from 0 in each frame.
 inline constexpr int kNotTaken = -1;
 
 /// Most items that a frame takes.

@@ -1,4 +1,3 @@
-// Where a window shows the screen, and what.
 #include "display/window_canvas.h"
 
 #include <gtest/gtest.h>
@@ -14,30 +13,6 @@ namespace {
 
 constexpr Size kScreen = {200, 300};
 constexpr Area kAll = {0, 0, kScreen.w, kScreen.h};
-
-struct FitCase {
-  Size screen, area, fitted;
-};
-
-TEST(WindowFit, KeepsTheProportions) {
-  for (const auto& [screen, area, fitted] : std::to_array<FitCase>({
-           {{100, 200}, {300, 300}, {100, 200}},
-           {{1440, 2560}, {1920, 1040}, {585, 1040}},
-           {{1440, 2560}, {360, 2000}, {360, 640}},
-           {{16384, 1}, {10, 10}, {10, 1}},
-           {{16384, 16384}, {16383, 16383}, {16383, 16383}},
-       })) {
-    EXPECT_EQ(fittedSize(screen, area), fitted);
-    const WindowFit fit = WindowFit::of(screen, fitted);
-    EXPECT_EQ(fit.shown, (Area{0, 0, fitted.w, fitted.h})) << "a window of that size is filled";
-    EXPECT_EQ(fit.toScreen({0, 0}), (ScreenPoint{0, 0}));
-    EXPECT_EQ(fit.toScreen({fitted.w - 1, 0}).x, screen.w - 1);
-  }
-  EXPECT_EQ(WindowFit::of(kScreen, {0, -3}).toScreen({0, 0}), (ScreenPoint{0, 0}));
-  const WindowFit centred = WindowFit::of({100, 100}, {200, 120});
-  EXPECT_EQ(centred.toScreen({51, 109}), (ScreenPoint{1, 99}));
-  EXPECT_EQ(centred.toScreen({-5, 500}), (ScreenPoint{0, 99})) << "beside the picture: its edge";
-}
 
 /// Other pixels in that part.
 void addNoise(cairo_surface_t* picture, const Area& part, std::mt19937& random) {

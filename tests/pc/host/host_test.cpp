@@ -1,5 +1,5 @@
-// The platform as an application and its user meet it, without a window or with one that nobody
-// sees.
+// The platform as applications and users meet it, without a window or with one on SDL's dummy
+// driver.
 #include <brimol/display.h>
 #include <brimol/frame.h>
 #include <brimol/host.h>
@@ -226,7 +226,7 @@ TEST_F(HostTest, SurvivesDrawingAndPollingWhileItOpensAndCloses) {
     EXPECT_EQ(brimol_host_open(), 1);
     EXPECT_EQ(brimol_host_screenshot(shot.c_str()), 1);
     inputService().takeHand(GetTicks());
-    EventQuit();  // and the clock is real again: nobody waits for the hand any more
+    EventQuit();  // makes the clock real again, so that no thread waits for the hand
   }
   isOver = true;
   drawer.join();

@@ -12,7 +12,8 @@ TEST(Properties, AreReadBackWithinTheirBound) {
   std::array<char, BRIMOL_PROPERTY_BYTES + 1> room = {};
   room.back() = '#';
   const auto read = [&room](const char* key, const char* fallback) {
-    EXPECT_EQ(property_get(key, room.data(), fallback), property_get(key, nullptr, fallback));
+    const int length = property_get(key, room.data(), fallback);
+    EXPECT_EQ(length, property_get(key, nullptr, fallback)) << "the length alone";
     return std::string(room.data());
   };
   const std::string longest(91, 'v');

@@ -7,7 +7,6 @@
 #include <limits>
 
 #include "display/sdl_input.h"
-#include "input/keymap.h"
 #include "pc/support/record_text.h"
 
 namespace brimol::pc {
@@ -110,30 +109,6 @@ TEST_F(TranslatorTest, ReportsLongPressesInTheOrderOfTime) {
                 ElementsAre("down 0 at 1,1", "down 1 at 2,2", "motion 0 at 2,1 by 1,0",
                             "long 0 at 2,1", "up 0 at 2,1", "up 1 at 2,2"));
   }
-}
-
-TEST(LongPress, AllowsMotionOfTwoPercentOfTheWidth) {
-  const auto staysWith = [](int width, ScreenPoint by) {
-    LongPress finger(width);
-    finger.press({500, 500}, 0);
-    finger.move({500 + by.x, 500 + by.y});
-    finger.move({500, 500});  // coming back does not help
-    return finger.due(500) && !finger.due(501);
-  };
-  EXPECT_TRUE(staysWith(1000, {12, -16}));
-  EXPECT_FALSE(staysWith(1000, {-13, 16}));
-  EXPECT_TRUE(staysWith(1440, {0, 28}));
-  EXPECT_FALSE(staysWith(1440, {0, 29}));
-  EXPECT_FALSE(staysWith(16384, {16383, 0}));
-}
-
-TEST(Keymap, PlaysTheKeysOfThePhoneAndSaysWhich) {
-  for (const char* const line :
-       {"Up                  up (273)", "Down                down (274)",
-        "Right               right (275)", "Keypad Enter        select (327)"}) {
-    EXPECT_THAT(helpText(), testing::HasSubstr(line));
-  }
-  EXPECT_EQ(phoneKey(SDLK_LEFT), 276U);
 }
 
 }  // namespace

@@ -1,0 +1,25 @@
+/// What the turn clock knows of a thread.
+#pragma once
+
+#include "clock/turn_clock.h"
+
+namespace brimol::pc {
+
+struct TurnClock::Participant {
+  enum class State { Running, Waiting, Away, Left };
+
+  std::string name;
+  pid_t thread = 0;  // 0: not started yet
+  State state = State::Waiting;
+  uint64_t wake = 0;  // when its pause ends
+  bool isPoller = false;
+  bool isOutside = false;  // away, and named as one that blocks outside
+  bool isAtWork = false;   // has the turn and knows it
+  int calls = 0;           // since its pause; the thread's own
+  std::atomic<bool> waitsInside = false;
+  std::atomic<bool> arrives = false;                // waits for the clock's lock, or is about to
+  std::chrono::steady_clock::time_point runsSince;  // away, and seen running
+  std::condition_variable go;
+};
+
+}  // namespace brimol::pc

@@ -1,0 +1,26 @@
+/// What a thread of this process is doing, as the kernel shows it.
+#pragma once
+
+#include <sys/types.h>
+
+#include <string_view>
+#include <vector>
+
+namespace brimol::pc {
+
+enum class ThreadState {
+  Running,   ///< or ready to
+  OnThread,  ///< waits for what another thread of the process does: a lock, a condition, an end
+  Outside,   ///< waits for anything else: a pipe, a child process, a pause
+  Gone,
+};
+
+/// From the text of the thread's `syscall` file.
+ThreadState stateOf(std::string_view syscallText);
+
+ThreadState lookAt(pid_t thread);
+
+/// All threads that the process has at the moment.
+std::vector<pid_t> threadsOfProcess();
+
+}  // namespace brimol::pc

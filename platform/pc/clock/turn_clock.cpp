@@ -1,0 +1,226 @@
+#include "clock/turn_clock.h"
+
+#include <pthread.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <array>
+#include <utility>
+
+#include "clock/participant.h"
+#include "clock/thread_look.h"
+
+namespace brimol::pc {
+
+namespace {
+
+// So many calls without a pause are a loop that waits for the time to move.
+constexpr int kMostCalls = 10'000;
+
+std::atomic<uint64_t> lastId = 0;
+
+std::string nameOfThread() {
+  constexpr std::size_t kNameBytes = 16;
+  std::array<char, kNameBytes> name = {};
+  return pthread_getname_np(pthread_self(), name.data(), name.size()) == 0 ? name.data() : "";
+}
+
+// Where the calling thread sits. The main thread keeps the turn when it ends: the process does too.
+struct Seat {
+  ~Seat() {
+    if (clock != nullptr && ::gettid() != ::getpid()) clock->leave();
+  }
+  TurnClock* clock = nullptr;
+  uint64_t id = 0;
+  TurnClock::Participant* place = nullptr;
+};
+thread_local Seat seat;
+
+}  // namespace
+
+TurnClock::TurnClock(uint32_t firstTicks, Speed wantedSpeed)
+    : id(++lastId), firstTick(firstTicks), speed(wantedSpeed) {
+  if (speed == Speed::Real) pace.start(0);
+  keeper = std::thread([this] { keep(); });
+}
+
+TurnClock::~TurnClock() {
+  {
+    const std::lock_guard lock(mutex);
+    isOver = true;
+  }
+  keeperWakes.notify_one();
+  keeper.join();
+  if (seat.id == id) seat = {};
+  cpus.leave();
+}
+
+TurnClock::Participant& TurnClock::add(const std::string& name) {
+  Participant& added = participants.emplace_back();
+  added.name = name;
+  added.wake = time;
+  return added;
+}
+
+void TurnClock::sitDown(Participant& me) {
+  seat.clock = this;
+  seat.id = id;
+  seat.place = &me;
+  me.thread = ::gettid();
+  if (speed == Speed::Free) cpus.join();
+}
+
+TurnClock::Participant& TurnClock::self() {
+  if (seat.id == id) return *seat.place;
+  const std::lock_guard lock(mutex);
+  Participant& me = add(nameOfThread());
+  sitDown(me);
+  return me;
+}
+
+void TurnClock::takePart() {
+  Participant& me = self();
+  if (holder == &me) {
+    if (++me.calls >= kMostCalls) delay(1);
+    return;
+  }
+  Lock lock = lockFor(me);
+  waitForTurn(lock, me, time);
+}
+
+// A thread that is away and waits for the lock looks blocked, and yet is on its way.
+TurnClock::Lock TurnClock::lockFor(Participant& me) {
+  me.arrives = true;
+  Lock lock(mutex);
+  me.arrives = false;
+  return lock;
+}
+
+void TurnClock::takePartAsPoller() {
+  takePart();
+  Participant& me = self();
+  if (me.isPoller) return;
+  const Lock lock = lockFor(me);
+  for (Participant& each : participants) each.isPoller = &each == &me;
+}
+
+uint32_t TurnClock::ticks() {
+  takePart();
+  return ticksNow();
+}
+
+void TurnClock::delay(uint32_t ms) {
+  Participant& me = self();
+  Lock lock = lockFor(me);
+  waitForTurn(lock, me, time + std::max(ms, 1U));
+}
+
+bool TurnClock::setWaitsInside(bool waits) { return self().waitsInside.exchange(waits); }
+
+void TurnClock::wakePoller() {
+  const std::lock_guard lock(mutex);
+  for (Participant& each : participants) {
+    if (each.isPoller) each.wake = std::min(each.wake, time.load());
+  }
+}
+
+TurnClock::Participant& TurnClock::announce(const char* name) {
+  takePart();
+  const std::lock_guard lock(mutex);
+  return add(name == nullptr ? "" : name);
+}
+
+void TurnClock::withdraw(Participant& announced) {
+  const std::lock_guard lock(mutex);
+  participants.remove_if([&](const Participant& each) { return &each == &announced; });
+}
+
+void TurnClock::begin(Participant& announced) {
+  Lock lock(mutex);
+  sitDown(announced);
+  announced.go.wait(lock, [&] { return holder == &announced; });
+  announced.isAtWork = true;
+}
+
+void TurnClock::leave() {
+  if (seat.id != id) return;
+  Participant& me = *std::exchange(seat, {}).place;
+  const Lock lock = lockFor(me);
+  me.state = Participant::State::Left;
+  if (holder == &me) holder = nullptr;
+  keeperWakes.notify_one();
+}
+
+void TurnClock::waitForTurn(Lock& lock, Participant& me, uint64_t wake) {
+  me.calls = 0;
+  me.wake = wake;
+  me.isAtWork = false;
+  me.state = Participant::State::Waiting;
+  if (me.isOutside) takeBack(me);
+  if (holder == &me) holder = nullptr;
+  if (holder == nullptr) passOn(lock);
+  me.go.wait(lock, [&] { return holder == &me; });
+  me.isAtWork = true;
+}
+
+// Nobody has the turn.
+void TurnClock::passOn(Lock& lock) {
+  if (isPassing) return;
+  isPassing = true;
+  Participant* const next = choose(lock);
+  isPassing = false;
+  if (next == nullptr) {
+    keeperWakes.notify_one();
+    return;
+  }
+  time = std::max(time.load(), next->wake);
+  next->state = Participant::State::Running;
+  holder = next;
+  ++turns;
+  next->go.notify_one();
+}
+
+// Null: nobody can run, or real time has not come so far; the keeper looks again.
+TurnClock::Participant* TurnClock::choose(Lock& lock) {
+  while (!isOver) {
+    settle(lock);
+    const std::optional<uint64_t> moment = nextMoment();
+    if (!moment || !pace.isReached(*moment)) return nullptr;
+    const std::optional<uint64_t> due = agentDue();
+    Participant* const next = earliest();
+    if (!due || *due > next->wake) return next;
+    actAsAgent(lock, *due);
+  }
+  return nullptr;
+}
+
+TurnClock::Participant* TurnClock::earliest() {
+  Participant* found = nullptr;
+  for (Participant& each : participants) {
+    if (each.state != Participant::State::Waiting) continue;
+    if (found == nullptr || each.wake < found->wake) found = &each;
+  }
+  return found;
+}
+
+std::optional<uint64_t> TurnClock::agentDue() {
+  if (!agent.due) return std::nullopt;
+  return agent.due(pace.isStarted() ? std::max(time + 1, pace.reached()) : time + 1);
+}
+
+// None: every thread is away, and time stands still.
+std::optional<uint64_t> TurnClock::nextMoment() {
+  const Participant* const next = earliest();
+  if (next == nullptr) return std::nullopt;
+  const std::optional<uint64_t> due = agentDue();
+  return due ? std::min(*due, next->wake) : next->wake;
+}
+
+void TurnClock::actAsAgent(Lock& lock, uint64_t due) {
+  time = std::max(time.load(), due);
+  lock.unlock();
+  agent.act(time);
+  lock.lock();
+}
+
+}  // namespace brimol::pc

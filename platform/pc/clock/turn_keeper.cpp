@@ -1,0 +1,126 @@
+// What the turn clock does for threads that block or end: the part of it that looks at threads from
+// outside.
+#include <algorithm>
+#include <utility>
+
+#include "clock/participant.h"
+#include "clock/thread_look.h"
+#include "clock/turn_clock.h"
+
+namespace brimol::pc {
+
+namespace {
+
+using std::chrono::steady_clock;
+
+constexpr std::chrono::milliseconds kLookPause{1};
+constexpr std::chrono::microseconds kSettlePause{30};
+constexpr std::chrono::seconds kBlockedBound{2};
+constexpr int kLooksOnThread = 2;  // in a row, before a thread counts as blocked
+
+}  // namespace
+
+// Threads that are away and run are on their way to their next call; a thread that left wakes
+// whoever waits for its end. Both come first, however long the machine takes.
+void TurnClock::settle(Lock& lock) {
+  while (!isOver) {
+    dropGone();
+    if (std::ranges::none_of(participants, isUnsettled)) return;
+    lock.unlock();
+    std::this_thread::sleep_for(kSettlePause);
+    lock.lock();
+  }
+}
+
+// Not one that has run for long without a call: it does something else.
+bool TurnClock::isUnsettled(Participant& away) {
+  if (away.state == Participant::State::Left) return true;
+  if (away.state != Participant::State::Away) return false;
+  if (lookAt(away.thread) != ThreadState::Running) {
+    if (away.arrives) return true;
+    away.runsSince = {};
+    return false;
+  }
+  const auto now = steady_clock::now();
+  if (away.runsSince == steady_clock::time_point()) away.runsSince = now;
+  return now - away.runsSince < kBlockedBound;
+}
+
+void TurnClock::dropGone() {
+  using State = Participant::State;
+  participants.remove_if([](const Participant& each) {
+    const bool mayBeGone = each.state == State::Left || each.state == State::Away;
+    return mayBeGone && lookAt(each.thread) == ThreadState::Gone;
+  });
+}
+
+void TurnClock::keep() {
+  cpus.leave();
+  Lock lock(mutex);
+  while (!isOver) {
+    if (holder == nullptr) passOn(lock);
+    const auto moment = holder == nullptr && pace.isStarted() ? nextMoment() : std::nullopt;
+    if (moment) {
+      keeperWakes.wait_until(lock, pace.realAt(*moment));
+    } else {
+      keeperWakes.wait_for(lock, kLookPause);
+    }
+    watchHolder(lock);
+  }
+}
+
+void TurnClock::watchHolder(Lock& lock) {
+  Participant* const watched = holder;
+  if (watched == nullptr || watched->waitsInside) return;
+  const auto now = steady_clock::now();
+  // What waits for the clock's own lock, or to hear that it has the turn, is no more than slow.
+  const bool isSlow = !watched->isAtWork;
+  const ThreadState looked = isSlow ? ThreadState::Running : lookAt(watched->thread);
+  const ThreadState state = watched->arrives ? ThreadState::Running : looked;
+  if (turns != std::exchange(watchedTurn, turns) || state == ThreadState::Running) {
+    looksOnThread = 0;
+    blockedSince = now;
+    return;
+  }
+  if (state == ThreadState::Gone) return sendAway(lock, *watched);
+  looksOnThread = state == ThreadState::OnThread ? looksOnThread + 1 : 0;
+  if (looksOnThread >= kLooksOnThread && !othersRun()) return sendAway(lock, *watched);
+  if (now - blockedSince >= kBlockedBound) callOutside(lock, *watched);
+}
+
+// While a thread runs that takes no part, it may be about to let go of what is waited for.
+bool TurnClock::othersRun() {
+  const pid_t self = ::gettid();
+  return std::ranges::any_of(threadsOfProcess(), [&](pid_t thread) {
+    const bool isOurs = thread == self || std::ranges::any_of(participants, [&](const auto& each) {
+                          return each.thread == thread && each.state == Participant::State::Waiting;
+                        });
+    return !isOurs && lookAt(thread) == ThreadState::Running;
+  });
+}
+
+void TurnClock::sendAway(Lock& lock, Participant& blocked) {
+  blocked.state = Participant::State::Away;
+  blocked.runsSince = {};
+  holder = nullptr;
+  passOn(lock);
+}
+
+void TurnClock::callOutside(Lock& lock, Participant& blocked) {
+  blocked.isOutside = true;
+  if (!pace.isStarted()) pace.start(time);
+  const std::string name = blocked.name;
+  const pid_t thread = blocked.thread;
+  lock.unlock();
+  if (tellBlocked) tellBlocked(name, thread);
+  lock.lock();
+  if (holder == &blocked) sendAway(lock, blocked);
+}
+
+void TurnClock::takeBack(Participant& me) {
+  me.isOutside = false;
+  const bool isLast = std::ranges::none_of(participants, &Participant::isOutside);
+  if (isLast && speed == Speed::Free) pace.stop();
+}
+
+}  // namespace brimol::pc

@@ -1,0 +1,55 @@
+/// The file that a tool reads of a session. docs/traces.md describes it.
+#pragma once
+
+#include <cairo.h>
+
+#include <cstdint>
+#include <filesystem>
+#include <fstream>
+#include <string>
+#include <vector>
+
+#include "host/session_settings.h"
+#include "input/trace.h"
+#include "scene/scene.h"
+
+namespace brimol::pc {
+
+/// A changed frame of a session.
+struct SessionFrame {
+  uint64_t time;
+  int number;  // from 1
+  const Frame& frame;
+  const std::vector<std::string>& items;
+};
+
+/// Writes into a folder that it makes, each line when it happens. Not guarded: Session is. Times
+/// are milliseconds since the start.
+class SessionReport {
+ public:
+  /// `error` says in one line why the folder cannot be used.
+  SessionReport(std::filesystem::path where, std::string& error);
+
+  void start(const SessionSettings& settings, Size screen, const char* display,
+             uint32_t clockStart);
+  void step(uint64_t time, const TraceLine& line);
+  void event(uint64_t time, const Event& record, const TraceLine* line);
+  void close(uint64_t time, const TraceLine* line);
+  /// `picture` is written beside the file; null: none.
+  void frame(const SessionFrame& shown, Size screen, cairo_surface_t* picture, int64_t paintUs);
+  void log(uint64_t time, int priority, const char* tag, const char* message);
+  void expectation(uint64_t time, const TraceLine& line, const std::string& why);
+  void shot(uint64_t time, const TraceLine& line, const std::string& picture);
+  void world(uint64_t time, const std::string& name, const std::string& value);
+  void blocked(uint64_t time, const std::string& name, pid_t thread);
+  void error(uint64_t time, const std::string& message, const TraceLine* line);
+  void end(uint64_t time, int exitCode, const char* reason);
+
+  const std::filesystem::path& directory() const { return folder; }
+
+ private:
+  std::filesystem::path folder;
+  std::ofstream file;
+};
+
+}  // namespace brimol::pc

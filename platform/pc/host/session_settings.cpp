@@ -1,0 +1,80 @@
+#include "host/session_settings.h"
+
+#include <algorithm>
+#include <array>
+#include <charconv>
+#include <string_view>
+#include <system_error>
+
+namespace brimol::pc {
+
+namespace {
+
+constexpr const char* kClockVariable = "BRIMOL_CLOCK";
+constexpr const char* kStartVariable = "BRIMOL_CLOCK_START";
+
+std::string valueOf(const VariableLookup& lookup, const char* name) {
+  const char* const value = lookup(name);
+  return value == nullptr ? "" : value;
+}
+
+struct ClockRow {
+  std::string_view word;
+  ClockChoice clock;
+};
+constexpr auto kClocks = std::to_array<ClockRow>({{"real", ClockChoice::Real},
+                                                  {"simulated", ClockChoice::Simulated},
+                                                  {"paced", ClockChoice::Paced}});
+
+// What stands for no choice.
+ClockChoice usualClock(const SessionSettings& settings) {
+  if (!settings.recording.empty()) return ClockChoice::Paced;
+  return settings.trace.empty() ? ClockChoice::Real : ClockChoice::Simulated;
+}
+
+std::string readClock(const VariableLookup& lookup, SessionSettings& settings) {
+  const std::string value = valueOf(lookup, kClockVariable);
+  settings.clock = usualClock(settings);
+  if (value.empty()) return {};
+  const auto* const row = std::ranges::find(kClocks, value, &ClockRow::word);
+  if (row == kClocks.end()) {
+    return std::string(kClockVariable) + "=" + value + ": wanted real, simulated or paced";
+  }
+  settings.clock = row->clock;
+  const bool isSession = !settings.trace.empty() || !settings.recording.empty();
+  if (isSession && settings.clock == ClockChoice::Real) {
+    return "BRIMOL_CLOCK=real: a real clock plays no trace and records none";
+  }
+  return {};
+}
+
+std::string readStart(const VariableLookup& lookup, SessionSettings& settings) {
+  const std::string value = valueOf(lookup, kStartVariable);
+  if (value.empty()) return {};
+  uint32_t start = 0;
+  const char* const end = value.data() + value.size();
+  const auto [stop, failure] = std::from_chars(value.data(), end, start);
+  if (failure != std::errc() || stop != end) {
+    return std::string(kStartVariable) + "=" + value + ": wanted milliseconds, 0 to 4294967295";
+  }
+  settings.clockStart = start;
+  return {};
+}
+
+}  // namespace
+
+SessionSettings readSessionSettings(const VariableLookup& lookup) {
+  SessionSettings settings;
+  settings.trace = valueOf(lookup, "BRIMOL_TRACE");
+  settings.recording = valueOf(lookup, "BRIMOL_RECORD");
+  settings.reportFolder = valueOf(lookup, "BRIMOL_REPORT_DIR");
+  const std::string clockError = readClock(lookup, settings);
+  const std::string startError = readStart(lookup, settings);
+  settings.error = clockError.empty() ? startError : clockError;
+  if (!settings.trace.empty() && !settings.recording.empty()) {
+    settings.error = "BRIMOL_TRACE and BRIMOL_RECORD: a session is played or recorded, not both";
+  }
+  return settings;
+}
+
+}  // namespace brimol::pc

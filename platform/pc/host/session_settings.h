@@ -1,0 +1,27 @@
+/// What the environment asks of a played or recorded session.
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+#include "host/settings.h"
+
+namespace brimol::pc {
+
+enum class ClockChoice { Real, Simulated, Paced };
+
+struct SessionSettings {
+  ClockChoice clock = ClockChoice::Real;
+  std::optional<uint32_t> clockStart;
+  std::string trace;         // what is played; empty: nothing
+  std::string recording;     // what is recorded into; empty: nothing
+  std::string reportFolder;  // empty: none
+  std::string error;         // one line about the first wrong value; empty: none is wrong
+};
+
+/// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_TRACE, BRIMOL_RECORD and BRIMOL_REPORT_DIR; an
+/// empty value is no value.
+SessionSettings readSessionSettings(const VariableLookup& lookup);
+
+}  // namespace brimol::pc

@@ -1,0 +1,119 @@
+/// What a trace file says. docs/traces.md describes the file.
+#pragma once
+
+#include <brimol/input.h>
+
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <variant>
+#include <vector>
+
+#include "scene/geometry.h"
+#include "scene/shown_texts.h"
+
+namespace brimol::pc {
+
+struct TraceLine {
+  std::string file;
+  int number = 0;    // from 1
+  std::string text;  // as it is written, without blanks at its ends
+};
+
+/// Pixels, or hundredths of per cent of the screen's side.
+struct Coordinate {
+  int value = 0;
+  bool isPart = false;
+  int pixels(int side) const;
+};
+
+/// A position, or the middle of the item that shows a text.
+struct Place {
+  Coordinate x;
+  Coordinate y;
+  std::optional<TextPattern> text;
+};
+
+struct SearchArea {
+  Coordinate x;
+  Coordinate y;
+  Coordinate w;
+  Coordinate h;
+};
+
+// The steps. Durations are milliseconds.
+
+struct Touch {
+  enum class Kind { Tap, Press, Move, MoveBy, Release, Drag };
+  Kind kind = Kind::Tap;
+  Place place;  // MoveBy: the distance
+  Place to;     // Drag
+  uint32_t duration = 0;
+  int finger = 0;
+};
+struct KeyStroke {
+  enum class Kind { Stroke, Down, Up };
+  Kind kind = Kind::Stroke;
+  uint32_t code = 0;
+  uint32_t duration = 0;
+};
+struct Typing {
+  std::string text;
+};
+struct Look {
+  enum class Subject { Text, NoText, Pixel, Log, NoLog };
+  Subject subject = Subject::Text;
+  TextPattern pattern;
+  std::optional<SearchArea> area;
+  Coordinate x;
+  Coordinate y;
+  uint32_t colour = 0;  // 0x00RRGGBB
+  uint32_t within = 0;
+};
+struct Pause {
+  uint32_t duration = 0;
+};
+struct Shot {
+  std::string file;
+};
+struct WorldChange {
+  enum class Kind { Time, Random, Figure };
+  Kind kind = Kind::Time;
+  uint64_t number = 0;  // milliseconds since 1970, or the seed
+  std::string name;
+  std::string value;
+};
+struct RawRecord {
+  Event record = {};
+};
+struct CloseWish {};
+struct SessionEnd {};
+
+struct TraceStep {
+  enum class Timing { AsSoonAsPossible, At, After };
+  using Action = std::variant<Touch, KeyStroke, Typing, Look, Pause, Shot, WorldChange, RawRecord,
+                              CloseWish, SessionEnd>;
+  TraceLine line;
+  Timing timing = Timing::AsSoonAsPossible;
+  uint64_t time = 0;  // since the start, or since the step before was done
+  Action action;
+};
+
+struct RecordedFrame {
+  TraceLine line;
+  uint64_t time = 0;
+  uint64_t hash = 0;
+  std::vector<std::string> items;  // empty texts where they are not known
+};
+
+struct Trace {
+  bool isRecording = false;
+  bool leavesRunning = false;
+  std::string cutAt;  // a recording without an end: where it stops, for the user
+  std::optional<Size> screen;
+  std::optional<uint32_t> clockStart;
+  std::vector<TraceStep> steps;
+  std::vector<RecordedFrame> frames;
+};
+
+}  // namespace brimol::pc

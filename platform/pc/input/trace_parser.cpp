@@ -1,0 +1,260 @@
+#include "input/trace_parser.h"
+
+#include <algorithm>
+#include <filesystem>
+#include <fstream>
+#include <limits>
+#include <sstream>
+#include <string_view>
+#include <utility>
+
+#include "input/trace_steps.h"
+#include "input/trace_words.h"
+#include "scene/item_text.h"
+
+namespace brimol::pc {
+
+namespace {
+
+constexpr std::size_t kMostIncludes = 16;  // one in the other
+constexpr uint64_t kMostTime = uint64_t{1} << 40;
+constexpr uint64_t kMostItems = 65536;
+constexpr std::size_t kHashDigits = 16;
+constexpr uint64_t kMostSide = 16384;
+
+std::string_view trimmed(std::string_view line) {
+  constexpr std::string_view kBlanks = " \t\r";
+  const std::size_t first = line.find_first_not_of(kBlanks);
+  if (first == std::string_view::npos) return {};
+  return line.substr(first, line.find_last_not_of(kBlanks) + 1 - first);
+}
+
+bool isDigit(char letter) { return letter >= '0' && letter <= '9'; }
+
+/// Reads files into one trace.
+class TraceParser {
+ public:
+  TraceParser(Trace& target, const TraceFiles& source) : trace(target), files(source) {}
+
+  /// The error, or an empty text.
+  std::string read(const std::string& path) {
+    const std::optional<std::string> text = files(path);
+    if (!text) return path + ":1: cannot be read";
+    open.push_back(path);
+    std::string error = readLines(path, *text);
+    open.pop_back();
+    return error;
+  }
+
+  /// What can be said only once all is read.
+  std::string finish();
+
+ private:
+  std::string readLines(const std::string& path, std::string_view text);
+  void readLine(const TraceLine& line);
+  void readHeader(const TraceLine& line);
+  void readItem(const TraceLine& line);
+  void readFrame(const TraceLine& line, TraceWords& words, uint64_t time);
+  bool readSetting(const TraceLine& line, TraceWords& words);
+  void readTimed(const TraceLine& line, TraceWords& words);
+  void include(const TraceLine& line, const std::string& file);
+  void endFrame();
+
+  Trace& trace;
+  const TraceFiles& files;
+  std::vector<std::string> open;  // the files that are being read, the outermost first
+  std::string errorInside;        // of an included file
+  bool hasItems = false;          // of the newest frame
+  bool hasEnd = false;
+  std::string lastLine;
+};
+
+std::string TraceParser::readLines(const std::string& path, std::string_view text) {
+  TraceLine line = {path, 0, {}};
+  while (!text.empty() || line.number == 0) {
+    const std::size_t end = text.find('\n');
+    const bool isCut = end == std::string_view::npos;
+    const std::string_view written = text.substr(0, end);
+    text = isCut ? std::string_view() : text.substr(end + 1);
+    ++line.number;
+    line.text = trimmed(written);
+    if (isCut && trace.isRecording && line.number > 1)
+      break;  // the crash came while it was written
+    try {
+      line.number == 1 ? readHeader(line) : readLine(line);
+    } catch (const BadLine& bad) {
+      if (!errorInside.empty()) return errorInside;
+      return path + ":" + std::to_string(line.number) + ": " + bad.why;
+    }
+    lastLine = path + ":" + std::to_string(line.number);
+  }
+  return {};
+}
+
+void TraceParser::readHeader(const TraceLine& line) {
+  TraceWords words(line.text);
+  if (!words.takes("brimol-trace"))
+    throw BadLine{"not a trace: its first line is 'brimol-trace 1'"};
+  if (words.peek() != "1") throw BadLine{"this version of the format is not known; 1 is"};
+  (void)words.word("a version");
+  const bool isRecording = words.takes("recording");
+  words.expectEnd();
+  if (isRecording && open.size() > 1) throw BadLine{"a recording cannot be included"};
+  if (open.size() == 1) trace.isRecording = isRecording;
+}
+
+void TraceParser::readLine(const TraceLine& line) {
+  if (line.text.empty() || line.text.front() == '#') return;
+  if (line.text.front() == '|') return readItem(line);
+  endFrame();
+  TraceWords words(line.text);
+  if (words.isAtEnd()) return;
+  if (!readSetting(line, words)) readTimed(line, words);
+}
+
+// `| NUMBER ITEM`, of the frame above.
+void TraceParser::readItem(const TraceLine& line) {
+  std::string_view rest = trimmed(std::string_view(line.text).substr(1));
+  if (trace.frames.empty()) throw BadLine{"an item without a frame above"};
+  std::vector<std::string>& items = trace.frames.back().items;
+  TraceWords number(rest.substr(0, rest.find(' ')));
+  const uint64_t place = number.number("an item's number", kMostItems);
+  if (place >= items.size()) throw BadLine{"the frame above has not so many items"};
+  items[place] = trimmed(rest.substr(std::min(rest.find(' '), rest.size())));
+  hasItems = true;
+}
+
+// Settled with the first line behind its items. A damaged recording shows here.
+void TraceParser::endFrame() {
+  if (trace.frames.empty()) return;
+  RecordedFrame& frame = trace.frames.back();
+  const bool isWhole = hashOf(frame.items) == frame.hash;
+  if (!isWhole && trace.isRecording) {
+    throw BadLine{"the frame at line " + std::to_string(frame.line.number) +
+                  " does not have the items that its hash says"};
+  }
+  if (!isWhole && !hasItems) std::ranges::fill(frame.items, std::string());
+}
+
+void TraceParser::readFrame(const TraceLine& line, TraceWords& words, uint64_t time) {
+  RecordedFrame frame = {line, time, 0, {}};
+  frame.hash = words.hexadecimal("a hash of 16 digits", kHashDigits);
+  const uint64_t count = words.number("a number of items", kMostItems);
+  words.expectEnd();
+  if (!trace.frames.empty()) {
+    if (time < trace.frames.back().time) throw BadLine{"a frame before the one above"};
+    frame.items = trace.frames.back().items;
+  }
+  frame.items.resize(count);
+  trace.frames.push_back(std::move(frame));
+  hasItems = false;
+}
+
+// What is about the trace, and no step.
+bool TraceParser::readSetting(const TraceLine& line, TraceWords& words) {
+  const auto mustComeFirst = [this] {
+    const auto isOfWorld = [](const TraceStep& step) {
+      return std::holds_alternative<WorldChange>(step.action);
+    };
+    if (!std::ranges::all_of(trace.steps, isOfWorld)) {
+      throw BadLine{"this must stand before the first step"};
+    }
+  };
+  if (words.takes("screen")) {
+    mustComeFirst();
+    std::string size = words.word("a size as 720x1280");
+    std::ranges::replace(size, 'x', ' ');
+    TraceWords sides(size);
+    const auto side = [&] {
+      const uint64_t pixels = sides.number("a side in pixels", kMostSide);
+      if (pixels == 0) throw BadLine{"a screen without pixels"};
+      return static_cast<int>(pixels);
+    };
+    const int width = side();
+    trace.screen = Size{width, side()};
+    sides.expectEnd();
+  } else if (words.takes("clock")) {
+    mustComeFirst();
+    words.expect("start");
+    trace.clockStart = static_cast<uint32_t>(
+        words.number("a number of milliseconds", std::numeric_limits<uint32_t>::max()));
+  } else if (words.takes("include")) {
+    const std::string file = words.isTextNext() ? words.text("a file") : words.word("a file");
+    words.expectEnd();
+    include(line, file);
+  } else if (words.takes("leave")) {
+    words.expect("running");
+    trace.leavesRunning = true;
+  } else {
+    return false;
+  }
+  words.expectEnd();
+  return true;
+}
+
+void TraceParser::include(const TraceLine& line, const std::string& file) {
+  const std::string path = (std::filesystem::path(line.file).parent_path() / file).native();
+  if (std::ranges::count(open, path) != 0) throw BadLine{"'" + file + "' includes itself"};
+  if (open.size() >= kMostIncludes) throw BadLine{"too many files that include each other"};
+  if (!files(path)) throw BadLine{"'" + path + "' cannot be read"};
+  errorInside = read(path);
+  if (!errorInside.empty()) throw BadLine{};
+}
+
+void TraceParser::readTimed(const TraceLine& line, TraceWords& words) {
+  TraceStep step = {line, TraceStep::Timing::AsSoonAsPossible, 0, {}};
+  if (words.peek().starts_with('+')) {
+    TraceWords digits(words.word("a time").substr(1));
+    step.timing = TraceStep::Timing::After;
+    step.time = digits.number("a time", kMostTime);
+  } else if (isDigit(words.peek().front())) {
+    step.timing = TraceStep::Timing::At;
+    step.time = words.number("a time", kMostTime);
+  }
+  if (words.takes("frame")) {
+    if (step.timing != TraceStep::Timing::At) throw BadLine{"a frame needs its time"};
+    return readFrame(line, words, step.time);
+  }
+  if (trace.isRecording && step.timing != TraceStep::Timing::At && words.peek() != "world") {
+    throw BadLine{"a step of a recording needs its time"};
+  }
+  if (hasEnd) throw BadLine{"a step behind the end"};
+  step.action = readStep(words);
+  hasEnd = std::holds_alternative<SessionEnd>(step.action);
+  trace.steps.push_back(std::move(step));
+}
+
+std::string TraceParser::finish() {
+  try {
+    endFrame();
+  } catch (const BadLine& bad) {
+    // The crash came between the last frame and its items.
+    if (hasEnd) return lastLine + ": " + bad.why;
+    trace.frames.pop_back();
+  }
+  if (trace.isRecording && !hasEnd) trace.cutAt = lastLine;
+  return {};
+}
+
+}  // namespace
+
+ParsedTrace parseTrace(const std::string& path, const TraceFiles& files) {
+  ParsedTrace parsed;
+  TraceParser parser(parsed.trace, files);
+  parsed.error = parser.read(path);
+  if (parsed.error.empty()) parsed.error = parser.finish();
+  return parsed;
+}
+
+ParsedTrace parseTrace(const std::string& path) {
+  return parseTrace(path, [](const std::string& file) -> std::optional<std::string> {
+    std::error_code failure;
+    if (std::filesystem::is_directory(file, failure)) return std::nullopt;
+    std::ifstream in(file, std::ios::binary);
+    std::ostringstream bytes;
+    if (!in || (in.peek() != EOF && !(bytes << in.rdbuf()))) return std::nullopt;
+    return std::move(bytes).str();
+  });
+}
+
+}  // namespace brimol::pc

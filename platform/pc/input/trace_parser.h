@@ -1,0 +1,26 @@
+/// From a trace's text to its steps.
+#pragma once
+
+#include <functional>
+#include <optional>
+#include <string>
+
+#include "input/trace.h"
+
+namespace brimol::pc {
+
+/// The bytes of a file; nothing where it cannot be read.
+using TraceFiles = std::function<std::optional<std::string>(const std::string& path)>;
+
+struct ParsedTrace {
+  Trace trace;
+  std::string error;  // "FILE:LINE: what is wrong"; empty: nothing is
+};
+
+/// Reads `path` and what it includes. Throws nothing, whatever the files hold.
+ParsedTrace parseTrace(const std::string& path, const TraceFiles& files);
+
+/// The same from the file system.
+ParsedTrace parseTrace(const std::string& path);
+
+}  // namespace brimol::pc

@@ -1,0 +1,92 @@
+#include "input/trace_recorder.h"
+
+#include <array>
+#include <cerrno>
+#include <system_error>
+
+#include "input/trace_steps.h"
+#include "scene/item_text.h"
+#include "scene/quoted_text.h"
+
+namespace brimol::pc {
+
+namespace {
+
+struct RecordName {
+  int type;
+  const char* word;
+};
+constexpr auto kRecordNames = std::to_array<RecordName>({{BRIMOL_POINTER_DOWN, "down"},
+                                                         {BRIMOL_POINTER_UP, "up"},
+                                                         {BRIMOL_POINTER_MOTION, "motion"},
+                                                         {BRIMOL_LONG_PRESS, "long"},
+                                                         {BRIMOL_KEY_DOWN, "keydown"},
+                                                         {BRIMOL_KEY_UP, "keyup"}});
+
+std::string pointerWords(const BrimolPointerEvent& pointer) {
+  std::string words = ' ' + std::to_string(pointer.finger) + ' ' + std::to_string(pointer.x) + ' ' +
+                      std::to_string(pointer.y);
+  if (pointer.type == BRIMOL_POINTER_MOTION) {
+    words += ' ' + std::to_string(pointer.xrel) + ' ' + std::to_string(pointer.yrel);
+  }
+  return words;
+}
+
+}  // namespace
+
+std::string textOfRecord(const Event& record) {
+  for (const auto& [type, word] : kRecordNames) {
+    if (type != record.type) continue;
+    const bool isKey = type == BRIMOL_KEY_DOWN || type == BRIMOL_KEY_UP;
+    return word + (isKey ? ' ' + std::to_string(record.key.code) : pointerWords(record.pointer));
+  }
+  return {};
+}
+
+TraceRecorder::TraceRecorder(const std::string& path, std::string& error)
+    : file(path, std::ios::binary | std::ios::trunc) {
+  if (!file) error = path + ": " + std::generic_category().message(errno);
+}
+
+// A full disk ends the recording, not the session.
+void TraceRecorder::write(const std::string& line) { file << line << '\n' << std::flush; }
+
+void TraceRecorder::start(uint32_t clockStart, uint64_t utcMs, uint64_t seed) {
+  write("brimol-trace 1 recording");
+  write("clock start " + std::to_string(clockStart));
+  write("world time " + utcText(utcMs));
+  write("world random " + std::to_string(seed));
+}
+
+void TraceRecorder::screen(Size size) {
+  write("screen " + std::to_string(size.w) + 'x' + std::to_string(size.h));
+}
+
+void TraceRecorder::input(uint64_t time, const Event& record) {
+  const std::string words = textOfRecord(record);
+  if (!words.empty()) write(std::to_string(time) + ' ' + words);
+}
+
+void TraceRecorder::close(uint64_t time) { write(std::to_string(time) + " close"); }
+
+void TraceRecorder::figure(uint64_t time, const std::string& name, const std::string& value) {
+  write(std::to_string(time) + " world figure " + inQuotes(name) + ' ' + inQuotes(value));
+}
+
+void TraceRecorder::frame(uint64_t time, const std::vector<std::string>& items) {
+  std::string lines = std::to_string(time) + " frame " + hashText(hashOf(items)) + ' ' +
+                      std::to_string(items.size());
+  for (std::size_t i = 0; i < items.size(); ++i) {
+    if (i < lastItems.size() && lastItems[i] == items[i]) continue;
+    lines += "\n| " + std::to_string(i) + ' ' + items[i];
+  }
+  lastItems = items;
+  write(lines);
+}
+
+void TraceRecorder::end(uint64_t time) {
+  write(std::to_string(time) + " end");
+  file.close();
+}
+
+}  // namespace brimol::pc

@@ -1,0 +1,41 @@
+/// Writes a recording.
+#pragma once
+
+#include <brimol/input.h>
+
+#include <cstdint>
+#include <fstream>
+#include <string>
+#include <vector>
+
+#include "scene/geometry.h"
+
+namespace brimol::pc {
+
+/// A file that is written line by line, each as soon as it is known. Not guarded: Session is. Times
+/// are milliseconds since the start and do not run back.
+class TraceRecorder {
+ public:
+  /// Begins the file anew. `error` says in one line why it cannot be written.
+  TraceRecorder(const std::string& path, std::string& error);
+
+  /// The lines at the head, to be written first. Time of day in milliseconds since 1970.
+  void start(uint32_t clockStart, uint64_t utcMs, uint64_t seed);
+  void screen(Size size);
+  void input(uint64_t time, const Event& record);
+  void close(uint64_t time);
+  void figure(uint64_t time, const std::string& name, const std::string& value);
+  void frame(uint64_t time, const std::vector<std::string>& items);
+  void end(uint64_t time);
+
+ private:
+  void write(const std::string& line);
+
+  std::ofstream file;
+  std::vector<std::string> lastItems;
+};
+
+/// The words behind the time, such as "down 0 360 640"; empty for a record that has none.
+std::string textOfRecord(const Event& record);
+
+}  // namespace brimol::pc

@@ -1,0 +1,17 @@
+/// Texts between double quotes, on one line.
+#pragma once
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace brimol::pc {
+
+/// `text` in quotes, with \", \\, \n, \t and, for other control characters, \xHH.
+std::string inQuotes(std::string_view text);
+
+/// What stands between the quotes, with its escapes undone; \* becomes a star. Nothing for a wrong
+/// escape.
+std::optional<std::string> unescaped(std::string_view inside);
+
+}  // namespace brimol::pc

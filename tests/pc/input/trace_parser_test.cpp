@@ -1,0 +1,271 @@
+#include "input/trace_parser.h"
+
+#include <gtest/gtest.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <filesystem>
+#include <fstream>
+#include <map>
+#include <random>
+
+#include "input/event_records.h"
+#include "input/trace_recorder.h"
+#include "input/trace_steps.h"
+#include "scene/item_text.h"
+#include "scene/quoted_text.h"
+
+namespace brimol::pc {
+namespace {
+
+using Files = std::map<std::string, std::string>;
+
+ParsedTrace parse(const Files& files) {
+  return parseTrace("t/main.trace", [&](const std::string& path) -> std::optional<std::string> {
+    const auto found = files.find(path);
+    return found == files.end() ? std::nullopt : std::optional(found->second);
+  });
+}
+ParsedTrace parse(const std::string& text) { return parse(Files{{"t/main.trace", text}}); }
+ParsedTrace parseLines(const std::string& lines) { return parse("brimol-trace 1\n" + lines); }
+
+TEST(QuotedText, ComesBackAsItWas) {
+  std::string every;
+  for (int byte = 0; byte < 256; ++byte) every += static_cast<char>(byte);
+  const std::string written = inQuotes(every);
+  EXPECT_EQ(written.find('\n'), std::string::npos);
+  EXPECT_EQ(unescaped(std::string_view(written).substr(1, written.size() - 2)), every);
+  EXPECT_EQ(unescaped("a\\"), std::nullopt);
+  EXPECT_EQ(unescaped("\\x4"), std::nullopt);
+  EXPECT_EQ(unescaped("\\x4g"), std::nullopt);
+  EXPECT_EQ(unescaped("\\q"), std::nullopt);
+}
+
+TEST(TextPattern, MatchesWholeTextsAndStars) {
+  const auto fits = [](std::vector<std::string> pieces, const char* text) {
+    return TextPattern(std::move(pieces)).matches(text);
+  };
+  EXPECT_TRUE(fits({"PASS"}, "  PASS "));
+  EXPECT_FALSE(fits({"PASS"}, "PASSED"));
+  EXPECT_TRUE(fits({"Press: ", ""}, "Press: 10"));
+  EXPECT_TRUE(fits({"", "b", "b", ""}, "abcbd"));
+  EXPECT_FALSE(fits({"", "b", "b", ""}, "abcd"));
+  EXPECT_FALSE(fits({"ab", "ba"}, "aba")) << "no byte counts twice";
+}
+
+struct WrongLine {
+  const char* line;
+  const char* why;
+};
+class TraceParser : public testing::TestWithParam<WrongLine> {};
+
+TEST_P(TraceParser, RefusesALineWithItsNumber) {
+  const auto [line, why] = GetParam();
+  const std::string error = parseLines(std::string("# first\n\n") + line + "\nwait 1\n").error;
+  EXPECT_EQ(error.rfind("t/main.trace:4: ", 0), 0) << error;
+  EXPECT_NE(error.find(why), std::string::npos) << error;
+}
+
+INSTANTIATE_TEST_SUITE_P(
+    Lines, TraceParser,
+    testing::Values(
+        WrongLine{"dance", "unknown step 'dance'"},
+        WrongLine{"tap", "a text in quotes or a position is missing"},
+        WrongLine{"tap 10", "a number of pixels, 0 to 65535 is missing"},
+        WrongLine{"tap 10 -1", "'-1' is not a position"}, WrongLine{"tap 10 101%", "0% to 100%"},
+        WrongLine{"tap nan% 5", "0% to 100%"}, WrongLine{"tap \"PASS", "closing quote"},
+        WrongLine{"tap \"PASS\"x", "another word touches"}, WrongLine{"tap \"a\\qb\"", "escape"},
+        WrongLine{"tap \"\"", "empty text"}, WrongLine{"tap 1 2 finger 10", "a finger, 0 to 9"},
+        WrongLine{"tap 1 2 3", "'3' is too much"}, WrongLine{"drag 1 2 3 4", "'3' is not 'to'"},
+        WrongLine{"key sideways", "the name of a key"},
+        WrongLine{"expect pixel 1 2 #12345", "a colour"},
+        WrongLine{"expect txet \"a\"", "'txet' is not 'text'"},
+        WrongLine{"wait until", "'text' is missing"}, WrongLine{"wait -5", "'-5' is not"},
+        WrongLine{"+x tap 1 2", "'x' is not a time"},
+        WrongLine{"99999999999999 tap 1 2", "a time, 0 to"},
+        WrongLine{"world time yesterday", "is not a time as"},
+        WrongLine{"world time 2026-02-30T10:00:00Z", "is not a time as"},
+        WrongLine{"world figure load \"1\"", "the figure's name in quotes"},
+        WrongLine{"down 0 1 70000", "a position"},
+        WrongLine{"frame 0123456789abcdef 1", "needs its time"},
+        WrongLine{"5 frame 0123 1", "a hash of 16 digits"},
+        WrongLine{"| 0 box", "an item without a frame"},
+        WrongLine{"screen 720", "a side in pixels"}, WrongLine{"screen 0x5", "without pixels"},
+        WrongLine{"include gone.trace", "'t/gone.trace' cannot be read"},
+        WrongLine{"include main.trace", "includes itself"}));
+
+TEST(TraceParserTest, ReadsStepsWithTheirTimesAndOperands) {
+  const ParsedTrace parsed = parseLines(
+      "screen 720x1280\nclock start 4294960000\n"
+      "1500 tap \"a*\\*\" for 700 finger 9 # a comment\n"
+      "+20 move by -5 10% over 30\n"
+      "key down\nkey down up\nkey volume-up for 5\n"
+      "expect no text \"x\" in 0 0 50% 25.5% within 7\nwait until log \"y\"\nexpect pixel 1 2 "
+      "#fF0080");
+  ASSERT_EQ(parsed.error, "");
+  const auto& steps = parsed.trace.steps;
+  ASSERT_EQ(steps.size(), 8U);
+  EXPECT_EQ(parsed.trace.screen, (Size{720, 1280}));
+  EXPECT_EQ(parsed.trace.clockStart, 4294960000U);
+  const auto& tap = std::get<Touch>(steps[0].action);
+  EXPECT_EQ(steps[0].time, 1500U);
+  EXPECT_EQ(tap.duration, 700U);
+  EXPECT_EQ(tap.finger, 9);
+  EXPECT_TRUE(tap.place.text->matches("a bit*"));
+  EXPECT_FALSE(tap.place.text->matches("a bit"));
+  const auto& move = std::get<Touch>(steps[1].action);
+  EXPECT_EQ(steps[1].timing, TraceStep::Timing::After);
+  EXPECT_EQ(move.place.x.pixels(720), -5);
+  EXPECT_EQ(move.place.y.pixels(1280), 128);
+  EXPECT_EQ(std::get<KeyStroke>(steps[2].action).code, 274U);
+  EXPECT_EQ(std::get<KeyStroke>(steps[3].action).kind, KeyStroke::Kind::Down);
+  EXPECT_EQ(std::get<KeyStroke>(steps[3].action).code, 273U);
+  EXPECT_EQ(std::get<KeyStroke>(steps[4].action).code, 115U);
+  const auto& look = std::get<Look>(steps[5].action);
+  EXPECT_EQ(look.subject, Look::Subject::NoText);
+  EXPECT_EQ(look.area->h.pixels(1000), 255);
+  EXPECT_EQ(look.within, 7U);
+  EXPECT_EQ(std::get<Look>(steps[6].action).within, 10'000U);
+  EXPECT_EQ(std::get<Look>(steps[7].action).colour, 0xFF0080U);
+}
+
+TEST(TraceParserTest, IncludesFilesAndNamesTheirLines) {
+  Files files = {{"t/main.trace", "brimol-trace 1\ninclude sub/part.trace\nwait 2\n"},
+                 {"t/sub/part.trace", "brimol-trace 1\nwait 1\n"}};
+  const ParsedTrace whole = parse(files);
+  ASSERT_EQ(whole.error, "");
+  ASSERT_EQ(whole.trace.steps.size(), 2U);
+  EXPECT_EQ(whole.trace.steps[0].line.file, "t/sub/part.trace");
+  EXPECT_EQ(whole.trace.steps[1].line.number, 3);
+  files["t/sub/part.trace"] += "dance\n";
+  EXPECT_EQ(parse(files).error, "t/sub/part.trace:3: unknown step 'dance'");
+  files["t/sub/part.trace"] = "brimol-trace 1\ninclude ../sub/../main.trace\n";
+  EXPECT_NE(parse(files).error, "") << "it ends, whatever the names";
+  EXPECT_EQ(parse(Files{}).error, "t/main.trace:1: cannot be read");
+}
+
+TEST(TraceParserTest, ReadsTimesOfDay) {
+  for (const char* text : {"2026-11-22T10:00:00.007Z", "1970-01-01T00:00:00.000Z"}) {
+    EXPECT_EQ(utcText(readUtc(text)), text);
+  }
+  EXPECT_EQ(utcText(readUtc("2024-02-29T23:59:59Z")), "2024-02-29T23:59:59.000Z");
+}
+
+SKIA_Item itemAt(int x, const char* text) {
+  SKIA_Item item = {SKIA_TEXTBOX, {x, 2, 30, 40, 0xFF112233}, {}, {}};
+  item.text.size = 12;
+  item.text.string_len = static_cast<int32_t>(std::string(text).copy(item.text.text, 127));
+  return item;
+}
+
+/// A recording of three frames and some input, as a session leaves it.
+std::string recording() {
+  const std::string path = testing::TempDir() + "recording." + std::to_string(::getpid());
+  std::string error;
+  TraceRecorder recorder(path, error);
+  EXPECT_EQ(error, "");
+  recorder.start(77, readUtc("2026-11-22T10:00:00Z"), 12345678901234567890U);
+  recorder.screen({720, 1280});
+  recorder.frame(0, textOfFrame({itemAt(1, "one"), itemAt(2, "two \"quoted\"\n")}));
+  recorder.input(5, pointerRecord(BRIMOL_POINTER_DOWN, 1, {10, 20}));
+  Event motion = pointerRecord(BRIMOL_POINTER_MOTION, 1, {8, 20});
+  motion.pointer.xrel = -2;
+  recorder.input(6, motion);
+  recorder.figure(7, "load", "0.25");
+  recorder.frame(7, textOfFrame({itemAt(1, "one"), itemAt(3, "three"), itemAt(4, "")}));
+  recorder.input(8, keyRecord(BRIMOL_KEY_UP, 158));
+  recorder.frame(9, {});
+  recorder.close(10);
+  recorder.end(11);
+  std::ifstream in(path, std::ios::binary);
+  std::string text{std::istreambuf_iterator<char>(in), {}};
+  std::filesystem::remove(path);
+  return text;
+}
+
+TEST(Recording, IsReadAsItWasWritten) {
+  const ParsedTrace parsed = parse(recording());
+  ASSERT_EQ(parsed.error, "");
+  const Trace& trace = parsed.trace;
+  EXPECT_TRUE(trace.isRecording);
+  EXPECT_EQ(trace.cutAt, "");
+  ASSERT_EQ(trace.frames.size(), 3U);
+  EXPECT_EQ(trace.frames[1].time, 7U);
+  EXPECT_EQ(trace.frames[1].items,
+            textOfFrame({itemAt(1, "one"), itemAt(3, "three"), itemAt(4, "")}));
+  ASSERT_EQ(trace.steps.size(), 8U);
+  const Event& motion = std::get<RawRecord>(trace.steps[3].action).record;
+  EXPECT_EQ(motion.pointer.xrel, -2);
+  EXPECT_EQ(textOfRecord(motion), "motion 1 8 20 -2 0");
+  EXPECT_EQ(std::get<WorldChange>(trace.steps[4].action).value, "0.25");
+}
+
+TEST(Recording, IsPlayedUpToWhereItWasCutOrRefusedWithItsLine) {
+  const std::string whole = recording();
+  const Trace trace = parse(whole).trace;
+  for (std::size_t length = 0; length < whole.size(); ++length) {
+    const ParsedTrace cut = parse(whole.substr(0, length));
+    if (!cut.error.empty()) {
+      EXPECT_EQ(cut.error.rfind("t/main.trace:1: ", 0), 0) << length << ' ' << cut.error;
+      continue;
+    }
+    const auto isSameFrame = [](const RecordedFrame& one, const RecordedFrame& other) {
+      return one.time == other.time && one.hash == other.hash && one.items == other.items;
+    };
+    const auto isSameStep = [](const TraceStep& one, const TraceStep& other) {
+      return one.line.text == other.line.text;
+    };
+    ASSERT_LE(cut.trace.frames.size(), trace.frames.size());
+    ASSERT_LE(cut.trace.steps.size(), trace.steps.size());
+    EXPECT_TRUE(std::equal(cut.trace.frames.begin(), cut.trace.frames.end(), trace.frames.begin(),
+                           isSameFrame))
+        << length;
+    EXPECT_TRUE(
+        std::equal(cut.trace.steps.begin(), cut.trace.steps.end(), trace.steps.begin(), isSameStep))
+        << length;
+    EXPECT_NE(cut.trace.cutAt.empty(), cut.trace.isRecording) << length;
+  }
+}
+
+TEST(Recording, IsRefusedWhereItWasDamaged) {
+  std::string damaged = recording();
+  damaged.replace(damaged.find("\"three\""), 7, "\"threw\"");
+  const std::string error = parse(damaged).error;
+  EXPECT_NE(error.find("does not have the items that its hash says"), std::string::npos) << error;
+}
+
+// Whatever stands in a trace, the answer is steps, or a line and what is wrong with it.
+TEST(TraceParserTest, HasAClearAnswerToEveryMutation) {
+  const std::string script =
+      "brimol-trace 1\nscreen 720x1280\n100 tap \"PA*SS\" for 50 finger 1\nkey volume-up\n+5 drag "
+      "1% "
+      "2 to \"x\" over 20\nexpect no text \"\\x41\" in 1 2 3 4 within 9\nworld time "
+      "2026-11-22T10:00:00.000Z\nexpect pixel 1 2 #a0B1c2\ntype \"ab c\"\nwait until log \"z\"\n";
+  const std::string recorded = recording();
+  std::mt19937 random(7);
+  const auto below = [&](std::size_t bound) { return random() % bound; };
+  int refused = 0;
+  for (int round = 0; round < 10'000; ++round) {
+    std::string text = round % 2 == 0 ? script : recorded;
+    for (std::size_t changes = 1 + below(4); changes > 0 && !text.empty(); --changes) {
+      const std::size_t place = below(text.size());
+      switch (below(4)) {
+        case 0: text[place] = static_cast<char>(random()); break;
+        case 1: text.erase(place, 1 + below(12)); break;
+        case 2: text.insert(place, text.substr(below(text.size()), 1 + below(30))); break;
+        default: text.insert(place, 1, "\"\\|#%-*\n 9"[below(10)]); break;
+      }
+    }
+    const std::string error = parse(text).error;
+    if (error.empty()) continue;
+    ++refused;
+    const std::size_t colon = error.find(": ");
+    ASSERT_NE(colon, std::string::npos) << error;
+    ASSERT_EQ(error.rfind("t/main.trace:", 0), 0) << error;
+    ASSERT_GT(error.size(), colon + 2) << error;
+  }
+  EXPECT_GT(refused, 1000) << "and some do go wrong";
+}
+
+}  // namespace
+}  // namespace brimol::pc

@@ -1,0 +1,145 @@
+"""The report in a real browser: report_browser_test.py CHROMEDRIVER BRIMOL_REPLAY APPLICATION"""
+
+import pathlib
+import subprocess
+import sys
+import tempfile
+import unittest
+
+from browser import Browser
+
+CHROMEDRIVER, REPLAY, APPLICATION = sys.argv[1:4]
+
+# Every element's text against what is behind it, as the accessibility guidelines count it.
+LOW_CONTRAST = """
+const channels = (colour) => colour.match(/[\\d.]+/g).map(Number);
+const light = ([r, g, b]) => {
+  const [R, G, B] = [r, g, b].map((c) => c / 255).map((c) => c <= 0.04045 ? c / 12.92 : ((c + 0.055) / 1.055) ** 2.4);
+  return 0.2126 * R + 0.7152 * G + 0.0722 * B;
+};
+const ground = (element) => {
+  for (; element; element = element.parentElement) {
+    const colour = channels(getComputedStyle(element).backgroundColor);
+    if (colour.length < 4 || colour[3] === 1) return colour;
+  }
+  return [255, 255, 255];
+};
+const low = [];
+for (const element of document.querySelectorAll("body *")) {
+  const hasText = [...element.childNodes].some((node) => node.nodeType === 3 && node.data.trim());
+  if (!hasText || !element.checkVisibility() || element.disabled || element.tagName === "SCRIPT") continue;
+  const [a, b] = [light(channels(getComputedStyle(element).color)), light(ground(element))];
+  if ((Math.max(a, b) + 0.05) / (Math.min(a, b) + 0.05) < 4.5) low.push(element.outerHTML.slice(0, 80));
+}
+return low;
+"""
+NAMELESS = """
+return [...document.querySelectorAll("button, a[href], input, dialog, [role=img], section, img")]
+    .filter((one) => !(one.textContent.trim() || one.getAttribute("aria-label") || one.alt ||
+                       one.labels?.length || one.getAttribute("aria-labelledby")))
+    .filter((one) => one.id !== "viewer-picture").map((one) => one.outerHTML.slice(0, 80));
+"""
+
+
+class ReportTest(unittest.TestCase):
+    @classmethod
+    def setUpClass(cls):
+        cls.folder = tempfile.TemporaryDirectory()
+        cls.addClassCleanup(cls.folder.cleanup)
+        cls.browser = cls.enterClassContext(Browser(CHROMEDRIVER))
+        cls.browser.open("about:blank")
+        cls.browser.fetched()
+
+    def show(self, does, *options, width=1280, scheme="light"):
+        """Opens the report of a new run."""
+        folder = pathlib.Path(tempfile.mkdtemp(dir=self.folder.name))
+        (folder / "menu.trace").write_text("brimol-trace 1\n")
+        subprocess.run([REPLAY, "--dir", folder / "run", *options, folder / "menu.trace", "--", APPLICATION,
+                        *does.split()], stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL, check=False)
+        self.browser.resize(width, 900)
+        self.browser.prefer(scheme)
+        page = (folder / "run" / "report.html").as_uri()
+        self.browser.open(page)
+        self.assertEqual([page], [url for url in self.browser.fetched() if not url.startswith("data:")])
+        self.assertEqual([], self.browser.log("browser"))
+        return folder / "run"
+
+    def text(self, selector):
+        return self.browser.run(f"return document.querySelector('{selector}').innerText")
+
+    def viewer(self):
+        """What is enlarged; nothing: the viewer is closed."""
+        return self.browser.run("return document.getElementById('viewer').open"
+                                " ? document.getElementById('viewer-title').textContent : ''")
+
+    def test_opens_with_its_verdict(self):
+        for does, verdict, says in [("pass", "Passed", "played to its end"),
+                                    ("fail", "Failed", 'expect text "Passed"'),
+                                    ("crash", "Crashed", "crashed"),
+                                    ("silent", "Failed", "before it opened a screen")]:
+            with self.subTest(does):
+                self.show(does)
+                self.assertEqual(verdict, self.text("#badge"))
+                self.assertIn(says, self.text("#headline"))
+                title = self.browser.run("return document.title")
+                self.assertTrue(title.startswith(verdict), title)
+
+    def test_marks_a_failed_step(self):
+        self.show("fail")
+        self.assertIn("menu.trace:4", self.text("#failures li"))
+        self.assertIn("no item shows it", self.text(".card.marked .failure"))
+        self.assertIn("failed", self.text(".card.marked .failure .kind"))
+        self.browser.click("#failures a")
+        self.assertEqual("#frame-2", self.browser.run("return location.hash"))
+
+    def test_enlarges_a_thumbnail_by_mouse_and_keys(self):
+        self.show("pass")
+        self.browser.click(".thumb")
+        self.assertEqual("Frame 1", self.viewer())
+        self.assertTrue(self.browser.run("const p = document.getElementById('viewer-picture');"
+                                         "return p.complete && p.naturalWidth === 480"))
+        for key, shown in [("Right", "Frame 2"), ("Left", "Frame 1"), ("Left", "Frame 1"), ("End", "Frame 3"),
+                           ("Right", "Frame 3"), ("Escape", "")]:
+            self.browser.press(key)
+            self.assertEqual(shown, self.viewer(), key)
+        self.assertEqual("Enlarge Frame 3", self.browser.run("return document.activeElement.ariaLabel"))
+        self.browser.press("Enter")
+        self.assertEqual("Frame 3", self.viewer())
+        self.browser.click("#viewer-close")
+        self.assertEqual("", self.viewer())
+
+    def test_hides_what_is_not_wanted(self):
+        self.show("fail")
+        self.browser.click("#filters label:nth-of-type(4)")
+        self.assertFalse(self.browser.run("return document.querySelector('.log').checkVisibility()"))
+        self.browser.click("#filters label:nth-of-type(3)")
+        self.assertFalse(self.browser.run("return document.querySelector('.check:not(.failure)').checkVisibility()"))
+        self.assertTrue(self.browser.run("return document.querySelector('.check.failure').checkVisibility()"))
+
+    def test_shows_both_sides_of_a_comparison(self):
+        first = self.show("pass")
+        self.show("pass-otherwise", "--against", first)
+        self.assertIn("1 of 3 frames differs", self.text("#comparison-summary"))
+        self.assertEqual(3, self.browser.run("return document.querySelectorAll('.pair img').length"))
+
+    def test_can_be_read_everywhere(self):
+        for scheme in ("light", "dark"):
+            for width in (1280, 390):
+                with self.subTest(scheme=scheme, width=width):
+                    self.show("fail", width=width, scheme=scheme)
+                    self.assertEqual([], self.browser.run(LOW_CONTRAST))
+                    self.assertEqual([], self.browser.run(NAMELESS))
+                    self.assertEqual(width, self.browser.run("return document.documentElement.scrollWidth"))
+        dark = self.browser.run("return getComputedStyle(document.body).backgroundColor")
+        self.browser.prefer("light")
+        self.assertNotEqual(dark, self.browser.run("return getComputedStyle(document.body).backgroundColor"))
+
+    def test_shows_thousands_of_frames(self):
+        folder = self.show("animate 5000")
+        self.assertLess((folder / "report.html").stat().st_size, 20_000_000)
+        self.assertEqual(4000, self.browser.run("return document.querySelectorAll('.strip figure').length"))
+        self.assertIn("1000 frames left out", self.text("#frame-list"))
+
+
+if __name__ == "__main__":
+    unittest.main(argv=sys.argv[:1], verbosity=2)

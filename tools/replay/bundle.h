@@ -1,0 +1,42 @@
+/// One archive of all that repeats a run elsewhere.
+#pragma once
+
+#include <filesystem>
+#include <map>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace brimol::replay {
+
+/// What was run, and with what.
+struct RunRecord {
+  std::string version = {};                             // of brimol-replay
+  std::string trace = {};                               // in a bundle: its file there
+  std::vector<std::string> command = {};                // the application and its arguments
+  std::map<std::string, std::string> environment = {};  // the platform's settings
+  std::string verdict = {};
+
+  bool operator==(const RunRecord&) const = default;
+};
+
+std::string jsonOf(const RunRecord& record);
+/// Nothing for what is no such text.
+std::optional<RunRecord> parseRecord(const std::string& json);
+
+/// Packs the trace with what it includes as trace/, the run's folder as run/, and the record, to a
+/// compressed tar archive. False, with one line in `error`, if it cannot be written whole.
+bool writeBundle(const std::filesystem::path& bundle, const RunRecord& record,
+                 const std::filesystem::path& trace, const std::filesystem::path& run,
+                 std::string& error);
+
+struct UnpackedBundle {
+  RunRecord record;           // its trace named from where this program runs
+  std::filesystem::path run;  // the folder of the run that was packed
+};
+
+/// Unpacks it into the folder. What is no bundle, or would be written elsewhere, is refused.
+std::optional<UnpackedBundle> unpackBundle(const std::filesystem::path& bundle,
+                                           const std::filesystem::path& folder, std::string& error);
+
+}  // namespace brimol::replay

@@ -1,0 +1,23 @@
+/// The folder that a run leaves its files in.
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+
+namespace brimol::replay {
+
+constexpr auto kSessionName = "session.jsonl";
+constexpr auto kOutputName = "output.txt";
+constexpr auto kReportName = "report.html";
+constexpr auto kRecordFileName = "run.json";
+constexpr auto kUnpackedName = "bundle";  // a folder
+
+/// Makes the folder if it is missing, and removes the files of an earlier run from it. An empty
+/// name: makes a new one in the working directory, named after `title`. Its absolute path; nothing,
+/// with one line in `error`, if it holds other things than a run or cannot be made.
+std::optional<std::filesystem::path> prepareRunDirectory(const std::filesystem::path& wanted,
+                                                         const std::string& title,
+                                                         std::string& error);
+
+}  // namespace brimol::replay
