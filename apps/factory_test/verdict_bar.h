@@ -3,6 +3,7 @@
 
 #include <MW/button3.h>
 #include <MW/key.h>
+#include <brimol/input.h>
 
 #include <array>
 #include <atomic>
@@ -45,6 +46,6 @@ class VerdictBar {
 };
 
 /// The key that leaves a screen.
-inline constexpr unsigned int kKeyBack = 158;
+inline constexpr unsigned int kKeyBack = BRIMOL_CODE_BACK;
 
 }  // namespace factory_test

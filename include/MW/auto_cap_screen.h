@@ -8,7 +8,8 @@ namespace MW {
 /// A page with access to its colours and texts.
 class MW_API AutoCapScreen : public ColorPage {
  public:
-  /// The argument is not read: the page is transparent until setBgColor().
+  /// The argument is not read. The page is transparent until setBgColor(), or setBg_title() and
+  /// then setRect(), gives it a colour.
   explicit AutoCapScreen(unsigned int unused);
   ~AutoCapScreen() override;
 
@@ -24,8 +25,9 @@ class MW_API AutoCapScreen : public ColorPage {
   /// A box's own text record, valid while the page lives; read it on the thread that sets it. Null
   /// for an index over 3.
   SKIA_Text* getText(unsigned int index);
-  /// The colour of a box's text. An index over 3: nothing, and 0.
+  /// Sets the colour of a box's text. An index over 3: nothing.
   void setTextColor(unsigned int index, unsigned int color);
+  /// The colour of a box's text; 0 for an index over 3.
   unsigned int getTextColor(unsigned int index);
 };
 

@@ -1,9 +1,9 @@
 /// The callback word that applications store their functions in.
 #pragma once
 
-#include <MW/api.h>
 #include <MW/records.h>
 
+#include <atomic>
 #include <concepts>
 #include <cstddef>
 #include <type_traits>
@@ -13,14 +13,19 @@ namespace MW {
 /// A plain function of the application, or null: not wanted. One pointer wide.
 ///
 /// It takes `nullptr`, a function or a captureless lambda that returns nothing and takes one int,
-/// mouse_event*, kbd_event* or int*. Which of them a class calls it with stands at the class; a
-/// function of another kind compiles, but must not be stored there. Calling a null one does
-/// nothing. A word may be assigned at any time on the thread that calls it, and elsewhere while its
-/// widget is not active.
+/// mouse_event*, kbd_event* or int*. The class that calls the word says which of them it calls it
+/// with. A function of another kind compiles, and is then called with an argument that it does not
+/// understand. Calling a null word does nothing.
+///
+/// A word may be assigned on any thread at any time, also while its widget is active: a handler
+/// calls the function before or the function after the assignment. The function before may still
+/// run when the assignment returns. Only copies of a const or temporary word, and words that are
+/// made as copies, are plain: no other thread may assign or call the two meanwhile.
 class Callback {
  public:
   constexpr Callback() = default;
   constexpr Callback(std::nullptr_t) {}  // NOLINT(google-explicit-constructor): assigned from null
+  constexpr Callback(const Callback&) = default;
 
   template <typename Function>
   requires(std::convertible_to<Function, void (*)(int)>)
@@ -39,7 +44,22 @@ class Callback {
   requires(std::convertible_to<Function, void (*)(int*)>) Callback(Function function)
       : word(erase(static_cast<void (*)(int*)>(function))) {}
 
-  explicit operator bool() const { return word != nullptr; }
+  Callback& operator=(std::nullptr_t) {
+    store({});
+    return *this;
+  }
+  /// From a function, a lambda or another word.
+  // A template, since a copy assignment that is written by hand is not trivial.
+  template <std::convertible_to<Callback> Source>
+  Callback& operator=(Source&& source) {  // NOLINT(misc-unconventional-assign-operator)
+    store(source);
+    return *this;
+  }
+  // From a word that is const, as in a record, or temporary: a plain copy.
+  Callback& operator=(const Callback&) = default;
+  Callback& operator=(Callback&&) = default;
+
+  explicit operator bool() const { return load() != nullptr; }
 
   void operator()(int value) const { call(value); }
   void operator()(mouse_event* event) const { call(event); }
@@ -57,10 +77,17 @@ class Callback {
   // A function pointer that went through another function pointer type comes back unchanged.
   template <typename Argument>
   void call(Argument argument) const {
-    if (word != nullptr) reinterpret_cast<void (*)(Argument)>(word)(argument);
+    const Word function = load();
+    if (function != nullptr) reinterpret_cast<void (*)(Argument)>(function)(argument);
   }
 
-  Word word = nullptr;
+  // What the assigning thread wrote before is seen by the function.
+  Word load() const { return std::atomic_ref(word).load(std::memory_order_acquire); }
+  void store(const Callback& source) {
+    std::atomic_ref(word).store(source.load(), std::memory_order_release);
+  }
+
+  mutable Word word = nullptr;  // mutable: std::atomic_ref reads nothing that is const
 };
 
 static_assert(sizeof(Callback) == sizeof(void (*)()), "descriptors count on one word each");

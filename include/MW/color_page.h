@@ -12,12 +12,12 @@ namespace MW {
 /// A box of one colour over the whole screen, with up to four text boxes on it. The classes derived
 /// from it add access to colours and texts; this class is not used by itself.
 ///
-/// The application owns a page. It enters the top layer when it is constructed, inactive, and
+/// The application owns the page. A page enters the top layer, inactive, when it is constructed and
 /// leaves it when it is deleted; setActive(1) brings it up, and it never hides itself. While it is
-/// active nothing below gets events. The application's thread draws it. onRecvEvent(), the one
-/// entry for events, runs on the dispatch thread and calls the handlers below it and the callbacks;
-/// a callback may delete the page. It takes keys, but no touches and no null event. Neither a
-/// touch nor a setter (any thread) raises the redraw flag: isDisplayUpdate(1) does.
+/// active, the widgets underneath get no events. The application's thread draws it. onRecvEvent(),
+/// the one entry for events, runs on the dispatch thread and calls the handlers declared below and
+/// the callbacks; a callback may delete the page. The page takes keys, but no touches and no null
+/// event. Touches and setters (any thread) raise no redraw flag: call isDisplayUpdate(1).
 class MW_API ColorPage : public Widget {
  public:
   static constexpr unsigned int kTexts = 4;
@@ -26,8 +26,8 @@ class MW_API ColorPage : public Widget {
 
   /// show(0).
   int show() override;
-  /// Draws the page, be it active or not, and its text boxes up to the last one that was set; one
-  /// of them that was not set has no size and says "ABC". Returns 1.
+  /// Draws the page, be it active or not, and its text boxes up to the highest number that was set.
+  /// A box below it that was not set has no size and says "ABC". Returns 1.
   int show(unsigned int ticks) override;
   /// Raises the redraw flag from the time of the last key click on, if a derived class has set
   /// `timerOn`.
@@ -35,7 +35,7 @@ class MW_API ColorPage : public Widget {
   /// Makes it inactive. Returns 1.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// Keeps the value in `lcdOnFlag`, for derived classes; touches are told as before.
+  /// Keeps the value in `lcdOnFlag`, for derived classes; touches are reported as before.
   void lcdOn(int on) override;
   void onPressTouch(mouse_event mouse) override;
   void onReleaseTouch(mouse_event mouse) override;
@@ -63,8 +63,7 @@ class MW_API ColorPage : public Widget {
   void (*touchReleaseCallback)(mouse_event*) = nullptr;
   void (*keyPressCallback)(kbd_event*) = nullptr;
   void (*keyReleaseCallback)(kbd_event*) = nullptr;
-  /// The second and the third release of one key of which each comes within 1000 ms of the one
-  /// before.
+  /// The second and the third release of the same key, each within 1000 ms of the one before.
   void (*doubleKeyCallback)(kbd_event*) = nullptr;
   void (*tripleKeyCallback)(kbd_event*) = nullptr;
 

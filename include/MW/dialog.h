@@ -12,9 +12,9 @@ namespace MW {
 /// button": the application hides it. "Stars": a progress row on a red screen, which takes touches
 /// as button 1 does. A number without a name is an empty dialog of two buttons.
 ///
-/// Callbacks are PromptDialog's, and two of one kbd_event*: `doubleKeyCallback` and
-/// `tripleKeyCallback` for the second and third release of one key of which each comes within
-/// 1000 ms of the one before. Handlers run on the dispatch thread.
+/// Callbacks are PromptDialog's and two more of one kbd_event*: `doubleKeyCallback` and
+/// `tripleKeyCallback` get the second and the third release of the same key, each within 1000 ms
+/// of the one before. Handlers run on the dispatch thread.
 class MW_API Dialog : public PromptDialog {
  public:
   enum Kind {
@@ -31,7 +31,7 @@ class MW_API Dialog : public PromptDialog {
     kRecalibrateAPlus = 10,
     kBadAPlusChecksum = 11,
     kFactoryReset = 12,
-    kPushHookKey = 13,      ///< no button; the only kind whose hook key answers
+    kPushHookKey = 13,      ///< no button; the only kind that answers the hook key
     kReinsertEarjack = 14,  ///< no button
     kStartTouchTest = 15,   ///< OK
     kBootNormally = 16,
@@ -76,9 +76,9 @@ class MW_API Dialog : public PromptDialog {
   static int isType(int dialogKind);
   /// Lays it out on the present screen as `dialogKind`; its texts stay. Any thread.
   void setRect(int dialogKind);
-  /// Replace the title, and the message. At most 127 bytes are taken; null is the empty text. Any
-  /// thread.
+  /// Replaces the title. At most 127 bytes are taken; null is the empty text. Any thread.
   void setTitle(const char* newTitle);
+  /// Replaces the message, by the same rules.
   void setDesc(const char* newMessage);
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key);

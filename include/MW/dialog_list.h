@@ -11,9 +11,13 @@ namespace MW {
 /// "OK".
 ///
 /// addIndex() fills it, initFinish() ends that, and setActive(1) brings it up: before initFinish()
-/// it draws nothing. A press on a row marks it. The finger that pressed keeps the others out until
-/// it lifts, and reaches nothing but what it pressed, a button or the rows. The rows may be changed
-/// by any thread; that raises no redraw flag (isDisplayUpdate(1) does).
+/// it draws nothing. A press on a row marks it. The rows may be changed by any thread; that raises
+/// no redraw flag (isDisplayUpdate(1) does).
+///
+/// The finger that presses a button or the body holds the dialog until it lifts, and reaches only
+/// what it pressed. Meanwhile touches of other fingers are not taken, and no callback gets them.
+/// The dialog takes the press, the motion of the finger that holds (but not after lcdOn(0)), and
+/// every release, unless another finger holds it.
 ///
 /// Callbacks as for FramedDialog, but three are of one int*, valid for the call: `rowPressCallback`
 /// gets the pressed row; `button1Callback` ("CANCEL"; the dialog stays up) the row confirmed last,
@@ -35,16 +39,16 @@ class MW_API DialogList : public FramedDialog {
   bool onRecvEvent(event_data* event, unsigned int arg) override;
 
   using Widget::setText;
-  /// What the constructor does: an empty list, inactive, without callbacks, and registered. Called
-  /// again, it registers the dialog once more, which is then drawn twice.
+  /// What the constructor does: an empty list, inactive, without callbacks, and registered. A
+  /// further call registers the dialog a second time: each drawing pass then draws it twice.
   void init_DialogList();
   /// Takes all rows away; they may be added again.
   void initIndex();
   /// Appends a row and returns its number, from 0. -1: the list is full or finished, the text is
   /// null or longer than 126 bytes. The text is copied.
   int addIndex(const char* rowText);
-  /// Replaces a row's text; the number behind the last row's writes the text of a row that is not
-  /// there yet. Another number, or a text that is null, empty or longer than 126 bytes: nothing.
+  /// Replaces the text of row `index`. Any other number, or a text that is null, empty or longer
+  /// than 126 bytes, changes nothing that is drawn.
   void setText(int index, const char* rowText);
   /// Ends the filling and lays it out. `index`: the marked and confirmed row; with kNoRow, or any
   /// other number that is not a row's, none is marked. Returns the number of rows.

@@ -32,8 +32,8 @@ class MW_API DialogNew : public PromptDialog {
   /// The lines, up to the first null one; `align` as above. Lays out: the letters of one line are
   /// larger than those of two or three.
   void setDesc(const char* line1, const char* line2, const char* line3, int align) override;
-  /// The captions, up to the first null one. Lays out: one button is as wide as two, and without
-  /// any there is no room for them.
+  /// The captions, up to the first null one. Lays out: one button is as wide as two together;
+  /// without any the row is left out.
   void setbutton(const char* caption1, const char* caption2) override;
 
   using Widget::onPressKey;
@@ -50,9 +50,11 @@ class MW_API DialogNew : public PromptDialog {
   void setProgress(unsigned int amount);
   /// The colour of the screen around the dialog, half-transparent black at first.
   void setBackGroundColor(unsigned int color);
-  /// The colour behind the lines from the next layout on, where the body does not blink.
+  /// The body's colour, 0xAARRGGBB. It shows after setDescBlink(0) and then a layout: setRect(),
+  /// setDesc(), setbutton() or setProgress().
   void setDescColor(unsigned int color);
-  /// 1, as at first: the body has the widget's blink colour. Else it keeps the colour that it has.
+  /// 1, as at first: the body is drawn in the widget's blink colour, black while setBlink() is off.
+  /// Any other value: it keeps its last colour until the next layout.
   void setDescBlink(int on);
 
  protected:

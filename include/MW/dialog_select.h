@@ -10,17 +10,17 @@ namespace MW {
 /// A modal panel with a title and six large square buttons in three rows of two. A touch that lifts
 /// on the button that it pressed is the answer; one that slides off gives the button up.
 ///
-/// The application owns it. It enters the top layer when it is constructed, inactive, and leaves it
-/// when it is deleted; setActive(1) brings it up, and it never hides itself. While it is active
-/// nothing below gets events. The application's thread draws it. onRecvEvent(), the one entry for
-/// events, runs on the dispatch thread and calls the handlers below it and the callbacks; a
-/// callback may delete the dialog. A null event is not taken.
+/// The application owns the dialog. A dialog enters the top layer, inactive, when it is constructed
+/// and leaves it when it is deleted; setActive(1) brings it up, and it never hides itself. While it
+/// is active, the widgets underneath get no events. The application's thread draws it.
+/// onRecvEvent(), the one entry for events, runs on the dispatch thread and calls the handlers
+/// declared below and the callbacks; a callback may delete the dialog. A null event is not taken.
 ///
-/// Neither a release is taken, though it may answer, nor the motion that gives a button up. No
-/// redraw follows an event that is not taken, nor a setter (any thread): the highlight goes from
-/// the screen after isDisplayUpdate(1).
+/// Call isDisplayUpdate(1) after an answer, after a touch has slid off its button, and after a
+/// setter (any thread): these ask for no redraw, so the screen would stay as it is. No release is
+/// taken, even if it answers, and no motion that leaves the pressed button.
 ///
-/// Callbacks of the base besides its own ones: `hoverCallback`, of one mouse_event*;
+/// The dialog also calls these callbacks of the base: `hoverCallback`, of one mouse_event*;
 /// `plugCallback`, of one kbd_event*; `hookKeyCallback`, of one int, called with 0 for the hook key
 /// after setButtonType(kHookVariant). Records are copies, valid for the call.
 class MW_API DialogSelect : public Widget {
@@ -38,7 +38,7 @@ class MW_API DialogSelect : public Widget {
   /// Makes it inactive. Returns 1.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// 0: touches are told but choose nothing, until it is called with another value. Any thread.
+  /// 0: touches are reported but choose nothing, until it is called with another value. Any thread.
   void lcdOn(int on) override;
   void onHover(event_data* event) override;
   void onPress(event_data* event) override;
@@ -54,10 +54,11 @@ class MW_API DialogSelect : public Widget {
   void setTitle(const char* newTitle);
   /// The caption of choice `index`, 0 to 5 row by row; any other: nothing.
   void setText_str(unsigned int index, const char* caption);
-  /// Highlight choice `index`, 0 to 5, and let it answer; any other index: nothing.
+  /// Highlights choice `index`, 0 to 5, as the pressed one; any other index: nothing.
   void onBtnPressed(mouse_event mouse, int index);
+  /// Answers with choice `index`, 0 to 5; any other index: nothing.
   void onBtnReleased(mouse_event mouse, int index);
-  /// The hook key goes to onHookKeyPressed() in variant kHookVariant, and else nowhere.
+  /// In variant kHookVariant the hook key goes to onHookKeyPressed(); otherwise it is ignored.
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key) const;
   void onHookKeyPressed();

@@ -10,8 +10,9 @@ namespace MW {
 /// A modal console: a title, lines of text of which the oldest goes when there is no room, and the
 /// button "OK", which leaves the dialog up. Callbacks as for FramedDialog.
 ///
-/// The finger that pressed the button holds the dialog until it is hidden: other fingers press and
-/// move nothing meanwhile, though the button answers any that lifts on it.
+/// The finger that presses the button holds the dialog until it is hidden. Meanwhile presses and
+/// motion of other fingers are not taken, and no callback gets them. Releases are taken as ever,
+/// and the button answers any finger that lifts on it.
 class MW_API DialogShell : public FramedDialog {
  public:
   static constexpr int kLines = 25;
@@ -24,12 +25,12 @@ class MW_API DialogShell : public FramedDialog {
   ~DialogShell() override;
 
   using Widget::show;
-  /// Draws it, be it active or not; lines of no text stay blank. Returns 1.
+  /// Draws it, be it active or not; lines without text stay blank. Returns 1.
   int show(unsigned int ticks) override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
 
-  /// What the constructors do: an empty console, inactive, without callbacks, and registered.
-  /// Called again, it registers the dialog once more, which is then drawn twice.
+  /// What the constructors do: an empty console, inactive, without callbacks, and registered. A
+  /// further call registers the dialog a second time: each drawing pass then draws it twice.
   void init_DialogShell(const char* title);
   /// Takes all lines away. Any thread.
   void initShell();

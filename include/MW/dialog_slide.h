@@ -9,16 +9,16 @@ namespace MW {
 /// A modal prompt: a title, a message, and below them a thumb between two captions. A finger drags
 /// the thumb by its relative motion, and if it lifts with the thumb at an end, the dialog answers
 /// with that side. The thumb then goes back to the middle; the dialog stays up. A finger that lifts
-/// without having moved answers as the drag before it did. A second finger that presses the thumb
-/// takes it over.
+/// without having moved answers as the drag before it did. A second finger takes the thumb over by
+/// a press on its place in the middle, wherever the thumb has been dragged.
 ///
-/// The application owns it. It enters the top layer when it is constructed, inactive, and leaves it
-/// when it is deleted; setActive(1) brings it up. While it is active nothing below gets events. The
-/// application's thread draws it. onRecvEvent(), the one entry for events, runs on the dispatch
-/// thread and calls the handlers below it and the callbacks; a callback may delete the dialog. A
-/// null event is not taken. The texts may be set by any thread and are copied; that raises no
-/// redraw flag (isDisplayUpdate(1) does). A null text is empty, and so is one of more than 127
-/// bytes.
+/// The application owns the dialog. A dialog enters the top layer, inactive, when it is constructed
+/// and leaves it when it is deleted; setActive(1) brings it up. While it is active, the widgets
+/// underneath get no events. The application's thread draws it. onRecvEvent(), the one entry for
+/// events, runs on the dispatch thread and calls the handlers declared below and the callbacks; a
+/// callback may delete the dialog. A null event is not taken. The texts may be set by any thread
+/// and are copied; that raises no redraw flag (isDisplayUpdate(1) does). A null text is empty, and
+/// so is one of more than 127 bytes.
 class MW_API DialogSlide : public Widget {
  public:
   /// The kind that asks whether a passed test is to be repeated. Kinds 4 and 5 say the same.
@@ -81,7 +81,7 @@ class MW_API DialogSlide : public Widget {
   enum SlideState { kBetween = 0, kAtLeft = 1, kAtRight = 2 };
 
   int kind;
-  // Guarded by stateLock, except for the flag.
+  // Guarded by stateLock, except for lcdOnFlag.
   DialogFrame frame;
   SKIA_Rect messageRect = {};
   SKIA_Text message = {};

@@ -1,4 +1,4 @@
-/// Input: from the platform's records to queued events, and the tests that widgets make on them.
+/// Input: the platform's records become queued events. And where an event lies.
 #pragma once
 
 #include <MW/api.h>
@@ -14,16 +14,18 @@ namespace MW {
 /// thread. Window::init creates the one service, Window::destroy deletes it.
 class MW_API EventService {
  public:
-  /// Starts the platform's input and the input thread.
+  /// Starts the platform's input and the input thread. Window::init does it for the application.
   EventService();
-  /// Stops both and waits. Events still queued are not freed: they may be the application's.
+  /// Stops both and waits. Events that are still queued are lost, and their memory is not freed.
   ~EventService();
   EventService(const EventService&) = delete;
   EventService& operator=(const EventService&) = delete;
 
-  /// 1, or 0 when the thread could not be created.
+  /// What the constructor and the destructor do. 1; startEvent() 0 after an error line when the
+  /// thread could not be created.
   static int startEvent();
   static int stopEvent();
+  /// 1 until the destructor begins. Any thread.
   int isActive() const;
 
   /// Converts the platform's record and queues it. Without memory the event is lost and a line is
@@ -31,18 +33,21 @@ class MW_API EventService {
   void sendEvent(const Event* event);
   /// Fills `data` from the platform's record. A type that is not known gives kEventUnknown.
   static void parseEvent(const Event* event, event_data* data);
-  /// Queues a block from malloc, which the queue owns from here on; without memory it is freed and
-  /// a line logged. Null is ignored. Any thread.
+  /// Queues a block from malloc. It belongs to the queue from here on: recvEvent() frees it.
+  /// Without memory to queue it, it is freed at once and a line is logged. Null is ignored. Any
+  /// thread.
   void saveQueue(event_data* data);
   /// Queues an application event (code 6) that carries `value`. As for sendEvent. Any thread.
   void AppEvent(int value);
-  /// The oldest event, in a record that stays valid until the next call, or null. One thread.
+  /// The oldest event, in a record of the service that stays valid until the next call, or null.
+  /// For one thread alone; while the window runs that is the dispatch thread.
   event_data* recvEvent();
 
-  /// True for a pointer event inside `area`. Null records are nowhere. Any thread; works without
-  /// a service.
+  /// Whether it is a pointer event inside `area`, left and top edges in, the others out. False
+  /// where one of the two is null. Any thread; works without a service.
   static bool isMouseEventForMe(const SKIA_Rect* area, const event_data* event);
-  /// True when the event's point, or one 20 pixels right, left, below or above it, is inside.
+  /// The same for the event's point and those 20 pixels right, left, below and above it: whether
+  /// one of them is inside.
   static bool isMouseEventAroundMe(const SKIA_Rect* area, const event_data* event);
 
  private:
@@ -50,7 +55,7 @@ class MW_API EventService {
   std::atomic<int> active = 1;
 };
 
-/// True only for a pointer event of finger 0. Null is none.
+/// True only for a pointer event of finger 0; false for null.
 MW_API bool isFirstFinger(const event_data* event);
 
 }  // namespace MW

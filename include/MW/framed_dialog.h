@@ -9,22 +9,22 @@ namespace MW {
 /// A frame in the middle of the screen: a title, a body, and below it up to two buttons. The
 /// classes derived from it say what stands in the body; this class is not used by itself.
 ///
-/// The application owns a dialog. It enters the top layer when it is constructed, inactive, and
-/// leaves it when it is deleted; setActive(1) brings it up. While it is active nothing below gets
-/// events. The application's thread draws it. onRecvEvent(), the one entry for events, runs on the
-/// dispatch thread and calls the handlers below it and the callbacks; a callback may delete the
-/// dialog. A null event is not taken.
+/// The application owns the dialog. A dialog enters the top layer, inactive, when it is constructed
+/// and leaves it when it is deleted; setActive(1) brings it up. While it is active, the widgets
+/// underneath get no events. The application's thread draws it. onRecvEvent(), the one entry for
+/// events, runs on the dispatch thread and calls the handlers declared below and the callbacks; a
+/// callback may delete the dialog. A null event is not taken.
 ///
-/// A button turns kColorHighlight when a finger presses it and goes back when a finger moves
-/// outside it or lifts. It answers a finger that lifts on it, wherever that finger came from. Of the
-/// touches the dialog takes the press of a button, all motion from there until it is hidden, and
-/// every release.
+/// A button turns kColorHighlight when a finger presses it, and turns back when a finger moves
+/// outside it or lifts. It answers every finger that lifts on it, wherever that finger came from.
+/// The dialog takes the press of a button, all motion after that until it is hidden, and every
+/// release. DialogList and DialogShell follow one finger and say which touches they take.
 ///
 /// Callbacks, null where they are not wanted:
 /// - of one int, called with 0: `button1Callback` (the left button; the dialog stays up until the
 ///   application hides it) and `button2Callback` (the right one; the dialog has hidden itself).
-/// - of one mouse_event*: `pressCallback`, `hoverCallback` and `clickCallback` hear of every press,
-///   motion and release, at any place; clickCallback after the buttons.
+/// - of one mouse_event*: `pressCallback`, `hoverCallback` and `clickCallback` get every press,
+///   motion and release, at any place; clickCallback comes after the buttons' callbacks.
 /// - of one kbd_event*: `keyPressCallback`, `keyReleaseCallback`.
 /// Records are copies, valid for the call.
 class MW_API FramedDialog : public Widget {
@@ -32,8 +32,9 @@ class MW_API FramedDialog : public Widget {
   /// Makes it inactive, and sensitive to touch the next time. Returns 1. Any thread.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// 0: the buttons ignore touches until it is called with another value, or the dialog was hidden.
-  /// Any thread.
+  /// 0: touches press no button, and no button answers or turns back when a finger lifts, until it
+  /// is called with another value or the dialog is hidden. Motion still turns a button back, except
+  /// in a DialogList. Any thread.
   void lcdOn(int on) override;
   void onHover(event_data* event) override;
   void onPress(event_data* event) override;
@@ -70,8 +71,9 @@ class MW_API FramedDialog : public Widget {
   const char* word;
   Answer answer1 = &FramedDialog::onBtn1Released;
   Answer answer2 = &FramedDialog::onBtn2Released;
-  bool leavesInTheDark = true;  // a finger that leaves a button dims it after lcdOn(0), too
-  // Guarded by stateLock, except for the flag.
+  // Whether motion is taken and turns buttons back even after lcdOn(0).
+  bool followsMotionInTheDark = true;
+  // Guarded by stateLock, except for lcdOnFlag.
   DialogFrame frame;
   DialogButton button1;
   DialogButton button2;

@@ -7,8 +7,8 @@
 namespace MW {
 
 /// A dialog that may have a growing row of asterisks in the place of its buttons, and that knows
-/// the hook key and the plug. Dialog has built-in texts, DialogNew any; this class is not used by
-/// itself.
+/// the hook key and the plug. Dialog has built-in texts, DialogNew takes any; this class is not
+/// used by itself.
 ///
 /// Callbacks besides FramedDialog's: `hookKeyCallback`, of one int, called with 0, where the hook
 /// key answers; elsewhere the press of that key is ignored. `plugCallback`, of one kbd_event*.

@@ -1,6 +1,7 @@
 /// The records that events carry, their codes, and the toolkit's common colours. C11 and C++.
 #pragma once
 
+#include <brimol/input.h>
 #include <brimol/scene.h>
 
 #ifdef __cplusplus
@@ -17,7 +18,7 @@ enum EventCode {
   kEventKeyRelease = 5,
   kEventApplication = 6,  ///< raised by EventService::AppEvent
   kEventUser = 7,         ///< raised by the platform
-  kEventUnknown = 8       ///< input that the toolkit does not know; no widget acts on it
+  kEventUnknown = 8       ///< input of another kind; no widget acts on it
 };
 
 /// The window's layers; what a widget's `type` says.
@@ -26,14 +27,14 @@ enum LayerNumber {
   kBaseLayer = 1
 };
 
-/// Key codes that widgets act on.
+/// Key codes that widgets act on, as the platform reports them.
 enum KeyCode {
-  kKeyUp = 273,
-  kKeyDown = 274,
-  kKeyRight = 275,
-  kKeyLeft = 276,
-  kKeyHook = 323,
-  kKeySelect = 327
+  kKeyUp = BRIMOL_CODE_UP,
+  kKeyDown = BRIMOL_CODE_DOWN,
+  kKeyRight = BRIMOL_CODE_RIGHT,
+  kKeyLeft = BRIMOL_CODE_LEFT,
+  kKeyHook = BRIMOL_CODE_HOOK,
+  kKeySelect = BRIMOL_CODE_SELECT
 };
 
 /// A touch, in screen pixels.
@@ -49,7 +50,7 @@ struct mouse_event {
 /// A key, or the two words of a user event.
 struct kbd_event {
   uint32_t state;
-  uint32_t code;  ///< a KeyCode or any other code of the platform
+  uint32_t code;  ///< enum BrimolKeyCode, or any other code of the platform
 };
 
 /// One event as widgets receive it.
@@ -64,14 +65,24 @@ struct event_data {
 
 #ifdef __cplusplus
 
-static_assert(sizeof(mouse_event) == 24, "six words");
-static_assert(sizeof(kbd_event) == 8, "two words");
-static_assert(sizeof(event_data) == 28, "the code and six words");
+static_assert(sizeof(mouse_event) == 24 && offsetof(mouse_event, state) == 0 &&
+                  offsetof(mouse_event, finger) == 4 && offsetof(mouse_event, x) == 8 &&
+                  offsetof(mouse_event, y) == 12 && offsetof(mouse_event, xrel) == 16 &&
+                  offsetof(mouse_event, yrel) == 20,
+              "mouse_event");
+static_assert(sizeof(kbd_event) == 8 && offsetof(kbd_event, state) == 0 &&
+                  offsetof(kbd_event, code) == 4,
+              "kbd_event");
+static_assert(sizeof(event_data) == 28 && offsetof(event_data, type) == 0 &&
+                  offsetof(event_data, mouse) == 4 && offsetof(event_data, key) == 4 &&
+                  offsetof(event_data, value) == 4,
+              "event_data");
 
 // Colours are 0xAARRGGBB.
 inline constexpr uint32_t kColorBlack = 0xFF000000;
 inline constexpr uint32_t kColorWhite = 0xFFFFFFFF;
 inline constexpr uint32_t kColorGrey = 0xFFBFBFBF;
+inline constexpr uint32_t kColorDarkGrey = 0xFF4F4F4F;
 inline constexpr uint32_t kColorRed = 0xFFFF0000;
 inline constexpr uint32_t kColorBlue = 0xFF0000FF;
 inline constexpr uint32_t kColorGreen = 0xFF00FF00;

@@ -17,9 +17,16 @@ namespace MW {
 ///
 /// The application creates, owns and deletes widgets. A widget is drawn, timed and offered events
 /// while it stands in one of the window's layers (Window::registerWidget) and is active. Drawing
-/// and timing run on the application's thread, onRecvEvent on the dispatch thread. Deleting a
-/// widget takes it out of its layer and waits for a handler of it that runs on another thread; a
-/// handler may delete its own widget.
+/// and timing run on the application's thread, events on the dispatch thread: callbacks run there.
+///
+/// Deleting a widget takes it out of its layer and waits for a handler of it that runs on another
+/// thread. So the deleting thread may hold no lock that this handler, or a callback in it, takes. A
+/// callback may delete its own widget. Where callbacks on several threads delete each other's
+/// widgets in a circle, one of them does not wait, and another finds its own widget gone.
+///
+/// Changing a widget does not draw it: setters, setActive(), hide(), Lock() and the like leave the
+/// redraw flag as it is, unless a class says otherwise; isDisplayUpdate(1) raises it. Setters may
+/// be called on any thread unless their class says otherwise.
 ///
 /// A class that an application derives, and that has state of its own, calls leaveLayers() first in
 /// its destructor, so that no other thread meets a half-destroyed object.
@@ -30,76 +37,112 @@ class MW_API Widget {
   Widget& operator=(const Widget&) = delete;
 
   // The virtual operations, in an order that is part of the binary interface. The base does
-  // nothing in each, and answers 0, false or null.
+  // nothing in each, and answers 0, false or null. The window calls show(ticks), updateTimer() and
+  // onRecvEvent() of active widgets, and onRecvEvent() of a widget in the base layer that is
+  // selected, active or not. The rest is called by the application or by the widget itself.
 
   virtual ~Widget();
-  /// Draws the widget. The result is the class's to define.
+  /// Draws the widget outside a drawing pass: for the application, on the thread that draws. The
+  /// result is the class's to define.
   virtual int show();
-  /// The same as part of a drawing pass at `ticks` (GetTicks() milliseconds).
+  /// Draws it as part of the drawing pass at `ticks` (GetTicks() milliseconds). Window::show calls
+  /// it, on the application's thread.
   virtual int show(unsigned int ticks);
-  /// The timer pass at GetTicks() milliseconds.
+  /// The timer pass at GetTicks() milliseconds. Window::updateTimer calls it, on the application's
+  /// thread.
   virtual void updateTimer(unsigned int ticks);
+  /// For the application: the widget disappears until setActive(1). Its classes differ in what they
+  /// forget with it. Any thread.
   virtual int hide();
-  /// Offers an event. True: taken; it goes to no further widget, and a redraw follows. The event
+  /// The one way in for events: the dispatch thread calls it, and an application may, with an event
+  /// of its own. True: taken; the event goes to no further widget, and a redraw follows. The event
   /// must not be kept beyond the call. The second argument is 0.
   virtual bool onRecvEvent(event_data* event, unsigned int arg);
+
+  // For the application. Which of them a class has, its header says.
+
   /// The widget's text, in its own record: valid while the widget lives. Read it on the thread
   /// that sets it.
   virtual char* getText();
   virtual unsigned int getBgColor();
   virtual unsigned int getTextColor();
   virtual int getFontSize();
-  /// The widget's own rectangle record; as for getText.
+  /// The widget's own rectangle record; as for getText().
   virtual SKIA_Rect* getPositionAndSize();
   virtual void setFontSize(int pixels);
   /// Texts are copied, and cut to 127 bytes at a whole character. Null is the empty text.
   virtual void setText(const char* newText);
+  /// enum SKIA_Align.
   virtual void setTextAlign(int align);
   virtual void setTextColor(unsigned int color);
+  /// Background, border and line.
   virtual void setBgColor(unsigned int color);
   virtual void setBdColor(unsigned int color);
   virtual void setLnColor(unsigned int color);
+  /// Makes the widget active now and visible after `ms` milliseconds.
   virtual void onShowTimer(int ms);
-  /// Copies a primitive to the display-item table. The item's index, or a negative code.
+  /// Copies a primitive to the display-item table (WidgetList), on that table's thread. The item's
+  /// index, or a negative code.
   virtual int add_MWWList();
+  /// Tells the widget whether the display's panel is on: any value but 0.
   virtual void lcdOn(int on);
+  /// Hides the widget after `ms` milliseconds.
   virtual void onHideTimer(int ms);
+
+  // Parts of onRecvEvent(), which has tested what they rely on: classes call them on themselves, on
+  // the dispatch thread. Derived classes may override them; to play input, call onRecvEvent().
+
   virtual void onHover(event_data* event);
   virtual void onPress(event_data* event);
   virtual void onRelease(event_data* event);
   virtual void onPressLong(event_data* event);
+  /// For the application: moves and resizes. What `variant` means, the class says.
   virtual void setRect(int variant, const SKIA_Rect* newRect);
+  /// For the application: the text of a timed widget.
   virtual void setMsg(const char* message);
+  /// A part of onRecvEvent(): a tap ended, which may be the second of two.
   virtual void onTouchClickCount();
+  /// No class of the toolkit has it.
   virtual int setTimer(int ms);
+  // Parts of onRecvEvent() again. No class of the toolkit has the first two.
   virtual void onPressKey(kbd_event* key);
   virtual void onReleaseKey(kbd_event* key);
   virtual void onPlugKey(kbd_event key);
   virtual void onPressTouch(mouse_event mouse);
   virtual void onReleaseTouch(mouse_event mouse);
+
+  // For the application again.
+
+  /// How far a progress bar is.
   virtual void onProgressbar(int value);
+  /// Ends a highlight.
   virtual void restoreColor();
+  /// Whether a slide follows the finger.
   virtual void Lock();
   virtual void unLock();
+  /// The lines and the captions of a free dialog.
   virtual void setDesc(const char* line1, const char* line2, const char* line3, int align);
   virtual void setbutton(const char* caption1, const char* caption2);
 
-  /// Any value but 0 makes the widget active; 0 also unselects it. Any thread.
+  /// Any value but 0 makes the widget active; 0 also unselects it, so that it lets go of a finger.
+  /// Any thread.
   void setActive(int on);
   bool isActive() const { return active; }
-  /// Non-zero: selected; in the base layer it is offered events before the others. Any thread.
+  /// Non-zero: selected; in the base layer it is offered events before the others, and while it is
+  /// active once more if it declines. A widget that a finger holds is selected with the finger's
+  /// number + 1. Any thread.
   void setSelect(int value) { select = value; }
   int isSelect() const { return select; }
   /// The layer: 0 top (dialogs), 1 base. Set it before the widget is registered.
   void setType(int value) { type_ = value; }
   int type() const { return type_; }
-  /// The number that Window::registerWidget gave; not unique after a removal.
+  /// The number that Window::registerWidget gave. After a removal two widgets may have the same.
   void setId(int value) { id_ = value; }
   int id() const { return id_; }
   /// The variant of a class that has several looks.
   void setButtonType(int variant) { buttonType = variant; }
   int typeButton() const { return buttonType; }
-  /// The finger whose gesture the widget follows, -1 for none.
+  /// The finger whose drag a slide follows, -1 for none.
   void setOwnerFinger(int finger) { ownerFinger = finger; }
   int getOwnerFinger() const { return ownerFinger; }
 
@@ -140,14 +183,13 @@ class MW_API Widget {
 
  protected:
   /// Takes the widget out of its layer, by its own address and whatever its id, and waits for a
-  /// handler of it that runs on another thread. Its counters and the log are not touched.
+  /// handler of it that runs on another thread. The window's count and the log stay as they are.
   void leaveLayers();
-  /// Window::unregisterWidget, with its log line and count, and then leaveLayers(): what removes
-  /// the widget even where another one of the same id was removed.
+  /// The same with the log line and the count of Window::unregisterWidget.
   void leaveWindow();
 
   /// Whether a pointer event lies in the rectangle, left and top edges in, the others out. `field`
-  /// is one of the widget's, read under its lock; a null event lies nowhere.
+  /// is one of the widget's and is read under its lock. False for a null event.
   bool isUnder(const SKIA_Rect& field, const event_data* event) const;
 
   /// A field that handlers and drawing share, read and written under the lock.

@@ -35,15 +35,16 @@ class MW_API WidgetList {
   static int index2slot(int index);
   /// The first free slot, or kFull.
   static int findEmpty();
-  /// Takes a free slot with a zeroed item and a new index, and returns it; 100 (slot 100, whose
-  /// item is to be replaced) when the table is full. Otherwise a negative code.
+  /// Takes a free slot with a zeroed item and a new index, and returns its number; in a full table
+  /// 100, the slot whose item the caller is to replace. Otherwise a negative code.
   static int getSlot();
   /// Copies the records that are not null to a new item and returns its index, or a negative code.
   /// In a full table the item of slot 100 is replaced, and its index returned. A text record's
   /// length is cut to what the record holds.
   static int addQueue(int kind, const SKIA_Rect* rect, const SKIA_Point* point,
                       const SKIA_Text* text);
-  /// Items stay until destroy(): removes nothing. Returns is_init.
+  /// Does nothing: items stay until destroy(). hide(index) keeps one from being drawn. Returns
+  /// is_init.
   static int remove(int index);
 
   /// Draws the shown items in slot order. Returns 1.

@@ -14,30 +14,41 @@ class Widget;
 /// updateTimer(). At the end it deletes its widgets and calls destroy().
 ///
 /// The passes and the dispatch thread walk the layers without a lock. Widgets may be registered,
-/// unregistered and deleted at any time, from any thread and from inside callbacks: no walk skips
-/// or repeats another widget, and a widget that has left is not called again.
+/// unregistered and deleted at any time, on any thread and inside callbacks: no walk skips or
+/// repeats another widget, and a widget that has left is not called again.
 class MW_API Window {
  public:
-  /// Starts input and the dispatch thread. Returns 1, or 0 when the dispatch thread could not be
-  /// created (input runs on until destroy). A second call before destroy() changes nothing.
+  /// Starts input and the dispatch thread. Returns 1, or 0 after an error line when there is no
+  /// memory or a thread could not be created; input may run already and does so until destroy(). A
+  /// second call before destroy() changes nothing and returns 1. Any thread: a call waits while
+  /// another thread is inside init() or destroy().
   static int init();
-  /// Stops the dispatch thread and then input, and waits for both; a callback that calls it is not
-  /// waited for. Returns 1. The widgets stay as they are.
+  /// Stops the dispatch thread and then input, and waits for both. Returns 1. The widgets stay as
+  /// they are. Any thread: a call waits while another thread is inside init() or destroy().
+  ///
+  /// A handler or callback may call it, too, but waits for no other thread, which might be waiting
+  /// for that handler. On the dispatch thread everything ends but that thread, which ends after its
+  /// callback. In a drawing or timer pass the dispatch thread is told to end, and an error line
+  /// says that the rest is left: the next init() or destroy() outside handlers does it, and until
+  /// then init() in a handler returns 0 after an error line. While another thread is inside init()
+  /// or destroy(), the call does nothing but log that line.
   static int destroy();
   /// The running event service; null before init() and after destroy().
   static EventService* getEventService();
 
   /// Appends the widget to the layer that its type() names (0 top, 1 base) and sets its id to the
-  /// number of widgets in that layer. It stays inactive. A null pointer, another type, or a lack of
-  /// memory is logged and registers nothing. Always returns 1. Any thread.
+  /// number of widgets in that layer. It stays active or inactive. A null pointer, another type, or
+  /// a lack of memory is logged and registers nothing. Always returns 1. Any thread.
   static int registerWidget(Widget* widget);
-  /// Removes from the widget's layer the first one that has its id, and waits for a handler of
-  /// that one on another thread. Two threads that would wait for each other's handlers do not.
-  /// Always returns 1. Any thread; no lock may be held that a handler takes.
+  /// Removes from the widget's layer the first one that has its id: after another removal that may
+  /// be another widget. (A widget that is deleted goes by itself, whatever its id.) Waits for a
+  /// handler of the removed one on another thread, and so the caller may hold no lock that this
+  /// handler takes. Of threads that would wait for each other's handlers in a circle, one does not.
+  /// Always returns 1. Any thread.
   static int unregisterWidget(Widget* widget);
 
-  /// The drawing pass: show(ticks) of every active widget, base layer first, each layer in the
-  /// order of registering.
+  /// The drawing pass, on the application's thread: show(ticks) of every active widget, base layer
+  /// first, each layer in the order of registering.
   static void show(unsigned int ticks);
   /// The same at GetTicks().
   static void show();
@@ -45,7 +56,8 @@ class MW_API Window {
   /// argument is not read.
   static void updateTimer(unsigned int ticks);
 
-  /// Stores the screen's size in pixels; 1440 x 2560 while none is known. Returns 1.
+  /// Stores the screen's size in pixels. Where `width` or `height` is 0, sets them to 1440 x 2560
+  /// first. A null pointer is skipped. Returns 1. Any thread.
   static int getwindowsize(int* outWidth, int* outHeight);
   /// Millimetres to pixels by the horizontal density; cut to the range of an int. Stores the
   /// density in dots per inch as it was before it is rounded. A null pointer is skipped.
@@ -60,7 +72,7 @@ class MW_API Window {
   static void onKeyPressed();
   static void onKeyReleased();
 
-  // Set before init(), or left at 0: not known yet.
+  // The application sets them before init(), or leaves them at 0: not known yet.
   static int width;   // pixels
   static int height;  // pixels
   static float xdpi;  // dots per inch

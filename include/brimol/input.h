@@ -1,10 +1,14 @@
 /* The input service of the platform: input records, the millisecond clock and its pauses. */
 #pragma once
 
+#include <stddef.h>
 #include <stdint.h>
 
 #ifdef __cplusplus
+#define BRIMOL_STATIC_ASSERT static_assert
 extern "C" {
+#else
+#define BRIMOL_STATIC_ASSERT _Static_assert
 #endif
 #pragma GCC visibility push(default)
 
@@ -17,6 +21,21 @@ enum BrimolEventType {
   BRIMOL_POINTER_UP = 6,
   BRIMOL_LONG_PRESS = 18,
   BRIMOL_USER_EVENT = 24
+};
+
+/* What the phone's keys report as their code. Other keys have other codes. */
+enum BrimolKeyCode {
+  BRIMOL_CODE_HOME = 102,
+  BRIMOL_CODE_VOLUME_DOWN = 114,
+  BRIMOL_CODE_VOLUME_UP = 115,
+  BRIMOL_CODE_POWER = 116,
+  BRIMOL_CODE_BACK = 158,
+  BRIMOL_CODE_UP = 273,
+  BRIMOL_CODE_DOWN = 274,
+  BRIMOL_CODE_RIGHT = 275,
+  BRIMOL_CODE_LEFT = 276,
+  BRIMOL_CODE_HOOK = 323,
+  BRIMOL_CODE_SELECT = 327
 };
 
 /* Types 4, 5, 6 and 18. Positions are in screen pixels. */
@@ -51,14 +70,35 @@ typedef struct BrimolUserEvent {
 
 enum { BRIMOL_EVENT_BYTES = 64 };
 
-/* One input record. The toolkit reads its first 12 bytes; a platform may use the room behind. */
+/* One input record. The toolkit reads its first 12 bytes, a platform may use those behind them. */
 typedef union Event {
-  uint8_t type; /* enum BrimolEventType, the first byte of every form */
+  uint8_t type; /* enum BrimolEventType; every form begins with it */
   BrimolPointerEvent pointer;
   BrimolKeyEvent key;
   BrimolUserEvent user;
   uint8_t bytes[BRIMOL_EVENT_BYTES];
 } Event;
+
+BRIMOL_STATIC_ASSERT(sizeof(BrimolPointerEvent) == 12 && offsetof(BrimolPointerEvent, type) == 0 &&
+                         offsetof(BrimolPointerEvent, finger) == 2 &&
+                         offsetof(BrimolPointerEvent, state) == 3 &&
+                         offsetof(BrimolPointerEvent, x) == 4 &&
+                         offsetof(BrimolPointerEvent, y) == 6 &&
+                         offsetof(BrimolPointerEvent, xrel) == 8 &&
+                         offsetof(BrimolPointerEvent, yrel) == 10,
+                     "BrimolPointerEvent");
+BRIMOL_STATIC_ASSERT(sizeof(BrimolKeyEvent) == 12 && offsetof(BrimolKeyEvent, type) == 0 &&
+                         offsetof(BrimolKeyEvent, state) == 2 &&
+                         offsetof(BrimolKeyEvent, code) == 8,
+                     "BrimolKeyEvent");
+BRIMOL_STATIC_ASSERT(sizeof(BrimolUserEvent) == 12 && offsetof(BrimolUserEvent, type) == 0 &&
+                         offsetof(BrimolUserEvent, word1) == 4 &&
+                         offsetof(BrimolUserEvent, word2) == 8,
+                     "BrimolUserEvent");
+BRIMOL_STATIC_ASSERT(sizeof(Event) == BRIMOL_EVENT_BYTES && offsetof(Event, type) == 0 &&
+                         offsetof(Event, pointer) == 0 && offsetof(Event, key) == 0 &&
+                         offsetof(Event, user) == 0,
+                     "Event");
 
 /* Starts the service; `flags` select what it reports. Non-zero on success. */
 int EventInit(unsigned int flags);
@@ -81,3 +121,4 @@ void Delay(unsigned int ms);
 #ifdef __cplusplus
 }
 #endif
+#undef BRIMOL_STATIC_ASSERT

@@ -7,6 +7,7 @@
  */
 #pragma once
 
+#include <stddef.h>
 #include <stdint.h>
 
 #ifdef __cplusplus
@@ -73,10 +74,25 @@ typedef struct SKIA_Item {
   SKIA_Text text;
 } SKIA_Item;
 
-BRIMOL_STATIC_ASSERT(sizeof(SKIA_Rect) == 20, "five words");
-BRIMOL_STATIC_ASSERT(sizeof(SKIA_Point) == 24, "six words");
-BRIMOL_STATIC_ASSERT(sizeof(SKIA_Text) == 144, "128 bytes and four words");
-BRIMOL_STATIC_ASSERT(sizeof(SKIA_Item) == 192, "kind, rect, point and text");
+/* What is drawn is read by its layout, also across languages. */
+BRIMOL_STATIC_ASSERT(sizeof(SKIA_Rect) == 20 && offsetof(SKIA_Rect, x) == 0 &&
+                         offsetof(SKIA_Rect, y) == 4 && offsetof(SKIA_Rect, w) == 8 &&
+                         offsetof(SKIA_Rect, h) == 12 && offsetof(SKIA_Rect, color) == 16,
+                     "SKIA_Rect");
+BRIMOL_STATIC_ASSERT(sizeof(SKIA_Point) == 24 && offsetof(SKIA_Point, x1) == 0 &&
+                         offsetof(SKIA_Point, y1) == 4 && offsetof(SKIA_Point, x2) == 8 &&
+                         offsetof(SKIA_Point, y2) == 12 && offsetof(SKIA_Point, color) == 16 &&
+                         offsetof(SKIA_Point, width) == 20,
+                     "SKIA_Point");
+BRIMOL_STATIC_ASSERT(sizeof(SKIA_Text) == 144 && offsetof(SKIA_Text, text) == 0 &&
+                         offsetof(SKIA_Text, string_len) == 128 &&
+                         offsetof(SKIA_Text, color) == 132 && offsetof(SKIA_Text, align) == 136 &&
+                         offsetof(SKIA_Text, size) == 140,
+                     "SKIA_Text");
+BRIMOL_STATIC_ASSERT(sizeof(SKIA_Item) == 192 && offsetof(SKIA_Item, kind) == 0 &&
+                         offsetof(SKIA_Item, rect) == 4 && offsetof(SKIA_Item, point) == 24 &&
+                         offsetof(SKIA_Item, text) == 48,
+                     "SKIA_Item");
 
 int skia_add_box_c(SKIA_Rect rect);
 int skia_add_roundbox_c(SKIA_Rect rect);

@@ -51,7 +51,7 @@ Offer offerToTop(event_data* event) {
   return offerToActive(kTopLayer, event);
 }
 
-// A selected active widget that declines is asked again among the active ones: meant so.
+// A selected active widget that declines is asked once more among the active ones.
 bool offerToBase(event_data* event) {
   if (Layers::layer(kBaseLayer).isEmpty()) return false;
   if (skia_live_widget_c() == 0) return false;

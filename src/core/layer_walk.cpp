@@ -186,26 +186,24 @@ Widget* LayerWalk::next() {
 }
 
 bool LayerWalk::isOnThisThread() {
-  return findRecord([](const WalkRecord& record) { return record.thread == thisThread(); }) !=
-         nullptr;
+  return findRecord([](const WalkRecord& each) { return each.thread == thisThread(); }) != nullptr;
 }
 
 bool LayerWalk::isPinned(const WidgetBlock* block) {
-  return findRecord([block](const WalkRecord& record) { return record.pinned == block; }) !=
-         nullptr;
+  return findRecord([block](const WalkRecord& each) { return each.pinned == block; }) != nullptr;
 }
 
 void LayerWalk::waitUntilNotCalled(const Widget* widget) {
-  findRecord([widget](WalkRecord& record) {
-    waitForCall(record, widget);
+  findRecord([widget](WalkRecord& each) {
+    waitForCall(each, widget);
     return false;
   });
 }
 
 void LayerWalk::forget(const Widget* widget) {
-  findRecord([widget](WalkRecord& record) {
+  findRecord([widget](WalkRecord& each) {
     const Widget* ended = widget;
-    if (record.calling == ended) record.calling.compare_exchange_strong(ended, nullptr);
+    if (each.calling == ended) each.calling.compare_exchange_strong(ended, nullptr);
     return false;
   });
 }

@@ -40,7 +40,7 @@ android::sp<func_dispatchEvent> event_dispatcher;
 // Not owned where this thread is inside a handler and another one starts or ends the window: that
 // one may wait for the handler.
 std::unique_lock<std::mutex> lockLife() {
-  if (LayerWalk::isOnThisThread()) return std::unique_lock(lifeLock, std::try_to_lock);
+  if (LayerWalk::isOnThisThread()) return {lifeLock, std::try_to_lock};
   return std::unique_lock(lifeLock);
 }
 

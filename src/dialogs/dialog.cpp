@@ -38,11 +38,12 @@ void Dialog::fillIn() {
   const auto& [left, right, touches] = entry.buttons;
   button1.enabled = touches == Touches::None ? 0 : 1;
   button2.enabled = touches == Touches::Both ? 1 : 0;
-  if (entry.letterSize != 0) message.size = second.size = entry.letterSize;
+  if (entry.letterSize != 0) message.size = entry.letterSize;
+  if (entry.letterSize != 0 && secondLine != nullptr) second.size = entry.letterSize;
   if (secondLine != nullptr) lastSecondLine = secondLine;
   putIfGiven(frame.title, entry.title);
   putIfGiven(message, firstLine);
-  putIfGiven(second, lastSecondLine);
+  putIfGiven(second, secondLine != nullptr ? secondLine : lastSecondLine.load());
   putIfGiven(button1.caption, left);
   putIfGiven(button2.caption, right);
 }

@@ -53,7 +53,7 @@ struct CatalogueEntry {
   const char* title;
   Lines lines;
   ButtonRow buttons;
-  int letterSize = 0;  // of the lines, in pixels; 0: as the layout says
+  int letterSize = 0;  // of the lines that are given, in pixels; 0: as the layout says
 };
 
 /// The entry of a kind; one without texts for a number that is not in the catalogue.

@@ -41,7 +41,7 @@ SKIA_Rect markIn(const SKIA_Rect& box) {
 DialogList::DialogList(const char* title) : FramedDialog(kWord) {
   answer1 = static_cast<Answer>(&DialogList::onBtn1Released);
   answer2 = static_cast<Answer>(&DialogList::onBtn2Released);
-  leavesInTheDark = false;
+  followsMotionInTheDark = false;
   kLog.print(LogLevel::Debug, "call registerWidget");
   putText(frame.title, boundedText(title));
   putText(button1.caption, "CANCEL");

@@ -38,7 +38,7 @@ bool FramedDialog::hoverAt(event_data* event) {
   const LifeGuard self(this);
   onHover(event);
   if (!self.isAlive() || !hold.isHeld()) return false;
-  if (!leavesInTheDark && lcdOnFlag == 0) return false;
+  if (!followsMotionInTheDark && lcdOnFlag == 0) return false;
   for (DialogButton* const button : {&button1, &button2}) {
     if (!isOn(*button, event)) restoreFace(*button);
   }

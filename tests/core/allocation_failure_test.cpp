@@ -8,6 +8,7 @@
 
 #include <algorithm>
 
+#include "core/dispatch_thread.h"
 #include "support/failing_malloc.h"
 #include "support/widget_test.h"
 
@@ -80,6 +81,28 @@ TEST_F(WidgetTest, ATextThatFindsNoMemoryIsNotShown) {
   }
 }
 
+// A dispatch within so many drawing passes, each in a handler of the one before.
+TEST_F(LiveWindowTest, ADialogKeepsAnEventEvenWithoutMemory) {
+  const android::sp<MW::func_dispatchEvent> dispatcher = new MW::func_dispatchEvent;
+  for (const int passes : {2, 40}) {
+    bool isOffered = false;
+    ProbeWidget dialog(MW::kTopLayer);
+    ProbeWidget below;
+    below.onEvent = [&](auto*, auto) { return isOffered = true; };
+    int left = passes;
+    below.onShow = [&](unsigned int) {
+      if (--left > 0) return Window::show(0);
+      Window::getEventService()->AppEvent(1);
+      const FailingAllocation failure(1);
+      dispatcher->threadLoop();
+    };
+    dialog.enter();
+    below.enter();
+    Window::show(0);
+    EXPECT_FALSE(isOffered) << passes;
+  }
+}
+
 // Every single allocation of a start fails in turn; the threads' own classes allocate as well.
 TEST_F(WidgetTest, StartsOrSaysWhyNot) {
   const std::vector<LogLine> refusals = logLines(
@@ -94,6 +117,7 @@ TEST_F(WidgetTest, StartsOrSaysWhyNot) {
     failure.reset();
     const LogLine last = platform().takeLog().back();
     EXPECT_NE(started == 1, std::ranges::count(refusals, last) == 1) << last;
+    EXPECT_TRUE(started == 0 || Window::getEventService() != nullptr);
     Window::destroy();
     EXPECT_EQ(platform().inits, platform().quits);
   }

@@ -1,5 +1,6 @@
 #include "core/layer_walk.h"
 
+#include <algorithm>
 #include <atomic>
 #include <optional>
 #include <thread>
@@ -25,6 +26,35 @@ TEST_F(LayerWalkTest, KnowsTheThreadsInsideHandlers) {
   Window::show(0);
   EXPECT_TRUE(here);
   EXPECT_FALSE(elsewhere || MW::LayerWalk::isOnThisThread());
+}
+
+TEST_F(LayerWalkTest, ChangesDuringAPassSkipAndRepeatNothing) {
+  std::string calls;
+  std::vector<std::unique_ptr<JournalWidget>> all;
+  const auto add = [&](char name) { all.push_back(std::make_unique<JournalWidget>(calls, name)); };
+  const auto unregister = [&](std::size_t i) { Window::unregisterWidget(all[i].get()); };
+  // Widgets a, b and c are drawn twice; what a does when it is drawn first.
+  const auto callsWith = [&](const std::function<void()>& change) {
+    all.clear();
+    calls.clear();
+    for (const char name : {'a', 'b', 'c'}) add(name);
+    bool changed = false;
+    all[0]->onShow = [&](unsigned int) {
+      calls += 'a';
+      if (!std::exchange(changed, true)) change();
+    };
+    Window::show(1);
+    calls += ' ';
+    Window::show(2);
+    return calls;
+  };
+  EXPECT_EQ(callsWith([&] { unregister(0); }), "abc bc");
+  EXPECT_EQ(callsWith([&] { unregister(1); }), "ac ac");
+  EXPECT_EQ(callsWith([&] { all.resize(1); }), "a a");
+  EXPECT_EQ(callsWith([&] { Window::show(1); }), "aabcbc abc");
+  EXPECT_EQ(callsWith([&] { unregister(1), all[1]->enter(); }), "ac acb");
+  const auto addMany = [&] { std::ranges::for_each(std::string(40, 'n'), add); };
+  EXPECT_EQ(callsWith(addMany), "abc abc" + std::string(40, 'n'));
 }
 
 // A widget that, when it is drawn within so many drawing passes, goes and is followed by another

@@ -1,6 +1,8 @@
 /// What the plays of dialogs have in common.
 #pragma once
 
+#include <MW/dialog_list.h>
+
 #include "support/drawings.h"
 #include "support/play.h"
 
@@ -18,6 +20,22 @@ Maker makesOwn(Arguments... arguments) {
     own.keyReleaseCallback = [](MW::kbd_event* key) { note("up" + std::to_string(key->code)); };
     return made;
   };
+}
+
+template <char target>
+void noteRow(int* row) {  // NOLINT(readability-non-const-parameter): a callback's type
+  note((stage.widget->isActive() ? "" : "hidden ") + std::string(1, target) + std::to_string(*row));
+}
+/// A list of three rows, the second of which is confirmed and marked.
+inline std::unique_ptr<MW::Widget> threeRows() {
+  auto made = makes<MW::DialogList>("Title")();
+  auto& list = static_cast<MW::DialogList&>(*made);
+  while (list.addIndex("row") < 2) continue;
+  list.initFinish(1);
+  list.rowPressCallback = noteRow<'r'>;
+  list.button1Callback = noteRow<'c'>;  // CANCEL
+  list.button2Callback = noteRow<'o'>;  // OK
+  return made;
 }
 
 /// How many boxes are highlighted.

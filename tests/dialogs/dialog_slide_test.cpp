@@ -25,18 +25,17 @@ Step lookAtThumb() {
 const PlaysOn kPrompt = {prompt};
 const auto kPlays = std::to_array<Play>({
     kPrompt("DraggedToTheLeftEndItAnswersAndGoesHome",
-            {press(905, 1623), drag(-380, 0), lookAtThumb(), drag(-1, 0), lookAtThumb(),
-             drag(INT_MIN, 0), release(), lookAtThumb(), lookAtLog()},
-            "touch+ hover+ <146> hover+ <145> hover+ lift left+ <526> <[DIALOGSLIDE] Left Slide>"),
+            {press(905, 1623), drag(-381, 0), drag(INT_MIN, 0), lookAtThumb(), release(),
+             lookAtThumb(), lookAtLog()},
+            "touch+ hover+ hover+ <145> lift left+ <526> <[DIALOGSLIDE] Left Slide>"),
     kPrompt("ATapRepeatsTheAnswerOfTheLastDrag",
-            {press(526, 1396), drag(INT_MAX, 0), lookAtThumb(), release(), press(), release()},
-            "touch+ hover+ <915> lift right+ touch+ lift right+"),
-    kPrompt("BackFromTheEndItAnswersNothing",
-            {press(526, 1396), drag(389, 0), drag(-1, 0), release()}, "touch+ hover+ hover+ lift+"),
+            {press(526, 1396), drag(INT_MAX, 0), lookAtThumb(), release(), press(), release(),
+             press(), drag(389, 0), drag(-1, 0), release()},
+            "touch+ hover+ <915> lift right+ touch+ lift right+ touch+ hover+ hover+ lift+"),
     kPrompt("BesideTheThumbOnlyKeysAreTaken",
-            {press(525, 1396), press(906, 1396), drag(5, 0), release(), plug(5), keyDown(5),
-             keyUp(323)},
-            "touch- touch- hover- lift- - down5+ up323+"),
+            {press(525, 1396), press(906, 1396), release(), finger(UINT_MAX), drag(5, 0), plug(5),
+             keyDown(5), keyUp(323)},
+            "touch- touch- lift- hover- - down5+ up323+"),
     kPrompt("ASecondFingerTakesTheThumbOver",
             {press(526, 1396), finger(1), drag(9, 0), press(), finger(0), drag(9, 0), release(),
              finger(1), drag(9, 0), lookAtThumb(), lookAtLog()},
@@ -51,7 +50,6 @@ INSTANTIATE_TEST_SUITE_P(, DialogSlidePlays, testing::ValuesIn(kPlays), kRowName
 
 TEST_F(DialogSlideTest, TakesTextsThatFitAndTheThumbsWidth) {
   DialogSlide slide(5);
-  EXPECT_EQ(words(shown(slide)), "Warning|Test already pass. Try again?|CANCEL|OK|<AAT>|");
   slide.setTitle(kTooLong.c_str());
   slide.setDesc(kTooLong.c_str() + 1);
   slide.setLeft(nullptr);

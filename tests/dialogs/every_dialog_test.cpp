@@ -8,14 +8,6 @@ namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 
-std::unique_ptr<MW::Widget> twoRows() {
-  auto made = std::make_unique<MW::DialogList>("Title");
-  while (made->addIndex("row") < 1) continue;
-  made->initFinish(1);
-  made->setActive(1);
-  return made;
-}
-
 struct DialogCase : Row {
   Maker make;
   const char* places;  // of the last boxes and texts, on a screen of 1920 x 1080
@@ -23,7 +15,7 @@ struct DialogCase : Row {
 const auto kDialogs = std::to_array<DialogCase>({
     {"Dialog", makes<MW::Dialog>(0), "538,631 417x162|964,630 419x164|965,631 417x162|"},
     {"DialogNew", makes<MW::DialogNew>("Title", 5, 7), "529,541 862x170|0,0 0x0|548,378 824x152|"},
-    {"DialogList", twoRows, "538,659 417x162|964,658 419x164|965,659 417x162|"},
+    {"DialogList", threeRows, "538,716 417x162|964,715 419x164|965,716 417x162|"},
     {"DialogShell", makes<MW::DialogShell>("Title"), "538,907 844x162|0,0 0x0|0,0 0x0|"},
     {"DialogSlide", makes<MW::DialogSlide>(3), "529,627 284x170|1099,627 284x170|814,627 284x170|"},
     {"DialogSelect", makes<MW::DialogSelect>(0U), "384,564 384x384|1152,564 384x384|"},
@@ -40,23 +32,6 @@ TEST_P(EveryDialog, StandsInTheMiddleOfTheTopLayerUntilItIsHidden) {
   EXPECT_EQ(layerSize(MW::kTopLayer), 1);
   EXPECT_EQ(dialog->hide(), 1);
   EXPECT_FALSE(dialog->isActive());
-}
-
-// Once the first of three has gone, a new one gets the third one's number.
-TEST_P(EveryDialog, LeavesItselfAndNotAnotherOfItsNumber) {
-  std::string told;
-  auto first = GetParam().make();
-  const auto second = GetParam().make();
-  JournalWidget third(told, 't', MW::kTopLayer, true);
-  first.reset();
-  const std::string counted = platform().takeLog().back().message;
-  auto fourth = GetParam().make();
-  ASSERT_EQ(fourth->id(), third.id());
-  fourth.reset();
-  EXPECT_EQ(platform().takeLog().back().message, counted);
-  MW::Window::show(1);
-  EXPECT_EQ(told, "t");
-  EXPECT_EQ(layerSize(MW::kTopLayer), 2);
 }
 
 const Steps kAnyInput = {

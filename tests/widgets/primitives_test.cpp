@@ -5,10 +5,7 @@
 #include <climits>
 #include <cstring>
 
-#include "core/bounded_text.h"
 #include "support/widget_test.h"
-
-extern "C" void callFromC(int* results);  // in c_api_test.c
 
 namespace {
 
@@ -16,7 +13,6 @@ using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's
 
 using List = MW::WidgetList;
 using PrimitivesTest = WidgetTest;
-using WidgetListTest = WidgetTest;
 
 constexpr SKIA_Rect kRect = {10, 20, 30, 40, 0xFF112233};
 constexpr SKIA_Rect kBlueRect = {10, 20, 30, 40, 0xFF0000FF};
@@ -83,41 +79,18 @@ TEST_F(PrimitivesTest, OnlyAnImageBelievesALength) {
   }
 }
 
-TEST_F(PrimitivesTest, AbsentRecordsAreEmptyAndTextsAreCut) {
-  MW::Label label(nullptr, nullptr);
-  MW::Textbox textbox(nullptr, nullptr);
-  MW::Image image(nullptr, nullptr);
-  MW::Box box(nullptr);
-  MW::Line line(nullptr);
-  EXPECT_EQ(shown(box)[0], Drawing{.call = Call::Box});
-  EXPECT_EQ(shown(line)[0], Drawing{.call = Call::Line});
-  for (MW::Widget* each : std::vector<MW::Widget*>{&label, &textbox, &image}) {
-    EXPECT_EQ(shown(*each)[0].text, DrawnText());
-    each->setText(std::string(300, 'x').c_str());
-    EXPECT_EQ(shown(*each)[0].text.text, std::string(127, 'x'));
-    each->setText(nullptr);
-    EXPECT_EQ(shown(*each)[0].text, DrawnText());
-  }
+TEST_F(PrimitivesTest, AbsentRecordsAreZero) {
+  EXPECT_EQ(shown(*std::make_unique<MW::Box>(nullptr))[0], Drawing{.call = Call::Box});
+  EXPECT_EQ(shown(*std::make_unique<MW::Line>(nullptr))[0], Drawing{.call = Call::Line});
+  EXPECT_EQ(shown(*std::make_unique<MW::Image>(nullptr, nullptr))[0], Drawing{.call = Call::Label});
 }
 
-TEST_F(PrimitivesTest, TextsAreCutAtAWholeCharacter) {
-  for (const std::string character : {"a", "\u00e9", "\uac00", "\U0001f600"}) {
-    for (std::size_t start = 120; start < 130; ++start) {
-      const std::string given = std::string(start, 'a') + character + "behind";
-      const std::size_t end = start + character.size();
-      const std::size_t kept = start < 127 && end > 127 ? start : 127;
-      EXPECT_EQ(MW::boundedText(given.c_str()), given.substr(0, kept));
-      EXPECT_EQ(MW::boundedText(given.c_str(), end), given.substr(0, std::min(kept, end)));
-    }
-  }
-  EXPECT_EQ(MW::boundedText(std::string(200, '\x80').c_str()).size(), 127U) << "no characters";
-  EXPECT_EQ(MW::boundedText("abc", 100), "abc");
-  EXPECT_EQ(MW::boundedText(nullptr, 5), "");
+TEST_F(PrimitivesTest, ATextMayBeAPartOfItsOwn) {
   SKIA_Text unbounded;
   std::memset(&unbounded, 'x', sizeof unbounded);
   MW::Textbox textbox(&kRect, &unbounded);
   textbox.setText(textbox.getText() + 1);
-  EXPECT_EQ(shown(textbox)[0].text.text, std::string(126, 'x')) << "a part of its own text";
+  EXPECT_EQ(shown(textbox)[0].text.text, std::string(126, 'x'));
 }
 
 TEST_F(PrimitivesTest, ALinesRectStartsAtTheLargerCoordinates) {
@@ -126,98 +99,6 @@ TEST_F(PrimitivesTest, ALinesRectStartsAtTheLargerCoordinates) {
       {{30, 5, 10, 20, 7, 1}, {30, 20, -20, -15, 7}},
       {{INT_MIN, INT_MAX, INT_MAX, INT_MIN, 7, 1}, {INT_MAX, INT_MAX, INT_MIN, INT_MIN, 7}}};
   for (const auto& [given, rect] : lines) EXPECT_EQ(*MW::Line(&given).getPositionAndSize(), rect);
-}
-
-int addText(const std::string& text) {
-  const SKIA_Text record = textRecord(text);
-  return List::addQueue(SKIA_LABEL, &kRect, nullptr, &record);
-}
-int addLine() { return List::addQueue(SKIA_LINE, nullptr, &kLine, nullptr); }
-
-std::vector<Drawing> drawn() {
-  List::show();
-  return platform().takeDrawings();
-}
-
-const Drawing kLineItem = {Call::Item, {}, kLine, {}, SKIA_LINE};
-
-TEST_F(WidgetListTest, NeedsToBeOpen) {
-  EXPECT_EQ(addText("a"), -1024);
-  EXPECT_EQ(List::show() + List::show(1) + List::hide(1) + List::hideShadow() + List::remove(1), 0);
-  EXPECT_EQ(List::setText(1, "a", 1) + List::setColor(1, 2, 3, 4) + List::setRect(1, kRect), 0);
-  EXPECT_EQ(List::setFontSize(1, 2) + static_cast<int>(platform().takeDrawings().size()), 0);
-}
-
-TEST_F(WidgetListTest, DrawsHidesAndVeilsItems) {
-  List::init();
-  EXPECT_EQ(addText("abc"), 1);
-  EXPECT_EQ(addLine(), 2);
-  const Drawing label = {Call::Item, kRect, {}, {"abc"}};
-  EXPECT_EQ(drawn(), (std::vector{label, kLineItem}));
-  EXPECT_EQ(List::hide(1) + List::remove(2), 2);
-  EXPECT_EQ(drawn(), std::vector{kLineItem}) << "nothing is removed";
-  EXPECT_EQ(List::show(1) + List::hideShadow(), 2);
-  const Drawing veil = {Call::Box, {0, 0, 539, 939, 0x7F000000}};
-  EXPECT_EQ(platform().takeDrawings(), (std::vector{label, kLineItem, veil}));
-  for (const int missing : {0, 3, INT_MIN}) {
-    EXPECT_EQ(List::hide(missing) + List::show(missing), 2 * -104) << missing;
-  }
-}
-
-TEST_F(WidgetListTest, NeverUsesAnIndexAgain) {
-  List::init();
-  EXPECT_EQ(addText("a"), 1);
-  EXPECT_EQ(List::destroy() + List::init(), 1);
-  EXPECT_EQ(addText("b"), 2);
-  EXPECT_EQ(List::init(), 1) << "empties an open table";
-  EXPECT_EQ(List::index2slot(2), -104);
-  List::index_num = 0x0FFFFFFE;
-  EXPECT_EQ(addText("last"), 0x0FFFFFFF);
-  EXPECT_EQ(addText("none"), -101);
-}
-
-TEST_F(WidgetListTest, AFullTableReplacesSlot100) {
-  List::init();
-  for (int i = 1; i <= 128; ++i) EXPECT_EQ(addText(std::to_string(i)), i);
-  EXPECT_EQ(List::getSlot(), 100);
-  List::hide(101);
-  EXPECT_EQ(addLine(), 101);
-  const std::vector<Drawing> items = drawn();
-  EXPECT_EQ(items.size(), 128U);
-  EXPECT_EQ(items.at(99).text.text, "100");
-  EXPECT_EQ(items.at(100), kLineItem);
-}
-
-TEST_F(WidgetListTest, ChangesAnItemWithinItsRecord) {
-  List::init();
-  addText("abc");
-  EXPECT_EQ(List::setText(1, "wxyz", 3) + List::setText(1, "", 0), 2) << "0 changes nothing";
-  EXPECT_EQ(List::setRect(1, {9, 8, 7, 6, 5}) + List::setColor(1, 0xA, 0xB, 0xC), 2);
-  EXPECT_EQ(List::setFontSize(1, 40), 1);
-  const Drawing changed = {
-      Call::Item, {9, 8, 7, 6, 0xB}, {0, 0, 0, 0, 0xC, 0}, {"wxy", 0xA, 0, 40}};
-  EXPECT_EQ(drawn(), std::vector{changed});
-  List::setText(1, std::string(300, 'x').c_str(), 300);
-  EXPECT_EQ(drawn()[0].text.text, std::string(127, 'x'));
-  List::setText(1, "ab\0cd", 5);
-  EXPECT_EQ(drawn()[0].text.text, std::string("ab\0cd", 5)) << "the count counts";
-  SKIA_Text endless = {{}, INT_MAX, 0, 0, 0};
-  endless.text[127] = 'y';
-  List::addQueue(SKIA_LABEL, nullptr, nullptr, &endless);
-  EXPECT_EQ(drawn()[1].text.text, std::string(127, '\0'));
-  EXPECT_EQ(List::save[1].item->text.text[127], '\0');
-  EXPECT_EQ(List::setText(3, "a", 1) + List::setColor(0, 1, 2, 3), 2 * -104);
-  EXPECT_EQ(List::setRect(0, kRect) + List::setFontSize(-5, 1), 2 * -104);
-  EXPECT_EQ(platform().takeLog().at(3),
-            (LogLine{kDebug, "BRIMOL_WIDGETLIST", "[WIDGET] setFontSize: index is invalid -5 "}));
-}
-
-TEST_F(WidgetListTest, IsReachedFromC) {
-  List::init();
-  std::array<int, 5> results = {};
-  callFromC(results.data());
-  EXPECT_EQ(results, (std::array{1, 1, 2, 1, 0}));
-  EXPECT_EQ(drawn()[0].rect, (SKIA_Rect{1, 2, 33, 4, 0xFF00FF00}));
 }
 
 }  // namespace

@@ -1,6 +1,7 @@
 // Every key once, and one of them twice and three times in a row.
 #include <MW/key.h>
 #include <MW/primitives.h>
+#include <brimol/input.h>
 
 #include <algorithm>
 #include <array>
@@ -31,10 +32,10 @@ constexpr auto kAsked = std::to_array<KeyName>({
     {MW::kKeyRight, "Right"},
     {MW::kKeySelect, "Select"},
     {MW::kKeyHook, "Hook"},
-    {115, "Volume up"},
-    {114, "Volume down"},
-    {116, "Power"},
-    {102, "Home"},
+    {BRIMOL_CODE_VOLUME_UP, "Volume up"},
+    {BRIMOL_CODE_VOLUME_DOWN, "Volume down"},
+    {BRIMOL_CODE_POWER, "Power"},
+    {BRIMOL_CODE_HOME, "Home"},
     {kTwice, "Twice"},
     {kThreeTimes, "Three times"},
 });

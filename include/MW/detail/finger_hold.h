@@ -7,8 +7,8 @@
 
 namespace MW {
 
-/// The finger that pressed holds until it lifts. Stands on the widget's own selection, which the
-/// window's routing reads as well: 0 while no finger holds, else the finger's number + 1. Any
+/// Records which finger holds a widget, in the widget's `select`, which event routing reads too: 0
+/// for none, else the finger's number + 1. Finger 0xFFFFFFFF therefore never holds. Safe on any
 /// thread.
 class FingerHold {
  public:
@@ -22,7 +22,11 @@ class FingerHold {
   void press(const mouse_event& mouse) { selection = wordOf(mouse); }
   void letGo() { selection = 0; }
   bool isHeld() const { return selection != 0; }
-  bool isOwner(const mouse_event& mouse) const { return selection == wordOf(mouse); }
+  /// Whether this finger holds.
+  bool isOwner(const mouse_event& mouse) const {
+    const int holder = selection;
+    return holder != 0 && holder == wordOf(mouse);
+  }
   /// Whether another finger than this one holds.
   bool isOthers(const mouse_event& mouse) const {
     const int holder = selection;

@@ -8,8 +8,9 @@
 namespace MW {
 
 /// Counts the releases of one key, each of which comes within 1000 ms of the one before. Times are
-/// GetTicks() milliseconds; their wrap may cut a series short. It belongs to the thread that
-/// handles events, or to the holder's lock.
+/// GetTicks() milliseconds. If they wrap between two releases, a series may be cut short, or two
+/// releases far apart may count as one series. It belongs to the thread that handles events, or to
+/// the holder's lock.
 class KeyClicks {
  public:
   static constexpr uint32_t kWindowMs = 1000;

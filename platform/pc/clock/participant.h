@@ -14,12 +14,14 @@ struct TurnClock::Participant {
   uint64_t wake = 0;  // when its pause ends
   bool isPoller = false;
   bool isOutside = false;  // away, and named as one that blocks outside
-  bool isAtWork = false;   // has the turn and knows it
   int calls = 0;           // since its pause; the thread's own
   std::atomic<bool> waitsInside = false;
   std::atomic<bool> arrives = false;                // waits for the clock's lock, or is about to
   std::chrono::steady_clock::time_point runsSince;  // away, and seen running
-  std::condition_variable go;
+
+  // Has the turn, and is to hear of it. A word of its own, so that who hears needs no lock.
+  std::atomic<int> granted = 0;
+  std::atomic<bool> isAtWork = false;  // has the turn, and knows it
 };
 
 }  // namespace brimol::pc

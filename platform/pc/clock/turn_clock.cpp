@@ -74,6 +74,7 @@ TurnClock::Participant& TurnClock::self() {
   if (seat.id == id) return *seat.place;
   const std::lock_guard lock(mutex);
   Participant& me = add(nameOfThread());
+  me.state = Participant::State::Away;  // on its way to wait for its turn
   sitDown(me);
   return me;
 }
@@ -84,8 +85,7 @@ void TurnClock::takePart() {
     if (++me.calls >= kMostCalls) delay(1);
     return;
   }
-  Lock lock = lockFor(me);
-  waitForTurn(lock, me, time);
+  pause(me, 0);
 }
 
 // A thread that is away and waits for the lock looks blocked, and yet is on its way.
@@ -109,11 +109,7 @@ uint32_t TurnClock::ticks() {
   return ticksNow();
 }
 
-void TurnClock::delay(uint32_t ms) {
-  Participant& me = self();
-  Lock lock = lockFor(me);
-  waitForTurn(lock, me, time + std::max(ms, 1U));
-}
+void TurnClock::delay(uint32_t ms) { pause(self(), std::max(ms, 1U)); }
 
 bool TurnClock::setWaitsInside(bool waits) { return self().waitsInside.exchange(waits); }
 
@@ -136,10 +132,11 @@ void TurnClock::withdraw(Participant& announced) {
 }
 
 void TurnClock::begin(Participant& announced) {
-  Lock lock(mutex);
-  sitDown(announced);
-  announced.go.wait(lock, [&] { return holder == &announced; });
-  announced.isAtWork = true;
+  {
+    const Lock lock(mutex);
+    sitDown(announced);
+  }
+  hearOfTurn(announced);
 }
 
 void TurnClock::leave() {
@@ -151,15 +148,22 @@ void TurnClock::leave() {
   keeperWakes.notify_one();
 }
 
-void TurnClock::waitForTurn(Lock& lock, Participant& me, uint64_t wake) {
+void TurnClock::pause(Participant& me, uint32_t ms) {
+  Lock lock = lockFor(me);
   me.calls = 0;
-  me.wake = wake;
+  me.wake = time + ms;
   me.isAtWork = false;
   me.state = Participant::State::Waiting;
   if (me.isOutside) takeBack(me);
   if (holder == &me) holder = nullptr;
   if (holder == nullptr) passOn(lock);
-  me.go.wait(lock, [&] { return holder == &me; });
+  lock.unlock();
+  hearOfTurn(me);
+}
+
+void TurnClock::hearOfTurn(Participant& me) {
+  me.granted.wait(0);
+  me.granted = 0;
   me.isAtWork = true;
 }
 
@@ -177,7 +181,8 @@ void TurnClock::passOn(Lock& lock) {
   next->state = Participant::State::Running;
   holder = next;
   ++turns;
-  next->go.notify_one();
+  next->granted = 1;
+  next->granted.notify_one();
 }
 
 // Null: nobody can run, or real time has not come so far; the keeper looks again.

@@ -99,7 +99,8 @@ class TurnClock {
   Participant& self();
   Participant& add(const std::string& name);
   void sitDown(Participant& me);
-  void waitForTurn(Lock& lock, Participant& me, uint64_t wake);
+  void pause(Participant& me, uint32_t ms);
+  static void hearOfTurn(Participant& me);
   void passOn(Lock& lock);
   Participant* choose(Lock& lock);
   Participant* earliest();

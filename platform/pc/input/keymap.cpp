@@ -1,5 +1,7 @@
 #include "input/keymap.h"
 
+#include <brimol/input.h>
+
 #include <algorithm>
 #include <array>
 #include <string_view>
@@ -12,26 +14,26 @@ namespace {
 
 struct KeyRow {
   SDL_Keycode key;
-  uint32_t code;           // what the phone's key reports
+  BrimolKeyCode code;      // what the phone's key reports
   std::string_view label;  // of the key on the PC
   std::string_view plays;  // the phone's key
 };
 
 // In the order of the help; a key that is not listed plays nothing.
 constexpr auto kKeyTable = std::to_array<KeyRow>({
-    {SDLK_UP, 273, "Up", "up"},
-    {SDLK_DOWN, 274, "Down", "down"},
-    {SDLK_RIGHT, 275, "Right", "right"},
-    {SDLK_LEFT, 276, "Left", "left"},
-    {SDLK_RETURN, 327, "Enter", "select"},
-    {SDLK_KP_ENTER, 327, "Keypad Enter", "select"},
-    {SDLK_h, 323, "H", "hook"},
-    {SDLK_PAGEUP, 115, "Page Up", "volume up"},
-    {SDLK_PAGEDOWN, 114, "Page Down", "volume down"},
-    {SDLK_p, 116, "P", "power"},
-    {SDLK_HOME, 102, "Home", "home"},
-    {SDLK_ESCAPE, 158, "Escape", "back"},
-    {SDLK_BACKSPACE, 158, "Backspace", "back"},
+    {SDLK_UP, BRIMOL_CODE_UP, "Up", "up"},
+    {SDLK_DOWN, BRIMOL_CODE_DOWN, "Down", "down"},
+    {SDLK_RIGHT, BRIMOL_CODE_RIGHT, "Right", "right"},
+    {SDLK_LEFT, BRIMOL_CODE_LEFT, "Left", "left"},
+    {SDLK_RETURN, BRIMOL_CODE_SELECT, "Enter", "select"},
+    {SDLK_KP_ENTER, BRIMOL_CODE_SELECT, "Keypad Enter", "select"},
+    {SDLK_h, BRIMOL_CODE_HOOK, "H", "hook"},
+    {SDLK_PAGEUP, BRIMOL_CODE_VOLUME_UP, "Page Up", "volume up"},
+    {SDLK_PAGEDOWN, BRIMOL_CODE_VOLUME_DOWN, "Page Down", "volume down"},
+    {SDLK_p, BRIMOL_CODE_POWER, "P", "power"},
+    {SDLK_HOME, BRIMOL_CODE_HOME, "Home", "home"},
+    {SDLK_ESCAPE, BRIMOL_CODE_BACK, "Escape", "back"},
+    {SDLK_BACKSPACE, BRIMOL_CODE_BACK, "Backspace", "back"},
 });
 
 constexpr std::size_t kLabelColumns = 20;

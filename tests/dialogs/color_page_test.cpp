@@ -1,0 +1,58 @@
+// The coloured pages.
+
+#include <MW/auto_cap_screen.h>
+#include <MW/dialog_warn.h>
+
+#include "dialogs/dialog_plays.h"
+
+namespace {
+
+using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+using ColorPageTest = WidgetTest;
+
+std::unique_ptr<MW::Widget> warning() {
+  auto made = makesOwn<MW::DialogWarn>(MW::kColorRed)();
+  auto& page = static_cast<MW::DialogWarn&>(*made);
+  page.doubleKeyCallback = [](MW::kbd_event* key) { note("twice" + std::to_string(key->code)); };
+  page.tripleKeyCallback = [](MW::kbd_event* key) { note("thrice" + std::to_string(key->code)); };
+  return made;
+}
+
+const PlaysOn kWarning = {warning};
+const auto kPlays = std::to_array<Play>({
+    kWarning("TouchesAreToldAndPassedOn",
+             {press(1, 1), drag(1, 0), release(), longPress(1, 1), lcdOn(0), press()},
+             "touch- - lift- - touch-"),
+    kWarning("KeysAreTakenAndCounted",
+             {keyDown(323), keyUp(5), keyUp(5), keyUp(5), keyUp(6), plug(7), appEvent(1)},
+             "down323+ up5+ twice5 up5+ thrice5 up5+ up6+ - -"),
+});
+using ColorPagePlays = PlayTest;
+TEST_P(ColorPagePlays, TellTheirJournal) { expectJournal(GetParam()); }
+INSTANTIATE_TEST_SUITE_P(, ColorPagePlays, testing::ValuesIn(kPlays), kRowName);
+
+TEST_F(ColorPageTest, TakesTextsThatFitItsFourBoxes) {
+  MW::DialogWarn page(MW::kColorRed);
+  page.setText(0, {}, textRecord(kTooLong));
+  page.setText(4, {}, textRecord("no such box"));
+  EXPECT_EQ(words(shown(page)), "");
+  page.setText(3, {1, 2, 3, 4, 5}, textRecord(kTooLong.substr(5)));
+  page.setText_str(0, "LONGER");
+  EXPECT_EQ(words(shown(page)), std::string("LON\0ER|", 7) + "ABC|ABC|" + kTooLong.substr(5) + '|');
+}
+
+TEST_F(ColorPageTest, AnAutoCapScreenChangesAtOnceAndWithItsLayout) {
+  MW::AutoCapScreen page(7);
+  page.setBgColor(1);
+  page.setBg_title(2);
+  EXPECT_EQ(shown(page).front().rect.color, 1U);
+  page.setRect(0, 0);
+  EXPECT_EQ(page.getBgColor(), 2U);
+  page.setText_str(3, "LONGER");
+  EXPECT_STREQ(page.getText(3)->text, "LONGER");
+  page.setTextColor(4, 6);
+  EXPECT_EQ(page.getTextColor(4), 0U) << "no such box";
+  EXPECT_EQ(page.getText(4), nullptr);
+}
+
+}  // namespace
