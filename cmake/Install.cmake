@@ -2,13 +2,14 @@
 # `development` (what building against them needs) and `tools` (the programs). Without BRIMOL_INSTALL
 # the functions do nothing.
 
-# Debian's folder for libraries, under every prefix: its loader and its pkg-config look there.
-if(PROJECT_IS_TOP_LEVEL AND EXISTS /etc/debian_version AND CMAKE_LIBRARY_ARCHITECTURE)
-  set(CMAKE_INSTALL_LIBDIR "lib/${CMAKE_LIBRARY_ARCHITECTURE}" CACHE PATH "Object code libraries")
+if(BRIMOL_INSTALL)
+  # Debian's folder for libraries, under every prefix: its loader and its pkg-config look there.
+  if(PROJECT_IS_TOP_LEVEL AND EXISTS /etc/debian_version AND CMAKE_LIBRARY_ARCHITECTURE)
+    set(CMAKE_INSTALL_LIBDIR "lib/${CMAKE_LIBRARY_ARCHITECTURE}" CACHE PATH "Object code libraries")
+  endif()
+  include(GNUInstallDirs)
+  set(BRIMOL_INSTALL_CMAKEDIR "${CMAKE_INSTALL_LIBDIR}/cmake/brimol3_widget")
 endif()
-include(GNUInstallDirs)
-
-set(BRIMOL_INSTALL_CMAKEDIR "${CMAKE_INSTALL_LIBDIR}/cmake/brimol3_widget")
 
 # brimol_install_library(<target> <component>): the library, and a CMake file that imports it as
 # brimol3_widget::<component>.

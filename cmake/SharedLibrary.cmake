@@ -19,6 +19,7 @@ function(brimol_shared_library target component map)
                EXPORT_NAME ${component}
                LINK_DEPENDS "${map}")
   target_include_directories(${target} PUBLIC "$<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/include>")
+  target_compile_features(${target} PUBLIC cxx_std_20)
   target_link_options(${target} PRIVATE "LINKER:--version-script=${map}")
   brimol_install_library(${target} ${component})
 endfunction()

@@ -35,7 +35,6 @@ inline constexpr SKIA_Rect kMenuHeader = {0, 0, kScreen.width, 340, MW::kColorBl
 
 // The verdicts: three squares of 220 pixels, 14 from each other and from the edges.
 inline constexpr SKIA_Rect kPass = {14, 1046, 220, 220, MW::kColorWhite};
-inline constexpr SKIA_Rect kRetry = {248, 1046, 220, 220, MW::kColorWhite};
 inline constexpr SKIA_Rect kFail = {482, 1046, 220, 220, MW::kColorWhite};
 
 inline constexpr SKIA_Rect kCentre = {350, 630, 20, 20, 0};
@@ -43,10 +42,8 @@ inline constexpr SKIA_Rect kCentre = {350, 630, 20, 20, 0};
 /// The knob of the first switch, at its left.
 inline constexpr SKIA_Rect kKnob = {36, 435, 258, 114, MW::kColorWhite};
 
-/// The buttons of a dialog that has two.
+/// The left button of a dialog that has two.
 inline constexpr SKIA_Rect kDialogOk = {82, 702, 273, 105, MW::kColorWhite};
-
-inline constexpr SKIA_Rect kDialogCancel = {365, 702, 273, 105, MW::kColorWhite};
 
 inline constexpr PageLayout kPage = layOutPage(kScreen);
 

@@ -22,6 +22,7 @@ Happening happeningOf(Happening::Kind kind, const char* text) {
   Happening happening;
   happening.kind = kind;
   happening.text = text;
+  if (kind == Happening::Kind::Error) happening.weight = Happening::Weight::Failure;
   return happening;
 }
 
@@ -92,7 +93,7 @@ TEST_F(Report, KeepsEachPictureOnceAndWithinItsBounds) {
   writePicture("two.png", 0x445566);
   write("text.png", "no picture");
   const std::size_t room = bytesOf(folder / "one.png").size();
-  Album album(folder, {room, room * 10});
+  Album album(folder, {room, room * 10, 216});
   EXPECT_EQ(album.addFile(folder / "one.png"), 0);
   EXPECT_EQ(album.addFile(folder / "copy.png"), 0);
   EXPECT_EQ(album.addFile(folder / "two.png"), 1);

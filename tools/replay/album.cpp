@@ -11,9 +11,6 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr int kThumbWidth = 216;
-constexpr int kThumbHeight = 384;
-
 // Nothing where it is larger than what is left.
 std::string kept(const std::string& png, std::size_t& left) {
   if (png.size() > left) return {};
@@ -50,7 +47,8 @@ std::optional<std::size_t> Album::add(const std::string& png, const std::string&
                 kept(png, left.fullBytes),
                 link};
   if (left.thumbBytes > 0) {
-    added.thumb = kept(encodePng(fitted(picture, kThumbWidth, kThumbHeight)), left.thumbBytes);
+    added.thumb =
+        kept(encodePng(fitted(picture, left.thumbWidth, 2 * left.thumbWidth)), left.thumbBytes);
   }
   pictures.push_back(std::move(added));
   return pictures.size() - 1;

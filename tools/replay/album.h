@@ -16,12 +16,12 @@ namespace brimol::replay {
 class Album {
  public:
   struct Bounds {
-    std::size_t fullBytes = std::size_t{24} << 20;
-    std::size_t thumbBytes = std::size_t{12} << 20;
+    std::size_t fullBytes = std::size_t{12} << 20;
+    std::size_t thumbBytes = std::size_t{8} << 20;
+    int thumbWidth = 216;  // at most, and twice as high
   };
 
   /// Links lead from `page`, the folder that the report is written to.
-  explicit Album(std::filesystem::path page) : Album(std::move(page), Bounds()) {}
   Album(std::filesystem::path page, Bounds bounds);
 
   /// The picture's place in json(). Nothing for what is no PNG file.

@@ -10,6 +10,7 @@
 #include <nlohmann/json.hpp>
 
 #include "picture.h"
+#include "run_directory.h"
 #include "trace_files.h"
 
 namespace brimol::replay {
@@ -62,10 +63,11 @@ std::vector<fs::path> filesBelow(const fs::path& folder) {
   std::error_code failure;
   for (fs::recursive_directory_iterator entry(folder, failure), end; !failure && entry != end;
        entry.increment(failure)) {
-    if (entry.depth() == 0 && entry->path().filename() == "bundle")
+    if (entry.depth() == 0 && entry->path().filename() == kUnpackedName) {
       entry.disable_recursion_pending();
-    else if (entry->is_regular_file())
+    } else if (entry->is_regular_file()) {
       files.push_back(entry->path().lexically_relative(folder));
+    }
   }
   std::ranges::sort(files);
   return files;

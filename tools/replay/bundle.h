@@ -22,7 +22,7 @@ struct RunRecord {
 
 std::string jsonOf(const RunRecord& record);
 /// Nothing for what is no such text.
-std::optional<RunRecord> parseRecord(const std::string& json);
+std::optional<RunRecord> parseRecord(const std::string& text);
 
 /// Packs the trace with what it includes as trace/, the run's folder as run/, and the record, to a
 /// compressed tar archive. False, with one line in `error`, if it cannot be written whole.

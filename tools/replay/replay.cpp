@@ -178,6 +178,7 @@ std::string pageOf(const Plan& plan, const Outcome& outcome) {
                  {"brimol-replay", kVersion}};
   input.output = outcome.output;
   input.page = fs::absolute(plan.options.report).parent_path();
+  input.traces = fs::path(plan.record.trace).parent_path();
   if (outcome.other) {
     input.other = &*outcome.other;
     input.comparison = &outcome.comparison;

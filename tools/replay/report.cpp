@@ -23,14 +23,12 @@ std::string scriptSafe(const std::string& json) {
   safe.reserve(json.size());
   for (const char letter : json) {
     // Within JSON these stand in texts alone, where they may be written so.
-    if (letter == '<')
-      safe += "\\u003c";
-    else if (letter == '>')
-      safe += "\\u003e";
-    else if (letter == '&')
-      safe += "\\u0026";
-    else
-      safe += letter;
+    switch (letter) {
+      case '<': safe += "\\u003c"; break;
+      case '>': safe += "\\u003e"; break;
+      case '&': safe += "\\u0026"; break;
+      default: safe += letter;
+    }
   }
   return safe;
 }

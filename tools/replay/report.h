@@ -19,7 +19,8 @@ struct ReportInput {
   std::string output = {};                                 // of the application
   const PlayedRun* other = nullptr;                        // both or none
   const Comparison* comparison = nullptr;
-  std::filesystem::path page = {};  // the folder that it is written to
+  std::filesystem::path page = {};    // the folder that it is written to
+  std::filesystem::path traces = {};  // the trace's; files below it are named from there
 };
 
 /// Frames and what happened are bounded, so that a session of any length gives a page that opens;

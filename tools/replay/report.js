@@ -44,6 +44,7 @@ function showVerdict() {
 // Pictures: all thumbnails of the page, in its order, can be enlarged and walked through.
 
 const plates = [];
+let fixedPlates = 0;  // those that stay when the frames are shown anew
 
 function thumbnail(index, title, shows, touches) {
   const picture = index === null || index === undefined ? null : session.pictures[index];
@@ -112,7 +113,7 @@ function wireViewer() {
 
 // What happened.
 
-const kindWords = {event: "input", check: "expected", world: "world", blocked: "blocked"};
+const kindWords = {event: "input", check: "expected", debug: "log"};
 
 function wordOf(entry) {
   if (entry.kind === "check" && !entry.passed) return "failed";
@@ -141,22 +142,24 @@ function listOf(entries) {
   return list;
 }
 
-// Frames: one with entries is a card; those without stand side by side.
+// Frames: one with entries that are wanted is a card; those without stand side by side.
 
-const hasFailed = (entries) => entries.some((entry) => entry.kind === "error" || entry.passed === false);
+const hidden = new Set(["debug"]);
+const wanted = (entries) => entries.filter((entry) => entry.weight === "failure" || !hidden.has(entry.kind));
+const hasFailed = (entries) => entries.some((entry) => (entry.kind === "error" || entry.kind === "check") && entry.weight === "failure");
 const touchesOf = (entries) => entries.filter((entry) => entry.touch).map((entry) => entry.touch);
 
-function card(frame, passed) {
+function card(frame, entries, passed) {
   const title = "Frame " + frame.number;
   const meta = [plural(frame.items, "item"), `painted in ${frame.paint.toFixed(1)} ms`];
   if (passed > 0) meta.unshift(`${seconds(passed)} after the one before`);
-  return make("article", {className: "card" + (hasFailed(frame.entries) ? " marked" : ""),
+  return make("article", {className: "card" + (hasFailed(entries) ? " marked" : ""),
                           id: "frame-" + frame.index, tabIndex: -1, "aria-label": title},
       make("div", {}, thumbnail(frame.picture, title, frame.shows, touchesOf(frame.entries))),
       make("div", {},
           make("header", {}, make("h3", {}, title), make("span", {className: "meta"}, seconds(frame.time))),
           make("p", {className: "meta"}, meta.join(" · "), " · ", make("span", {className: "hash"}, frame.hash)),
-          listOf(frame.entries)));
+          listOf(entries)));
 }
 
 function quiet(frame) {
@@ -168,38 +171,44 @@ function quiet(frame) {
 
 function showFrames() {
   const list = byId("frame-list");
-  if (session.before.length > 0) {
-    list.append(make("article", {className: "card bare" + (hasFailed(session.before) ? " marked" : "")},
-        make("div", {}, make("h3", {}, "Before the first frame"), listOf(session.before))));
+  list.replaceChildren();
+  plates.length = fixedPlates;
+  const before = wanted(session.before);
+  if (before.length > 0) {
+    list.append(make("article", {className: "card bare" + (hasFailed(before) ? " marked" : "")},
+        make("div", {}, make("h3", {}, "Before the first frame"), listOf(before))));
   }
   let strip = null;
   let last = null;
   for (const frame of session.frames) {
     const leftOut = last === null ? 0 : frame.index - last.index - 1;
     if (leftOut > 0) list.append(make("p", {className: "meta"}, plural(leftOut, "frame") + " left out here"));
-    if (leftOut > 0 || frame.entries.length > 0) strip = null;
-    if (frame.entries.length > 0) {
-      list.append(card(frame, last === null ? 0 : frame.time - last.time));
+    const entries = wanted(frame.entries);
+    if (leftOut > 0 || entries.length > 0) strip = null;
+    if (entries.length > 0) {
+      list.append(card(frame, entries, last === null ? 0 : frame.time - last.time));
     } else {
       if (strip === null) list.append(strip = make("div", {className: "strip"}));
       strip.append(quiet(frame));
     }
     last = frame;
   }
-  if (session.frames.length === 0 && session.before.length === 0) {
+  if (session.frames.length === 0 && before.length === 0) {
     list.append(make("p", {className: "meta"}, "There are none."));
   }
 }
 
 function showFilters() {
   const used = new Set([session.before, ...session.frames.map((frame) => frame.entries)].flat().map((one) => one.kind));
-  const choices = [["step", "Steps"], ["event", "Input"], ["check", "Expectations"], ["log", "Log"],
+  const choices = [["step", "Steps"], ["event", "Input"], ["check", "Expectations"], ["log", "Log"], ["debug", "Debug log"],
                    ["world", "World"], ["shot", "Shots"]];
   for (const [kind, label] of choices) {
     if (!used.has(kind)) continue;
-    const box = make("input", {type: "checkbox", checked: true});
+    const box = make("input", {type: "checkbox", checked: !hidden.has(kind)});
     box.addEventListener("change", () => {
-      for (const row of document.querySelectorAll(`.entries > .${kind}:not(.failure)`)) row.hidden = !box.checked;
+      if (box.checked) hidden.delete(kind);
+      else hidden.add(kind);
+      showFrames();
     });
     byId("filters").append(make("label", {}, box, label));
   }
@@ -302,6 +311,7 @@ showVerdict();
 showFailures();
 showTimeline();
 showComparison();
+fixedPlates = plates.length;
 showFrames();
 showFilters();
 wireViewer();

@@ -59,11 +59,18 @@ std::string describe(const Frame& frame) {
   return cut(std::move(texts), kMostDescriptionBytes);
 }
 
-json entryOf(const Happening& happening) {
-  json entry = {{"kind", nameOf(happening.kind)},
+// Below the trace's folder a file is named from there.
+std::string placeText(const Place& place, const std::filesystem::path& traces) {
+  const std::string folder = traces.native() + "/";
+  const std::string text = place.text();
+  return !traces.empty() && text.starts_with(folder) ? text.substr(folder.size()) : text;
+}
+
+json entryOf(const Happening& happening, const std::filesystem::path& traces) {
+  json entry = {{"kind", happening.isDetail ? "debug" : nameOf(happening.kind)},
                 {"time", happening.time},
                 {"text", cut(happening.text, kMostTextBytes)}};
-  if (!happening.place.file.empty()) entry["where"] = happening.place.text();
+  if (!happening.place.file.empty()) entry["where"] = placeText(happening.place, traces);
   if (!happening.why.empty()) entry["why"] = cut(happening.why, kMostTextBytes);
   if (happening.kind == Kind::Expectation) entry["passed"] = happening.passed;
   if (happening.weight == Weight::Warning) entry["weight"] = "warning";
@@ -77,14 +84,16 @@ json entryOf(const Happening& happening) {
 bool isMotion(const Happening& one) { return one.kind == Kind::Event && one.input == "motion"; }
 
 bool isFailure(const Happening& one) {
-  return one.kind == Kind::Error || (one.kind == Kind::Expectation && !one.passed);
+  const bool isKind = one.kind == Kind::Error || one.kind == Kind::Expectation;
+  return isKind && one.weight == Weight::Failure;
 }
 
 /// The entries of each frame; those at 0 came before the first one.
 class Entries {
  public:
-  explicit Entries(const Session& session) : ofFrames(session.frames.size() + 1, json::array()) {
-    for (const Happening& happening : session.happenings) add(happening);
+  explicit Entries(const ReportInput& input)
+      : ofFrames(input.run.session.frames.size() + 1, json::array()), traces(input.traces) {
+    for (const Happening& happening : input.run.session.happenings) add(happening);
   }
 
   json& of(std::size_t frames) { return ofFrames[frames]; }
@@ -99,6 +108,7 @@ class Entries {
  private:
   void add(const Happening& happening) {
     json& list = ofFrames[std::min(happening.frames, ofFrames.size() - 1)];
+    json entry = entryOf(happening, traces);
     // A movement is one line, however many records it has.
     if (isMotion(happening) && !list.empty() && list.back().contains("motions")) {
       json& movement = list.back();
@@ -108,18 +118,19 @@ class Entries {
     }
     const bool repeatsStep = happening.kind == Kind::Expectation && !list.empty() &&
                              list.back()["kind"] == nameOf(Kind::Step) &&
-                             list.back().value("where", "") == happening.place.text();
+                             list.back().value("where", "") == entry.value("where", "");
     if (repeatsStep) list.erase(list.size() - 1);
     if (count >= kMostHappenings && !isFailure(happening)) {
       ++leftOut;
       return;
     }
     ++count;
-    list.push_back(entryOf(happening));
+    list.push_back(std::move(entry));
     if (isMotion(happening)) list.back()["motions"] = 1;
   }
 
   std::vector<json> ofFrames;
+  const std::filesystem::path& traces;
   std::size_t count = 0;
 };
 
@@ -143,7 +154,8 @@ std::string checksText(const Session& session) {
       countOf(session, [](const Happening& one) { return one.kind == Kind::Expectation; });
   const auto failed = countOf(session, [](const Happening& one) { return !one.passed; });
   if (all == 0) return "none";
-  return std::to_string(all - failed) + " passed, " + std::to_string(failed) + " failed";
+  const std::string passed = std::to_string(all - failed) + " passed";
+  return failed == 0 ? passed : passed + ", " + std::to_string(failed) + " failed";
 }
 
 std::string logText(const Session& session) {
@@ -158,7 +170,9 @@ json factsOf(const ReportInput& input) {
   const Session& session = input.run.session;
   const auto isEvent = [](const Happening& one) { return one.kind == Kind::Event; };
   json facts = json::array();
-  const auto add = [&](const char* name, std::string value) { facts.push_back({name, value}); };
+  const auto add = [&](const char* name, const std::string& value) {
+    facts.push_back({name, value});
+  };
   add("Expectations", checksText(session));
   add("Frames", std::to_string(session.frames.size()));
   add("Input events", std::to_string(countOf(session, isEvent)));
@@ -194,11 +208,12 @@ json placeIn(const std::optional<std::size_t>& picture) {
   return picture ? json(*picture) : json(nullptr);
 }
 
-json failuresOf(const PlayedRun& run, Album& album) {
+json failuresOf(const ReportInput& input, Album& album) {
+  const PlayedRun& run = input.run;
   json failures = json::array();
   for (const Happening& happening : run.session.happenings) {
     if (!isFailure(happening)) continue;
-    json failure = entryOf(happening);
+    json failure = entryOf(happening, input.traces);
     const std::size_t frames = std::min(happening.frames, run.session.frames.size());
     if (frames > 0) {
       failure["frame"] = frames - 1;
@@ -314,6 +329,14 @@ json timesOf(const ReportInput& input) {
   return {{"frames", frames}, {"input", events}, {"passed", passed}, {"failed", failed}};
 }
 
+// Of many pictures the thumbnails are small, so that there is room for more of them.
+Album::Bounds boundsFor(std::size_t frames) {
+  constexpr std::size_t kMany = 400;
+  Album::Bounds bounds;
+  if (frames > kMany) bounds.thumbWidth /= 2;
+  return bounds;
+}
+
 json screenOf(const Session& session) {
   return session.start ? json{session.start->width, session.start->height} : json{0, 0};
 }
@@ -322,19 +345,19 @@ json screenOf(const Session& session) {
 
 json reportData(const ReportInput& input) {
   const Session& session = input.run.session;
-  Album album(input.page);
-  Entries entries(session);
+  Album album(input.page, boundsFor(session.frames.size()));
+  Entries entries(input);
   if (endsWithoutFailure(input)) entries.addEnd(session.lastTime, input.judgement);
   json data = {{"verdict", verdictName(input.judgement.verdict)},
                {"headline", input.judgement.headline},
                {"detail", cut(input.judgement.detail, kMostTextBytes)},
-               {"where", input.judgement.place.text()},
+               {"where", placeText(input.judgement.place, input.traces)},
                {"facts", factsOf(input)},
                {"about", aboutOf(input)},
                {"duration", session.lastTime},
                {"screen", screenOf(session)},
                {"times", timesOf(input)}};
-  data["failures"] = failuresOf(input.run, album);
+  data["failures"] = failuresOf(input, album);
   data["comparison"] = comparisonOf(input, album);
   data["before"] = std::move(entries.of(0));
   data["frames"] = framesOf(input.run, entries, album);

@@ -114,7 +114,7 @@ class Tail {
     if (!file.is_open()) return false;
     file.clear();
     bool hasGrown = false;
-    while (file.read(bytes.data(), bytes.size()) || file.gcount() > 0) {
+    while (file.read(bytes.data(), std::ssize(bytes)) || file.gcount() > 0) {
       reader.add({bytes.data(), static_cast<std::size_t>(file.gcount())});
       hasGrown = true;
     }

@@ -17,7 +17,7 @@ fs::path makeNew(const std::string& title) {
   const std::string name = "replay-" + title;
   std::error_code failure;
   for (int number = 1; number < kMost && !failure; ++number) {
-    const fs::path folder = number == 1 ? name : name + "-" + std::to_string(number);
+    fs::path folder = number == 1 ? name : name + "-" + std::to_string(number);
     if (fs::create_directory(folder, failure)) return folder;
   }
   return {};

@@ -92,9 +92,11 @@ void readEvent(const json& line, Happening& event) {
 }
 
 void readLog(const json& line, Happening& log) {
+  constexpr int kDebug = 3;
   constexpr int kWarning = 5;
   log.text = textIn(line, "tag") + ": " + textIn(line, "message");
   const int priority = numberIn(line, "priority");
+  log.isDetail = priority <= kDebug;
   if (priority == kWarning) log.weight = Weight::Warning;
   if (priority > kWarning) log.weight = Weight::Failure;
 }
@@ -114,8 +116,11 @@ void readWorld(const json& line, Happening& world) {
   world.text = textIn(line, "name") + " = " + textIn(line, "value");
 }
 
+// The message names the line once more.
 void readError(const json& line, Happening& error) {
   error.text = textIn(line, "message");
+  const std::string place = error.place.text() + ": ";
+  if (error.text.starts_with(place)) error.text.erase(0, place.size());
   error.weight = Weight::Failure;
 }
 
@@ -142,6 +147,13 @@ constexpr auto kKinds = std::to_array<KindRow>({
     {"blocked", Kind::Blocked, readBlocked},
 });
 
+// A failed expectation is an error of the session, too, and is told once.
+bool repeatsFailure(const Session& session, const Happening& happening) {
+  if (happening.kind != Kind::Error || session.happenings.empty()) return false;
+  const Happening& last = session.happenings.back();
+  return !last.passed && last.place == happening.place;
+}
+
 // False: the kind is not known.
 bool addHappening(const json& line, const std::string& kind, Session& session) {
   const auto* const row = std::ranges::find(kKinds, kind, &KindRow::name);
@@ -152,8 +164,15 @@ bool addHappening(const json& line, const std::string& kind, Session& session) {
   happening.frames = session.frames.size();
   happening.place = {textIn(line, "file"), numberIn(line, "line")};
   row->read(line, happening);
-  session.happenings.push_back(std::move(happening));
+  if (!repeatsFailure(session, happening)) session.happenings.push_back(std::move(happening));
   return true;
+}
+
+// What a session went on after did not make it fail.
+void forgiveErrors(Session& session) {
+  for (Happening& happening : session.happenings) {
+    if (happening.kind == Kind::Error) happening.weight = Weight::Warning;
+  }
 }
 
 bool addObject(const json& line, const std::string& kind, Session& session) {
@@ -164,6 +183,7 @@ bool addObject(const json& line, const std::string& kind, Session& session) {
     session.frames.push_back(frameOf(line));
   } else if (kind == "end") {
     session.end = {timeIn(line, "time"), numberIn(line, "exit"), textIn(line, "reason")};
+    if (session.end->reason == "closed") forgiveErrors(session);
   } else {
     return addHappening(line, kind, session);
   }
@@ -206,7 +226,7 @@ Session readSession(const std::string& path) {
   std::ifstream file(path, std::ios::binary);
   SessionReader reader;
   std::array<char, 1 << 16> bytes{};
-  while (file.read(bytes.data(), bytes.size()) || file.gcount() > 0) {
+  while (file.read(bytes.data(), std::ssize(bytes)) || file.gcount() > 0) {
     reader.add({bytes.data(), static_cast<std::size_t>(file.gcount())});
   }
   reader.finish();

@@ -56,7 +56,8 @@ struct Happening {
   std::string input = {};           // of an event: "down", "motion", ...
   std::optional<Touch> touch = {};  // where a finger was
   Weight weight = Weight::Plain;
-  bool passed = true;  // of an expectation
+  bool isDetail = false;  // of a log line: for developers of the toolkit
+  bool passed = true;     // of an expectation
 };
 
 struct SessionEnd {

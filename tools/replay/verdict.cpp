@@ -81,11 +81,11 @@ Judgement judgeEarlyExit(const Session& session, int code) {
 }
 
 // It came to a session's end.
-Judgement judgeFailure(const Session& session, const SessionEnd& end, int code) {
+Judgement judgeFailure(const Session& session, const SessionEnd& sessionEnd, int code) {
   const Happening* const error =
       findLast(session, [](const Happening& one) { return one.kind == Kind::Error; });
   const Happening* const expectation = firstFailed(session);
-  if (end.reason == "error" || code == kTraceRefused) {
+  if (sessionEnd.reason == "error" || code == kTraceRefused) {
     const bool isTrace = error != nullptr && !error->place.file.empty();
     return {isTrace || code == kTraceRefused ? Verdict::Unusable : Verdict::Failed,
             isTrace ? "The trace cannot be played." : "The session failed.",
@@ -96,7 +96,9 @@ Judgement judgeFailure(const Session& session, const SessionEnd& end, int code) 
             expectation->place};
   }
   if (error != nullptr) {
-    return {Verdict::Failed, "The session failed.", error->text, error->place};
+    const auto end = std::min(error->text.find('\n'), error->text.size());
+    return {Verdict::Failed, "A step failed: " + error->text.substr(0, end),
+            error->text.substr(end + (end < error->text.size() ? 1 : 0)), error->place};
   }
   return {Verdict::Failed, "The application failed, with exit code " + std::to_string(code) + "."};
 }

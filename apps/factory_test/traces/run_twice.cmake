@@ -1,0 +1,28 @@
+# Plays a run twice: the same frames, and the same results, byte for byte; then resumes it.
+# cmake -DREPLAY=<program> -DAPP=<program> -DTRACE=<file> -DFOLDER=<folder> -DSIZE=<w>x<h> -P run_twice.cmake
+file(MAKE_DIRECTORY "${FOLDER}")
+set(other)
+foreach(run first second)
+  file(REMOVE "${FOLDER}/${run}.json")
+  execute_process(
+    COMMAND "${REPLAY}" --dir "${FOLDER}/${run}" --screen ${SIZE} ${other} "${TRACE}" -- "${APP}"
+            --results "${FOLDER}/${run}.json" --junit "${FOLDER}/${run}.xml" --shell "sleep 9" COMMAND_ERROR_IS_FATAL ANY)
+  set(other --against "${FOLDER}/first")
+endforeach()
+foreach(kind json xml)
+  file(READ "${FOLDER}/first.${kind}" first)
+  file(READ "${FOLDER}/second.${kind}" second)
+  if(NOT first STREQUAL second)
+    message(FATAL_ERROR "the results differ:\n${first}\n${second}")
+  endif()
+endforeach()
+file(READ "${FOLDER}/first.json" results)
+string(REGEX MATCHALL "\"verdict\": \"(PASS|FAIL)\"" verdicts "${results}")
+list(LENGTH verdicts count)
+if(NOT count EQUAL 19)
+  message(FATAL_ERROR "${count} verdicts, 19 were given")
+endif()
+get_filename_component(traces "${TRACE}" DIRECTORY)
+execute_process(
+  COMMAND "${REPLAY}" --dir "${FOLDER}/resumed" --screen ${SIZE} "${traces}/resumed.trace" -- "${APP}"
+          --results "${FOLDER}/first.json" COMMAND_ERROR_IS_FATAL ANY)

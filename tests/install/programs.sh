@@ -1,0 +1,26 @@
+# Manual pages and completion name every option that a program's help prints; the desktop file is valid.
+. "$SOURCE/tests/install/common.sh"
+
+for program in "$staged"/bin/*; do
+  name=$(basename "$program")
+  options=$("$program" --help | grep -oE '^  --[a-z-]+' | sort -u)
+  [[ $options == *--help* ]] || fail "$name --help prints no options."
+
+  page=$(gzip -dc "$staged/share/man/man1/$name.1.gz" | sed 's/\\-/-/g')
+  for option in $options; do
+    grep -qE -- "$option( |\$|\")" <<<"$page" || fail "$name(1) does not name $option."
+  done
+
+  offered=$(
+    . "$staged/share/bash-completion/completions/$name"
+    complete -p "$name" >/dev/null
+    COMP_WORDS=("$program" --)
+    COMP_CWORD=1
+    _brimol_options "$program"
+    printf '  %s\n' "${COMPREPLY[@]}" | sort -u
+  )
+  diff <(echo "$options") <(echo "$offered") || fail "The completion of $name offers other options."
+done
+
+desktop-file-validate "$staged/share/applications/factory_test.desktop"
+"$staged/bin/factory_test" --headless --shot "$WORK/menu.png"
