@@ -23,11 +23,11 @@ class MW_API Button3 : public PushButton {
   };
 
   /// Captioned by its position: kBottomLeft "PASS", kBottomCentre "RETRY", any other "FAIL". The
-  /// caption's colour, alignment and size are 0 until they are set, so that it cannot be seen.
+  /// caption is left-aligned, and invisible until setTextColor() and setFontSize() are called.
   explicit Button3(int position);
   /// Copies the captions. A null one is left out.
   Button3(int position, const SKIA_Text* first);
-  /// `bottom`: pixels that stay free below the bottom row.
+  /// `bottom`: pixels that stay free below the bottom row, in addition to the usual gap.
   Button3(int position, const SKIA_Text* first, int bottom);
   Button3(int position, const SKIA_Text* first, const SKIA_Text* second, int bottom);
   ~Button3() override;
@@ -48,8 +48,8 @@ class MW_API Button3 : public PushButton {
   /// Places it anew on the present screen, in its normal colour. The rectangle is not read.
   void setRect(int position, const SKIA_Rect* unused) override;
 
-  /// What the constructors do: lays it out inactive, clears its callbacks, and registers it once
-  /// more.
+  /// Already called by the constructors. Calling it again lays it out anew, inactive and without
+  /// callbacks, and registers it a second time.
   void init(int position, const SKIA_Text* first, const SKIA_Text* second, int bottom);
 
  protected:

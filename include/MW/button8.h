@@ -7,8 +7,9 @@
 
 namespace MW {
 
-/// Up to eight square cells in a rectangle, each of which its own finger can hold. A cell is a
-/// round box with a "*", red while it is held. The rectangle itself is not drawn.
+/// Up to eight square cells in a rectangle, each of which can be held by a different finger. A
+/// cell is a box with rounded corners and a "*", red while it is held. The rectangle itself is not
+/// drawn.
 ///
 /// A pad enters the base layer when it is constructed, inactive, and stays there until it is
 /// deleted or unregistered. Handlers run on the dispatch thread. A cell is free again when any
@@ -16,8 +17,8 @@ namespace MW {
 /// rectangle are taken, in a cell or not; motions and long presses are not.
 ///
 /// Callbacks, functions of one mouse_event* that is valid for the call: `pressCallback` and
-/// `clickCallback` (released). The record is a copy of the event's whose `state` is the sum of the
-/// held cells' values: 1 for the first cell, 2 for the second, 4 for the third and so on.
+/// `clickCallback` (released). The record is a copy of the event's whose `state` is a bit mask of
+/// the held cells: bit 0 for the first cell, bit 1 for the second and so on.
 class MW_API Button8 : public ButtonFace {
  public:
   static constexpr int kCells = 8;
@@ -51,12 +52,12 @@ class MW_API Button8 : public ButtonFace {
   void setRect(int layout, const SKIA_Rect* newRect) override;
   /// Sets the colour of free cells.
   void setBgColor(unsigned int color) override;
-  /// Keep the colour and the width in pixels of a frame that is not drawn.
+  /// Store the colour and width, in pixels, of a frame that is never drawn.
   void setBdColor(unsigned int color) override;
   void setBdWidth(int pixels);
-  /// Takes the rows and columns of a layout number; setRect() lays cells out by them.
+  /// Sets the rows and columns to those of a layout; the cells follow at the next setRect().
   void getRowCol(int layout);
-  /// The cell that the event's point lies in, on none of its edges; kCells: none.
+  /// The first cell that contains the event's point, or kCells. A point on an edge is outside.
   int getButtonSelect(const event_data* event) const;
 
  protected:

@@ -17,7 +17,7 @@ namespace MW {
 /// `doubleClickCallback` is set.
 class MW_API ButtonS : public StyledButton {
  public:
-  /// A bit of the style; alone, it draws a text box.
+  /// A bit of the style. On its own it is a style too: a text box that passes events on.
   enum StyleBit { kPassOn = 2 };
 
   /// Copies both records. The style is kButtonBox. Null records are all zero or empty.

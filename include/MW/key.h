@@ -6,7 +6,7 @@
 
 namespace MW {
 
-/// Draws nothing, and tells the application about every event that it is offered.
+/// Draws nothing, and tells the application about keys, touches, long presses and plugs.
 ///
 /// It enters the base layer when it is constructed, active, and stays there until it is deleted or
 /// unregistered. Keys, long presses, user and application events are taken; touch press, release
@@ -14,7 +14,7 @@ namespace MW {
 ///
 /// It may be offered events before the application has set its callbacks, and while it sets them: a
 /// callback word may be assigned on any thread, and an event finds either the old function or the
-/// new one. An event that comes before is not told.
+/// new one. An event that arrives before its callback is set is lost.
 ///
 /// Callbacks. Of one kbd_event*: `keyPressCallback`; `keyReleaseCallback`; `doubleKeyCallback` and
 /// `tripleKeyCallback`, the second and the third release of one key, each within 1000 ms of the one
@@ -24,8 +24,8 @@ namespace MW {
 ///
 /// Plug events (user events) of the codes 2, 17 and 18 are held back for 100 ms, so that a plug
 /// that bounces is told once it has settled: 17 and 18 are then told as 2. Another code is told at
-/// once if the last one of these three was 2 or was told as 2; a 2 that is still held is then not
-/// told any more. Before the first of the three, and while 17 or 18 is held, another code is
+/// once if the last one of these three was 2 or was told as 2; a 2 that is still held is then
+/// dropped. Before the first of the three, and while 17 or 18 is held, another code is
 /// dropped. Nothing is held while `plugCallback` is null.
 class MW_API Key : public Widget {
  public:

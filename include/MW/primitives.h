@@ -19,7 +19,7 @@ class MW_API TextPrimitive : public Widget {
   SKIA_Rect* getPositionAndSize() override;
   void setFontSize(int pixels) override;
   void setTextAlign(int align) override;
-  /// The fill, which a label keeps though it draws none. getBgColor() stays 0.
+  /// Sets the fill colour; a label stores it but draws no fill. getBgColor() always returns 0.
   void setBgColor(unsigned int color) override;
 
  protected:
@@ -31,7 +31,7 @@ class MW_API Label : public TextPrimitive {
  public:
   /// The text's length is taken from its NUL, not from `string_len`.
   Label(const SKIA_Rect* area, const SKIA_Text* caption);
-  /// The handle that the platform gave to the item.
+  /// Draws it. Returns the platform's handle of the item.
   int show() override;
   int show(unsigned int ticks) override;
   /// Replaces the text's first bytes and its length and writes no NUL behind them: the platform
@@ -45,7 +45,7 @@ class MW_API Textbox : public TextPrimitive {
  public:
   /// The text's length is taken from its NUL, not from `string_len`.
   Textbox(const SKIA_Rect* area, const SKIA_Text* caption);
-  /// The handle that the platform gave to the item.
+  /// Draws it. Returns the platform's handle of the item.
   int show() override;
   int show(unsigned int ticks) override;
   void setText(const char* newText) override;
@@ -56,9 +56,9 @@ class MW_API Textbox : public TextPrimitive {
 class MW_API Image : public Widget {
  public:
   /// Takes `string_len` bytes of the text, and none of the record's other fields. A negative length
-  /// is 0; a text of a length over 127 ends at its NUL.
+  /// is 0; with a length over 127 the text ends at its NUL, or after 127 bytes.
   Image(const SKIA_Rect* area, const SKIA_Text* name);
-  /// The handle that the platform gave to the item, a label.
+  /// Draws it. Returns the platform's handle of the item. The drawing call is that of a label.
   int show() override;
   int show(unsigned int ticks) override;
   char* getText() override;
@@ -72,11 +72,11 @@ class MW_API Image : public Widget {
 class MW_API Box : public Widget {
  public:
   explicit Box(const SKIA_Rect* area);
-  /// The handle that the platform gave to the item.
+  /// Draws it. Returns the platform's handle of the item.
   int show() override;
   int show(unsigned int ticks) override;
   SKIA_Rect* getPositionAndSize() override;
-  /// The fill. getBgColor() stays 0.
+  /// Sets the fill colour. getBgColor() always returns 0.
   void setBgColor(unsigned int color) override;
   int add_MWWList() override;
 };
@@ -85,11 +85,12 @@ class MW_API Box : public Widget {
 class MW_API Line : public Widget {
  public:
   explicit Line(const SKIA_Point* line);
-  /// The handle that the platform gave to the item.
+  /// Draws it. Returns the platform's handle of the item.
   int show() override;
   int show(unsigned int ticks) override;
   /// The line's extent and colour. The rectangle starts at the larger x and y, and its width and
-  /// height are zero or negative: it contains no point, so compute a hit test from `x + w` to `x`.
+  /// height are zero or negative: it contains no point. For a hit test use (x + w, y + h) as the
+  /// top left corner and (x, y) as the bottom right one.
   SKIA_Rect* getPositionAndSize() override;
   void setLnColor(unsigned int color) override;
   int add_MWWList() override;

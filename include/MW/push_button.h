@@ -7,8 +7,8 @@
 
 namespace MW {
 
-/// A face that a finger presses. While it is held it has the colour kColorHighlight, where its
-/// class does not say otherwise. Button, Button3, ButtonS and ButtonNew say what stands on it and
+/// A face that a finger presses. While it is held it has the colour kColorHighlight, unless
+/// its class says otherwise. Button, Button3, ButtonS and ButtonNew say what stands on it and
 /// where; this class is not used by itself.
 ///
 /// A button enters the base layer when it is constructed, inactive, and stays there until it is
@@ -19,9 +19,9 @@ namespace MW {
 /// press of the button, and the first release of any finger ends the hold.
 ///
 /// Callbacks, each a function of one int that is called with 0 on the dispatch thread:
-/// `pressCallback`; `clickCallback`, a release inside, also one whose press was elsewhere;
-/// `longPressCallback`, which also ends the hold; `doubleClickCallback`, the second of two clicks
-/// with each step under 500 ms.
+/// `pressCallback`; `clickCallback`, a release inside, even if the press was elsewhere;
+/// `longPressCallback`, which also ends the hold; `doubleClickCallback`, the second of two clicks,
+/// the first released within 500 ms of its press, the second within 500 ms of the first.
 class MW_API PushButton : public ButtonFace {
  public:
   using Widget::show;
@@ -32,8 +32,8 @@ class MW_API PushButton : public ButtonFace {
   /// Makes it inactive and free, in its normal colour. Does not ask for a redraw. Returns 1.
   int hide() override;
   bool onRecvEvent(event_data* event, unsigned int arg) override;
-  /// Makes it active now. It is seen, and takes touches, from the first drawing pass after `ms`
-  /// milliseconds on.
+  /// Makes it active now. It appears, and takes touches, from the first drawing pass at least `ms`
+  /// milliseconds from now.
   void onShowTimer(int ms) override;
   void onPress(event_data* event) override;
   void onRelease(event_data* event) override;

@@ -82,6 +82,7 @@ static_assert(sizeof(event_data) == 28 && offsetof(event_data, type) == 0 &&
 inline constexpr uint32_t kColorBlack = 0xFF000000;
 inline constexpr uint32_t kColorWhite = 0xFFFFFFFF;
 inline constexpr uint32_t kColorGrey = 0xFFBFBFBF;
+inline constexpr uint32_t kColorDarkGrey = 0xFF4F4F4F;
 inline constexpr uint32_t kColorRed = 0xFFFF0000;
 inline constexpr uint32_t kColorBlue = 0xFF0000FF;
 inline constexpr uint32_t kColorGreen = 0xFF00FF00;

@@ -14,8 +14,9 @@ namespace MW {
 /// Callbacks: `pressCallback`, `hoverCallback`, `longPressCallback` and `clickCallback` (a release,
 /// wherever it is), each a function of one mouse_event* that is valid for the call; and
 /// `doubleClickCallback`, a function of one int that is called with 0: the second of two taps, each
-/// released within 25 pixels of its press, with each step under 500 ms. A tap that starts less than
-/// 50 pixels from an edge of the screen does not count.
+/// released inside the square of 50 x 50 pixels around its press, the first within 500 ms of its
+/// press, the second within 500 ms of the first. A tap that starts less than 50 pixels from an edge
+/// of the screen does not count.
 ///
 /// With kPassOn in its variant it reports its events and passes them on. While a finger holds it,
 /// each event then reaches it twice, once as a selected widget and once as an active one: it
@@ -41,22 +42,23 @@ class MW_API Screen : public Widget {
   void onPress(event_data* event) override;
   void onRelease(event_data* event) override;
   void onPressLong(event_data* event) override;
-  /// Puts the square in which a tap must end around the point at `center`'s corner. There is none
-  /// with kNoSquare, and near an edge of the screen. Null: no change.
+  /// Centres the square in which a tap must end on (`center->x`, `center->y`). With kNoSquare, or
+  /// less than 50 pixels from an edge of the screen, there is no square. Null: no change.
   void setRect(int mode, const SKIA_Rect* center) override;
   void onTouchClickCount() override;
 
  protected:
   int screenW = 0;  // pixels
   int screenH = 0;
-  DoubleTap clicks;  // dispatch thread, and so is `rect`, the square
+  // `clicks` and `rect` (the square) are used on the dispatch thread only.
+  DoubleTap clicks;
 };
 
 /// Fills the screen with one colour, to look for faults of the display.
 ///
 /// It enters the top layer when it is constructed, inactive, and stays there until it is deleted or
-/// unregistered. While it is active no event reaches the base layer, though it acts on none: what
-/// ends it stands in the top layer, too, or does not wait for input.
+/// unregistered. While it is active it ignores all events, yet none reaches the base layer. End it
+/// from another widget of the top layer, or without input, by a timer.
 class MW_API FullScreen : public Widget {
  public:
   /// What it is filled with; any other number is grey as well.
@@ -70,7 +72,7 @@ class MW_API FullScreen : public Widget {
   int show(unsigned int ticks) override;
   /// Makes it inactive, and remembers the panel as on. Returns 1.
   int hide() override;
-  /// Remembers whether the panel is on, for a derived class. It draws the same on either.
+  /// Remembers whether the panel is on, for a derived class. It looks the same either way.
   void lcdOn(int on) override;
   using Widget::setRect;
   /// Fills the present screen with the colour of that number.

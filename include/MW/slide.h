@@ -17,8 +17,9 @@ namespace MW {
 ///
 /// Callbacks: `leftCallback` and `rightCallback`, functions of one int that are called with 0 once
 /// `state` has changed; `doubleClickCallback` (the double tap), a function of one mouse_event* that
-/// is valid for the call and whose `state` is 1: two taps on the knob of a locked switch, each step
-/// under 500 ms. A locked switch shows its knob alone, dimmed, and does not move.
+/// is valid for the call and whose `state` is 1: two taps on the knob of a locked switch, the first
+/// released within 500 ms of its press, the second within 500 ms of the first. A locked switch
+/// shows its knob alone, dimmed, and does not move.
 class MW_API Slide : public Widget {
  public:
   /// A full-travel switch changes when the knob reaches the far end, a half-travel one when the
@@ -55,8 +56,8 @@ class MW_API Slide : public Widget {
   void onHover(mouse_event mouse);
   void onTouchClickCount(mouse_event mouse);
 
-  /// A State. Dragging changes it on the dispatch thread; a callback may read and set it. Another
-  /// thread reads and sets it through std::atomic_ref, as the switch itself does.
+  /// A State. Dragging changes it on the dispatch thread, where a callback may read it plainly.
+  /// Every write after setActive(1), and a read on another thread, goes through std::atomic_ref.
   int state;
 
  protected:

@@ -8,8 +8,8 @@
 
 namespace MW {
 
-/// A bar with a square knob marked "EXIT" at one end and a caption beside it. Dragging the knob to
-/// the very other end asks to exit.
+/// A bar with a square knob marked "EXIT" at one end and a caption beside it. Dragging the knob
+/// all the way to the other end asks to exit.
 ///
 /// It enters the base layer when it is constructed, inactive, and stays there until it is deleted
 /// or unregistered; setActive() alone shows and hides it. A finger that presses the knob drags it.
@@ -47,13 +47,13 @@ class MW_API SlideE : public Widget {
   void onRelease(mouse_event mouse);
   /// Drags the knob by the event's relative motion.
   void onHover(mouse_event mouse);
-  /// What the constructors do: lays it out inactive, clears the slide callbacks, and registers it
-  /// once more.
+  /// Already called by the constructors. Calling it again lays it out anew, inactive and without
+  /// slide callbacks, and registers it a second time.
   void SlideE_init(int startState, const SKIA_Rect* area, const SKIA_Text* caption,
                    const char* unused);
 
-  /// A State. Dragging does not change it. It is set before the slide is active, or through
-  /// std::atomic_ref, as the slide itself reads it.
+  /// A State. Dragging does not change it. Set it before the slide becomes active; later, only
+  /// through std::atomic_ref.
   int state;
 
  protected:

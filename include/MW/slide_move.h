@@ -9,8 +9,8 @@ namespace MW {
 /// A bar whose knob a finger drags to choose a number; what lies left of the knob is red. It has no
 /// callbacks: the application asks getValue().
 ///
-/// It is a control for percentages: a place of 99.9 or more reads as 100, whatever the range. Give
-/// it no maximum above 100.
+/// It is a control for percentages: a knob position worth 99.9 or more gives the value 100,
+/// whatever the range. Give it no maximum above 100.
 ///
 /// It enters the base layer when it is constructed, inactive, and stays there until it is deleted
 /// or unregistered; setActive() alone shows and hides it. A finger that presses the knob drags it.
@@ -18,13 +18,14 @@ namespace MW {
 /// on the dispatch thread; any thread may call getValue() and setValue().
 class MW_API SlideMove : public Widget {
  public:
-  /// A knob's width that stands for 20 per cent and for the value written on the knob.
+  /// As a knob's width: 20 per cent, with the value written on the knob.
   enum KnobWidth { kValueKnob = 0 };
 
   /// Copies `area`; null is all zero. `percent`: the knob's width in hundredths of the bar's, at
   /// most 50, or kValueKnob. `a` and `b` bound the value, in either order; equal ones stand for 0
-  /// to 1. `initial` becomes `b` unless it is less than `b`, and else `a` unless it is more than
-  /// `a`: give the lower bound first, and two different ones, or the knob may start beside the bar.
+  /// to 1. The value starts at `b` if `initial` is `b` or more, else at `a` if it is `a` or less,
+  /// else at `initial`. Give two different bounds, the lower one first, or the knob may start off
+  /// the bar.
   SlideMove(const SKIA_Rect* area, int percent, int a, int b, int initial);
   ~SlideMove() override;
 
@@ -35,7 +36,7 @@ class MW_API SlideMove : public Widget {
   bool onRecvEvent(event_data* event, unsigned int arg) override;
   void onPress(event_data* event) override;
   void onRelease(event_data* event) override;
-  /// Are remembered, for a derived class. A locked slider can still be dragged.
+  /// Set `locked`, which only a derived class reads: a locked slider can still be dragged.
   void Lock() override;
   void unLock() override;
 
@@ -49,8 +50,8 @@ class MW_API SlideMove : public Widget {
   /// nothing, and the next drawing pass lays both out by the knob again. Null: no change.
   void setRect_Slide(const SKIA_Rect* knob);
   int getValue() const;
-  /// Takes any number, read as an int, and moves the knob there: beside the bar for one out of
-  /// range, and to its start while the bar leaves the knob no room to move.
+  /// Sets the value without clamping it (read as an int) and moves the knob there: off the bar if
+  /// out of range, to its left end if the knob has no room to move.
   void setValue(unsigned int newValue);
   /// Sets the value that belongs to the knob's distance from the bar's left end, in pixels. The
   /// value stays while the bar leaves the knob no room to move.
@@ -62,7 +63,7 @@ class MW_API SlideMove : public Widget {
  protected:
   std::atomic<int> locked = 0;
   KnobHold knobHold{hold, ownerFinger};
-  int minValue;  // these four stay after construction
+  int minValue;  // these four never change after construction
   int maxValue;
   int knobPercent;
   int showValue;  // 1: the value stands on the knob

@@ -1,4 +1,4 @@
-/// What the push buttons have in common that do not light up.
+/// What push buttons that do not light up have in common.
 #pragma once
 
 #include <MW/push_button.h>

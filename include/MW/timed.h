@@ -11,13 +11,13 @@ namespace MW {
 /// It enters the base layer when it is constructed and leaves it when it is deleted. It is inactive
 /// until onHideTimer(). Made active in any other way, it goes away in the next drawing pass.
 ///
-/// show() without ticks draws nothing: only the time tells whether the box is still to be seen.
+/// An odd height is rounded down to an even one. show() without ticks draws nothing: only the time
+/// tells whether the box is still to be seen.
 class MW_API Toastbox : public Widget {
  public:
   /// One line, on a box of `area`'s colour. Copies the records. Null records are all zero or empty.
   Toastbox(const SKIA_Rect* area, const SKIA_Text* line);
-  /// Two lines, each in half of the box. An odd height loses its last pixel, so that both halves
-  /// are alike.
+  /// Two lines, each in half of the box.
   Toastbox(const SKIA_Rect* area, const SKIA_Text* line, const SKIA_Text* message);
   ~Toastbox() override;
 
@@ -36,7 +36,8 @@ class MW_API Toastbox : public Widget {
   /// change.
   void setRect(int lineCount, const SKIA_Rect* newRect) override;
 
-  /// What the constructors do: lays it out inactive, and registers it.
+  /// Already called by the constructors. Calling it again lays it out anew, inactive, and registers
+  /// it a second time.
   void init(const SKIA_Rect* area, const SKIA_Text* line, const SKIA_Text* message);
 
  protected:

@@ -80,7 +80,7 @@ Button8::Button8(int layout, const SKIA_Rect* area, const SKIA_Text* caption)
   SKIA_Text mark = {{}, 0, kColorBlue, SKIA_ALIGN_CENTRE, kMarkSize};
   putText(mark, "*");
   cellText.fill(mark);
-  Button8::setRect(layout, area);
+  Button8::setRect(layout, &rect);
   buttonType = layout;
   point.width = kFrameWidth;
   enterWindow(1);

@@ -13,7 +13,6 @@ namespace MW {
 namespace {
 
 constexpr ClassLog kLog("SLIDE");
-constexpr uint32_t kKnobColor = 0xFF4F4F4F;
 constexpr int kDefaultKnobPercent = 20;
 constexpr int kMostKnobPercent = 50;
 constexpr int kInnerFrame = 1;  // pixels around the knob
@@ -139,7 +138,7 @@ void SlideMove::layOut(const SKIA_Rect& area) {
   const int64_t width = percentOf(track.w, knobPercent);
   travel = toPixels(track.w - width);
   const int64_t knobX = int64_t{track.x} + distanceOf(value);
-  rect = makeRect(knobX, track.y, width, track.h, kKnobColor);
+  rect = makeRect(knobX, track.y, width, track.h, kColorDarkGrey);
   frameInner = grown(rect, kInnerFrame, kColorWhite);
   frameOuter = grown(rect, kOuterFrame, kColorBlack);
   fillUpTo(rect.x);

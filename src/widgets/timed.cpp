@@ -14,7 +14,6 @@ namespace {
 constexpr ClassLog kToastLog("TOASTBOX");
 constexpr ClassLog kBarLog("PROGRESSBAR");
 constexpr int kTwoLines = 2;
-constexpr uint32_t kBarFrameColor = 0xFF4F4F4F;
 constexpr int64_t kBarMargin = 2;  // pixels
 constexpr uint32_t kMostStars = 10;
 }  // namespace
@@ -143,7 +142,7 @@ void Progressbar::setRect(int, const SKIA_Rect* newRect) {
   const SKIA_Rect& to = *newRect;
   const int64_t height = 2 * int64_t{to.h};
   const std::lock_guard guard(stateLock);
-  frameRect = makeRect(to.x, to.y, int64_t{to.w} - 2 * kBarMargin, height, kBarFrameColor);
+  frameRect = makeRect(to.x, to.y, int64_t{to.w} - 2 * kBarMargin, height, kColorDarkGrey);
   barRect = makeRect(int64_t{to.x} + kBarMargin, int64_t{to.y} + kBarMargin, barRect.w,
                      height - 2 * kBarMargin, to.color);
   textRect = {to.x, to.y, to.w, to.h, 0};

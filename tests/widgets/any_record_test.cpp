@@ -38,6 +38,11 @@ Made make(Arguments... arguments) {
 int bottomOf(Area area) { return area != nullptr ? area->y : 0; }
 
 const std::vector<Kind> kKinds = {
+    {"Label", make<MW::Label>, 1},
+    {"Textbox", make<MW::Textbox>, 1},
+    {"Image", make<MW::Image>, 1},
+    {"Box", [](Area a, Text) { return make<MW::Box>(a); }, 0},
+    {"Line", [](Area, Text) { return make<MW::Line>(nullptr); }, 0},
     {"Button", make<MW::Button>, 1},
     {"Button3", [](Area a, Text t) { return make<MW::Button3>(5, t, t, bottomOf(a)); }, 2},
     {"ButtonS", make<MW::ButtonS>, 1},
@@ -92,6 +97,7 @@ TEST_P(AnyRecord, IsDrawnCutAndTouchedOnAnyScreen) {
 TEST_P(AnyRecord, WithoutRecordsItIsShownWithoutATimeAsAtZero) {
   const Made made = GetParam().make(nullptr, nullptr);
   made->setRect(0, nullptr);
+  made->setText(nullptr);
   EXPECT_FALSE(made->onRecvEvent(nullptr, 0));
   made->show();
   const std::vector<Drawing> untimed = platform().takeDrawings();

@@ -11,8 +11,6 @@ using MW::Widget;
 constexpr SKIA_Rect kArea = {100, 200, 300, 80, 0xFF202020};
 const SKIA_Text kCaption = textRecord("Start", 0xFFFFFFFF, 5, 48);
 const PlaysOn kButton = {makes<MW::Button, Told::Zero>(&kArea, &kCaption)};
-const PlaysOn kNoDoubleClick = {without(&Widget::doubleClickCallback, kButton.make)};
-const PlaysOn kNoLongPress = {without(&Widget::longPressCallback, kButton.make)};
 
 Step face() {
   return look([](Widget& button) {
@@ -24,13 +22,10 @@ Step face() {
 const std::vector<Play> kPlays = {
     kButton("IsClickedByAReleaseInside", {press(100, 279), face(), release(), face(), lookAtLog()},
             "press+ <1 lit> click+ <0 plain> <[BUTTON] released!!>"),
-    kButton(
-        "IsNotClickedByAReleaseOutside",
-        {press(100, 279), moveTo(399, 279), face(), moveTo(400, 279), face(), release(), face()},
-        "press+ + <1 lit> + <1 plain> + <0 plain>"),
-    kButton("StaysPlainWhenTheFingerComesBack",
-            {press(100, 279), moveTo(400, 240), moveTo(100, 200), face(), release()},
-            "press+ + + <1 plain> click+"),
+    kButton("StaysPlainWhenTheFingerComesBackAndIsNotClickedOutside",
+            {press(100, 279), moveTo(399, 279), face(), moveTo(400, 279), moveTo(100, 200), face(),
+             release(400, 279), face()},
+            "press+ + <1 lit> + + <1 plain> + <0 plain>"),
     kButton("IgnoresWhatBeginsOutsideButAReleaseInside",
             {press(99, 240), longPress(), release(), moveTo(100, 279), release()},
             "- - - - click+"),
@@ -41,15 +36,16 @@ const std::vector<Play> kPlays = {
     kButton("IsReleasedByALongPress",
             {press(100, 279), longPress(), lookAtLog(), face(), moveTo(101, 279), lookAtRedraw()},
             "press+ long+ <[BUTTON] long pressed!!> <0 plain> - <still>"),
-    kNoLongPress("StaysHeldWithoutALongPressCallback",
-                 {press(100, 279), longPress(400, 240), face(), keyDown(5), release(100, 279)},
-                 "press+ + <1 lit> - click+"),
-    kNoDoubleClick("CountsClicksWhileADoubleClickIsWanted",
-                   {press(100, 279), release(), call([](Widget& button) {
-                      button.doubleClickCallback = [](int) { note("double"); };
-                    }),
-                    press(), release(), press(), release(), press(), release()},
-                   "press+ click+ press+ click+ press+ click double+ press+ click+"),
+    PlaysOn{without(&Widget::longPressCallback, kButton.make)}(
+        "StaysHeldWithoutALongPressCallback",
+        {press(100, 279), longPress(400, 240), face(), keyDown(5), release(100, 279)},
+        "press+ + <1 lit> - click+"),
+    PlaysOn{without(&Widget::doubleClickCallback, kButton.make)}(
+        "CountsClicksWhileADoubleClickIsWanted",
+        {press(100, 279), release(),
+         call([](Widget& button) { button.doubleClickCallback = [](int) { note("double"); }; }),
+         press(), release(), press(), release(), press(), release()},
+        "press+ click+ press+ click+ press+ click double+ press+ click+"),
     kButton("IsFreedByHiding", {press(100, 279), call(&Widget::hide), face(), moveTo(101, 279)},
             "press+ <0 plain> -"),
     kButton("AsksForARedrawWhenItsColourComesBack",
@@ -61,6 +57,8 @@ const std::vector<Play> kPlays = {
              lookAtRedraw(), later(249), timer(), lookAtRedraw(), lookAtDrawings(), later(1),
              press(100, 279), timer(), lookAtRedraw(), lookAtDrawings(), press()},
             "<1> <redraw> <still> <0> - <redraw> <1> press+"),
+    kButton("IsSeenAtOnceWhereItsDelayReachesBehindTheWrap",
+            {at(~15U), call(&Widget::onShowTimer, 250), lookAtDrawings()}, "<1>"),
 };
 TEST_P(ButtonPlays, TellTheirJournal) { expectJournal(GetParam()); }
 INSTANTIATE_TEST_SUITE_P(, ButtonPlays, testing::ValuesIn(kPlays), kRowName);

@@ -22,7 +22,7 @@ static_assert(draws(startedAt(1000, 250), {1249, 1250, 0}) == 11);
 static_assert(!startedAt(1000, 250).isDue(1249) && startedAt(1000, 250).isDue(1250));
 static_assert(startedAt(1000, 250).isPending() && !MW::DelayedShow().isDue(9));
 
-// A due time behind the clock's wrap is reached at once.
+// A due time beyond the wrap of the clock counts as reached.
 static_assert(startedAt(~15U, 250).isDue(~15U));
 
 }  // namespace

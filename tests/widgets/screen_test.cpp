@@ -1,7 +1,5 @@
 #include <MW/screen.h>
 
-#include <climits>
-
 #include "support/play.h"
 
 namespace {
@@ -27,9 +25,6 @@ const std::vector<Play> kPlays = {
             {press(500, 500), release(475, 524), press(60, 2500), release(), press(), release(),
              lookAtLog()},
             "press+ click+ press+ click double+ press+ click+ <[BUTTON] onTouchClickCount!! 3>"),
-    kScreen("ALateTapStartsAnew",
-            {press(500, 500), release(), press(), later(500), release(), press(), release()},
-            "press+ click+ press+ click+ press+ click+"),
     kScreen("HidingLeavesItHeld",
             {press(500, 500), call(&MW::Widget::hide), look(&MW::Widget::isActive), lookAtHold()},
             "press+ <0> <held 1>"),
@@ -47,14 +42,6 @@ TEST_F(ScreenTest, CountsNoTapBesideItsSquare) {
                                  {{500, 500}, {500, 525}}}) {
     const Steps steps = {press(700, 700), release(), press(from.x, from.y), release(to.x, to.y)};
     EXPECT_EQ(played(kScreen.make, steps), "press+ click+ press+ click+");
-  }
-}
-
-TEST_F(ScreenTest, AnyOtherNumberFillsTheScreenWithGrey) {
-  MW::FullScreen fill(MW::FullScreen::kBlue);
-  for (const int number : {static_cast<int>(MW::FullScreen::kGrey), -1, INT_MIN}) {
-    fill.setRect(number);
-    EXPECT_EQ(shown(fill).front().rect, (SKIA_Rect{0, 0, 1441, 2561, MW::kColorGrey}));
   }
 }
 

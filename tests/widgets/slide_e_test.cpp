@@ -15,7 +15,6 @@ const SKIA_Text* const kNoText = nullptr;
 
 PlaysOn from(int state) { return {makes<SlideE>(state, &kBar, kNoText, nullptr)}; }
 const PlaysOn kLeft = from(SlideE::kFromLeft);
-const PlaysOn kRight = from(SlideE::kFromRight);
 
 Step knob() {
   return look<SlideE>([](SlideE& slide) {
@@ -28,9 +27,10 @@ Step knob() {
 const std::vector<Play> kPlays = {
     kLeft("ExitsAtTheRight", {press(99, 99), drag(499, 0), knob(), drag(1, 0), knob()},
           "+ + <0 at 499 held> exit+ <0 at 0>"),
-    kRight("ExitsAtTheLeft",
-           {press(500, 0), drag(-499, 0), drag(9, 0), drag(-10, 0), knob(), drag(600, 0)},
-           "+ + + exit+ <1 at 500> -"),
+    from(SlideE::kFromRight)(
+        "ExitsAtTheLeft",
+        {press(500, 0), drag(-499, 0), drag(9, 0), drag(-10, 0), knob(), drag(600, 0)},
+        "+ + + exit+ <1 at 500> -"),
     from(2)("SnapsBackWhenItIsReleased",
             {press(0, 0), drag(-5, 0), drag(5, 0), knob(), release(900, 0), knob()},
             "+ + + <2 at 5 held> + <2 at 0>"),

@@ -28,11 +28,7 @@ PlaysOn slide(int state) {
   }};
 }
 const PlaysOn kFullOff = slide(Slide::kFullLeft);
-const PlaysOn kFullOn = slide(Slide::kFullRight);
-const PlaysOn kHalfOff = slide(Slide::kHalfLeft);
 const PlaysOn kHalfOn = slide(Slide::kHalfRight);
-const PlaysOn kOther = slide(5);
-const PlaysOn kPlain = slide<MW::SlideV>(Slide::kFullLeft);
 
 // The state, the place of the caption, which goes with the knob, and whether it is held.
 Step knob() {
@@ -47,21 +43,21 @@ const std::vector<Play> kPlays = {
     kFullOff("FullTravelSwitchesOnAtTheEnd",
              {press(209, 79), drag(298, 0), knob(), drag(1, 0), knob(), drag(1, 0)},
              "+ + <0 at 308 held> right+ <1 at 310> -"),
-    kFullOn("FullTravelSwitchesOffAtTheEnd",
-            {press(310, 20), drag(-299, 0), knob(), drag(-1, 0), knob()},
-            "+ + <1 at 11 held> left+ <0 at 10>"),
-    kHalfOff("HalfTravelSwitchesOnAUnitBefore",
-             {press(10, 20), drag(199, 0), knob(), drag(1, 0), knob()},
-             "+ + <2 at 209 held> right+ <3 at 310>"),
+    slide(Slide::kFullRight)("FullTravelSwitchesOffAtTheEnd",
+                             {press(310, 20), drag(-299, 0), knob(), drag(-1, 0), knob()},
+                             "+ + <1 at 11 held> left+ <0 at 10>"),
+    slide(Slide::kHalfLeft)("HalfTravelSwitchesOnAUnitBefore",
+                            {press(10, 20), drag(199, 0), knob(), drag(1, 0), knob()},
+                            "+ + <2 at 209 held> right+ <3 at 310>"),
     kHalfOn("HalfTravelSwitchesOffAUnitBefore",
             {press(310, 20), drag(-199, 0), knob(), drag(-1, 0), knob()},
             "+ + <3 at 111 held> left+ <2 at 10>"),
     kHalfOn("SwitchesOnceByAnyMotion",
             {press(310, 20), drag(INT_MIN, 0), knob(), press(10, 20), drag(INT_MAX, 0), knob()},
             "+ left+ <2 at 10> + right+ <3 at 310>"),
-    kOther("AnotherStateDoesNotChange",
-           {press(10, 20), drag(-50, 0), drag(20, 0), knob(), drag(400, 0), knob()},
-           "+ + + <5 at 30 held> + <5 at 309 held>"),
+    slide(5)("AnotherStateDoesNotChange",
+             {press(10, 20), drag(-50, 0), drag(20, 0), knob(), drag(400, 0), knob()},
+             "+ + + <5 at 30 held> + <5 at 309 held>"),
     kFullOff("IsFollowedWhenHiddenWhileHeld",
              {press(10, 20), call(&MW::Widget::hide), drag(9, 0), knob(), release(), lookAtLog(),
               knob()},
@@ -70,8 +66,9 @@ const std::vector<Play> kPlays = {
              {call(&MW::Widget::Lock), press(15, 25), drag(299, 0), knob(), release(), press(),
               release(), press(), release()},
              "+ + <0 at 10 held> + + double1+ + +"),
-    kPlain("ThePlainOneCoversItsAreaAtTheLeft", {press(512, 119), drag(299, 0), knob()},
-           "+ right+ <1 at 310>"),
+    slide<MW::SlideV>(Slide::kFullLeft)("ThePlainOneCoversItsAreaAtTheLeft",
+                                        {press(512, 119), drag(299, 0), knob()},
+                                        "+ right+ <1 at 310>"),
 };
 TEST_P(SlidePlays, TellTheirJournal) { expectJournal(GetParam()); }
 INSTANTIATE_TEST_SUITE_P(, SlidePlays, testing::ValuesIn(kPlays), kRowName);

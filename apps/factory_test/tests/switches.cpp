@@ -1,6 +1,7 @@
 // The slide switches, one of them locked.
 #include <MW/slide.h>
 
+#include <atomic>
 #include <optional>
 
 #include "current.h"
@@ -55,8 +56,8 @@ class SwitchTest : public PageTest {
   }
 
   void moveAll() {
-    full->state = full->state ^ kRightBit;
-    half->state = half->state ^ kRightBit;
+    std::atomic_ref(full->state).fetch_xor(kRightBit);
+    std::atomic_ref(half->state).fetch_xor(kRightBit);
     page.say((full->state & kRightBit) != 0 ? "Right" : "Left");
   }
 

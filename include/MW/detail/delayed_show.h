@@ -6,8 +6,8 @@
 namespace MW {
 
 /// Until the first drawing pass at or after the due time the widget is not drawn and takes no
-/// events. Times are GetTicks() milliseconds and are compared as they are: a due time behind the
-/// clock's wrap is reached at once. The holder's lock guards it.
+/// events. Times are GetTicks() milliseconds and are compared as they are: a due time beyond the
+/// clock's wrap counts as reached at once. The holder's lock guards it.
 class DelayedShow {
  public:
   constexpr void start(uint32_t now, uint32_t delayMs) {

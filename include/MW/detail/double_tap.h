@@ -6,8 +6,8 @@
 namespace MW {
 
 /// Counts taps, each of which ends within 500 ms of the one before. Times are GetTicks()
-/// milliseconds; 0 stands for none. The clock's wrap may cut a series short. One thread, the one
-/// that handles events.
+/// milliseconds; 0 stands for none. The clock's wrap may cut a series short. Use it on the
+/// thread that handles events only.
 class DoubleTap {
  public:
   static constexpr uint32_t kWindowMs = 500;

@@ -7,9 +7,9 @@
 
 namespace MW {
 
-/// The finger that pressed holds until it lifts. The hold is kept in the widget's selection, which
-/// the window's routing reads, too: 0 while no finger holds, else the finger's number + 1. Finger
-/// 0xFFFFFFFF therefore never holds. Any thread.
+/// Records which finger holds a widget, in the widget's `select`, which event routing reads too: 0
+/// for none, else the finger's number + 1. Finger 0xFFFFFFFF therefore never holds. Safe on any
+/// thread.
 class FingerHold {
  public:
   explicit FingerHold(std::atomic<int>& selectionWord) : selection(selectionWord) {}

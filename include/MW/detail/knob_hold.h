@@ -10,8 +10,9 @@
 namespace MW {
 
 /// Says what an event means for a knob. The finger that presses the knob holds it until it lifts,
-/// or until a press beside the knob, of any finger, cancels the hold. Stands on the widget's hold
-/// and on its owner finger, which is -1 while the knob is free. The thread that handles events.
+/// or until a press beside the knob, of any finger, cancels the hold. A finger that presses a held
+/// knob takes it over. Uses the widget's `hold` and `ownerFinger` (-1: free). Call it on the thread
+/// that handles events.
 class MW_API KnobHold {
  public:
   enum class Touch { NotMine, Grab, Cancel, Move, Drop };
