@@ -4,7 +4,7 @@
 
 #include <bit>
 
-#include "support/drawings.h"
+#include "testkit/drawings.h"
 
 namespace {
 

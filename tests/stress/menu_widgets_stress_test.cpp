@@ -9,7 +9,7 @@
 #include <random>
 #include <thread>
 
-#include "support/drawings.h"
+#include "testkit/drawings.h"
 
 namespace {
 
