@@ -261,7 +261,8 @@ void Session::frame(Platform& platform, Frame&& shown) {
   const auto start = std::chrono::steady_clock::now();
   platform.submit(std::move(shown));
   if (report) {
-    const CairoSurface picture = platform.copyPicture(kPictureBound);
+    CairoSurface picture;
+    if (settings.keepsPictures) picture = platform.copyPicture(kPictureBound);
     const auto taken = std::chrono::steady_clock::now() - start;
     report->frame({now(), frames, lastFrame, items}, screenSize, picture.get(),
                   std::chrono::duration_cast<std::chrono::microseconds>(taken).count());

@@ -12,6 +12,7 @@ namespace {
 
 constexpr const char* kClockVariable = "BRIMOL_CLOCK";
 constexpr const char* kStartVariable = "BRIMOL_CLOCK_START";
+constexpr const char* kPicturesVariable = "BRIMOL_REPORT_PICTURES";
 
 std::string valueOf(const VariableLookup& lookup, const char* name) {
   const char* const value = lookup(name);
@@ -61,6 +62,13 @@ std::string readStart(const VariableLookup& lookup, SessionSettings& settings) {
   return {};
 }
 
+std::string readPictures(const VariableLookup& lookup, SessionSettings& settings) {
+  const std::string value = valueOf(lookup, kPicturesVariable);
+  settings.keepsPictures = value != "none";
+  if (value.empty() || value == "none" || value == "changed") return {};
+  return std::string(kPicturesVariable) + "=" + value + ": wanted changed or none";
+}
+
 }  // namespace
 
 SessionSettings readSessionSettings(const VariableLookup& lookup) {
@@ -69,8 +77,10 @@ SessionSettings readSessionSettings(const VariableLookup& lookup) {
   settings.recording = valueOf(lookup, "BRIMOL_RECORD");
   settings.reportFolder = valueOf(lookup, "BRIMOL_REPORT_DIR");
   const std::string clockError = readClock(lookup, settings);
-  const std::string startError = readStart(lookup, settings);
-  settings.error = clockError.empty() ? startError : clockError;
+  for (const std::string& error :
+       {clockError, readStart(lookup, settings), readPictures(lookup, settings)}) {
+    if (settings.error.empty()) settings.error = error;
+  }
   if (!settings.trace.empty() && !settings.recording.empty()) {
     settings.error = "BRIMOL_TRACE and BRIMOL_RECORD: a session is played or recorded, not both";
   }

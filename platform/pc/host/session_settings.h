@@ -14,14 +14,15 @@ enum class ClockChoice { Real, Simulated, Paced };
 struct SessionSettings {
   ClockChoice clock = ClockChoice::Real;
   std::optional<uint32_t> clockStart;
-  std::string trace;         // what is played; empty: nothing
-  std::string recording;     // what is recorded into; empty: nothing
-  std::string reportFolder;  // empty: none
-  std::string error;         // one line about the first wrong value; empty: none is wrong
+  std::string trace;          // what is played; empty: nothing
+  std::string recording;      // what is recorded into; empty: nothing
+  std::string reportFolder;   // empty: none
+  bool keepsPictures = true;  // of the frames, in that folder
+  std::string error;          // one line about the first wrong value; empty: none is wrong
 };
 
-/// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_TRACE, BRIMOL_RECORD and BRIMOL_REPORT_DIR; an
-/// empty value is no value.
+/// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_TRACE, BRIMOL_RECORD,
+/// BRIMOL_REPORT_DIR and BRIMOL_REPORT_PICTURES; an empty value is no value.
 SessionSettings readSessionSettings(const VariableLookup& lookup);
 
 }  // namespace brimol::pc

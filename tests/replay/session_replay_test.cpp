@@ -1,0 +1,172 @@
+// Sessions of the example application: the same trace is the same session, whatever the machine
+// does meanwhile; and what a real user did in a real window comes out again without one.
+#include <gtest/gtest.h>
+#include <unistd.h>
+
+#include <chrono>
+#include <cstdlib>
+#include <fstream>
+#include <nlohmann/json.hpp>
+#include <optional>
+#include <thread>
+
+#include "program.h"
+
+namespace brimol::test {
+namespace {
+
+namespace fs = std::filesystem;
+
+class SessionReplay : public testing::Test {
+ protected:
+  SessionReplay() { fs::create_directories(folder); }
+  ~SessionReplay() override {
+    if (!HasFailure()) fs::remove_all(folder);
+  }
+
+  /// Plays a trace without a window, in `variables` too; its results stand in the folder.
+  int play(const std::string& trace, Variables variables = {}) const {
+    variables.insert({{"BRIMOL_TRACE", trace}, {"BRIMOL_DISPLAY", "headless"}});
+    fs::remove(results);
+    return Program(folder, variables, {"--results", results}).waitForEnd();
+  }
+  /// The session's lines, without what real time says in them.
+  static std::string session(const fs::path& kept) {
+    std::ifstream in(kept / "session.jsonl");
+    std::string lines;
+    for (std::string line; std::getline(in, line);) {
+      nlohmann::ordered_json object = nlohmann::ordered_json::parse(line);
+      if (object["kind"] == "start") continue;
+      object.erase("paint_us");
+      lines += object.dump() + '\n';
+    }
+    return lines;
+  }
+  std::string writeTrace(const std::string& lines) const {
+    std::ofstream(folder / "written.trace") << "brimol-trace 1\n" << lines;
+    return folder / "written.trace";
+  }
+
+  const fs::path folder =
+      fs::path(testing::TempDir()) / ("session_replay." + std::to_string(::getpid()));
+  const std::string results = folder / "results.json";
+  const std::string report = folder / "report";
+};
+
+TEST_F(SessionReplay, IsTheSameTenMinutesEveryTime) {
+  std::string first;
+  std::string firstResults;
+  for (int round = 0; round < QUIET_ROUNDS + 1; ++round) {
+    std::optional<BusyCore> busy;
+    std::optional<BusyCore> busier;
+    if (round >= QUIET_ROUNDS - 1) busy.emplace();
+    if (round == QUIET_ROUNDS) busier.emplace();
+    ASSERT_EQ(play(TRACES "ten_minutes.trace",
+                   {{"BRIMOL_REPORT_DIR", report}, {"BRIMOL_REPORT_PICTURES", "none"}}),
+              0)
+        << readAll(folder / "stderr");
+    const std::string lines = session(report);
+    if (round == 0) first = lines;
+    if (round == 0) firstResults = readAll(results);
+    EXPECT_NE(lines.find("\"kind\":\"log\""), std::string::npos);
+    EXPECT_TRUE(lines == first) << "session " << round << " differs";
+    EXPECT_EQ(readAll(results), firstResults);
+  }
+  EXPECT_NE(firstResults.find("2026-01-01T00:"), std::string::npos) << firstResults;
+}
+
+TEST_F(SessionReplay, PaintsTheSamePictures) {
+  const fs::path other = folder / "other";
+  const std::string trace = writeTrace("screen 720x1280\ninclude " TRACES "minute.trace\n");
+  ASSERT_EQ(play(trace, {{"BRIMOL_REPORT_DIR", report}}), 0) << readAll(folder / "stderr");
+  const BusyCore busy;
+  ASSERT_EQ(play(trace, {{"BRIMOL_REPORT_DIR", other}}), 0);
+  int pictures = 0;
+  for (const auto& entry : fs::directory_iterator(report)) {
+    if (entry.path().extension() != ".png") continue;
+    ++pictures;
+    EXPECT_TRUE(readAll(entry.path()) == readAll(other / entry.path().filename())) << entry.path();
+  }
+  EXPECT_GT(pictures, 20);
+}
+
+void act(const std::string& actions) {
+  EXPECT_EQ(std::system(("xdotool " + actions).c_str()), 0) << actions;
+}
+
+/// What a user does with the mouse and the keys in a window of 720 x 1280 at the middle of the
+/// desktop.
+void useTheMenu() {
+  const auto at = [](int x, int y) {
+    return "mousemove " + std::to_string(40 + x) + ' ' + std::to_string(60 + y) + ' ';
+  };
+  act(at(360, 1148) + "click 1 sleep 0.3 " + at(160, 400) + "mousedown 1 sleep 0.7 mouseup 1");
+  act(at(500, 400) + "click 1 click 1 sleep 0.2 " + at(124, 1156) + "click 1 sleep 0.3");
+  std::string drag = at(300, 900) + "mousedown 1 ";
+  for (int y = 890; y > 600; y -= 20) drag += at(300, y);
+  act(drag + "mouseup 1 sleep 0.5");
+  act("key Down Return sleep 0.3 key Up Left Escape Escape sleep 0.3");
+  act("key Escape sleep 0.5 key Return");
+}
+
+TEST_F(SessionReplay, PlaysWhatAUserDidInAWindow) {
+  const std::string trace = folder / "user.trace";
+  {
+    Program program(
+        folder,
+        {{"BRIMOL_RECORD", trace}, {"BRIMOL_DISPLAY", "window"}, {"BRIMOL_SCREEN", "720x1280"}},
+        {"--results", results});
+    while (readAll(trace).find(" frame ") == std::string::npos) {
+      std::this_thread::sleep_for(std::chrono::milliseconds(50));
+    }
+    act("search --sync --onlyvisible --name brimol");
+    useTheMenu();
+    ASSERT_EQ(program.waitForEnd(), 0) << readAll(folder / "stderr");
+  }
+  const std::string recorded = readAll(results);
+  const std::string text = readAll(trace);
+  EXPECT_NE(recorded.find("\"verdict\""), std::string::npos) << recorded;
+  EXPECT_NE(text.find(" long 0 "), std::string::npos);
+  EXPECT_NE(text.find(" end\n"), std::string::npos);
+  for (int round = 0; round < 5 * QUIET_ROUNDS; ++round) {
+    ASSERT_EQ(play(trace), 0) << readAll(folder / "stderr");
+    EXPECT_EQ(readAll(results), recorded);
+  }
+}
+
+TEST_F(SessionReplay, ARecordingOfAKilledSessionIsPlayedUpToThere) {
+  const std::string trace = folder / "killed.trace";
+  {
+    Program program(folder, {{"BRIMOL_RECORD", trace}, {"BRIMOL_DISPLAY", "headless"}}, {});
+    while (readAll(trace).find(" frame ") == std::string::npos) {
+      std::this_thread::sleep_for(std::chrono::milliseconds(50));
+    }
+    program.kill();
+  }
+  EXPECT_EQ(play(trace), 0) << readAll(folder / "stderr");
+  EXPECT_NE(readAll(folder / "stderr").find("the recording has no end"), std::string::npos);
+}
+
+TEST_F(SessionReplay, EndsWithTheReasonOfAFailure) {
+  EXPECT_EQ(play(writeTrace("wait 5\nexpect text \"Nowhere\" within 10\n"),
+                 {{"BRIMOL_REPORT_DIR", report}}),
+            1);
+  const std::string errors = readAll(folder / "stderr");
+  EXPECT_NE(errors.find("written.trace:3: expect text \"Nowhere\" within 10: not shown"),
+            std::string::npos)
+      << errors;
+  EXPECT_NE(errors.find("Factory test"), std::string::npos) << errors;
+  EXPECT_NE(readAll(fs::path(report) / "failed.items.txt"), "");
+  EXPECT_TRUE(fs::exists(fs::path(report) / "failed.png"));
+  EXPECT_NE(session(report).find("\"exit\":1,\"reason\":\"failed\""), std::string::npos);
+
+  EXPECT_EQ(play(writeTrace("dance\n")), 2);
+  EXPECT_EQ(readAll(folder / "stderr"), writeTrace("") + ":2: unknown step 'dance'\n");
+  EXPECT_EQ(play(folder / "gone.trace"), 2);
+  EXPECT_EQ(play(writeTrace("screen 10x10\n"), {{"BRIMOL_SCREEN", "20x20"}}), 2);
+  EXPECT_EQ(play(writeTrace("key back\nkey select\nwait 5000\n")), 1);
+  EXPECT_NE(readAll(folder / "stderr").find("ended before this step"), std::string::npos);
+}
+
+}  // namespace
+}  // namespace brimol::test
