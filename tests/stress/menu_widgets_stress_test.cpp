@@ -9,6 +9,7 @@
 #include <random>
 #include <thread>
 
+#include "support/widget_test.h"
 #include "testkit/drawings.h"
 
 namespace {
