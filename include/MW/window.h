@@ -31,8 +31,8 @@ class MW_API Window {
   /// It may also be called in a handler or callback. There it waits for no thread that runs
   /// handlers, since that thread might be waiting for this very handler. On the dispatch thread
   /// everything ends but that thread, which ends after its callback. An init() in the same callback
-  /// starts a new dispatch thread at once, whose handlers may run beside the rest of the callback; a
-  /// later destroy() waits for the new thread alone.
+  /// starts a new dispatch thread at once, whose handlers may run beside the rest of the callback;
+  /// a later destroy() waits for the new thread alone.
   ///
   /// In a handler of a drawing or timer pass, or of a dispatch thread that init() has replaced, it
   /// only tells the dispatch thread to end and logs an error line; a later init() or destroy(),
