@@ -5,7 +5,7 @@ set -euo pipefail
 cd "$(dirname "$0")/.."
 
 mapfile -t sources < <(git ls-files '*.h' '*.cpp' '*.c')
-units_of=('src/*.cpp' 'platform/*.cpp' 'apps/*.cpp')
+units_of=('src/*.cpp' 'platform/*.cpp' 'apps/*.cpp' 'tools/*.cpp')
 [[ ${1:-} != --all ]] || units_of=('*.cpp')
 mapfile -t units < <(git ls-files "${units_of[@]}")
 

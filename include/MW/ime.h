@@ -13,11 +13,12 @@ struct ImeKey;
 /// A bar with what was typed and five rows of keys below it, in one of four layouts. See TextPanel
 /// for its life and its callbacks, which are functions of an int and the keyboard.
 ///
-/// A press types at once and calls nothing; so `press_cb` is called by onPress() alone, which no
-/// event reaches. A press on the border of a key hits no key. `release_cb` is called when a finger
-/// lifts inside the keyboard, on a key or not, and is the place to read what enter left in
-/// getResultString(): it runs on the thread that types. It is not called for a finger that lifts
-/// outside, nor once onShowTimer() was called.
+/// A press types at once and calls nothing. `press_cb` and `double_tap_cb` need onPress(), which no
+/// event reaches: they are called only if the application calls onPress() itself. A press on the
+/// border of a key hits no key. `release_cb` is called when a finger lifts inside the keyboard, on
+/// a key or not, and is the place to read what enter left in getResultString(): it runs on the
+/// thread that types. It is not called for a finger that lifts outside, nor once onShowTimer() was
+/// called.
 ///
 /// The "fold" key clears the typed text and sets the fold status, which the application asks for;
 /// the keyboard itself stays. In the layout of digits alone, "fold" first sets the property

@@ -15,9 +15,10 @@ class RowColumn;
 /// is filled by addIndex() and drawn from initFinish() on. The items may be changed on any thread
 /// while handlers run.
 ///
-/// An item is drawn where its top lies below the list's, so an item whose top is the list's own is
-/// missing: the first one at rest, and the one that move_key_up() scrolled to. Begin the list with
-/// an item of height 0, and scroll down by a pixel (onHover()) once a key has scrolled up.
+/// An item is drawn while its top lies strictly between the list's top and bottom edges, so an item
+/// whose top is the list's own is missing: the first one at rest, and the one that move_key_up()
+/// scrolled to. Begin the list with an item of height 0, and after move_key_up() call onHover()
+/// with a motion of yrel 1.
 ///
 /// The list marks no current item and does not move by keys itself: the application calls
 /// move_key_down() and move_key_up() from its key callback and recolours the item.
@@ -84,7 +85,8 @@ class MW_API MainList : public RowList {
   /// list that is registered already is drawn and called twice from here on: unregister it first.
   void init_MainList(int listMode);
   /// Lays it out on the present screen, with the title bar of a mode. The status texts become what
-  /// they were at first; which of them are drawn stays as the constructor's mode said.
+  /// they were at first; which of them are drawn stays as the mode given to the constructor or
+  /// init_MainList() said.
   void setRect(int listMode);
   /// Takes all items away. A finished list stays finished, so that it takes no new ones: only
   /// init_MainList() opens it again.
@@ -126,6 +128,8 @@ class MW_API MainList : public RowList {
   void onRelease(mouse_event mouse);
   /// Scrolls by the motion, if the list is higher than its area.
   void onHover(mouse_event mouse);
+  /// Adds a motion to the drag; a sum above 2 % of the screen's width takes the click away.
+  void inClick(int dx, int dy);
   /// The item at the position; its first line of pixels does not belong to it. Where there is none,
   /// -1, or -100 if all 64 items are there and none of kEnd ends the list.
   int position2index(mouse_event mouse);
@@ -159,13 +163,16 @@ class MW_API MainList : public RowList {
   SKIA_Rect screenRect = {};
   SKIA_Rect titleBar = {};
   SKIA_Rect titleRect = {};
+  SKIA_Rect bottomEdge = {};
+  SKIA_Rect listRect = {};
   std::array<Option, kOptions> option;
   std::array<Item, kItems> items;
   int count = 0;
   int finished = 0;  // 1 after initFinish()
   int current = -1;
-  int scroll = 0;  // pixels, 0 or less
-  int shown = 0;   // 1 between the first drawing and hide()
+  int scroll = 0;     // pixels, 0 or less
+  int touchSlop = 0;  // pixels
+  int shown = 0;      // 1 between the first drawing and hide()
 
  private:
   template <typename Change>
@@ -173,7 +180,6 @@ class MW_API MainList : public RowList {
   bool isClicked(int item) const;
   int nextSelectable(int from, int step) const;
   RowColumn columnOf(int itemCount) const;
-  RowColumn shownColumn() const;
   RowColumn wholeColumn() const;
   void drawItems() const;
   void drawStatus() const;

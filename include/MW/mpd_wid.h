@@ -25,14 +25,14 @@ struct MpdLine {
 static_assert(sizeof(MpdLine) == 776, "flag, level and three texts");
 
 /// A full-screen list of up to 64 results in levels, one row of five cells each: the expand marker,
-/// the level, the head text, the name and the value. Above it stands an empty white box from a
-/// thirteenth of the screen's height on, a seventh of that height high. A row is 141 pixels high,
-/// its text 19 on every screen.
+/// the level, the head text, the name and the value. Above the rows stands an empty white box: it
+/// begins at 1/13 of the screen's height and is 1/7 of the screen's height high. A row is 141
+/// pixels high, its text 19 on every screen.
 ///
-/// A row whose next one has a higher level can be expanded: "[>]", its children are hidden, or
-/// "[V]". A double tap, each step under 500 ms, changes that. All others are marked "[*]". The last
-/// row is never hidden and does not change. A row's colour goes by its level: 1 grey, 2 light
-/// orange, 3 orange.
+/// A row followed by one of a higher level is a parent: marked "[>]" while its children are hidden,
+/// "[V]" while they are shown. A double tap, each step under 500 ms, changes that. All others are
+/// marked "[*]". The last row is never hidden and does not change. A row's colour goes by its
+/// level: 1 grey, 2 light orange, 3 orange.
 ///
 /// It enters the base layer when it is constructed, active at once, and leaves it when it is
 /// deleted. It is filled by cal_line(), on any thread, also while it is drawn and handlers run.
@@ -76,7 +76,8 @@ class MW_API MpdWid : public RowList {
   /// Not while it handles events. A list that is registered already is drawn and called twice from
   /// here on: unregister it first.
   void init_MpdWid();
-  /// Lays it out on the present screen. The rows stay where they are until initIndex().
+  /// Lays it out on the present screen. The scroll stays, but the next drawing brings it into the
+  /// new area's range.
   void setRect();
   /// Scrolls to the first row.
   void initIndex();
@@ -90,8 +91,8 @@ class MW_API MpdWid : public RowList {
   ///   the name is "no name", and the value all that stands behind "[MPDIA]". Without "[MPDIA]" the
   ///   name is "no name", and the value the line.
   ///
-  /// `lines` is a C string of at least `length` + 1 bytes, of which the last may be the NUL: it is
-  /// read up to its NUL or up to the byte with the number `length`, that one included. Only what a
+  /// `lines` is read up to its NUL or through the byte with the index `length`, whichever comes
+  /// first. Only what a
   /// "\n" ends is a line; one that is the text's first byte ends none. Of more than 64 lines the
   /// first 64 are shown. Null, or a length of 0 or less: an empty list. Drawn texts are cut to 127
   /// bytes. Without memory the rows stay, and a line is logged.
@@ -126,6 +127,8 @@ class MW_API MpdWid : public RowList {
   void onRelease(mouse_event mouse);
   void onMpdRelease(event_data* event);
   void onHover(mouse_event mouse);
+  /// Adds a motion to the drag; a sum above 2 % of the screen's width takes the click away.
+  void inClick(int dx, int dy);
   /// Counts taps, and expands or collapses at the second one.
   void onTouchClickCount(event_data* event);
   /// Expands or collapses the row under the event.
@@ -143,8 +146,8 @@ class MW_API MpdWid : public RowList {
   void setTextColor(int, int);
 
   /// A press and a release, without a drag between them, that position2index() both answers with
-  /// -1. So a list is clicked only below its rows before the first one of kHitEnd, and never
-  /// without such a row.
+  /// -1. So a list with a row of kHitEnd is clicked wherever position2index() finds none of the
+  /// rows before it; a list without one, never.
   void (*click_cb)(mouse_event* event, MpdWid* list) = nullptr;
   void (*key_press_cb)(kbd_event* event, MpdWid* list) = nullptr;
   void (*key_release_cb)(kbd_event* event, MpdWid* list) = nullptr;
@@ -170,9 +173,12 @@ class MW_API MpdWid : public RowList {
 
   // Guarded by stateLock, unless a field says otherwise.
   std::array<SKIA_Rect, kCells> cell = {};  // of the row being drawn
+  SKIA_Rect list_rect = {};
+  SKIA_Rect bottom_line = {};
   SKIA_Rect header_box = {};
   std::array<Item, kItems> item = {};
   int scroll_y = 0;       // of the first row
+  int touch_slop = 0;     // pixels
   int mpd_line = 0;       // rows, at most kItems
   int visible_count = 0;  // rows that the last drawing left visible
   std::vector<MpdLine> mpd_buf;
@@ -181,9 +187,7 @@ class MW_API MpdWid : public RowList {
 
  private:
   void fillItem(int index, const MpdLine& line);
-  RowColumn visibleColumn() const;
   RowColumn countedColumn() const;
-  RowColumn hitColumn() const;
   void scrollTo(int64_t top);
   void drawRows();
   void drawRow(const Item& row);

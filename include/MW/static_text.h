@@ -15,10 +15,11 @@ namespace MW {
 ///
 /// Characters are bytes of UTF-8. A row holds w / size * 100 / 63 of them, in integers and rounded
 /// down to an even number, and 8 more without line numbers; 1 at least and 127 at most. A viewer
-/// with line numbers has the 8 more, too, until setRect() and the setText() behind it: its rows may
-/// stand out at the right. Where the property "brimol.info.type" is "cpu" at construction, rows
-/// hold 88 until setRect(). A character of several bytes that a row cannot take whole begins the
-/// next row. h / size - 2 rows are in view; a font size under 1 shows none.
+/// with line numbers, too, has the 8 more until a setText() that follows a setRect(), so its rows
+/// may run out at the right. Where the property "brimol.info.type" is "cpu" at construction, rows
+/// hold 88 until a setText() that follows a setRect(). A character of several bytes that a row
+/// cannot take whole begins the next row. h / size - 2 rows are in view; a font size under 1 shows
+/// none.
 ///
 /// The application may set texts and search on one thread while another one draws. A text, or a
 /// text to be searched, counts up to 2 GiB; null is the empty text. Where there is no memory for
@@ -62,7 +63,7 @@ class MW_API StaticText : public TextPanel {
   /// handles events. A viewer that is registered already is drawn and called twice from here on:
   /// unregister it first.
   void init(const SKIA_Rect* area, const SKIA_Text* looks);
-  /// Every fourth motion scrolls by a row, the way that this one goes.
+  /// Every fourth motion scrolls by a row, in the direction of that fourth motion.
   void onHover(mouse_event mouse);
 
   /// Keeps what is to be searched, cut to 99 bytes at a whole character. Null is the empty text.

@@ -23,20 +23,21 @@ using ShortText = std::array<char, 100>;
 /// Callbacks are functions of the application, called with 0 on the dispatch thread; null: not
 /// wanted. Assign them before the panel becomes active:
 ///
-/// - press_cb: pressed inside.
+/// - press_cb / long_press_cb: a press / long press inside, or anywhere while a finger holds the
+///   panel.
 /// - release_cb: released inside.
-/// - long_press_cb: held for long inside.
 /// - double_tap_cb: the second of two taps of which each step took under 500 ms.
 class MW_API TextPanel : public Widget {
  public:
   using Widget::show;
   /// show(0).
   int show() override;
-  /// Asks for a redraw in every timer pass from the time on that onShowTimer set.
+  /// From the time set by onShowTimer() on, asks for a redraw in every timer pass.
   void updateTimer(unsigned int ticks) override;
-  /// Makes it inactive and free. Asks for no redraw. Returns 1.
+  /// Makes it inactive and lets the finger go. Asks for no redraw. Returns 1.
   int hide() override;
-  /// StaticText: the text that its constructor was given, whatever setText() set. Ime: none.
+  /// StaticText: the text that its constructor was given, whatever setText() set. Ime: an empty
+  /// text.
   char* getText() override;
   unsigned int getBgColor() override;
   unsigned int getTextColor() override;
@@ -68,7 +69,7 @@ class MW_API TextPanel : public Widget {
 
   TextTouch takePress(const event_data& event);
   TextTouch takeRelease(const event_data* event);
-  TextTouch takeLongPress();
+  TextTouch takeLongPress() const;
   TextTouch takeTap();
 
   unsigned int saved_bg_color = 0;  // 0xAARRGGBB; guarded by stateLock

@@ -16,7 +16,7 @@ enum RcuiKind {
   kRcuiLine = 4,
   kRcuiImage = 5,
   /// While `visible`, a text box directly below the column's last one, as wide, high and coloured
-  /// as that. Else an item of the type 14.
+  /// as that. The process's first one stands at its own rectangle. Else an item of the type 14.
   kRcuiNextInColumn = 7,
   kRcuiFirstInColumn = 8,  ///< the same, but it begins a new column at its own rectangle
   kRcuiLabel = 9,
@@ -88,9 +88,9 @@ static_assert(offsetof(ref_cb_t, cbHover) == 14 * sizeof(Callback));
 /// Builds one item or widget from a descriptor; RcuiKind says which.
 ///
 /// Items are copied to the display-item table (WidgetList) and have no widget. All objects of the
-/// process share one column; make them on one thread, as with WidgetList. A kind that has no name
-/// builds nothing; a negative one is logged. Of 0 to 9 those without a name are items of the type
-/// 14, whose look is the platform's.
+/// process share one column; make them on one thread, as with WidgetList. Of the kinds
+/// without a name, 1, 3 and 6 make items of the type 14, whose look is the platform's; all others
+/// build nothing, and a negative one is logged.
 ///
 /// Texts are copied where the kind shows them. One without a NUL is logged and cut to 127 bytes. A
 /// length that is negative or above 127 is logged and replaced by the text's own. The length of an
@@ -98,7 +98,7 @@ static_assert(offsetof(ref_cb_t, cbHover) == 14 * sizeof(Callback));
 /// five texts of `desc` is there when its length is not 0, even where its first byte is the NUL.
 ///
 /// The object owns its widget and deletes it with itself: the application must not delete it,
-/// neither from a callback, but may delete the WidgetRcui there. The object itself is in no layer
+/// not even from a callback, but may delete the WidgetRcui there. The object itself is in no layer
 /// and draws nothing.
 class MW_API WidgetRcui : public Widget {
  public:

@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <utility>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
@@ -19,7 +20,6 @@ namespace {
 constexpr ClassLog kLog("MAINLIST");
 constexpr int kItemGap = 3;  // pixels
 constexpr int kNoItem = -1;
-static_assert(MainList::kItems <= RowColumn::kMost);
 constexpr int kLongestText = kTextMax - 1;  // bytes
 
 bool isText(const char* given, int64_t length) {
@@ -65,7 +65,8 @@ void MainList::setRect(int listMode) {
   titleBar = {0, 0, screen.w, titleHeight, kColorBlack};
   titleRect = {0, 0, screen.w, kTitleHeight, kColorBlack};
   listRect = makeRect(0, titleHeight, screen.w, int64_t{screen.h} - titleHeight, 0);
-  layOutFrame(screen.w, screen.h);
+  bottomEdge = footLine(screen.w, screen.h);
+  touchSlop = clickSlop(screen.w);
   for (std::size_t i = 0; i < option.size(); ++i) {
     const StatusRow& row = kStatusRows.at(i);
     option.at(i).rect = statusRect(row, screen.w);
@@ -114,12 +115,6 @@ RowColumn MainList::columnOf(int itemCount) const {
   return column;
 }
 
-// Those that are drawn and clicked.
-RowColumn MainList::shownColumn() const {
-  const auto* const end = std::ranges::find(items, kEnd, &Item::kind);
-  return columnOf(static_cast<int>(end - items.begin()));
-}
-
 // Those that the list's height counts: it goes on behind an end that was set between items.
 RowColumn MainList::wholeColumn() const {
   RowColumn column(listRect.y, kItemGap);
@@ -146,11 +141,11 @@ int MainList::show(unsigned int) {
 
 void MainList::drawItems() const {
   const int64_t bottom = int64_t{listRect.y} + listRect.h;
-  const RowColumn column = shownColumn();
-  for (int i = 0; i < column.count(); ++i) {
-    const int64_t y = column.topOf(i);
+  RowColumn column = columnOf(0);
+  for (const Item& item : items) {
+    if (item.kind == kEnd) return;
+    const int64_t y = column.add(item.height).top;
     if (!isBetween(listRect.y, y, bottom)) continue;
-    const Item& item = items.at(static_cast<std::size_t>(i));
     skia_add_textbox_c(makeRect(0, y, screenRect.w, item.height, item.bgColor), item.text);
   }
 }
@@ -165,10 +160,13 @@ void MainList::drawStatus() const {
 }
 
 int MainList::hide() {
-  if (read(shown) == 1) kLog.print(LogLevel::Debug, "HIDE<-%s", title.text);
-  setActive(0);  // before `shown`: a drawing pass that still met it active would set `shown` again
+  setActive(0);
   setSelect(0);
-  write(shown, 0);
+  const bool wasShown = [this] {
+    const std::lock_guard guard(stateLock);
+    return std::exchange(shown, 0) == 1;
+  }();
+  if (wasShown) kLog.print(LogLevel::Debug, "HIDE<-%s", title.text);
   return 0;
 }
 
@@ -227,7 +225,7 @@ bool MainList::onRecvEvent(event_data* event, unsigned int) {
     case kEventKeyRelease: onReleaseKey(event->key); return true;
     default: break;
   }
-  if (!takesTouch(*event, kEventRelease)) return false;
+  if (!takesTouch(*event, listRect, kEventRelease)) return false;
   switch (event->type) {
     case kEventMotion: onHover(event->mouse); return true;
     case kEventPress: onPress(event->mouse); return true;
@@ -247,7 +245,8 @@ void MainList::onReleaseKey(kbd_event key) {
 }
 
 void MainList::onPress(mouse_event mouse) {
-  pressRow(mouse, position2index(mouse));
+  hold.press(mouse);
+  pressRow(position2index(mouse));
   if (auto* const call = pressCallback) call(&mouse, this);
 }
 
@@ -279,16 +278,26 @@ void MainList::onHover(mouse_event mouse) {
   if (auto* const call = scrollCallback) call(&mouse, this);
 }
 
+void MainList::inClick(int dx, int dy) {
+  const std::lock_guard guard(stateLock);
+  click.move(dx, dy, touchSlop);
+}
+
+// Asks copies, so that drawing need not wait for the log.
 int MainList::position2index(mouse_event mouse) {
-  const RowColumn column = [this] {
+  auto [column, asked] = [this] {
     const std::lock_guard guard(stateLock);
-    return shownColumn();
+    return std::pair(columnOf(0), items);
   }();
-  const int item = column.rowAt(mouse.y);
-  const int looked = item != RowColumn::kNoRow ? item + 1 : column.count();
-  for (int i = 0; i < looked; ++i) logHit(column.topOf(i), mouse, column.bottomOf(i));
-  if (item != RowColumn::kNoRow) return item;
-  return column.count() < kItems ? kNoItem : ClickSlop::kNone;
+  int number = 0;
+  for (const Item& item : asked) {
+    if (item.kind == kEnd) return kNoItem;
+    const RowPlace row = column.add(item.height);
+    logHit(row.top, mouse, row.bottom);
+    if (row.isAt(mouse.y)) return number;
+    ++number;
+  }
+  return ClickSlop::kNone;
 }
 
 int MainList::move_key_down(int) {
@@ -296,7 +305,7 @@ int MainList::move_key_down(int) {
   const int next = nextSelectable(current, 1);
   if (next == kNoItem) return kNotMoved;
   current = next;
-  const int64_t below = columnOf(next + 1).topOf(next + 1) - listRect.y - listRect.h;
+  const int64_t below = columnOf(next + 1).nextTop() - listRect.y - listRect.h;
   if (below > 0) scroll = toPixels(scroll - below);
   return next;
 }
@@ -306,7 +315,7 @@ int MainList::move_key_up(int) {
   const int previous = nextSelectable(current, -1);
   if (previous == kNoItem) return kNotMoved;
   current = previous;
-  const int64_t above = listRect.y - columnOf(previous).topOf(previous);
+  const int64_t above = listRect.y - columnOf(previous).nextTop();
   if (above > 0) scroll = toPixels(scroll + above);
   return previous;
 }

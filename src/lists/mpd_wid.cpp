@@ -26,7 +26,6 @@ constexpr int kRowGap = 1;
 constexpr int kDrawnAbove = 143;  // a row is drawn whose top lies by less above the list's
 constexpr int kRowTextSize = 19;
 constexpr int kEndRow = -1;  // the row that ends a hit test
-static_assert(MpdWid::kItems <= RowColumn::kMost);
 
 // Parts of the screen's height.
 constexpr int kAboveHeader = 13;
@@ -80,17 +79,18 @@ void MpdWid::setRect() {
   const int headerHeight = screen.h / kHeader;
   const int64_t top = int64_t{headerTop} + headerHeight;
   const std::lock_guard guard(stateLock);
-  layOutFrame(screen.w, screen.h);
+  bottom_line = footLine(screen.w, screen.h);
+  touch_slop = clickSlop(screen.w);
   rect = {0, 0, screen.w, screen.h, rect.color};
   header_box = makeRect(kMargin, headerTop, width, headerHeight, kColorWhite);
-  listRect = makeRect(kMargin, top, width, screen.h - top, 0);
+  list_rect = makeRect(kMargin, top, width, screen.h - top, 0);
   cell = layOutCells(screen.w);
 }
 
 void MpdWid::initIndex() {
   kLog.print(LogLevel::Debug, "initIndex");
   const std::lock_guard guard(stateLock);
-  scroll_y = listRect.y;
+  scroll_y = list_rect.y;
 }
 
 void MpdWid::cal_line(const char* lines, int length) try {
@@ -158,33 +158,32 @@ int MpdWid::show(unsigned int) {
   const std::lock_guard guard(stateLock);
   drawRows();
   skia_add_box_c(header_box);
-  skia_add_box_c(bottomEdge);
+  skia_add_box_c(bottom_line);
   scrollTo(scroll_y);
   return 1;
 }
 
 void MpdWid::drawRows() {
-  const int64_t top = int64_t{listRect.y} - kDrawnAbove;
-  const int64_t bottom = int64_t{listRect.y} + listRect.h;
-  const RowColumn column = visibleColumn();
-  visible_count = 0;
-  for (int i = 0; i < column.count(); ++i) {
-    Item& row = item.at(static_cast<std::size_t>(i));
-    row.y = toPixels(column.topOf(i));
-    if (column.isHidden(i)) continue;
-    ++visible_count;
-    if (isBetween(top, column.topOf(i), bottom)) drawRow(row);
-  }
-}
-
-// The rows where they are seen.
-RowColumn MpdWid::visibleColumn() const {
+  const int64_t top = int64_t{list_rect.y} - kDrawnAbove;
+  const int64_t bottom = int64_t{list_rect.y} + list_rect.h;
   RowColumn column(scroll_y, kRowGap);
-  while (column.count() < mpd_line) {
-    for (int hidden = hiddenFrom(column.count()); hidden > 0; --hidden) column.addHidden();
-    column.add(item.at(static_cast<std::size_t>(column.count())).height);
+  visible_count = mpd_line;
+  int hidden = 0;  // rows still to be passed over
+  for (int i = 0; i < mpd_line; ++i) {
+    Item& row = item.at(static_cast<std::size_t>(i));
+    const int64_t y = column.nextTop();
+    row.y = toPixels(y);
+    if (hidden == 0) {
+      hidden = hiddenFrom(i);
+      visible_count -= hidden;
+    }
+    if (hidden > 0) {
+      --hidden;
+      continue;
+    }
+    if (isBetween(top, y, bottom)) drawRow(row);
+    column.add(row.height);
   }
-  return column;
 }
 
 // How many rows from this one on are hidden by the one before. The last row never is.
@@ -222,7 +221,7 @@ int MpdWid::Max_height() {
 
 // The rows that the list's height counts.
 RowColumn MpdWid::countedColumn() const {
-  RowColumn column(listRect.y, kRowGap);
+  RowColumn column(list_rect.y, kRowGap);
   for (int i = 0; i < visible_count; ++i) {
     if (item.at(static_cast<std::size_t>(i)).listType != kHitEnd) column.add(kRowHeight);
   }
@@ -236,10 +235,10 @@ void MpdWid::onHover_temp() {
 
 void MpdWid::scrollTo(int64_t top) {
   const RowColumn column = countedColumn();
-  const int64_t wanted = top - listRect.y;
-  // Too few rows to scroll come back from above at once or not at all.
-  if (column.height() < listRect.h && wanted < 0) return;
-  scroll_y = toPixels(listRect.y + column.clampScroll(wanted, listRect.h));
+  const int64_t wanted = top - list_rect.y;
+  // When all rows fit, a scroll above the list's top is left alone; any other becomes the top.
+  if (column.height() < list_rect.h && wanted < 0) return;
+  scroll_y = toPixels(list_rect.y + column.clampScroll(wanted, list_rect.h));
 }
 
 bool MpdWid::onRecvEvent(event_data* event, unsigned int) {
@@ -249,7 +248,7 @@ bool MpdWid::onRecvEvent(event_data* event, unsigned int) {
     case kEventKeyRelease: onReleaseKey(event->key); return true;
     default: break;
   }
-  if (!takesTouch(*event, kEventLongPress)) return false;
+  if (!takesTouch(*event, list_rect, kEventLongPress)) return false;
   const LifeGuard self(this);
   switch (event->type) {
     case kEventMotion: onHover(event->mouse); return true;
@@ -276,7 +275,8 @@ void MpdWid::onReleaseKey(kbd_event key) {
 }
 
 void MpdWid::onPress(mouse_event mouse) {
-  pressRow(mouse, position2index(mouse));
+  hold.press(mouse);
+  pressRow(position2index(mouse));
   if (auto* const call = press_cb) call(&mouse, this);
 }
 
@@ -345,24 +345,23 @@ void MpdWid::onHover(mouse_event mouse) {
   if (auto* const call = hover_cb) call(&mouse, this);
 }
 
-// The rows before the first that ends a hit test. The list's top counts twice.
-RowColumn MpdWid::hitColumn() const {
-  RowColumn column(int64_t{listRect.y} + scroll_y, kRowGap);
-  for (int i = 0; i < mpd_line; ++i) {
-    const Item& row = item.at(static_cast<std::size_t>(i));
-    if (row.listType == kHitEnd) break;
-    column.add(row.height);
-  }
-  return column;
+void MpdWid::inClick(int dx, int dy) {
+  const std::lock_guard guard(stateLock);
+  click.move(dx, dy, touch_slop);
 }
 
 int MpdWid::position2index(mouse_event mouse) {
   const std::lock_guard guard(stateLock);
-  const RowColumn column = hitColumn();
-  const int row = column.rowAt(mouse.y);
-  if (row == RowColumn::kNoRow) return column.count() < mpd_line ? kEndRow : ClickSlop::kNone;
-  logHit(column.topOf(row), mouse, column.bottomOf(row));
-  return row;
+  RowColumn column(int64_t{list_rect.y} + scroll_y, kRowGap);  // the list's top counts twice
+  for (int i = 0; i < mpd_line; ++i) {
+    const Item& asked = item.at(static_cast<std::size_t>(i));
+    if (asked.listType == kHitEnd) return kEndRow;
+    const RowPlace row = column.add(asked.height);
+    if (!row.isAt(mouse.y)) continue;
+    logHit(row.top, mouse, row.bottom);
+    return i;
+  }
+  return ClickSlop::kNone;
 }
 
 void MpdWid::control_context(int, SKIA_Rect*, char*) {}

@@ -17,10 +17,11 @@ RowList::RowList(const char* logWord, const char* listTitle)
   putText(title, boundedText(listTitle));
 }
 
-void RowList::layOutFrame(int screenWidth, int screenHeight) {
-  bottomEdge = {0, screenHeight, screenWidth, kEdgeHeight, kColorBlack};
-  touchSlop = toPixels(percentOf(screenWidth, kSlopPercent));
+SKIA_Rect RowList::footLine(int screenWidth, int screenHeight) {
+  return {0, screenHeight, screenWidth, kEdgeHeight, kColorBlack};
 }
+
+int RowList::clickSlop(int screenWidth) { return toPixels(percentOf(screenWidth, kSlopPercent)); }
 
 int RowList::show() { return show(0); }
 
@@ -28,14 +29,11 @@ void RowList::lcdOn(int on) {
   if (lcdState.exchange(on) != on) hold.letGo();
 }
 
-void RowList::inClick(int dx, int dy) {
-  const std::lock_guard guard(stateLock);
-  click.move(dx, dy, touchSlop);
-}
-
-bool RowList::takesTouch(const event_data& event, EventCode last) const {
+bool RowList::takesTouch(const event_data& event, const SKIA_Rect& area, EventCode last) const {
   const bool isTouch = event.type >= kEventMotion && event.type <= last;
-  if (!isTouch || !hold.isOthers(event.mouse)) return hold.isHeld() || isUnder(listRect, &event);
+  const HeldBy holder = hold.heldBy(event.mouse);
+  if (holder == HeldBy::Nobody) return isUnder(area, &event);
+  if (holder == HeldBy::ThisFinger || !isTouch) return true;
   if (event.type != kEventMotion) {
     ClassLog(word).print(LogLevel::Debug, "onRecvEvent-> T:%d, F:%d", event.type,
                          static_cast<int>(event.mouse.finger));
@@ -43,8 +41,7 @@ bool RowList::takesTouch(const event_data& event, EventCode last) const {
   return false;
 }
 
-void RowList::pressRow(const mouse_event& mouse, int row) {
-  hold.press(mouse);
+void RowList::pressRow(int row) {
   const std::lock_guard guard(stateLock);
   click.press(row);
 }

@@ -151,8 +151,12 @@ void Ime::onPress(event_data* event) {
 
 void Ime::onRelease(event_data* event) {
   const LifeGuard self(this);
-  tell(takeRelease(event));
-  if (self.isAlive() && double_tap_cb != nullptr && gesture.endedTap()) onTouchClickCount();
+  const TextTouch what = takeRelease(event);
+  tell(what);
+  if (what == TextTouch::Release && self.isAlive() && double_tap_cb != nullptr &&
+      gesture.isTapAwaited()) {
+    onTouchClickCount();
+  }
   kLog.print(LogLevel::Debug, "released!!");
 }
 

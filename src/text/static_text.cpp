@@ -172,8 +172,12 @@ void StaticText::onPress(event_data* event) {
 
 void StaticText::onRelease(event_data* event) {
   const LifeGuard self(this);
-  tell(takeRelease(event));
-  if (self.isAlive() && double_tap_cb != nullptr && gesture.endedTap()) onTouchClickCount();
+  const TextTouch what = takeRelease(event);
+  tell(what);
+  if (what == TextTouch::Release && self.isAlive() && double_tap_cb != nullptr &&
+      gesture.isTapAwaited()) {
+    onTouchClickCount();
+  }
   kViewerLog.print(LogLevel::Debug, "released!!");
 }
 

@@ -68,17 +68,17 @@ void TextPanel::restoreColor() {
 TextTouch TextPanel::takePress(const event_data& event) {
   ClassLog(word).print(LogLevel::Debug, "pressed!!");
   hold.press(event.mouse);
-  return gesture.press();
+  return TextTouch::Press;
 }
 
 TextTouch TextPanel::takeRelease(const event_data* event) {
   hold.letGo();
-  return gesture.release(isUnder(rect, event));
+  return isUnder(rect, event) ? TextTouch::Release : TextTouch::None;
 }
 
-TextTouch TextPanel::takeLongPress() {
+TextTouch TextPanel::takeLongPress() const {
   ClassLog(word).print(LogLevel::Debug, "long pressed!!");
-  return gesture.longPress();
+  return TextTouch::LongPress;
 }
 
 TextTouch TextPanel::takeTap() {

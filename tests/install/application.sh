@@ -22,7 +22,7 @@ path=-Wl,-rpath,$staged/$LIBRARIES
 
 for program in application/application by_pkg_config; do
   "$out/$program" "$out/empty.png" "$out/$(basename "$program").png"
-  ldd "$out/$program" | grep -q "libbrimol3_widget.so.$INTERFACE => $staged/" ||
+  grep -q "libbrimol3_widget.so.$INTERFACE => $staged/" <<<"$(ldd "$out/$program")" ||
     fail "$program does not run with the installed library."
 done
 cmp "$out/application.png" "$out/by_pkg_config.png"

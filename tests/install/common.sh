@@ -4,6 +4,8 @@ set -euo pipefail
 here=$SOURCE/tests/install
 staged=$WORK/moved
 
+# With pipefail a search that ends at its first find would fail the command that still writes, so what
+# a command prints is searched as `grep -q ... <<<"$(command)"`.
 fail() {
   echo "$*" >&2
   exit 1

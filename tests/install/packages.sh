@@ -7,7 +7,8 @@ cd "$WORK/packages"
 lintian --allow-root --fail-on error ./*.deb
 
 needs() {
-  dpkg-deb --field ./"$1"_*.deb Depends | grep -qE -- "(^|, )$2( |,|\$)" || fail "$1 does not need $2."
+  grep -qE -- "(^|, )$2( |,|\$)" <<<"$(dpkg-deb --field ./"$1"_*.deb Depends)" ||
+    fail "$1 does not need $2."
 }
 library=libbrimol3-widget$INTERFACE
 needs "$library" android-libutils
@@ -15,5 +16,6 @@ needs "$library" libsdl2-2.0-0
 needs "$library" fonts-roboto
 needs libbrimol3-widget-dev "$library"
 needs brimol3-widget-tools "$library"
-dpkg-deb --fsys-tarfile ./"$library"_*.deb | tar -xO "./usr/share/doc/$library/copyright" |
-  grep -q "not chosen a licence" || fail "The copyright file says nothing of a licence."
+dpkg-deb --extract ./"$library"_*.deb library
+grep -q "not chosen a licence" "library/usr/share/doc/$library/copyright" ||
+  fail "The copyright file says nothing of a licence."

@@ -4,6 +4,6 @@
 outer=$WORK/outer
 cmake -S "$here/outer" -B "$outer" "-DBRIMOL=$SOURCE" -DCMAKE_CXX_FLAGS="-g -O0"
 cmake --build "$outer" --parallel "$(nproc)"
-ctest --test-dir "$outer" -N | grep -q 'Total Tests: 0' || fail "The subdirectory registers tests."
+grep -q 'Total Tests: 0' <<<"$(ctest --test-dir "$outer" -N)" || fail "The subdirectory registers tests."
 cmake --install "$outer" --prefix "$WORK/outer_installed"
 [[ ! -d $WORK/outer_installed ]] || fail "The subdirectory installs files."

@@ -31,10 +31,8 @@ struct CutCase : Row {
 };
 constexpr auto kCuts = std::to_array<CutCase>({
     {"Empty", "", 4, "1|"},
-    {"EndOfTheLastLine", "a\nb\n", 4, "1a|2b|"},
     {"TwoEnds", "a\n\n", 4, "1a|2|"},
     {"ARowThatIsFull", "abcd\ne", 4, "1abcd|+|2e|"},
-    {"LongerThanARow", "abcdefg", 3, "1abc|+def|+g|"},
     {"DroppedBytes", "a\r\x02\x03z\r\n", 2, "1az|+|"},
     {"ACharacterThatDoesNotFit", "ab\xE2\x82\xAC!", 4, "1ab|+\xE2\x82\xAC!|+|"},
     {"ARowShorterThanACharacter", "\xE2\x82\xAC", 1, "1\xE2|+\x82|+\xAC|+|"},
@@ -64,14 +62,6 @@ TEST(TextLines, RowsGiveTheTextBack) {
     std::erase_if(text, [](char byte) { return byte == '\r' || byte == '\x02' || byte == '\x03'; });
     EXPECT_EQ(joined, text);
   }
-}
-
-TEST(TextLines, RowsAreFoundByTheirLines) {
-  const TextLines lines("ab\nc\nd", 2, 4);  // 1ab +  2c  3d
-  EXPECT_EQ(lines.find(2, 0, 4), 2);
-  EXPECT_EQ(lines.find(2, 3, 4), 4) << "not before where it begins";
-  EXPECT_EQ(lines.find(3, 0, 3), 3) << "not at the end";
-  EXPECT_EQ(lines.find(1, 5, 4), 4);
 }
 
 TEST(TextLines, NothingStandsBeyondTheRows) {

@@ -27,7 +27,9 @@ function showVerdict() {
   byId("verdict").classList.add(tones[session.verdict] || "warn");
   byId("badge").textContent = session.verdict;
   byId("headline").textContent = session.headline;
-  byId("detail").textContent = session.detail;
+  // What failed tells it once more, and in full.
+  const isToldBelow = session.failures.some((failure) => failure.why === session.detail);
+  byId("detail").textContent = isToldBelow ? "" : session.detail;
   byId("where").textContent = session.where;
   for (const [name, value] of session.facts) {
     byId("facts").append(make("div", {}, make("dt", {}, name), make("dd", {}, value)));

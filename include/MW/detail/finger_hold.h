@@ -7,6 +7,9 @@
 
 namespace MW {
 
+/// Who holds a widget, as one finger asks.
+enum class HeldBy { Nobody, ThisFinger, AnotherFinger };
+
 /// Records which finger holds a widget, in the widget's `select`, which event routing reads too: 0
 /// for none, else the finger's number + 1. Finger 0xFFFFFFFF therefore never holds. Safe on any
 /// thread.
@@ -23,15 +26,15 @@ class FingerHold {
   void letGo() { selection = 0; }
   bool isHeld() const { return selection != 0; }
   /// Whether this finger holds.
-  bool isOwner(const mouse_event& mouse) const {
+  bool isOwner(const mouse_event& mouse) const { return heldBy(mouse) == HeldBy::ThisFinger; }
+  /// Read once, so that the answer does not change halfway.
+  HeldBy heldBy(const mouse_event& mouse) const {
     const int holder = selection;
-    return holder != 0 && holder == wordOf(mouse);
+    if (holder == 0) return HeldBy::Nobody;
+    return holder == wordOf(mouse) ? HeldBy::ThisFinger : HeldBy::AnotherFinger;
   }
   /// Whether another finger than this one holds.
-  bool isOthers(const mouse_event& mouse) const {
-    const int holder = selection;
-    return holder != 0 && holder != wordOf(mouse);
-  }
+  bool isOthers(const mouse_event& mouse) const { return heldBy(mouse) == HeldBy::AnotherFinger; }
 
  private:
   std::atomic<int>& selection;
