@@ -4,7 +4,8 @@
 
 #include <bit>
 
-#include "support/drawings.h"
+#include "support/widget_test.h"
+#include "testkit/drawings.h"
 
 namespace {
 

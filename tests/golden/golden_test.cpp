@@ -14,7 +14,7 @@
 #include "scene/frame_sink.h"
 #include "scene/item.h"
 #include "scene/recorder.h"
-#include "support/records.h"
+#include "testkit/records.h"
 
 // What the library asks of a platform only when it opens a window or takes input.
 int EventInit(unsigned int) { return 0; }

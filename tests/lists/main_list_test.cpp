@@ -3,8 +3,8 @@
 
 #include <array>
 
-#include "support/drawings.h"
-#include "support/play.h"
+#include "support/play_test.h"
+#include "testkit/drawings.h"
 
 namespace {
 

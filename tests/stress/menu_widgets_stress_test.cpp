@@ -9,7 +9,8 @@
 #include <random>
 #include <thread>
 
-#include "support/drawings.h"
+#include "support/widget_test.h"
+#include "testkit/drawings.h"
 
 namespace {
 

@@ -1,7 +1,7 @@
 #include <MW/button8.h>
 
-#include "support/drawings.h"
-#include "support/play.h"
+#include "support/play_test.h"
+#include "testkit/drawings.h"
 
 namespace {
 

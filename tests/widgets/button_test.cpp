@@ -1,6 +1,6 @@
 #include <MW/button.h>
 
-#include "support/play.h"
+#include "support/play_test.h"
 
 namespace {
 

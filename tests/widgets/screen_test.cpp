@@ -1,6 +1,6 @@
 #include <MW/screen.h>
 
-#include "support/play.h"
+#include "support/play_test.h"
 
 namespace {
 

@@ -2,7 +2,7 @@
 
 #include <climits>
 
-#include "support/play.h"
+#include "support/play_test.h"
 
 namespace {
 

@@ -3,8 +3,8 @@
 #include <algorithm>
 #include <climits>
 
-#include "support/drawings.h"
-#include "support/play.h"
+#include "support/play_test.h"
+#include "testkit/drawings.h"
 
 namespace {
 

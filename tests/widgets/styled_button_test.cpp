@@ -1,7 +1,7 @@
 #include <MW/button_new.h>
 #include <MW/button_s.h>
 
-#include "support/play.h"
+#include "support/play_test.h"
 
 namespace {
 

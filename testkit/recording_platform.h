@@ -13,7 +13,7 @@
 #include <utility>
 #include <vector>
 
-#include "support/records.h"
+#include "testkit/records.h"
 
 namespace brimol::test {
 

@@ -8,13 +8,15 @@
 /// looked at stands in angle brackets.
 #pragma once
 
+#include <MW/window.h>
+
 #include <functional>
 #include <memory>
 #include <sstream>
 #include <string>
 #include <vector>
 
-#include "support/widget_test.h"
+#include "testkit/input.h"
 
 namespace brimol::test {
 
@@ -182,41 +184,6 @@ inline std::string played(const Maker& make, const Steps& steps, int deletingCal
   while (!journal.empty() && journal.back() == ' ') journal.pop_back();
   return journal;
 }
-
-/// Plays the steps once for each callback that they cause, which then deletes the widget: nothing
-/// is told after that.
-inline void expectCallbacksMayDelete(const Maker& make, const Steps& steps) {
-  played(make, steps);
-  for (int deleting = stage.calls; deleting > 0; --deleting) {
-    played(make, steps, deleting);
-    EXPECT_EQ(stage.calls, deleting) << "calls once the widget was deleted";
-  }
-}
-
-/// A row of a table of plays.
-struct Play : Row {
-  Maker make;
-  Steps steps;
-  std::string journal;
-};
-/// Makes rows of plays on one widget.
-struct PlaysOn {
-  Maker make;
-  Play operator()(const char* name, const Steps& steps, const char* journal) const {
-    return {name, make, steps, journal};
-  }
-};
-/// Plays a row, and again for each of its callbacks, which then deletes the widget.
-inline void expectJournal(const Play& play) {
-  EXPECT_EQ(played(play.make, play.steps), play.journal);
-  expectCallbacksMayDelete(play.make, play.steps);
-}
-/// The fixture of such a table:
-///
-///     using SlidePlays = PlayTest;
-///     TEST_P(SlidePlays, TellTheirJournal) { expectJournal(GetParam()); }
-///     INSTANTIATE_TEST_SUITE_P(, SlidePlays, testing::ValuesIn(kPlays), kRowName);
-class PlayTest : public WidgetTest, public testing::WithParamInterface<Play> {};
 
 /// What a widget's touch callbacks are called with: 0, or the finger's record.
 enum class Told { Zero, Touch };

@@ -1,4 +1,4 @@
-#include "support/recording_platform.h"
+#include "testkit/recording_platform.h"
 
 #include <android/log.h>
 #include <brimol/display.h>

@@ -8,7 +8,7 @@
 #include <climits>
 #include <sstream>
 
-#include "support/widget_test.h"
+#include "testkit/input.h"
 
 namespace brimol::test {
 
