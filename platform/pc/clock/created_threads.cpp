@@ -29,6 +29,7 @@ int runThread(void* data) {
   return start->entry(start->data);
 }
 
+// NOLINTNEXTLINE(readability-function-size): the parameters are the hook's
 int createThread(android_thread_func_t entry, void* data, const char* name, int32_t priority,
                  size_t stack, android_thread_id_t* thread) {
   const char* const shown = name == nullptr ? "" : name;

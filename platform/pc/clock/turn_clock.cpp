@@ -51,7 +51,10 @@ TurnClock::~TurnClock() {
   }
   keeperWakes.notify_one();
   keeper.join();
-  if (seat.id == id) seat = {};
+  if (seat.id == id) {
+    seat.clock = nullptr;
+    seat.id = 0;
+  }
   cpus.leave();
 }
 
@@ -141,7 +144,9 @@ void TurnClock::begin(Participant& announced) {
 
 void TurnClock::leave() {
   if (seat.id != id) return;
-  Participant& me = *std::exchange(seat, {}).place;
+  Participant& me = *seat.place;
+  seat.clock = nullptr;
+  seat.id = 0;
   const Lock lock = lockFor(me);
   me.state = Participant::State::Left;
   if (holder == &me) holder = nullptr;

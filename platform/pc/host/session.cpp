@@ -132,11 +132,12 @@ std::string Session::prepare() {
 }
 
 void Session::begin(Platform& platform) {
+  // Without the lock, which is taken while the log holds its own.
+  const bool isHeard = (!report && !runner) || watchLog(hearLog);
   const std::lock_guard lock(mutex);
   if (isOver || open != nullptr) return;
   open = &platform;
-  const bool wantsLog = report || runner;
-  if (wantsLog && !watchLog(hearLog) && report) {
+  if (!isHeard && report) {
     report->error(now(), "the log is not heard: link brimol_pc before the log's library", nullptr);
   }
 }

@@ -72,8 +72,8 @@ class Session {
   void startReport();
   TraceStage stage();
   std::optional<uint64_t> due(uint64_t soonest);
-  void act(uint64_t now);
-  void takeArrivals(uint64_t now);
+  void act(uint64_t moment);
+  void takeArrivals(uint64_t moment);
   void deliver(const Event& record);
   void askToClose();
   uint64_t now() const { return turns ? turns->now() : 0; }

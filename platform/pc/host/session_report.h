@@ -32,17 +32,17 @@ class SessionReport {
 
   void start(const SessionSettings& settings, Size screen, const char* display,
              uint32_t clockStart);
-  void step(uint64_t time, const TraceLine& line);
-  void event(uint64_t time, const Event& record, const TraceLine* line);
-  void close(uint64_t time, const TraceLine* line);
+  void step(uint64_t time, const TraceLine& place);
+  void event(uint64_t time, const Event& record, const TraceLine* place);
+  void close(uint64_t time, const TraceLine* place);
   /// `picture` is written beside the file; null: none.
   void frame(const SessionFrame& shown, Size screen, cairo_surface_t* picture, int64_t paintUs);
   void log(uint64_t time, int priority, const char* tag, const char* message);
-  void expectation(uint64_t time, const TraceLine& line, const std::string& why);
-  void shot(uint64_t time, const TraceLine& line, const std::string& picture);
+  void expectation(uint64_t time, const TraceLine& place, const std::string& why);
+  void shot(uint64_t time, const TraceLine& place, const std::string& picture);
   void world(uint64_t time, const std::string& name, const std::string& value);
   void blocked(uint64_t time, const std::string& name, pid_t thread);
-  void error(uint64_t time, const std::string& message, const TraceLine* line);
+  void error(uint64_t time, const std::string& message, const TraceLine* place);
   void end(uint64_t time, int exitCode, const char* reason);
 
   const std::filesystem::path& directory() const { return folder; }

@@ -159,7 +159,7 @@ TraceRunner::Outcome TraceRunner::attempt(const Typing& typing, uint64_t now) {
   lookUntil = std::nullopt;
   planTouch({.kind = Touch::Kind::Tap, .place = {}, .to = {}, .duration = kTapMs, .finger = 0},
             *place, *place, now);
-  plan(now + 2 * kTapMs, [](uint64_t) {});
+  plan(now + uint64_t{2} * kTapMs, [](uint64_t) {});
   return Outcome::Later;
 }
 
@@ -215,17 +215,17 @@ TraceRunner::Outcome TraceRunner::attempt(const Shot& shot, uint64_t) {
   return Outcome::Done;
 }
 
-TraceRunner::Outcome TraceRunner::attempt(const WorldChange& change, uint64_t) {
+TraceRunner::Outcome TraceRunner::attempt(const WorldChange& change, uint64_t) const {
   stage.changeWorld(change);
   return Outcome::Done;
 }
 
-TraceRunner::Outcome TraceRunner::attempt(const RawRecord& raw, uint64_t) {
+TraceRunner::Outcome TraceRunner::attempt(const RawRecord& raw, uint64_t) const {
   stage.post(raw.record);
   return Outcome::Done;
 }
 
-TraceRunner::Outcome TraceRunner::attempt(const CloseWish&, uint64_t) {
+TraceRunner::Outcome TraceRunner::attempt(const CloseWish&, uint64_t) const {
   stage.close();
   return Outcome::Done;
 }

@@ -17,6 +17,7 @@ namespace brimol::pc {
 namespace {
 
 constexpr std::size_t kMostIncludes = 16;  // one in the other
+constexpr int kMostFiles = 10'000;
 constexpr uint64_t kMostTime = uint64_t{1} << 40;
 constexpr uint64_t kMostItems = 65536;
 constexpr std::size_t kHashDigits = 16;
@@ -37,20 +38,21 @@ class TraceParser {
   TraceParser(Trace& target, const TraceFiles& source) : trace(target), files(source) {}
 
   /// The error, or an empty text.
-  std::string read(const std::string& path) {
-    const std::optional<std::string> text = files(path);
-    if (!text) return path + ":1: cannot be read";
-    open.push_back(path);
-    std::string error = readLines(path, *text);
-    open.pop_back();
-    return error;
-  }
-
-  /// What can be said only once all is read.
-  std::string finish();
+  std::string read(const std::string& path);
 
  private:
-  std::string readLines(const std::string& path, std::string_view text);
+  // A file that is being read. What is left of it are the bytes from `place` on.
+  struct OpenFile {
+    std::string path;
+    std::string text;
+    std::size_t place = 0;
+    int lines = 0;
+  };
+
+  bool begin(const std::string& path);
+  bool takeLine(TraceLine& line);
+  std::string readOne(const TraceLine& line);
+  std::string finish();
   void readLine(const TraceLine& line);
   void readHeader(const TraceLine& line);
   void readItem(const TraceLine& line);
@@ -62,32 +64,56 @@ class TraceParser {
 
   Trace& trace;
   const TraceFiles& files;
-  std::vector<std::string> open;  // the files that are being read, the outermost first
-  std::string errorInside;        // of an included file
-  bool hasItems = false;          // of the newest frame
+  std::vector<OpenFile> open;  // each is included by the one before
+  int filesRead = 0;
+  bool hasItems = false;  // of the newest frame
   bool hasEnd = false;
   std::string lastLine;
 };
 
-std::string TraceParser::readLines(const std::string& path, std::string_view text) {
-  TraceLine line = {path, 0, {}};
-  while (!text.empty() || line.number == 0) {
-    const std::size_t end = text.find('\n');
-    const bool isCut = end == std::string_view::npos;
-    const std::string_view written = text.substr(0, end);
-    text = isCut ? std::string_view() : text.substr(end + 1);
-    ++line.number;
-    line.text = trimmed(written);
-    if (isCut && trace.isRecording && line.number > 1)
-      break;  // the crash came while it was written
-    try {
-      line.number == 1 ? readHeader(line) : readLine(line);
-    } catch (const BadLine& bad) {
-      if (!errorInside.empty()) return errorInside;
-      return path + ":" + std::to_string(line.number) + ": " + bad.why;
+std::string TraceParser::read(const std::string& path) {
+  if (!begin(path)) return path + ":1: cannot be read";
+  while (!open.empty()) {
+    TraceLine line;
+    if (!takeLine(line)) {
+      open.pop_back();
+    } else if (std::string error = readOne(line); !error.empty()) {
+      return error;
     }
-    lastLine = path + ":" + std::to_string(line.number);
   }
+  return finish();
+}
+
+bool TraceParser::begin(const std::string& path) {
+  std::optional<std::string> text = files(path);
+  if (text) open.push_back({path, std::move(*text)});
+  ++filesRead;
+  return text.has_value();
+}
+
+// The next line of the innermost file; an empty file has one. False at its end.
+bool TraceParser::takeLine(TraceLine& line) {
+  OpenFile& file = open.back();
+  if (file.place >= file.text.size() && file.lines > 0) return false;
+  const std::size_t end = file.text.find('\n', file.place);
+  const bool isCut = end == std::string::npos;
+  // The crash came while the line was written.
+  if (isCut && trace.isRecording && file.lines > 0) return false;
+  const std::string_view written =
+      std::string_view(file.text).substr(file.place, isCut ? end : end - file.place);
+  line = {file.path, ++file.lines, std::string(trimmed(written))};
+  file.place = isCut ? file.text.size() : end + 1;
+  return true;
+}
+
+std::string TraceParser::readOne(const TraceLine& line) {
+  const std::string place = line.file + ":" + std::to_string(line.number);
+  try {
+    line.number == 1 ? readHeader(line) : readLine(line);
+  } catch (const BadLine& bad) {
+    return place + ": " + bad.why;
+  }
+  lastLine = place;
   return {};
 }
 
@@ -194,11 +220,12 @@ bool TraceParser::readSetting(const TraceLine& line, TraceWords& words) {
 
 void TraceParser::include(const TraceLine& line, const std::string& file) {
   const std::string path = (std::filesystem::path(line.file).parent_path() / file).native();
-  if (std::ranges::count(open, path) != 0) throw BadLine{"'" + file + "' includes itself"};
-  if (open.size() >= kMostIncludes) throw BadLine{"too many files that include each other"};
-  if (!files(path)) throw BadLine{"'" + path + "' cannot be read"};
-  errorInside = read(path);
-  if (!errorInside.empty()) throw BadLine{};
+  if (std::ranges::count(open, path, &OpenFile::path) != 0)
+    throw BadLine{"'" + file + "' includes itself"};
+  if (open.size() >= kMostIncludes || filesRead >= kMostFiles) {
+    throw BadLine{"too many files are included"};
+  }
+  if (!begin(path)) throw BadLine{"'" + path + "' cannot be read"};
 }
 
 void TraceParser::readTimed(const TraceLine& line, TraceWords& words) {
@@ -242,7 +269,6 @@ ParsedTrace parseTrace(const std::string& path, const TraceFiles& files) {
   ParsedTrace parsed;
   TraceParser parser(parsed.trace, files);
   parsed.error = parser.read(path);
-  if (parsed.error.empty()) parsed.error = parser.finish();
   return parsed;
 }
 

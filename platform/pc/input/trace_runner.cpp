@@ -202,16 +202,18 @@ void TraceRunner::missFrames(uint64_t now) {
 std::string differenceOf(const std::vector<std::string>& recorded,
                          const std::vector<std::string>& played) {
   std::string text;
+  const auto add = [&text](const char* mark, std::size_t number, const std::string& item) {
+    text.append(mark).append(std::to_string(number)).append(" ").append(item).append("\n");
+  };
   for (std::size_t i = 0; i < std::max(recorded.size(), played.size()); ++i) {
-    const std::string was = i < recorded.size() ? recorded[i] : "";
-    const std::string is = i < played.size() ? played[i] : "";
-    const std::string number = std::to_string(i) + ' ';
-    if (was == is) {
-      text += "    " + number + is + '\n';
+    const bool isRecorded = i < recorded.size();
+    const bool isPlayed = i < played.size();
+    if (isRecorded && isPlayed && recorded[i] == played[i]) {
+      add("    ", i, played[i]);
       continue;
     }
-    if (i < recorded.size()) text += "  - " + number + (was.empty() ? "(not known)" : was) + '\n';
-    if (i < played.size()) text += "  + " + number + is + '\n';
+    if (isRecorded) add("  - ", i, recorded[i].empty() ? "(not known)" : recorded[i]);
+    if (isPlayed) add("  + ", i, played[i]);
   }
   return text;
 }

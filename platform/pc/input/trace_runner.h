@@ -82,9 +82,9 @@ class TraceRunner {
   Outcome attempt(const Look& look, uint64_t now);
   Outcome attempt(const Pause& pause, uint64_t now);
   Outcome attempt(const Shot& shot, uint64_t now);
-  Outcome attempt(const WorldChange& change, uint64_t now);
-  Outcome attempt(const RawRecord& raw, uint64_t now);
-  Outcome attempt(const CloseWish& wish, uint64_t now);
+  Outcome attempt(const WorldChange& change, uint64_t now) const;
+  Outcome attempt(const RawRecord& raw, uint64_t now) const;
+  Outcome attempt(const CloseWish& wish, uint64_t now) const;
   Outcome attempt(const SessionEnd& end, uint64_t now);
 
   Outcome lookAgainUntil(uint64_t deadline, uint64_t now, const std::string& why);

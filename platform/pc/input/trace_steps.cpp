@@ -217,6 +217,10 @@ constexpr auto kSteps = std::to_array<StepRow>({
     {"keyup", readKeyRecord<BRIMOL_KEY_UP>},
 });
 
+[[noreturn]] void refuseTime(const std::string& text) {
+  throw BadLine{"'" + text + "' is not a time as 2026-11-22T10:00:00.000Z"};
+}
+
 }  // namespace
 
 TraceStep::Action readStep(TraceWords& words) {
@@ -231,20 +235,19 @@ TraceStep::Action readStep(TraceWords& words) {
 uint64_t readUtc(const std::string& text) {
   constexpr uint64_t kSecond = 1000;
   constexpr std::size_t kFractionBytes = 5;  // ".000Z"
-  const BadLine wrong = {"'" + text + "' is not a time as 2026-11-22T10:00:00.000Z"};
   std::tm parts = {};
   const char* const rest = ::strptime(text.c_str(), "%Y-%m-%dT%H:%M:%S", &parts);
   const std::time_t seconds = rest == nullptr ? -1 : ::timegm(&parts);
-  if (seconds < 0) throw wrong;
+  if (seconds < 0) refuseTime(text);
   const uint64_t whole = static_cast<uint64_t>(seconds) * kSecond;
   std::string written = utcText(whole);
   if (text == written.erase(written.size() - kFractionBytes) + "Z") return whole;
   std::string fraction = rest;
-  if (fraction.size() != kFractionBytes || !fraction.ends_with('Z')) throw wrong;
+  if (fraction.size() != kFractionBytes || !fraction.ends_with('Z')) refuseTime(text);
   fraction.pop_back();
   const uint64_t ms =
       whole + TraceWords(fraction.substr(1)).number("a part of a second", kSecond - 1);
-  if (text != utcText(ms)) throw wrong;
+  if (text != utcText(ms)) refuseTime(text);
   return ms;
 }
 

@@ -39,7 +39,7 @@ std::string_view insideOf(std::string_view text) { return text.substr(1, text.si
 
 std::string plainText(std::string_view inside) {
   const auto text = unescaped(inside);
-  if (!text) throw BadLine{"a text with an escape other than \\\" \\\\ \\n \\t \\* and \\xHH"};
+  if (!text) throw BadLine{R"(a text with an escape other than \" \\ \n \t \* and \xHH)"};
   return *text;
 }
 

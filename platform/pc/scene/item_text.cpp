@@ -36,7 +36,11 @@ std::string figureText(const SKIA_Item& item) {
   switch (figureOf(item)) {
     case Figure::Text:
       return ' ' + inQuotes(shownText(text)) + numbers(text.size, text.align) + colour(text.color);
-    case Figure::Picture: return ' ' + inQuotes(shownText(text));
+    // Without its folder, which is another one on another machine.
+    case Figure::Picture: {
+      const std::string_view name = shownText(text);
+      return ' ' + inQuotes(name.substr(name.rfind('/') + 1));
+    }
     case Figure::Line:
       return numbers(line.x1, line.y1, line.x2, line.y2, line.width) + colour(line.color);
     case Figure::Arrow: return (line.width == 0 ? " right" : " left") + colour(line.color);

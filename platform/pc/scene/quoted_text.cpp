@@ -54,7 +54,7 @@ std::string inQuotes(std::string_view text) {
     if (row != kEscapes.end() && each != '*') {
       out.append({'\\', row->letter});
     } else if (isControl(each)) {
-      const auto byte = static_cast<std::size_t>(each);
+      const auto byte = static_cast<unsigned char>(each);
       out.append({'\\', 'x', kHexDigits[byte / kHexBase], kHexDigits[byte % kHexBase]});
     } else {
       out += each;

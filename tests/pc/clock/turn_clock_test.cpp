@@ -22,15 +22,19 @@ TEST(ThreadLook, ReadsTheKernelsText) {
   EXPECT_EQ(stateOf("0 0x3 0x7ffe 0x10"), ThreadState::Outside);
 }
 
-/// What threads do and when, in the order in which they did it. Only who has the turn writes.
+/// What threads do and when, in the order in which they did it.
 class Journal {
  public:
   explicit Journal(TurnClock& turns) : clock(turns) {}
-  void add(const std::string& who) { text += std::to_string(clock.now()) + who + " "; }
-  std::string text;
+  void add(const std::string& who) {
+    const std::lock_guard lock(mutex);
+    text += std::to_string(clock.now()) + who + " ";
+  }
+  std::string text;  // guarded by the mutex until the threads have ended
 
  private:
   TurnClock& clock;
+  std::mutex mutex;
 };
 
 /// Takes part as a thread of the phone's class does.
