@@ -1,22 +1,23 @@
-#!/ usr / bin / env bash
-#Builds and tests everything : scripts / test.sh, \
-    or only the suites named : scripts / test.sh asan tidy
+#!/usr/bin/env bash
+# Builds and tests everything: scripts/test.sh, or only the suites named: scripts/test.sh asan tidy
 #
-#release the unit, thread and end - to - end tests, optimised
-#asan the same under the address and undefined - behaviour sanitizers
-#tsan the same under the thread sanitizer
-#phone the library alone, without the PC platform
-#tidy formatting everywhere, clang - tidy over what is shipped
-set -
-        euo pipefail cd "$(dirname " $0 ")/.."
+#   release  the unit, thread and end-to-end tests, optimised
+#   asan     the same under the address and undefined-behaviour sanitizers
+#   tsan     the same under the thread sanitizer
+#   phone    the library alone, without the PC platform
+#   tidy     formatting everywhere, clang-tidy over what is shipped
+set -euo pipefail
+cd "$(dirname "$0")/.."
 
-        if command -
-        v ccache >
-    / dev / null;
-then export CMAKE_C_COMPILER_LAUNCHER = ccache CMAKE_CXX_COMPILER_LAUNCHER = ccache fi
+if command -v ccache >/dev/null; then
+  export CMAKE_C_COMPILER_LAUNCHER=ccache CMAKE_CXX_COMPILER_LAUNCHER=ccache
+fi
 
-build(){echo "== Building $1 in build/$1" cmake-- preset
-        "$1" > / dev / null cmake-- build-- preset "$1"}
+build() {
+  echo "== Building $1 in build/$1"
+  cmake --preset "$1" >/dev/null
+  cmake --build --preset "$1"
+}
 
 run_suite() {
   case $1 in

@@ -19,7 +19,8 @@ void ask(const char* name, std::string& figure) {
 
 std::chrono::sys_seconds presentTime() {
   const std::chrono::milliseconds since1970(brimol_host_utc_ms());
-  return std::chrono::floor<std::chrono::seconds>(std::chrono::sys_time<std::chrono::milliseconds>(since1970));
+  return std::chrono::floor<std::chrono::seconds>(
+      std::chrono::sys_time<std::chrono::milliseconds>(since1970));
 }
 
 MachineFigures presentFigures() {

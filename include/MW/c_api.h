@@ -20,7 +20,7 @@ MW_API int isDisplayUpdate_c(int set);
 MW_API int isFirstFinger_c(const mw_event_data* event);
 /// Raises the redraw flag, whatever `value`, and returns 0. No event is queued.
 MW_API int EventService_AppEvent_c(int value);
-/// Tests and clears the redraw flag. No event is taken.
+/// Tests and clears the redraw flag: 1 when it was raised, else 0. No event is taken.
 MW_API int EventService_GetEvent_c(void);
 
 #ifdef __cplusplus

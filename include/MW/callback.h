@@ -18,9 +18,9 @@ namespace MW {
 /// understand. Calling a null word does nothing.
 ///
 /// A word may be assigned on any thread at any time, also while its widget is active: a handler
-/// calls the function before or the function after the assignment. The function before may still
-/// run when the assignment returns. Only copies of a const or temporary word, and words that are
-/// made as copies, are plain: no other thread may assign or call the two meanwhile.
+/// calls either the old or the new function, and the old one may still be running when the
+/// assignment returns. Making a new word as a copy is not atomic: nobody may assign the copied word
+/// meanwhile.
 class Callback {
  public:
   constexpr Callback() = default;
@@ -55,9 +55,9 @@ class Callback {
     store(source);
     return *this;
   }
-  // From a word that is const, as in a record, or temporary: a plain copy.
-  Callback& operator=(const Callback&) = default;
-  Callback& operator=(Callback&&) = default;
+  // Trivial, and so the word is trivially copyable. No word that has a name can be its target:
+  // there every source comes to the template.
+  Callback& operator=(const Callback&) && = delete;
 
   explicit operator bool() const { return load() != nullptr; }
 

@@ -21,8 +21,8 @@ class MW_API EventService {
   EventService(const EventService&) = delete;
   EventService& operator=(const EventService&) = delete;
 
-  /// What the constructor and the destructor do. 1; startEvent() 0 after an error line when the
-  /// thread could not be created.
+  /// What the constructor and the destructor call. Both return 1; startEvent() returns 0, after an
+  /// error line, when the thread could not be created.
   static int startEvent();
   static int stopEvent();
   /// 1 until the destructor begins. Any thread.
@@ -33,9 +33,9 @@ class MW_API EventService {
   void sendEvent(const Event* event);
   /// Fills `data` from the platform's record. A type that is not known gives kEventUnknown.
   static void parseEvent(const Event* event, event_data* data);
-  /// Queues a block from malloc. It belongs to the queue from here on: recvEvent() frees it.
-  /// Without memory to queue it, it is freed at once and a line is logged. Null is ignored. Any
-  /// thread.
+  /// Queues a block from malloc, which recvEvent() frees. A block still queued when the service
+  /// ends is freed by nobody. Without memory to queue it, it is freed at once and a line is logged.
+  /// Null is ignored. Any thread.
   void saveQueue(event_data* data);
   /// Queues an application event (code 6) that carries `value`. As for sendEvent. Any thread.
   void AppEvent(int value);

@@ -59,7 +59,7 @@ class MW_API Widget {
   /// must not be kept beyond the call. The second argument is 0.
   virtual bool onRecvEvent(event_data* event, unsigned int arg);
 
-  // For the application. Which of them a class has, its header says.
+  // For the application. Each class's header says which of them it has.
 
   /// The widget's text, in its own record: valid while the widget lives. Read it on the thread
   /// that sets it.
@@ -102,9 +102,9 @@ class MW_API Widget {
   virtual void setMsg(const char* message);
   /// A part of onRecvEvent(): a tap ended, which may be the second of two.
   virtual void onTouchClickCount();
-  /// No class of the toolkit has it.
+  /// No class of the toolkit overrides it.
   virtual int setTimer(int ms);
-  // Parts of onRecvEvent() again. No class of the toolkit has the first two.
+  // Parts of onRecvEvent() again. No class of the toolkit overrides the first two.
   virtual void onPressKey(kbd_event* key);
   virtual void onReleaseKey(kbd_event* key);
   virtual void onPlugKey(kbd_event key);
@@ -124,8 +124,8 @@ class MW_API Widget {
   virtual void setDesc(const char* line1, const char* line2, const char* line3, int align);
   virtual void setbutton(const char* caption1, const char* caption2);
 
-  /// Any value but 0 makes the widget active; 0 also unselects it, so that it lets go of a finger.
-  /// Any thread.
+  /// Any value but 0 makes the widget active; 0 makes it inactive and unselects it, so that it lets
+  /// go of a finger. Any thread.
   void setActive(int on);
   bool isActive() const { return active; }
   /// Non-zero: selected; in the base layer it is offered events before the others, and while it is

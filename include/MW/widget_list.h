@@ -9,8 +9,8 @@
 namespace MW {
 
 /// Up to 128 display items, addressed by the index that addQueue handed out. Static members only;
-/// one thread uses them. Before init(), addQueue and getSlot answer kNotInitialised, index2slot and
-/// findEmpty look through the table, all others answer 0; nothing is changed.
+/// one thread uses them. Before init(), addQueue() and getSlot() return kNotInitialised; the
+/// operations that draw or change items return 0 and do nothing.
 class MW_API WidgetList {
  public:
   static constexpr int kSlots = 128;

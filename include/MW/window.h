@@ -19,21 +19,29 @@ class Widget;
 class MW_API Window {
  public:
   /// Starts input and the dispatch thread. Returns 1, or 0 after an error line when there is no
-  /// memory or a thread could not be created; input may run already and does so until destroy(). A
-  /// second call before destroy() changes nothing and returns 1. Any thread: a call waits while
-  /// another thread is inside init() or destroy().
+  /// memory or the dispatch thread could not be created; input may run already and does so until
+  /// destroy(). Without memory or a thread for input it logs an error line and returns 1, and no
+  /// input comes. A second call before destroy() changes nothing and returns 1. Any thread: a call
+  /// waits while another thread is inside init() or destroy(); in a handler it returns 0 instead,
+  /// after an error line.
   static int init();
   /// Stops the dispatch thread and then input, and waits for both. Returns 1. The widgets stay as
   /// they are. Any thread: a call waits while another thread is inside init() or destroy().
   ///
-  /// A handler or callback may call it, too, but waits for no other thread, which might be waiting
-  /// for that handler. On the dispatch thread everything ends but that thread, which ends after its
-  /// callback. In a drawing or timer pass the dispatch thread is told to end, and an error line
-  /// says that the rest is left: the next init() or destroy() outside handlers does it, and until
-  /// then init() in a handler returns 0 after an error line. While another thread is inside init()
-  /// or destroy(), the call does nothing but log that line.
+  /// It may also be called in a handler or callback. There it waits for no thread that runs
+  /// handlers, since that thread might be waiting for this very handler. On the dispatch thread
+  /// everything ends but that thread, which ends after its callback. An init() in the same callback
+  /// starts a new dispatch thread at once, whose handlers may run beside the rest of the callback;
+  /// a later destroy() waits for the new thread alone.
+  ///
+  /// In a handler of a drawing or timer pass, or of a dispatch thread that init() has replaced, it
+  /// only tells the dispatch thread to end and logs an error line; a later init() or destroy(),
+  /// outside handlers or on the dispatch thread, does the rest. In other handlers init() returns 0
+  /// until then. If another thread is inside init() or destroy(), a handler's destroy() only logs
+  /// that line; after an init() the window runs on, and needs another destroy() to end.
   static int destroy();
-  /// The running event service; null before init() and after destroy().
+  /// The running event service; null before init() and after destroy(). Valid until destroy()
+  /// begins; no thread may use it from then on.
   static EventService* getEventService();
 
   /// Appends the widget to the layer that its type() names (0 top, 1 base) and sets its id to the

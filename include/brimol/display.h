@@ -1,4 +1,4 @@
-/* What the platform tells of its display. */
+/* What the platform tells about its display. */
 #pragma once
 
 #ifdef __cplusplus

@@ -12,7 +12,7 @@ extern "C" {
 #endif
 #pragma GCC visibility push(default)
 
-/* What an input record tells; any other value is one that the toolkit does not know. */
+/* The kind of an input record; the toolkit ignores any other value. */
 enum BrimolEventType {
   BRIMOL_KEY_DOWN = 2,
   BRIMOL_KEY_UP = 3,

@@ -39,7 +39,7 @@ typedef struct SKIA_Point {
 
 enum { SKIA_TEXT_BYTES = 128 };
 
-/* Where a text stands in its rectangle; any other code is left. */
+/* Where a text stands in its rectangle; any other code means left. */
 enum SKIA_Align { SKIA_ALIGN_LEFT = 1, SKIA_ALIGN_RIGHT = 2, SKIA_ALIGN_CENTRE = 5 };
 
 /* A text of at most 127 bytes of UTF-8 and a NUL. */
@@ -74,7 +74,7 @@ typedef struct SKIA_Item {
   SKIA_Text text;
 } SKIA_Item;
 
-/* What is drawn is read by its layout, also across languages. */
+/* Other languages and the platform rely on these layouts. */
 BRIMOL_STATIC_ASSERT(sizeof(SKIA_Rect) == 20 && offsetof(SKIA_Rect, x) == 0 &&
                          offsetof(SKIA_Rect, y) == 4 && offsetof(SKIA_Rect, w) == 8 &&
                          offsetof(SKIA_Rect, h) == 12 && offsetof(SKIA_Rect, color) == 16,
@@ -110,7 +110,7 @@ int skia_add_arrow_c(SKIA_Rect rect, SKIA_Point direction);
  */
 int skia_add_widget_c(const SKIA_Item* item);
 
-/* Non-zero while the display takes part in input: what is false for a dark display. */
+/* Non-zero while the display accepts input; 0, for instance, while it is dark. */
 int skia_live_widget_c(void);
 
 #pragma GCC visibility pop

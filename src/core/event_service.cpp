@@ -24,7 +24,8 @@ constexpr int kProbeDistance = 20;  // pixels
 constinit std::mutex EvtQL;  // the queue lock
 constinit event_data handedOut = {};
 
-// Null until startEvent; the thread that creates and deletes the service alone touches it.
+// Null until startEvent. Whoever creates and deletes the service touches it, one thread at a time:
+// Window's lock sees to that.
 android::sp<func_eventLoop> thread_event;
 
 struct Free {

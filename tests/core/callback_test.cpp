@@ -10,13 +10,6 @@ namespace {
 
 using MW::Callback;
 
-// Records of words are copied as bytes.
-struct Record {
-  Callback first = {};
-  Callback second = {};
-};
-static_assert(std::is_trivially_copyable_v<Record>);
-
 std::string told;
 void tell(int value) { told += std::to_string(value); }
 
@@ -75,6 +68,9 @@ TEST(CallbackTest, IsAssignedWhileAnotherThreadCallsIt) {
     Callback next;
     word = next = [](int) { ++other; };
     word = next;
+    const Callback last = next;
+    word = last;
+    word = Callback(next);
   }
   EXPECT_EQ(first + other, kCalls);
 }

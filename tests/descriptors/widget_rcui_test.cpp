@@ -111,8 +111,9 @@ TEST_F(WidgetRcuiTest, FiveTextsAreThereByTheirLengths) {
 }
 
 TEST_F(WidgetRcuiTest, GivesTheCallbacks) {
-  const std::array<std::uintptr_t, 15> given = {1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11, 12, 13, 14, 15};
-  callbacks = std::bit_cast<MW::ref_cb_t>(given);
+  const auto word = [](std::uintptr_t number) { return std::bit_cast<MW::Callback>(number); };
+  callbacks = {word(1), word(2),  word(3),  word(4),  word(5),  word(6),  word(7), word(8),
+               word(9), word(10), word(11), word(12), word(13), word(14), word(15)};
   ref.kind = MW::kRcuiKey;
   MW::WidgetRcui built(&ref, &callbacks, 0);
   const MW::Widget& w = *built.getPointer();
@@ -123,7 +124,9 @@ TEST_F(WidgetRcuiTest, GivesTheCallbacks) {
       w.callbackWord17, w.callbackWord18, w.leftCallback, w.rightCallback, w.exitCallback};
   const std::array<std::uintptr_t, 22> expected = {1, 15, 2, 3, 4, 5, 8, 9, 14, 11, 12, 5, 6, 6, 7, 13, 5, 6, 7, 6, 7, 6};
   // clang-format on
-  EXPECT_EQ((std::bit_cast<std::array<std::uintptr_t, 22>>(copied)), expected);
+  for (std::size_t i = 0; i < expected.size(); ++i) {
+    EXPECT_EQ(std::bit_cast<std::uintptr_t>(copied[i]), expected[i]) << "word " << i;
+  }
   ref.cbIndex = 0;
   MW::WidgetRcui silent(&ref, &callbacks, 0);
   EXPECT_FALSE(silent.getPointer()->pressCallback);
