@@ -61,7 +61,7 @@ double runFor(std::chrono::seconds time, const Variables& variables) {
 
 std::string writeTrace(const std::string& steps) {
   fs::create_directories(kFolder);
-  const std::string path = kFolder / "bench.trace";
+  std::string path = kFolder / "bench.trace";
   std::ofstream(path) << "brimol-trace 1\n" << steps;
   return path;
 }
@@ -87,7 +87,7 @@ void replayedFrames(benchmark::State& state) {
   int frames = 0;
   std::ifstream lines(report / "session.jsonl");
   for (std::string line; std::getline(lines, line);) {
-    if (line.find("\"kind\":\"frame\"") != std::string::npos) ++frames;
+    if (line.find(R"("kind":"frame")") != std::string::npos) ++frames;
   }
   for ([[maybe_unused]] auto round : state) run({{"BRIMOL_TRACE", trace}});
   state.counters["frames_per_second"] =

@@ -18,6 +18,7 @@ Program::Program(const std::filesystem::path& folder, const Variables& variables
                  std::vector<std::string> arguments) {
   arguments.insert(arguments.begin(), FACTORY_TEST);
   std::vector<char*> words;
+  words.reserve(arguments.size() + 1);
   for (std::string& each : arguments) words.push_back(each.data());
   words.push_back(nullptr);
   process = ::fork();

@@ -13,8 +13,10 @@ struct TurnClock::Participant {
   State state = State::Waiting;
   uint64_t wake = 0;  // when its pause ends
   bool isPoller = false;
-  bool isOutside = false;  // away, and named as one that blocks outside
-  int calls = 0;           // since its pause; the thread's own
+  bool polls = false;         // away, and looks again and again whether it can go on
+  uint64_t sleepsBefore = 0;  // of one that polls, as the clock last looked
+  bool isOutside = false;     // away, and named as one that blocks outside
+  int calls = 0;              // since its pause; the thread's own
   std::atomic<bool> waitsInside = false;
   std::atomic<bool> arrives = false;                // waits for the clock's lock, or is about to
   std::chrono::steady_clock::time_point runsSince;  // away, and seen running

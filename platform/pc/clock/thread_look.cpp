@@ -46,6 +46,15 @@ ThreadState lookAt(pid_t thread) {
   return fs::exists(folderOf(thread), failure) ? stateByLetter(thread) : ThreadState::Gone;
 }
 
+uint64_t sleepsOf(pid_t thread) {
+  constexpr std::string_view kName = "voluntary_ctxt_switches:";
+  std::ifstream file(folderOf(thread) / "status");
+  for (std::string line; std::getline(file, line);) {
+    if (line.starts_with(kName)) return std::stoull(line.substr(kName.size()));
+  }
+  return 0;
+}
+
 std::vector<pid_t> threadsOfProcess() {
   std::vector<pid_t> threads;
   std::error_code failure;

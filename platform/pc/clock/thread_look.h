@@ -3,6 +3,7 @@
 
 #include <sys/types.h>
 
+#include <cstdint>
 #include <string_view>
 #include <vector>
 
@@ -19,6 +20,9 @@ enum class ThreadState {
 ThreadState stateOf(std::string_view syscallText);
 
 ThreadState lookAt(pid_t thread);
+
+/// How often the thread has gone to sleep by itself so far; 0 where that cannot be told.
+uint64_t sleepsOf(pid_t thread);
 
 /// All threads that the process has at the moment.
 std::vector<pid_t> threadsOfProcess();

@@ -159,6 +159,7 @@ void TurnClock::pause(Participant& me, uint32_t ms) {
   me.wake = time + ms;
   me.isAtWork = false;
   me.state = Participant::State::Waiting;
+  me.polls = false;
   if (me.isOutside) takeBack(me);
   if (holder == &me) holder = nullptr;
   if (holder == nullptr) passOn(lock);

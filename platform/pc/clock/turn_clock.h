@@ -109,6 +109,8 @@ class TurnClock {
   void actAsAgent(Lock& lock, uint64_t due);
   void settle(Lock& lock);
   static bool isUnsettled(Participant& away);
+  static bool isStillToPoll(Participant& away);
+  bool seemsToPoll(Participant& watched);
   void dropGone();
   void keep();
   void watchHolder(Lock& lock);
@@ -138,6 +140,7 @@ class TurnClock {
   // What the keeper saw of the thread that has the turn.
   uint64_t watchedTurn = 0;
   int looksOnThread = 0;
+  int looksPolling = 0;
   std::chrono::steady_clock::time_point blockedSince;
 
   std::thread keeper;  // hands on the turn where no thread does, and watches the one that has it

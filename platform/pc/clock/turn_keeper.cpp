@@ -16,13 +16,19 @@ using std::chrono::steady_clock;
 constexpr std::chrono::milliseconds kLookPause{1};
 constexpr std::chrono::microseconds kSettlePause{30};
 constexpr std::chrono::seconds kBlockedBound{2};
-constexpr int kLooksOnThread = 2;  // in a row, before a thread counts as blocked
+constexpr int kLooksOnThread = 2;    // in a row, before a thread counts as blocked
+constexpr int kLooksPolling = 4;     // in a row, before it counts as one that polls
+constexpr uint64_t kPollSleeps = 3;  // between two looks
+constexpr uint64_t kSureSleeps = 2;  // so many later a thread that polls has looked once more
 
 }  // namespace
 
 // Threads that are away and run are on their way to their next call; a thread that left wakes
 // whoever waits for its end. Both come first, however long the machine takes.
 void TurnClock::settle(Lock& lock) {
+  for (Participant& each : participants) {
+    if (each.polls) each.sleepsBefore = sleepsOf(each.thread);
+  }
   while (!isOver) {
     dropGone();
     if (std::ranges::none_of(participants, isUnsettled)) return;
@@ -36,6 +42,7 @@ void TurnClock::settle(Lock& lock) {
 bool TurnClock::isUnsettled(Participant& away) {
   if (away.state == Participant::State::Left) return true;
   if (away.state != Participant::State::Away) return false;
+  if (away.polls) return isStillToPoll(away);
   if (lookAt(away.thread) != ThreadState::Running) {
     if (away.arrives) return true;
     away.runsSince = {};
@@ -44,6 +51,20 @@ bool TurnClock::isUnsettled(Participant& away) {
   const auto now = steady_clock::now();
   if (away.runsSince == steady_clock::time_point()) away.runsSince = now;
   return now - away.runsSince < kBlockedBound;
+}
+
+// It sleeps for real time, and sees what the last turn did only when it wakes up.
+bool TurnClock::isStillToPoll(Participant& away) {
+  if (away.arrives) return true;
+  if (sleepsOf(away.thread) >= away.sleepsBefore + kSureSleeps) {
+    away.runsSince = {};
+    return false;
+  }
+  const auto now = steady_clock::now();
+  if (away.runsSince == steady_clock::time_point()) away.runsSince = now;
+  const bool waitsForThread = lookAt(away.thread) == ThreadState::OnThread;
+  away.polls = !waitsForThread && now - away.runsSince < kBlockedBound;
+  return true;  // judged anew, as any other one if it does not poll any more
 }
 
 void TurnClock::dropGone() {
@@ -79,13 +100,26 @@ void TurnClock::watchHolder(Lock& lock) {
   const ThreadState state = watched->arrives ? ThreadState::Running : looked;
   if (turns != std::exchange(watchedTurn, turns) || state == ThreadState::Running) {
     looksOnThread = 0;
+    looksPolling = 0;
     blockedSince = now;
     return;
   }
   if (state == ThreadState::Gone) return sendAway(lock, *watched);
+  if (seemsToPoll(*watched)) {
+    watched->polls = true;
+    return sendAway(lock, *watched);
+  }
   looksOnThread = state == ThreadState::OnThread ? looksOnThread + 1 : 0;
   if (looksOnThread >= kLooksOnThread && !othersRun()) return sendAway(lock, *watched);
   if (now - blockedSince >= kBlockedBound) callOutside(lock, *watched);
+}
+
+// A thread that sleeps for moments, over and over, waits for something that another one does.
+bool TurnClock::seemsToPoll(Participant& watched) {
+  const uint64_t sleeps = sleepsOf(watched.thread);
+  const uint64_t before = std::exchange(watched.sleepsBefore, sleeps);
+  looksPolling = sleeps >= before + kPollSleeps ? looksPolling + 1 : 0;
+  return looksPolling >= kLooksPolling;
 }
 
 // While a thread runs that takes no part, it may be about to let go of what is waited for.

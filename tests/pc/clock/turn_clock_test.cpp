@@ -4,7 +4,8 @@
 #include <unistd.h>
 #include <utils/Thread.h>
 
-#include <latch>
+#include <array>
+#include <mutex>
 #include <string>
 
 #include "clock/created_threads.h"
@@ -113,12 +114,33 @@ TEST(TurnClock, LetsThreadsEndAndBeWaitedFor) {
   }
 }
 
+TEST(TurnClock, GoesOnWithoutAThreadThatLooksAgainAndAgain) {
+  for (int round = 0; round < 5; ++round) {
+    TurnClock clock(0, Speed::Free);
+    Journal journal(clock);
+    std::atomic<bool> isDone = false;
+    clock.takePart();
+    std::thread ticker = taking(clock, [&] { tick(clock, journal, "t", 10, 4); });
+    std::thread handler = taking(clock, [&] {
+      clock.delay(15);
+      isDone = true;
+    });
+    clock.delay(1);
+    while (!isDone) std::this_thread::sleep_for(50us);
+    clock.takePart();
+    journal.add("a");
+    ticker.join();
+    handler.join();
+    EXPECT_EQ(journal.text, "0t 10t 15a 20t 30t ");
+  }
+}
+
 TEST(TurnClock, GoesOnWithoutAThreadThatBlocksOutsideAndNamesIt) {
   TurnClock clock(0, Speed::Free);
   std::string named;
   clock.setBlockedWatcher([&](const std::string& name, pid_t) { named = name; });
-  int ends[2] = {};
-  ASSERT_EQ(::pipe(ends), 0);
+  std::array<int, 2> ends = {};
+  ASSERT_EQ(::pipe(ends.data()), 0);
   clock.takePart();
   std::atomic<bool> isBack = false;
   std::thread blocked = taking(clock, [&] {

@@ -234,29 +234,33 @@ TEST(Recording, IsRefusedWhereItWasDamaged) {
   EXPECT_NE(error.find("does not have the items that its hash says"), std::string::npos) << error;
 }
 
+// The text with a few bytes changed, lost, repeated or put in.
+std::string mutated(std::string text, std::mt19937& random) {
+  const auto below = [&](std::size_t bound) { return random() % bound; };
+  for (std::size_t changes = 1 + below(4); changes > 0 && !text.empty(); --changes) {
+    const std::size_t place = below(text.size());
+    switch (below(4)) {
+      case 0: text[place] = static_cast<char>(random()); break;
+      case 1: text.erase(place, 1 + below(12)); break;
+      case 2: text.insert(place, text.substr(below(text.size()), 1 + below(30))); break;
+      default: text.insert(place, 1, "\"\\|#%-*\n 9"[below(10)]); break;
+    }
+  }
+  return text;
+}
+
 // Whatever stands in a trace, the answer is steps, or a line and what is wrong with it.
 TEST(TraceParserTest, HasAClearAnswerToEveryMutation) {
   const std::string script =
-      "brimol-trace 1\nscreen 720x1280\n100 tap \"PA*SS\" for 50 finger 1\nkey volume-up\n+5 drag "
-      "1% "
-      "2 to \"x\" over 20\nexpect no text \"\\x41\" in 1 2 3 4 within 9\nworld time "
-      "2026-11-22T10:00:00.000Z\nexpect pixel 1 2 #a0B1c2\ntype \"ab c\"\nwait until log \"z\"\n";
+      "brimol-trace 1\nscreen 720x1280\n100 tap \"PA*SS\" for 50 finger 1\nkey volume-up\n"
+      "+5 drag 1% 2 to \"x\" over 20\nexpect no text \"\\x41\" in 1 2 3 4 within 9\n"
+      "world time 2026-11-22T10:00:00.000Z\nexpect pixel 1 2 #a0B1c2\ntype \"ab c\"\n"
+      "wait until log \"z\"\n";
   const std::string recorded = recording();
   std::mt19937 random(7);
-  const auto below = [&](std::size_t bound) { return random() % bound; };
   int refused = 0;
   for (int round = 0; round < 10'000; ++round) {
-    std::string text = round % 2 == 0 ? script : recorded;
-    for (std::size_t changes = 1 + below(4); changes > 0 && !text.empty(); --changes) {
-      const std::size_t place = below(text.size());
-      switch (below(4)) {
-        case 0: text[place] = static_cast<char>(random()); break;
-        case 1: text.erase(place, 1 + below(12)); break;
-        case 2: text.insert(place, text.substr(below(text.size()), 1 + below(30))); break;
-        default: text.insert(place, 1, "\"\\|#%-*\n 9"[below(10)]); break;
-      }
-    }
-    const std::string error = parse(text).error;
+    const std::string error = parse(mutated(round % 2 == 0 ? script : recorded, random)).error;
     if (error.empty()) continue;
     ++refused;
     const std::size_t colon = error.find(": ");

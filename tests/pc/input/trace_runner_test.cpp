@@ -181,7 +181,7 @@ TEST(TraceRunner, ComparesFramesWithTheRecordedOnes) {
            "\n";
   };
   const std::string lines = lineOf(5, one) + lineOf(9, two) + "20 end\n";
-  const auto failureWith = [&](std::map<uint64_t, const Frame*> frames) {
+  const auto failureWith = [&](const std::map<uint64_t, const Frame*>& frames) {
     Played played(lines);
     std::map<uint64_t, std::function<void()>> at;
     for (const auto& [time, frame] : frames)
