@@ -1,15 +1,26 @@
 #include "golden/golden_cases.h"
 
-#include "scene/recorder.h"
+#include <brimol/frame.h>
+
 #include "support/widget_test.h"
 
-namespace brimol::pc {
+namespace brimol::test {
 
 namespace {
 
-constexpr Size kSmall = {360, 240};
-constexpr Size kStrip = {720, 160};
-constexpr Size kPhone = {720, 1280};
+constexpr uint32_t kBlack = MW::kColorBlack;
+constexpr uint32_t kWhite = MW::kColorWhite;
+constexpr uint32_t kRed = 0xFFFF0000;
+constexpr uint32_t kBlue = 0xFF0000FF;
+
+SKIA_Text textOf(const std::string& words, int32_t size = 20, uint32_t color = kWhite,
+                 int32_t align = SKIA_ALIGN_LEFT) {
+  return textRecord(words, color, align, size);
+}
+
+constexpr ScreenSize kSmall = {360, 240};
+constexpr ScreenSize kStrip = {720, 160};
+constexpr ScreenSize kPhone = {720, 1280};
 
 constexpr int kLongMs = 60000;
 constexpr SKIA_Rect kArea = {40, 60, 280, 80, 0xFF00A000};
@@ -17,8 +28,8 @@ constexpr SKIA_Rect kTrack = {60, 20, 600, 120, 0xFF808000};
 constexpr SKIA_Point kSlope = {30, 200, 330, 40, kRed, 6};
 constexpr SKIA_Rect kPage = {0, 0, 360, 240, 0xFFE0E0E0};
 constexpr SKIA_Rect kPad = {20, 20, 200, 400, 0xFFB0C0D0};
-constexpr test::Spot kInside = {100, 100};  // the area and the left end of the track
-constexpr test::Spot kOnThumb = {720, 940};
+constexpr Spot kInside = {100, 100};  // the area and the left end of the track
+constexpr Spot kOnThumb = {720, 940};
 const SKIA_Text kSentence = textOf("Déjà vu 한국어 שלום", 30, kWhite, SKIA_ALIGN_RIGHT);
 const SKIA_Text kTitle = textOf("Saved", 40, kWhite, SKIA_ALIGN_CENTRE);
 const SKIA_Text kDetail = textOf("3 of 5 tests passed", 26, kWhite, SKIA_ALIGN_CENTRE);
@@ -31,18 +42,10 @@ constexpr const char* kResults =
 const SKIA_Text kHint = textOf("hold it", 30, kBlue, SKIA_ALIGN_CENTRE);
 
 // While a finger holds it where it was pressed, or has moved it from there.
-void showHeld(MW::Widget&& held, test::Spot spot, int by = 0) {
-  test::press(held, spot);
-  if (by != 0) test::offer(held, {.type = MW::kEventMotion, .mouse = {1, 0, 0, 0, by, 0}});
+void showHeld(MW::Widget&& held, Spot spot, int by = 0) {
+  press(held, spot);
+  if (by != 0) offer(held, {.type = MW::kEventMotion, .mouse = {1, 0, 0, 0, by, 0}});
   held.show(kNow);
-}
-
-void drawCanary() {
-  skia_add_roundbox_c({6, 6, 60, 40, kRed});
-  skia_add_roundbox_c({40, 20, 51, 33, 0x8000FF00});
-  skia_add_line_c({70, 50, 150, 22, kBlue, 5});
-  skia_add_label_c({4, 54, 90, 40, 0}, textOf("Rag 47%", 22));
-  skia_add_label_c({94, 54, 64, 40, 0}, textOf("한국어", 20));
 }
 
 // By way of the display-item table: on its own it draws its name.
@@ -65,7 +68,7 @@ void drawProgressbar() {
   MW::Progressbar bar(0, &kArea, &kTitle);
   bar.onProgressbar(kLongMs);
   for (const unsigned int ms : {0U, 101U, 202U}) {
-    beginRecording();
+    skia_begin_frame_c();
     bar.show(kNow + ms);
   }
 }
@@ -103,7 +106,7 @@ void drawKeyboard(unsigned int layout) {
   MW::Ime keyboard(&kPage, &kLetters);
   keyboard.presskey_set(layout);
   keyboard.keyboard_change(layout);
-  for (const int y : {60, 100, 60}) test::press(keyboard, {50, y});
+  for (const int y : {60, 100, 60}) press(keyboard, {50, y});
   keyboard.show(kNow);
 }
 
@@ -112,8 +115,8 @@ void drawResults(int tapped, int scroll) {
   MW::MpdWid list("");
   list.cal_line(kResults, INT_MAX);
   list.show(kNow);
-  beginRecording();
-  MW::event_data tap = test::pointerEvent(MW::kEventRelease, {100, tapped});
+  skia_begin_frame_c();
+  MW::event_data tap = pointerEvent(MW::kEventRelease, {100, tapped});
   list.depth_cal(&tap);
   list.onHover({1, 0, 0, 0, 0, -scroll});
   list.show(kNow);
@@ -155,7 +158,7 @@ void drawSelect() {
 
 void drawPad() {
   MW::Button8 pad(3, &kPad, nullptr);
-  test::press(pad, {70, 70});
+  press(pad, {70, 70});
   showHeld(std::move(pad), {170, 270});
 }
 
@@ -181,7 +184,6 @@ void drawDescriptors() {
 }
 
 const auto kCases = std::to_array<Case>({
-    {"canary", {160, 96}, drawCanary},
     {"label", kSmall, [] { MW::Label(&kArea, &kSentence).show(); }},
     {"textbox", kSmall, [] { MW::Textbox(&kArea, &kSentence).show(); }},
     {"image", kSmall, drawImage},
@@ -244,4 +246,4 @@ const auto kCases = std::to_array<Case>({
 
 std::span<const Case> goldenCases() { return kCases; }
 
-}  // namespace brimol::pc
+}  // namespace brimol::test

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "support/widget_test.h"
-#include "testkit/play.h"
+#include <brimol3_widget_test/play.h>
 
 namespace brimol::test {
 

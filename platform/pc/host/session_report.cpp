@@ -149,7 +149,7 @@ void SessionReport::frame(const SessionFrame& shown, Size screen, cairo_surface_
   line["hash"] = hashText(hashOf(shown.items));
   line["items"] = shown.items.size();
   line["texts"] = ordered_json::array();
-  for (const auto& [text, area] : shownTexts(shown.frame, screen)) {
+  for (const auto& [text, area, item] : shownTexts(shown.frame, screen)) {
     line["texts"].push_back(
         {{"text", text}, {"x", area.x}, {"y", area.y}, {"w", area.width}, {"h", area.height}});
   }
