@@ -6,6 +6,8 @@
 #include <brimol/input.h>
 #include <brimol/scene.h>
 
+#include <utility>
+
 #include "core/class_log.h"
 #include "core/layer_walk.h"
 #include "core/layers.h"
@@ -65,8 +67,8 @@ bool dispatch(event_data* event) {
 
 }  // namespace
 
-func_dispatchEvent::func_dispatchEvent(const android::sp<func_dispatchEvent>& replaced)
-    : Thread(true), before(replaced) {
+func_dispatchEvent::func_dispatchEvent(android::sp<func_dispatchEvent> replaced)
+    : Thread(true), before(std::move(replaced)) {
   kLog.print(LogLevel::Debug, "func_dispatchEvent start!");
 }
 

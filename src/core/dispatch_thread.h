@@ -14,7 +14,7 @@ namespace MW {
 class func_dispatchEvent : public android::Thread {
  public:
   /// It begins once `replaced`, if any, has ended.
-  explicit func_dispatchEvent(const android::sp<func_dispatchEvent>& replaced = nullptr);
+  explicit func_dispatchEvent(android::sp<func_dispatchEvent> replaced = nullptr);
   ~func_dispatchEvent() override;
 
   /// Waits for the replaced one.
