@@ -17,6 +17,8 @@ void brimol_host_screen_size(int* width, int* height) {
   *height = platform().height;
 }
 
+float brimol_host_density() { return platform().xdpi; }
+
 int brimol_host_close_requested() { return platform().closeRequested ? 1 : 0; }
 
 void brimol_host_set_brightness(int percent) {
