@@ -7,6 +7,7 @@
 
 #include "scene/rectangles.h"
 #include "scene/shown_texts.h"
+#include "text_pattern.h"
 
 namespace brimol::test {
 
@@ -16,22 +17,6 @@ constexpr std::size_t kFingers = 10;
 constexpr std::size_t kToolkitThreads = 2;
 constexpr unsigned int kRoundMs = 5;
 constexpr unsigned int kHoldMs = 50;
-
-// Its pieces between stars.
-pc::TextPattern patternOf(const std::string& text) {
-  std::vector<std::string> pieces(1);
-  for (auto at = text.begin(); at != text.end(); ++at) {
-    const bool isEscape = *at == '\\' && at + 1 != text.end() && at[1] == '*';
-    if (isEscape) {
-      pieces.back() += *++at;
-    } else if (*at == '*') {
-      pieces.emplace_back();
-    } else {
-      pieces.back() += *at;
-    }
-  }
-  return pc::TextPattern(std::move(pieces));
-}
 
 std::vector<pc::ShownText> fitting(const Frame& frame, ScreenSize size, const std::string& text) {
   const pc::TextPattern pattern = patternOf(text);
@@ -120,7 +105,10 @@ void Screen::pointer(BrimolEventType type, unsigned int finger, Spot to) {
   post(event);
 }
 
-void Screen::press(Spot spot, unsigned int finger) { pointer(BRIMOL_POINTER_DOWN, finger, spot); }
+void Screen::press(Spot spot, unsigned int finger) {
+  remember(Moment::Deed::None, spot);
+  pointer(BRIMOL_POINTER_DOWN, finger, spot);
+}
 void Screen::moveTo(Spot spot, unsigned int finger) {
   pointer(BRIMOL_POINTER_MOTION, finger, spot);
 }
@@ -132,7 +120,8 @@ void Screen::longPress(unsigned int finger) {
 }
 
 void Screen::tap(Spot spot) {
-  press(spot);
+  remember(Moment::Deed::Tap, spot);
+  pointer(BRIMOL_POINTER_DOWN, 0, spot);
   advance(kHoldMs);
   release();
 }
@@ -155,13 +144,22 @@ void Screen::drag(Spot from, Spot to) {
   release();
 }
 
-void Screen::keyDown(unsigned int code) { post(keyInput(BRIMOL_KEY_DOWN, code)); }
+void Screen::keyDown(unsigned int code) {
+  remember(Moment::Deed::Key, {0, 0});
+  post(keyInput(BRIMOL_KEY_DOWN, code));
+}
 void Screen::keyUp(unsigned int code) { post(keyInput(BRIMOL_KEY_UP, code)); }
 
 void Screen::key(unsigned int code) {
   keyDown(code);
   advance(kHoldMs);
   keyUp(code);
+}
+
+std::vector<Moment> Screen::moments() const {
+  std::vector<Moment> all = before;
+  all.push_back({newest});
+  return all;
 }
 
 std::vector<std::string> Screen::texts() const {
@@ -223,6 +221,15 @@ void Screen::expectLog(const std::string& text, const Here& here) {
                             said.str());
   }
   lines.erase(lines.begin(), found + 1);
+}
+
+void expectLayout(const Screen& screen, const Profile& profile, const AcceptedFindings& accepted,
+                  const Here& here) {
+  std::string all;
+  for (const std::string& line : accepted.judge(lint(screen.moments(), profile), profile)) {
+    all += "\n  " + line;
+  }
+  if (!all.empty()) throw Failure(here, "the layout has faults" + all);
 }
 
 }  // namespace brimol::test

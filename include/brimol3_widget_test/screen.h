@@ -10,6 +10,7 @@
 
 #include <brimol3_widget_test/failure.h>
 #include <brimol3_widget_test/input.h>
+#include <brimol3_widget_test/lint.h>
 #include <brimol3_widget_test/picture.h>
 
 #include <MW/window.h>
@@ -85,6 +86,8 @@ class Screen {
   /// The one item that shows the text.
   const SKIA_Item& itemOf(const std::string& text, const Here& here = Here::now()) const;
   Picture picture() const { return paint(newest, screen); }
+  /// What was there whenever a finger or a key came down, and is there now: what lint() looks at.
+  std::vector<Moment> moments() const;
 
   void expectText(const std::string& text, const Here& here = Here::now()) const;
   void expectNoText(const std::string& text, const Here& here = Here::now()) const;
@@ -100,6 +103,7 @@ class Screen {
   void expectLog(const std::string& text, const Here& here = Here::now());
 
  private:
+  void remember(Moment::Deed deed, Spot spot) { before.push_back({newest, deed, spot.x, spot.y}); }
   void post(const Event& event);
   void pointer(BrimolEventType type, unsigned int finger, Spot to);
   void round(unsigned int ms);
@@ -108,6 +112,7 @@ class Screen {
   ScreenSize screen;
   Loop loop;
   Frame newest;
+  std::vector<Moment> before;
   std::vector<Spot> fingers;
 };
 
