@@ -1,5 +1,6 @@
 #include "application.h"
 
+#include <MW/widget.h>
 #include <MW/window.h>
 #include <brimol/host.h>
 #include <brimol/input.h>
@@ -39,7 +40,7 @@ void loop(FactoryTest& test) {
   while (!test.isEnded() && brimol_host_close_requested() == 0 && interrupted == 0) {
     test.update(GetTicks());
     if (MW::isDisplayUpdate(0) == 1) test.draw();
-    MW::Window::updateTimer(0);
+    MW::Window::updateTimer(MW::kUnused);
     Delay(kLoopMs);
   }
 }
@@ -75,6 +76,7 @@ int showScreens(const Options& options, ResultBook& book, const Surroundings& su
 int runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
+  if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   std::string error;
   auto book = ResultBook::open(options.results, error);
   if (!book) return fail(error);

@@ -59,6 +59,18 @@ class MW_API Dialog : public PromptDialog {
     kLeaveLightSensor = 39
   };
 
+  /// How the kinds are laid out; a number without a name is kStandard.
+  enum Layout {
+    kStandard = 0,      ///< one line of message, two buttons
+    kTwoLine = 1,       ///< two lines, two buttons
+    kHook = 2,          ///< one line, no button; the hook key answers
+    kEarjack = 3,       ///< two lines, no button
+    kOkOnly = 4,        ///< one line, one wide button
+    kTouchWarning = 5,  ///< one line and a progress row, on red
+    kTouchCaution = 6,  ///< two lines and a progress row, on red
+    kWait = 7           ///< one line, no button
+  };
+
   /// `dialogKind`: a Kind or any other number.
   explicit Dialog(int dialogKind);
   ~Dialog() override;
@@ -72,7 +84,7 @@ class MW_API Dialog : public PromptDialog {
   using Widget::onReleaseKey;
   using Widget::setDesc;
   using Widget::setRect;
-  /// The number of a kind's layout, 0 to 7.
+  /// The Layout of a kind.
   static int isType(int dialogKind);
   /// Lays it out on the present screen as `dialogKind`; its texts stay. Any thread.
   void setRect(int dialogKind);

@@ -21,10 +21,12 @@ namespace MW {
 /// so is one of more than 127 bytes.
 class MW_API DialogSlide : public Widget {
  public:
-  /// The kind that asks whether a passed test is to be repeated. Kinds 4 and 5 say the same.
-  static constexpr int kRepeatPassedTest = 3;
+  enum Kind {
+    kOwnTexts = 0,         ///< the setters give the texts; so is any number without a name
+    kRepeatPassedTest = 3  ///< asks whether a passed test is to be repeated; 4 and 5 say the same
+  };
 
-  /// `dialogKind`: kRepeatPassedTest, or another number for a dialog whose texts the setters give.
+  /// `dialogKind`: a Kind or any other number.
   explicit DialogSlide(int dialogKind);
   ~DialogSlide() override;
 
@@ -44,7 +46,7 @@ class MW_API DialogSlide : public Widget {
   using Widget::onReleaseKey;
   using Widget::setDesc;
   using Widget::setRect;
-  /// The number of a kind's layout, as Dialog::isType() gives it: 0 for any kind.
+  /// The number of a kind's layout, as Dialog::isType() gives it: Dialog::kStandard for any.
   static int isType(int dialogKind);
   /// Lays it out on the present screen, the same for any kind; the thumb stays until setRect().
   void setRect_init(int dialogKind);

@@ -10,6 +10,15 @@
 
 namespace MW {
 
+/// What type() of a primitive says. Its kind in the display-item table (SKIA_ItemKind) is another.
+enum PrimitiveType {
+  kTypeLabel = 3,
+  kTypeImage = 5,
+  kTypeBox = 6,
+  kTypeLine = 7,
+  kTypeTextbox = 8
+};
+
 /// What labels and text boxes have in common; not used by itself.
 class MW_API TextPrimitive : public Widget {
  public:

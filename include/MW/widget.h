@@ -13,6 +13,9 @@
 
 namespace MW {
 
+/// For an argument that an operation does not read.
+inline constexpr int kUnused = 0;
+
 /// Everything that can be seen or touched is a Widget.
 ///
 /// The application creates, owns and deletes widgets. A widget is drawn, timed and offered events
@@ -133,7 +136,8 @@ class MW_API Widget {
   /// number + 1. Any thread.
   void setSelect(int value) { select = value; }
   int isSelect() const { return select; }
-  /// The layer: 0 top (dialogs), 1 base. Set it before the widget is registered.
+  /// The layer, a LayerNumber; of a primitive its PrimitiveType. Set it before the widget is
+  /// registered.
   void setType(int value) { type_ = value; }
   int type() const { return type_; }
   /// The number that Window::registerWidget gave. After a removal two widgets may have the same.
@@ -152,8 +156,10 @@ class MW_API Widget {
   /// The colour to draw at `now` (GetTicks() milliseconds): black in the dark phase and while
   /// blinking is off. A phase lasts a little over 500 ms; the first one is dark.
   unsigned int updateBlink(unsigned int now);
-  /// Follows the left and right keys between two choices (`keyDir`), where the choice may be
-  /// taken. Returns 1 when `key` is the select key and at least one may be taken.
+  /// Which of two choices keys have taken.
+  enum KeySide { kNoSide = 0, kLeftSide = 1, kRightSide = 2 };
+  /// Follows the left and right keys between two choices (`keyDir`, a KeySide), where the choice
+  /// may be taken. Returns 1 when `key` is the select key and at least one may be taken.
   int move_key_select(int key, int canLeft, int canRight);
 
   // The application's callbacks. Null: not wanted.
@@ -222,7 +228,7 @@ class MW_API Widget {
   unsigned int blinkColor = 0;
   unsigned int blinkNext = 0;   // GetTicks() milliseconds, 0: not started
   unsigned int blinkCount = 0;  // toggles so far
-  int keyDir = 0;               // last key selection: 0 none, 1 left, 2 right
+  int keyDir = kNoSide;         // last key selection
 
  private:
   friend class Layers;

@@ -100,6 +100,9 @@ BRIMOL_STATIC_ASSERT(sizeof(Event) == BRIMOL_EVENT_BYTES && offsetof(Event, type
                          offsetof(Event, user) == 0,
                      "Event");
 
+/* The flags that the toolkit asks for. */
+enum { BRIMOL_INPUT_FLAGS = 0x01000001 };
+
 /* Starts the service; `flags` select what it reports. Non-zero on success. */
 int EventInit(unsigned int flags);
 

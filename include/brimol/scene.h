@@ -34,13 +34,16 @@ typedef struct SKIA_Point {
   int32_t x2;
   int32_t y2;
   uint32_t color; /* 0xAARRGGBB */
-  int32_t width;  /* thickness in pixels */
+  int32_t width;  /* thickness in pixels; of an arrow its direction */
 } SKIA_Point;
 
 enum { SKIA_TEXT_BYTES = 128 };
 
 /* Where a text stands in its rectangle; any other code means left. */
 enum SKIA_Align { SKIA_ALIGN_LEFT = 1, SKIA_ALIGN_RIGHT = 2, SKIA_ALIGN_CENTRE = 5 };
+
+/* An arrow's direction, in its point record's `width`; any other number points left, too. */
+enum SKIA_ArrowDirection { SKIA_ARROW_RIGHT = 0, SKIA_ARROW_LEFT = 1 };
 
 /* A text of at most 127 bytes of UTF-8 and a NUL. */
 typedef struct SKIA_Text {
@@ -103,8 +106,8 @@ int skia_add_roundtextbox_c(SKIA_Rect rect, SKIA_Text text);
 int skia_add_buttonbox_c(SKIA_Rect rect, SKIA_Text text);
 int skia_add_roundbuttonbox_c(SKIA_Rect rect, SKIA_Text text);
 int skia_add_staticbox_c(SKIA_Rect rect, SKIA_Text text);
-/* An arrow within the rectangle, in the point record's colour. The record's `width` is the
- * direction word: 0 points right, any other left. */
+/* An arrow within the rectangle, in the point record's colour. The record's `width` says where it
+ * points: enum SKIA_ArrowDirection. */
 int skia_add_arrow_c(SKIA_Rect rect, SKIA_Point direction);
 /* The item is copied. A null pointer or an unknown kind adds nothing and returns a negative number.
  */

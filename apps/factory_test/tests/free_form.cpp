@@ -63,7 +63,7 @@ class FreeFormTest : public StepTest {
   void putProgress() {
     MW::DialogNew& made = put("Progress");
     made.setDesc("Something goes on", nullptr, nullptr);
-    made.setProgress(0);
+    made.setProgress(MW::kUnused);
   }
 
   void putSlide() {

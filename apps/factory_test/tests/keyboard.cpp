@@ -70,7 +70,7 @@ class KeyboardTest : public PageTest {
 
   Current<KeyboardTest> current{this};
   std::atomic<bool> folded = false;
-  std::atomic<std::size_t> layout = 0;
+  std::atomic<std::size_t> layout = MW::Ime::kSmall;
   std::optional<MW::Ime> keyboard;
   std::optional<ButtonRow> layouts;
 };

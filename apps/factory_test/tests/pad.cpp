@@ -74,7 +74,7 @@ class PadTest : public PageTest {
   }
 
   Current<PadTest> current{this};
-  std::atomic<int> layout = 0;
+  std::atomic<int> layout = MW::Button8::kOneCell;
   std::optional<MW::Button8> pad;
   std::optional<ButtonRow> changer;
 };

@@ -22,7 +22,7 @@ class SixChoiceTest : public LookTest {
 
  protected:
   void beginLook() override {
-    dialog.emplace(0).setTitle("Which radio?");
+    dialog.emplace(MW::kUnused).setTitle("Which radio?");
     for (std::size_t i = 0; i < kChoices.size(); ++i) {
       dialog->setText_str(static_cast<unsigned int>(i), kChoices.at(i));
     }

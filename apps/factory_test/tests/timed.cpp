@@ -59,7 +59,7 @@ class TimedTest : public PageTest {
 
   void placeProgress(const SKIA_Rect& area) {
     const SKIA_Text caption = captionOf("Three seconds of work", MW::kColorWhite);
-    progress.emplace(0, &area, &caption);
+    progress.emplace(MW::kUnused, &area, &caption);
   }
 
   void startToast() {
