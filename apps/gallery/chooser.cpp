@@ -18,12 +18,12 @@ constexpr int kRowPercent = 6;  // of the screen's height
 
 // What the list's callbacks leave behind. Rows count from 1: the first has no height.
 std::atomic<int> chosen = kNothing;
-int marked = kNothing;  // dispatch thread, once the list is active
+int markedRow = kNothing;  // dispatch thread, once the list is active
 
 void mark(MW::MainList& list, int row) {
   if (row < 1) return;
-  if (marked != kNothing) list.setTextColor(marked, MW::kColorWhite);
-  marked = row;
+  if (markedRow != kNothing) list.setTextColor(markedRow, MW::kColorWhite);
+  markedRow = row;
   list.setTextColor(row, MW::kColorHighlight);
 }
 
@@ -39,7 +39,7 @@ void followKey(MW::kbd_event* event, MW::MainList* list) {
   switch (event->code) {
     case MW::kKeyDown: mark(*list, list->move_key_down(0)); break;
     case MW::kKeyUp: mark(*list, moveUp(*list)); break;
-    case MW::kKeySelect: chosen = marked; break;
+    case MW::kKeySelect: chosen = markedRow; break;
     case BRIMOL_CODE_BACK: chosen = kBack; break;
     default: break;
   }
@@ -59,16 +59,16 @@ void fill(MW::MainList& list, const std::vector<std::string>& rows) {
 }  // namespace
 
 std::optional<std::size_t> choose(const std::string& title, const std::vector<std::string>& rows,
-                                  std::size_t first) {
+                                  std::size_t marked) {
   MW::MainList list(title.c_str(), MW::MainList::kPlain);
   fill(list, rows);
   list.clickCallback = [](MW::mouse_event* event, MW::MainList* from) {
     chosen = from->position2index(*event);
   };
   list.keyPressCallback = followKey;
-  chosen = marked = kNothing;
+  chosen = markedRow = kNothing;
   mark(list, 1);
-  for (std::size_t i = 0; i < first; ++i) mark(list, list.move_key_down(0));
+  for (std::size_t i = 0; i < marked; ++i) mark(list, list.move_key_down(0));
   list.setActive(1);
   runMainLoop([] { return chosen != kNothing; }, [] { MW::Window::show(); });
   if (chosen < 1) return {};

@@ -15,7 +15,7 @@ constexpr int kLettersInHeight = 36;
 
 constinit std::mutex lineLock;
 
-std::string line;  // guarded by lineLock
+std::string spoken;  // guarded by lineLock
 
 }  // namespace
 
@@ -40,17 +40,19 @@ std::string pictureFile(const std::string& name) {
   return (folder.parent_path() / "share" / "brimol_gallery" / name).string();
 }
 
-void say(const std::string& spoken) {
+void say(const std::string& line) {
   {
     const std::lock_guard guard(lineLock);
-    line = spoken;
+    spoken = line;
   }
   MW::isDisplayUpdate(1);
 }
 
+void say(const std::string& line, int64_t number) { say(line + ' ' + std::to_string(number)); }
+
 std::string said() {
   const std::lock_guard guard(lineLock);
-  return line;
+  return spoken;
 }
 
 }  // namespace gallery

@@ -24,6 +24,8 @@ std::string pictureFile(const std::string& name);
 
 /// Shows a line: what an application does when it is told something. Any thread.
 void say(const std::string& line);
+/// The same, with a number behind it.
+void say(const std::string& line, int64_t number);
 /// What was said last; empty at first.
 std::string said();
 

@@ -112,7 +112,7 @@ constexpr auto kButtons = std::to_array<Example>({
        MW::Button8 pad(MW::Button8::kFourByTwo, &area, nullptr);
        const auto tell = [](MW::mouse_event* mouse) {
          const std::bitset<MW::Button8::kCells> held(mouse->state);
-         say(std::to_string(held.count()) + " cells are held");
+         say("Held cells:", static_cast<int64_t>(held.count()));
        };
        pad.pressCallback = tell;
        pad.clickCallback = tell;

@@ -14,10 +14,11 @@ namespace gallery {
 
 namespace {
 
+// NOLINTBEGIN(readability-non-const-parameter): the list calls its callbacks with an int*
 constexpr auto kDialogs = std::to_array<Example>({
     {"dialog_new", "DialogNew", "Any title, up to three lines, and up to two buttons.", kMiddle,
      [](Loop& loop) {
-       MW::DialogNew dialog("Sensor", SKIA_ALIGN_CENTRE, MW::kColorHighlight);
+       MW::DialogNew dialog("Sensor", SKIA_ALIGN_CENTRE, static_cast<int>(MW::kColorHighlight));
        dialog.setDesc("Cover the sensor", "with a finger", "and look at it");
        dialog.setbutton("FAIL", "PASS");
        dialog.button1Callback = [](int) { say("Failed"); };
@@ -29,7 +30,7 @@ constexpr auto kDialogs = std::to_array<Example>({
     {"dialog_new_one_button", "DialogNew with one button", "The letters of one line are larger.",
      kMiddle,
      [](Loop& loop) {
-       MW::DialogNew dialog("Sensor", SKIA_ALIGN_CENTRE, MW::kColorHighlight);
+       MW::DialogNew dialog("Sensor", SKIA_ALIGN_CENTRE, static_cast<int>(MW::kColorHighlight));
        dialog.setDesc("The sensor works.", nullptr, nullptr, SKIA_ALIGN_CENTRE);
        dialog.setbutton("OK", nullptr);
        dialog.button1Callback = [](int) { say("Confirmed"); };
@@ -39,7 +40,7 @@ constexpr auto kDialogs = std::to_array<Example>({
      MW::kTopLayer},
     {"dialog_new_lines", "DialogNew without buttons", "The application hides it.", kMiddle,
      [](Loop& loop) {
-       MW::DialogNew dialog("Sensor", SKIA_ALIGN_CENTRE, MW::kColorHighlight);
+       MW::DialogNew dialog("Sensor", SKIA_ALIGN_CENTRE, static_cast<int>(MW::kColorHighlight));
        dialog.setDesc("Cover the sensor", "with a finger", nullptr);
        dialog.setActive(1);
        loop();
@@ -47,7 +48,7 @@ constexpr auto kDialogs = std::to_array<Example>({
      MW::kTopLayer},
     {"dialog_new_progress", "DialogNew with a progress row", "", kMiddle,
      [](Loop& loop) {
-       MW::DialogNew dialog("Sensor", SKIA_ALIGN_CENTRE, MW::kColorHighlight);
+       MW::DialogNew dialog("Sensor", SKIA_ALIGN_CENTRE, static_cast<int>(MW::kColorHighlight));
        dialog.setDesc("The sensor is calibrated", "Do not move the phone", nullptr);
        dialog.setProgress(0);
        dialog.setActive(1);
@@ -63,7 +64,7 @@ constexpr auto kDialogs = std::to_array<Example>({
        for (const char* const lens : {"Main", "Wide", "Tele", "Front"}) dialog.addIndex(lens);
        dialog.initFinish(1);
        dialog.button1Callback = [](int*) { say("Cancelled"); };
-       dialog.button2Callback = [](int* row) { say("Row " + std::to_string(*row)); };
+       dialog.button2Callback = [](int* row) { say("Row", *row); };
        dialog.setActive(1);
        loop();
      },
@@ -79,9 +80,7 @@ constexpr auto kDialogs = std::to_array<Example>({
        for (const char* const name : {"2G", "3G", "4G", "5G", "BT", "NFC"}) {
          dialog.setText_str(choice++, name);
        }
-       dialog.choiceCallback = [](MW::mouse_event* mouse) {
-         say("Choice " + std::to_string(mouse->state));
-       };
+       dialog.choiceCallback = [](MW::mouse_event* mouse) { say("Choice", mouse->state); };
        dialog.setActive(1);
        loop();
      },
@@ -126,6 +125,7 @@ constexpr auto kDialogs = std::to_array<Example>({
      },
      MW::kTopLayer},
 });
+// NOLINTEND(readability-non-const-parameter)
 
 }  // namespace
 

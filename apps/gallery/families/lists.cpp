@@ -37,7 +37,7 @@ constexpr auto kLists = std::to_array<Example>({
        list.setTextBattery("BAT 87%", 7);
        list.setTextBrightness("LCD 120", 7);
        list.clickCallback = [](MW::mouse_event* mouse, MW::MainList* from) {
-         say("Row " + std::to_string(from->position2index(*mouse)));
+         say("Row", from->position2index(*mouse));
        };
        list.setActive(1);
        loop();

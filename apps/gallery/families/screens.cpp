@@ -28,9 +28,9 @@ constexpr auto kScreens = std::to_array<Example>({
      "A warning in a colour of the application's choice, with up to four text boxes.",
      {25, 60},
      [](Loop& loop) {
-       constexpr uint32_t alarm = 0xFFC02020;
-       MW::DialogWarn warning(alarm);
-       warning.setText(0, place(10, 30, 80, 10, alarm), words("Warning", MW::kColorWhite));
+       constexpr uint32_t kAlarm = 0xFFC02020;
+       MW::DialogWarn warning(kAlarm);
+       warning.setText(0, place(10, 30, 80, 10, kAlarm), words("Warning", MW::kColorWhite));
        warning.setText(1, place(10, 42, 80, 10, MW::kColorWhite), words("Do not switch off"));
        warning.touchReleaseCallback = [](MW::mouse_event*) { say("Touched"); };
        warning.setActive(1);
@@ -69,9 +69,7 @@ constexpr auto kScreens = std::to_array<Example>({
     {"key", "Key", "Tells keys, touches and plugs, and draws nothing.", kThird,
      [](Loop& loop) {
        MW::Key key;
-       key.keyPressCallback = [](MW::kbd_event* event) {
-         say("Key " + std::to_string(event->code));
-       };
+       key.keyPressCallback = [](MW::kbd_event* event) { say("Key", event->code); };
        key.doubleKeyCallback = [](MW::kbd_event*) { say("Twice"); };
        const SKIA_Rect area = place(5, 12, 90, 10);
        const SKIA_Text hint = words("Press the volume keys", MW::kColorWhite);
