@@ -140,10 +140,9 @@ void Goldens::renewPicture(const std::string& name, const Picture& picture, cons
   write(folder / (name + ".png"), picture, here);
 }
 
-Compared Goldens::expectPicture(const std::string& name, const Frame& frame, ScreenSize size,
+Compared Goldens::expectPicture(const std::string& name, const Picture& actual,
                                 const Here& here) {
   const fs::path file = folder / (name + ".png");
-  const Picture actual = paint(frame, size);
   if (isRenewing()) {
     renewPicture(name, actual, here);
     return Compared::Same;
@@ -167,7 +166,7 @@ Compared Goldens::expectPicture(const std::string& name, const Frame& frame, Scr
 
 Compared Goldens::expect(const std::string& name, const Screen& screen, const Here& here) {
   expectItems(name, screen.frame(), here);
-  return expectPicture(name, screen.frame(), screen.size(), here);
+  return expectPicture(name, screen.picture(), here);
 }
 
 }  // namespace brimol::test

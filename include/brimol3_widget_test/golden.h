@@ -36,10 +36,10 @@ class Goldens {
   /// The frame's items. Throws Failure with the first line that differs, and where the list was
   /// written (NAME.actual.items.txt); also where there is no such golden.
   void expectItems(const std::string& name, const Frame& frame, const Here& here = Here::now());
-  /// The frame's picture. Throws Failure with how many pixels differ, the first of them, and where
+  /// A picture. Throws Failure with how many pixels differ, the first of them, and where
   /// NAME.expected.png, NAME.actual.png and NAME.difference.png were written; the last shows in red
   /// what differs.
-  Compared expectPicture(const std::string& name, const Frame& frame, ScreenSize size,
+  Compared expectPicture(const std::string& name, const Picture& actual,
                          const Here& here = Here::now());
   /// Both, of a screen's newest frame.
   Compared expect(const std::string& name, const Screen& screen, const Here& here = Here::now());

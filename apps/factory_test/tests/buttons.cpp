@@ -122,8 +122,8 @@ const std::array<ButtonTest::ButtonRow, ButtonTest::kButtonCount> ButtonTest::kB
     {"Hide me", &Widget::clickCallback, [](int) { self().hideLate(); }},
 }};
 
-const TestRegistration kRegistration({Group::Widgets, 0, "buttons", "Buttons",
-                                      makeTest<ButtonTest>});
+const TestRegistration kButtonsRegistration({Group::Widgets, 0, "buttons", "Buttons",
+                                             makeTest<ButtonTest>});
 
 }  // namespace
 

@@ -180,8 +180,8 @@ const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
     {kRcuiFullScreen, false, {}, ""},
 };
 
-const TestRegistration kRegistration({Group::Widgets, 5, "descriptors", "Descriptors",
-                                      makeTest<DescriptorTest>});
+const TestRegistration kDescriptorsRegistration({Group::Widgets, 5, "descriptors", "Descriptors",
+                                                 makeTest<DescriptorTest>});
 
 }  // namespace
 

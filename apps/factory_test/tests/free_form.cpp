@@ -84,8 +84,8 @@ class FreeFormTest : public StepTest {
   std::unique_ptr<MW::Widget> dialog;
 };
 
-const TestRegistration kRegistration({Group::Dialogs, 3, "free_form", "Free-form dialogs",
-                                      makeTest<FreeFormTest>});
+const TestRegistration kFreeFormRegistration({Group::Dialogs, 3, "free_form", "Free-form dialogs",
+                                              makeTest<FreeFormTest>});
 
 }  // namespace
 

@@ -82,8 +82,8 @@ const std::array<ButtonRow::Face, KeyboardTest::kLayoutCount> KeyboardTest::kFac
     {"123", [](int) { self().change(MW::Ime::kOnlyDigits); }},
 }};
 
-const TestRegistration kRegistration({Group::Input, 3, "keyboard", "Keyboard",
-                                      makeTest<KeyboardTest>});
+const TestRegistration kKeyboardRegistration({Group::Input, 3, "keyboard", "Keyboard",
+                                              makeTest<KeyboardTest>});
 
 }  // namespace
 

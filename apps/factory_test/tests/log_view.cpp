@@ -136,7 +136,7 @@ const std::array<ButtonRow::Face, 3> LogTest::kFaces = {{
     {"Next", [](int) { self().jump(Viewer::kNext); }},
 }};
 
-const TestRegistration kRegistration({Group::Reports, 0, "log", "Log", makeTest<LogTest>});
+const TestRegistration kLogViewRegistration({Group::Reports, 0, "log", "Log", makeTest<LogTest>});
 
 }  // namespace
 

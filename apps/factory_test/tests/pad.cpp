@@ -83,8 +83,8 @@ const std::array<ButtonRow::Face, 1> PadTest::kFaces = {{
     {"Next layout", [](int) { self().nextLayout(); }},
 }};
 
-const TestRegistration kRegistration({Group::Input, 2, "pad", "Multi-touch pad",
-                                      makeTest<PadTest>});
+const TestRegistration kPadRegistration({Group::Input, 2, "pad", "Multi-touch pad",
+                                         makeTest<PadTest>});
 
 }  // namespace
 

@@ -52,8 +52,8 @@ class SixChoiceTest : public LookTest {
   std::optional<MW::DialogSelect> dialog;
 };
 
-const TestRegistration kRegistration({Group::Dialogs, 2, "six_choice", "Six-way choice",
-                                      makeTest<SixChoiceTest>});
+const TestRegistration kSixChoiceRegistration({Group::Dialogs, 2, "six_choice", "Six-way choice",
+                                               makeTest<SixChoiceTest>});
 
 }  // namespace
 

@@ -84,8 +84,8 @@ class TimedTest : public PageTest {
   std::optional<MW::Progressbar> progress;
 };
 
-const TestRegistration kRegistration({Group::Widgets, 3, "timed", "Toast and progress",
-                                      makeTest<TimedTest>});
+const TestRegistration kTimedRegistration({Group::Widgets, 3, "timed", "Toast and progress",
+                                           makeTest<TimedTest>});
 
 }  // namespace
 

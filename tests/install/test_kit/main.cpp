@@ -92,7 +92,7 @@ void testGoldens(Screen& screen, const std::string& folder) {
       failureOf([&] { goldens.expectItems("counter", screen.frame()); });
   expect(has(items, "item 1 of ") && has(items, "Taps: 1") && has(items, "Taps: 2"), items);
   const std::string picture =
-      failureOf([&] { goldens.expectPicture("counter", screen.frame(), screen.size()); });
+      failureOf([&] { goldens.expectPicture("counter", screen.picture()); });
   expect(has(picture, "main.cpp:") && has(picture, " pixels differ"), picture);
   const auto marks = brimol::test::readPicture(folder + "/results/counter.difference.png");
   expect(marks.size == screen.size(), "the picture of the difference is missing");
