@@ -75,6 +75,7 @@ int showScreens(const Options& options, ResultBook& book, const Surroundings& su
 int runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
+  if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   std::string error;
   auto book = ResultBook::open(options.results, error);
   if (!book) return fail(error);

@@ -1,8 +1,12 @@
 #include "options.h"
 
+#include <brimol/device.h>
+
 #include <algorithm>
 #include <array>
+#include <cmath>
 #include <string_view>
+#include <utility>
 
 namespace factory_test {
 
@@ -20,6 +24,8 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char*) { options.action = Options::Action::Help; }},
     {"--headless", nullptr, "draw to memory instead of a window",
      [](Options& options, const char*) { options.headless = true; }},
+    {"--device", "NAME", "play on that phone's screen, see below",
+     [](Options& options, const char* value) { options.device = value; }},
     {"--results", "FILE.json", "keep the verdicts in FILE.json, and go on from what it holds",
      [](Options& options, const char* value) { options.results = value; }},
     {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
@@ -35,6 +41,13 @@ constexpr auto kOptions = std::to_array<OptionRow>({
 });
 
 constexpr std::size_t kNameColumns = 22;
+constexpr std::size_t kDeviceColumns = 14;
+
+std::span<const BrimolDevice> devices() {
+  int count = 0;
+  const BrimolDevice* const first = brimol_devices(&count);
+  return {first, static_cast<std::size_t>(count)};
+}
 
 // What is left behind one option and its value; nothing, with `error`, where it is wrong.
 std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::string& error) {
@@ -56,6 +69,22 @@ std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::st
   return arguments.subspan(2);
 }
 
+std::string wrongDevice(const std::string& name) {
+  std::string error = "unknown device '" + name + "', known are:";
+  for (const BrimolDevice& device : devices()) error.append(" ").append(device.name);
+  return error;
+}
+
+std::string helpLine(std::string name, std::size_t columns, const std::string& meaning) {
+  name.resize(std::max(columns, name.size() + 1), ' ');
+  return "  " + name + meaning + "\n";
+}
+
+std::string sizeOf(const BrimolDevice& device) {
+  return std::to_string(device.width) + "x" + std::to_string(device.height) + ", " +
+         std::to_string(std::lround(device.density)) + " dots per inch, ";
+}
+
 }  // namespace
 
 std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
@@ -69,6 +98,10 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
     error = "--results and --junit name the same file";
     return {};
   }
+  if (!options.device.empty() && brimol_device_named(options.device.c_str()) == nullptr) {
+    error = wrongDevice(options.device);
+    return {};
+  }
   return options;
 }
 
@@ -80,13 +113,18 @@ std::string usage() {
   for (const OptionRow& row : kOptions) {
     std::string name(row.name);
     if (row.value != nullptr) name.append(" ").append(row.value);
-    name.resize(std::max(kNameColumns, name.size() + 1), ' ');
-    text.append("  ").append(name).append(row.meaning).append("\n");
+    text += helpLine(std::move(name), kNameColumns, row.meaning);
   }
   text +=
       "\nEnvironment:\n"
       "  BRIMOL_DISPLAY=window|headless   where to draw; a window when there is a display\n"
-      "  BRIMOL_SCREEN=WIDTHxHEIGHT       screen size in pixels, 1440x2560 when not set\n";
+      "  BRIMOL_DEVICE=NAME               as --device; 1440x2560 pixels when not set\n"
+      "  BRIMOL_SCREEN=WIDTHxHEIGHT       screen size in pixels, instead of the device's\n"
+      "\nDevices:\n";
+  for (const BrimolDevice& device : devices()) {
+    text += helpLine(device.name, kDeviceColumns,
+                     sizeOf(device) + std::to_string(device.year) + ": " + device.title);
+  }
   return text;
 }
 

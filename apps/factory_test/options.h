@@ -12,6 +12,7 @@ struct Options {
 
   Action action = Action::Run;
   bool headless = false;     // draw to memory, without a window
+  std::string device = {};   // the phone's screen that is played; empty: what BRIMOL_DEVICE says
   bool verbose = false;      // write the toolkit's log to stderr
   std::string shot = {};     // draw once, write this PNG file and end; empty: no
   std::string results = {};  // the JSON file that keeps the verdicts; empty: none

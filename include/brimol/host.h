@@ -14,9 +14,10 @@ extern "C" {
 #pragma GCC visibility push(default)
 
 /* Opens the screen as the environment asks: BRIMOL_DISPLAY=window|headless (a window when there is
- * a display, headless otherwise) and BRIMOL_SCREEN=WIDTHxHEIGHT in pixels (1440x2560). EventInit
- * does it for an application that did not; EventQuit closes it. Opening an open screen is a
- * success. Returns 1, or 0 when it cannot be opened; brimol_host_error() says why. */
+ * a display, headless otherwise), BRIMOL_DEVICE=NAME of brimol/device.h (1440x2560 pixels at 489.5
+ * dots per inch) and BRIMOL_SCREEN=WIDTHxHEIGHT, which changes that size and leaves the density.
+ * EventInit does it for an application that did not; EventQuit closes it. Opening an open screen is
+ * a success. Returns 1, or 0 when it cannot be opened; brimol_host_error() says why. */
 int brimol_host_open(void);
 
 /* One line without a line end about the call that failed last; empty when none did. The text stays
@@ -25,6 +26,9 @@ const char* brimol_host_error(void);
 
 /* Stores the size of the open screen in pixels; what it would be where none is open. */
 void brimol_host_screen_size(int* width, int* height);
+
+/* The dots per inch of the open screen, across and down; what they would be where none is open. */
+float brimol_host_density(void);
 
 /* The keys and mouse actions that the host understands, a line each, for an application's help. */
 const char* brimol_host_help(void);

@@ -41,6 +41,7 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
        std::vector<WrongLine>{{{"--frobnicate"}, "--frobnicate"},
                               {{"--shot"}, "--shot needs"},
                               {{"--results", ""}, "--results needs"},
+                              {{"--device", "wvga"}, "wvga-4.0"},
                               {{"file"}, "'file'"},
                               {{"--results", "a", "--junit", "a"}, "same file"}}) {
     std::string error;

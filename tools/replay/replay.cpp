@@ -23,7 +23,8 @@ namespace fs = std::filesystem;
 namespace {
 
 // The platform's settings that a run depends on, and that a repeated run takes from the first.
-constexpr auto kSettings = std::to_array<const char*>({"BRIMOL_SCREEN", "BRIMOL_CLOCK_START"});
+constexpr auto kSettings =
+    std::to_array<const char*>({"BRIMOL_DEVICE", "BRIMOL_SCREEN", "BRIMOL_CLOCK_START"});
 
 int complain(const std::string& message) {
   std::cerr << "brimol-replay: " << message << '\n';

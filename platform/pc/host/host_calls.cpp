@@ -20,10 +20,6 @@ namespace {
 
 constexpr std::chrono::seconds kPictureBound{10};
 
-// Dots per inch, across and down: those of a phone whose screen of the default size measures six
-// inches from corner to corner. The same whatever shows the screen, so that layouts are the same.
-constexpr float kDpi = 489.5f;
-
 std::string lastError;  // belongs to the application's thread, as the calls do
 
 int resultOf(std::string error) {
@@ -59,6 +55,11 @@ void brimol_host_screen_size(int* width, int* height) {
   if (height != nullptr) *height = screen.h;
 }
 
+float brimol_host_density() {
+  const auto platform = openedPlatform();
+  return platform ? platform->density() : brimol::pc::readSettings().settings.density;
+}
+
 const char* brimol_host_help() {
   static const std::string text = brimol::pc::helpText();
   return text.c_str();
@@ -81,8 +82,8 @@ int brimol_host_screenshot(const char* path) {
 }
 
 void getDpi(float* xdpi, float* ydpi) {
-  if (xdpi != nullptr) *xdpi = brimol::pc::kDpi;
-  if (ydpi != nullptr) *ydpi = brimol::pc::kDpi;
+  if (xdpi != nullptr) *xdpi = brimol_host_density();
+  if (ydpi != nullptr) *ydpi = brimol_host_density();
 }
 
 int skia_live_widget_c() { return openedPlatform() ? 1 : 0; }

@@ -43,6 +43,7 @@ class Platform {
   void close();
 
   Size screen() const { return settings.screen; }
+  float density() const { return settings.density; }
 
   /// Shows `frame` soon, instead of one that still waits to be shown. Never waits itself.
   void submit(Frame&& frame);

@@ -79,12 +79,10 @@ void Session::takeScreen() {
   if (problem.empty()) problem = wanted.error;
   const std::optional<Size>& size = parsed.trace.screen;
   if (!size) return;
-  if (const char* const given = std::getenv("BRIMOL_SCREEN"); given == nullptr || *given == '\0') {
-    screenSize = *size;
-  }
+  if (!wanted.settings.isSizeGiven) screenSize = *size;
   if (*size != screenSize && parsed.error.empty()) {
     parsed.error = settings.trace + ": it is for a screen of " + std::to_string(size->w) + 'x' +
-                   std::to_string(size->h) + ", and BRIMOL_SCREEN asks for another";
+                   std::to_string(size->h) + ", and the environment asks for another";
   }
 }
 

@@ -7,11 +7,14 @@
 #include <optional>
 #include <string_view>
 
+#include "host/devices.h"
+
 namespace brimol::pc {
 
 namespace {
 
 constexpr const char* kDisplayVariable = "BRIMOL_DISPLAY";
+constexpr const char* kDeviceVariable = "BRIMOL_DEVICE";
 constexpr const char* kScreenVariable = "BRIMOL_SCREEN";
 constexpr std::array kDesktopVariables = {"DISPLAY", "WAYLAND_DISPLAY"};
 constexpr std::size_t kShownBytes = 60;  // of a wrong value
@@ -68,7 +71,18 @@ std::string readDisplay(const VariableLookup& lookup, DisplayChoice& display) {
   return {};
 }
 
-std::string readScreen(const VariableLookup& lookup, Size& screen) {
+std::string readDevice(const VariableLookup& lookup, Settings& settings) {
+  const std::string value(valueOf(lookup, kDeviceVariable));
+  if (value.empty()) return {};
+  const BrimolDevice* const device = brimol_device_named(value.c_str());
+  if (device == nullptr) return wrongValue(kDeviceVariable, value, namesOfDevices());
+  settings.screen = {device->width, device->height};
+  settings.density = device->density;
+  settings.isSizeGiven = true;
+  return {};
+}
+
+std::string readScreen(const VariableLookup& lookup, Settings& settings) {
   const std::string_view value = valueOf(lookup, kScreenVariable);
   if (value.empty()) return {};
   const std::optional<Size> size = readSize(value);
@@ -76,7 +90,8 @@ std::string readScreen(const VariableLookup& lookup, Size& screen) {
     return wrongValue(kScreenVariable, value,
                       "WIDTHxHEIGHT, each 1 to " + std::to_string(kMaxScreenSide));
   }
-  screen = *size;
+  settings.screen = *size;
+  settings.isSizeGiven = true;
   return {};
 }
 
@@ -84,9 +99,11 @@ std::string readScreen(const VariableLookup& lookup, Size& screen) {
 
 SettingsResult readSettings(const VariableLookup& lookup) {
   SettingsResult result;
-  const std::string displayError = readDisplay(lookup, result.settings.display);
-  const std::string screenError = readScreen(lookup, result.settings.screen);
-  result.error = displayError.empty() ? screenError : displayError;
+  for (const std::string& error :
+       {readDisplay(lookup, result.settings.display), readDevice(lookup, result.settings),
+        readScreen(lookup, result.settings)}) {
+    if (result.error.empty()) result.error = error;
+  }
   return result;
 }
 

@@ -3,10 +3,12 @@
 ///
 /// | variable | value | without it |
 /// |---|---|---|
-/// | BRIMOL_DISPLAY | window or headless | a window where there is a desktop or SDL finds a driver
-/// | | BRIMOL_SCREEN | WIDTHxHEIGHT in pixels, each 1 to 16384 | 1440x2560 | | BRIMOL_TRACE | the
-/// trace that is played | none is | | BRIMOL_RECORD | the file that the session is recorded into |
-/// it is not | | BRIMOL_CLOCK | real, simulated or paced | what the session asks for, else real |
+/// | BRIMOL_DISPLAY | window or headless | a window where SDL finds a driver for one |
+/// | BRIMOL_DEVICE | a name of brimol/device.h: size and density | 1440x2560, 489.5 dots per inch |
+/// | BRIMOL_SCREEN | WIDTHxHEIGHT in pixels, each 1 to 16384; the density stays | the device's |
+/// | BRIMOL_TRACE | the trace that is played | none is |
+/// | BRIMOL_RECORD | the file that the session is recorded into | it is not |
+/// | BRIMOL_CLOCK | real, simulated or paced | what the session asks for, else real |
 /// | BRIMOL_CLOCK_START | GetTicks() at the start, in milliseconds | 0 |
 /// | BRIMOL_REPORT_DIR | the folder of a session's report and pictures | none is written |
 ///
@@ -22,11 +24,16 @@
 namespace brimol::pc {
 
 inline constexpr Size kDefaultScreen = {1440, 2560};
+// Dots per inch, across and down: those of a phone whose screen of the default size measures six
+// inches from corner to corner. The same whatever the size, so that layouts are the same.
+inline constexpr float kDefaultDensity = 489.5f;
 inline constexpr int kMaxScreenSide = 16384;  // pixels
 
 struct Settings {
   DisplayChoice display = DisplayChoice::WindowIfPossible;
   Size screen = kDefaultScreen;  // pixels, each side 1 to kMaxScreenSide
+  float density = kDefaultDensity;
+  bool isSizeGiven = false;  // by BRIMOL_DEVICE or BRIMOL_SCREEN
 };
 
 struct SettingsResult {
@@ -37,8 +44,8 @@ struct SettingsResult {
 /// Gives the value of a variable, or null where it is not set.
 using VariableLookup = std::function<const char*(const char* name)>;
 
-/// Reads BRIMOL_DISPLAY and BRIMOL_SCREEN. DISPLAY or WAYLAND_DISPLAY tell of a desktop. Opens
-/// nothing.
+/// Reads BRIMOL_DISPLAY, BRIMOL_DEVICE and BRIMOL_SCREEN. DISPLAY or WAYLAND_DISPLAY tell of a
+/// desktop. Opens nothing.
 SettingsResult readSettings(const VariableLookup& lookup);
 
 /// The same from the process's own environment.

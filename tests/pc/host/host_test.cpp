@@ -78,6 +78,10 @@ TEST_F(HostTest, OpensShowsAndClosesAgainAndAgain) {
     EXPECT_EQ(brimol_host_open(), 1) << brimol_host_error();
     EXPECT_EQ(EventInit(0), 1) << "open already";
     setEnvironment(display, "77x77");
+    setenv("BRIMOL_DEVICE", "wvga-4.0", 1);
+    float density = 0;
+    getDpi(&density, nullptr);
+    EXPECT_EQ(density, kDefaultDensity) << "what the open screen has";
     Size size = {};
     brimol_host_screen_size(&size.w, nullptr);
     brimol_host_screen_size(nullptr, &size.h);
@@ -91,6 +95,8 @@ TEST_F(HostTest, OpensShowsAndClosesAgainAndAgain) {
     EXPECT_NE(skia_live_widget_c(), 0);
     EventQuit();
     EventQuit();
+    EXPECT_NE(brimol_host_density(), kDefaultDensity) << "what the next one will have";
+    unsetenv("BRIMOL_DEVICE");
     EXPECT_EQ(skia_live_widget_c(), 0);
   }
 }

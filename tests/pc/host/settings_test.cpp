@@ -3,7 +3,10 @@
 #include <gtest/gtest.h>
 
 #include <array>
+#include <cmath>
 #include <string>
+
+#include "host/devices.h"
 
 namespace brimol::pc {
 namespace {
@@ -11,33 +14,40 @@ namespace {
 struct SettingsCase {
   const char* name;
   const char* display;  // BRIMOL_DISPLAY
+  const char* device;   // BRIMOL_DEVICE
   const char* screen;   // BRIMOL_SCREEN
   const char* desktop;  // DISPLAY
   DisplayChoice choice;
   Size size;
+  float density = kDefaultDensity;
   const char* error = "";
 };
 
+constexpr DisplayChoice kIfPossible = DisplayChoice::WindowIfPossible;
 constexpr const char* kWrongWord = "BRIMOL_DISPLAY=Window: wanted window or headless";
+constexpr const char* kWrongDevice =
+    "BRIMOL_DEVICE=wvga: wanted hvga-3.2, wvga-4.0, hd-4.7, fhd-5.0, wqhd-5.5, hdplus-6.5, "
+    "fhdplus-6.5 or wqhdplus-6.8";
 constexpr const char* kWrongBytes = "BRIMOL_DISPLAY=a??: wanted window or headless";
 constexpr auto kCases = std::to_array<SettingsCase>({
-    {"nothing is set", nullptr, nullptr, nullptr, DisplayChoice::WindowIfPossible, {1440, 2560}},
-    {"on a desktop", "", "", ":0", DisplayChoice::Window, {1440, 2560}},
-    {"a window", "window", "7x9", nullptr, DisplayChoice::Window, {7, 9}},
-    {"headless", "headless", "1x16384", ":0", DisplayChoice::Headless, {1, 16384}},
-    {"the first of two",
-     "Window",
-     "1x",
-     ":0",
-     DisplayChoice::WindowIfPossible,
-     {1440, 2560},
+    {"nothing is set", nullptr, nullptr, nullptr, nullptr, kIfPossible, kDefaultScreen},
+    {"on a desktop", "", "", "", ":0", DisplayChoice::Window, kDefaultScreen},
+    {"a window", "window", nullptr, "7x9", nullptr, DisplayChoice::Window, {7, 9}},
+    {"headless", "headless", "", "1x16384", ":0", DisplayChoice::Headless, {1, 16384}},
+    {"a device", "", "wvga-4.0", "", "", kIfPossible, {480, 800}, 233.2f},
+    {"its size alone", "", "wvga-4.0", "9x9", "", kIfPossible, {9, 9}, 233.2f},
+    {"no device", "", "wvga", "1x", "", kIfPossible, kDefaultScreen, kDefaultDensity, kWrongDevice},
+    {"the first of two", "Window", "", "1x", ":0", kIfPossible, kDefaultScreen, kDefaultDensity,
      kWrongWord},
-    {"no letters", "a\n\x7f", "", "", DisplayChoice::WindowIfPossible, {1440, 2560}, kWrongBytes},
+    {"no letters", "a\n\x7f", "", "", "", kIfPossible, kDefaultScreen, kDefaultDensity,
+     kWrongBytes},
 });
 
-SettingsResult read(const char* display, const char* screen, const char* desktop) {
+SettingsResult read(const char* display, const char* device, const char* screen,
+                    const char* desktop) {
   return readSettings([=](const std::string& name) -> const char* {
     if (name == "BRIMOL_DISPLAY") return display;
+    if (name == "BRIMOL_DEVICE") return device;
     if (name == "BRIMOL_SCREEN") return screen;
     return name == "DISPLAY" ? desktop : nullptr;
   });
@@ -46,9 +56,10 @@ SettingsResult read(const char* display, const char* screen, const char* desktop
 TEST(Settings, FollowTheEnvironment) {
   for (const SettingsCase& each : kCases) {
     SCOPED_TRACE(each.name);
-    const auto [settings, error] = read(each.display, each.screen, each.desktop);
+    const auto [settings, error] = read(each.display, each.device, each.screen, each.desktop);
     EXPECT_EQ(settings.display, each.choice);
     EXPECT_EQ(settings.screen, each.size);
+    EXPECT_EQ(settings.density, each.density);
     EXPECT_EQ(error, each.error);
   }
 }
@@ -56,9 +67,19 @@ TEST(Settings, FollowTheEnvironment) {
 TEST(Settings, TellASizeThatIsNone) {
   for (const char* const size : {"abc", "x1", "0x1", "-1x1", "+1x1", "16385x1", "1x", "1x-1",
                                  "99999999999x1", "10X1", " 10x1", "1x1 ", "10x20x1"}) {
-    EXPECT_EQ(read("", size, "").error,
+    EXPECT_EQ(read("", "", size, "").error,
               std::string("BRIMOL_SCREEN=") + size + ": wanted WIDTHxHEIGHT, each 1 to 16384");
   }
+}
+
+TEST(Devices, HaveTheDiagonalThatTheirNamesSay) {
+  for (const BrimolDevice& device : devices()) {
+    const std::string name = device.name;
+    const double inches = std::hypot(device.width, device.height) / device.density;
+    EXPECT_NEAR(inches, std::stod(name.substr(name.find('-') + 1)), 0.01) << name;
+    EXPECT_EQ(brimol_device_named(device.name), &device);
+  }
+  EXPECT_EQ(brimol_device_named(nullptr), nullptr);
 }
 
 }  // namespace
