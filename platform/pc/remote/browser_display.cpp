@@ -70,15 +70,15 @@ OpenedDisplay BrowserDisplay::open(Size screen, const std::optional<ListenAddres
 BrowserDisplay::BrowserDisplay(Size screen, Listeners listeners, const std::string& password,
                                InputTranslator& target, const InputService& clock)
     : input(target), service(clock), vnc(std::make_unique<VncServer>(screen, password, actions)) {
-  const std::size_t update = static_cast<std::size_t>(screen.w) *
-                                 static_cast<std::size_t>(screen.h) * kPixelBytes +
-                             kOverheadBytes;
-  web = std::make_unique<WebServer>(
-      std::move(listeners), update,
-      ViewerService{[this](Socket end, std::shared_ptr<Viewer> viewer) {
-                      vnc->attach(std::move(end), std::move(viewer));
-                    },
-                    [this] { vnc->lookAgain(); }});
+  const std::size_t update =
+      static_cast<std::size_t>(screen.w) * static_cast<std::size_t>(screen.h) * kPixelBytes +
+      kOverheadBytes;
+  web =
+      std::make_unique<WebServer>(std::move(listeners), update,
+                                  ViewerService{[this](Socket end, std::shared_ptr<Viewer> viewer) {
+                                                  vnc->attach(std::move(end), std::move(viewer));
+                                                },
+                                                [this] { vnc->lookAgain(); }});
 }
 
 // Up to its end the VNC server needs someone who takes what it still has to say.

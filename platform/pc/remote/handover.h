@@ -13,7 +13,9 @@ namespace brimol::pc {
 /// A picture in screen pixels, four bytes each.
 class Picture {
  public:
-  explicit Picture(Size size) : width(size.w), pixels(static_cast<std::size_t>(size.w) * static_cast<std::size_t>(size.h)) {}
+  explicit Picture(Size size)
+      : width(size.w),
+        pixels(static_cast<std::size_t>(size.w) * static_cast<std::size_t>(size.h)) {}
   uint32_t* row(int x, int y) {
     return pixels.data() + static_cast<std::size_t>(y) * static_cast<std::size_t>(width) + x;
   }

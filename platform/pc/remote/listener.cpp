@@ -53,11 +53,10 @@ std::optional<Listener> listenOnOne(const ListenAddress& address) {
   if (!found) return std::nullopt;
   Socket socket(::socket(found->ai_family, SOCK_STREAM | SOCK_NONBLOCK | SOCK_CLOEXEC, 0));
   const int yes = 1;
-  const bool listens =
-      socket.get() >= 0 &&
-      setsockopt(socket.get(), SOL_SOCKET, SO_REUSEADDR, &yes, sizeof yes) == 0 &&
-      bind(socket.get(), found->ai_addr, found->ai_addrlen) == 0 &&
-      listen(socket.get(), kBacklog) == 0;
+  const bool listens = socket.get() >= 0 &&
+                       setsockopt(socket.get(), SOL_SOCKET, SO_REUSEADDR, &yes, sizeof yes) == 0 &&
+                       bind(socket.get(), found->ai_addr, found->ai_addrlen) == 0 &&
+                       listen(socket.get(), kBacklog) == 0;
   if (!listens) return std::nullopt;
   const std::optional<uint16_t> port = portOf(socket);
   if (!port) return std::nullopt;

@@ -35,7 +35,7 @@ class ViewerHands {
  private:
   int64_t device;
   ActionQueue& queue;
-  std::map<int64_t, ScreenPoint> fingers;    // that are down, and where
+  std::map<int64_t, ScreenPoint> fingers;     // that are down, and where
   std::optional<ScreenPoint> mousePressedAt;  // or dragged to since
   std::set<SDL_Keycode> keys;
 };

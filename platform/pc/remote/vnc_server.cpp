@@ -56,13 +56,12 @@ void blockBrokenPipes() {
 bool isBehind(const Viewer& viewer) { return viewer.queuedBytes > kEnoughQueued; }
 
 // The outline is black and the inside white: the mask has both.
-rfbCursorPtr makeArrow() {
+rfbCursor* makeArrow() {
   std::string outline = kArrow;
   std::string mask = kArrow;
   std::ranges::replace(outline, '.', ' ');
   std::ranges::replace(mask, '.', 'x');
-  rfbCursorPtr arrow = rfbMakeXCursor(kArrowWidth, kArrowHeight, outline.data(), mask.data());
-  arrow->cleanup = TRUE;
+  rfbCursor* const arrow = rfbMakeXCursor(kArrowWidth, kArrowHeight, outline.data(), mask.data());
   arrow->foreRed = arrow->foreGreen = arrow->foreBlue = 0;
   arrow->backRed = arrow->backGreen = arrow->backBlue = 0xFFFF;
   return arrow;
@@ -78,6 +77,7 @@ VncServer::VncServer(Size size, std::string secret, ActionQueue& target)
       actions(target),
       handover(size),
       shown(size),
+      arrow(makeArrow()),
       bell(eventfd(0, EFD_CLOEXEC | EFD_NONBLOCK)) {
   setUpServer(size);
   thread = std::thread([this] { run(); });
@@ -114,7 +114,10 @@ void VncServer::setUpServer(Size size) {
   server->deferUpdateTime = 0;
   server->deferPtrUpdateTime = 0;
   server->maxClientWait = kPatienceMs;
-  server->cursor = makeArrow();
+  // Sent to viewers that draw a pointer themselves, and never painted into the picture.
+  server->cursor = nullptr;
+  server->getCursorPtr = [](rfbClientPtr client) { return serverOf(client).arrow.get(); };
+  server->screenData = this;
 }
 
 void VncServer::present(cairo_surface_t* picture, const Region& changed) {
@@ -202,6 +205,10 @@ void VncServer::removeGone() {
     rfbClientConnectionGone(guest->client);
     guest = guests.erase(guest);
   }
+}
+
+VncServer& VncServer::serverOf(rfbClientPtr client) {
+  return *static_cast<VncServer*>(client->screen->screenData);
 }
 
 ViewerHands& VncServer::handsOf(rfbClientPtr client) {

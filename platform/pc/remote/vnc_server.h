@@ -23,6 +23,10 @@ struct VncScreenDeleter {
   void operator()(rfbScreenInfo* screen) const { rfbScreenCleanup(screen); }
 };
 
+struct VncCursorDeleter {
+  void operator()(rfbCursor* cursor) const { rfbFreeCursor(cursor); }
+};
+
 /// Sends viewers what changes of the picture, and takes what they do. It never meets their
 /// connections: the web server passes on their bytes, whole messages only, by a pair of sockets,
 /// and takes all that it has for them at once. So no viewer can make it wait.
@@ -35,7 +39,8 @@ class VncServer {
   VncServer(const VncServer&) = delete;
   VncServer& operator=(const VncServer&) = delete;
 
-  /// Ends its thread, and with it the viewers; nothing is served any more. A second call does nothing.
+  /// Ends its thread, and with it the viewers; nothing is served any more. A second call does
+  /// nothing.
   void stop();
 
   /// Shows what changed of `picture`. One thread.
@@ -65,6 +70,7 @@ class VncServer {
   void sendChanges();
   void removeGone();
 
+  static VncServer& serverOf(rfbClientPtr client);
   static ViewerHands& handsOf(rfbClientPtr client);
   static void takePointer(int buttons, int x, int y, rfbClientPtr client);
   static void takeKey(rfbBool isDown, rfbKeySym symbol, rfbClientPtr client);
@@ -76,6 +82,7 @@ class VncServer {
   ActionQueue& actions;
   Handover handover;
   Picture shown;
+  std::unique_ptr<rfbCursor, VncCursorDeleter> arrow;
   std::unique_ptr<rfbScreenInfo, VncScreenDeleter> server;
   std::list<Guest> guests;  // the thread's own
   int64_t guestsSoFar = 0;

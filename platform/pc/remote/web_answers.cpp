@@ -29,8 +29,8 @@ constexpr auto kParts = std::to_array<PartRow>({
 // Names of letters, figures, - and _, with one dot before the ending, in folders of such names.
 bool isScript(std::string_view path) {
   const auto isPlain = [](char c) {
-    return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') ||
-           c == '-' || c == '_' || c == '/';
+    return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') || c == '-' ||
+           c == '_' || c == '/';
   };
   constexpr std::string_view kEnding = ".js";
   if (!path.ends_with(kEnding)) return false;

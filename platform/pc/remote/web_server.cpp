@@ -39,7 +39,8 @@ std::optional<std::string> header(lws* wsi, lws_token_indexes token) {
 }
 
 std::string_view bytesAt(const void* in, std::size_t length) {
-  return in == nullptr ? std::string_view() : std::string_view(static_cast<const char*>(in), length);
+  return in == nullptr ? std::string_view()
+                       : std::string_view(static_cast<const char*>(in), length);
 }
 
 int sendText(lws* wsi, const WebAnswer& answer) {
@@ -55,8 +56,7 @@ int sendText(lws* wsi, const WebAnswer& answer) {
   }
   std::vector<unsigned char> body(LWS_PRE);
   body.insert(body.end(), answer.text.begin(), answer.text.end());
-  const int sent =
-      lws_write(wsi, body.data() + LWS_PRE, answer.text.size(), LWS_WRITE_HTTP_FINAL);
+  const int sent = lws_write(wsi, body.data() + LWS_PRE, answer.text.size(), LWS_WRITE_HTTP_FINAL);
   return sent < 0 || lws_http_transaction_completed(wsi) != 0 ? 1 : 0;
 }
 
@@ -136,12 +136,11 @@ int WebServer::callback(lws* wsi, lws_callback_reasons reason, void* user, void*
   return lws_callback_http_dummy(wsi, reason, user, in, length);
 }
 
-bool WebServer::isHandled(lws* wsi, lws_callback_reasons reason, std::string_view in,
-                          int& result) {
+bool WebServer::isHandled(lws* wsi, lws_callback_reasons reason, std::string_view in, int& result) {
   switch (reason) {
     case LWS_CALLBACK_RAW_RX_FILE: accept(wsi); return true;
     case LWS_CALLBACK_HTTP: result = answer(wsi, in); return true;
-    case LWS_CALLBACK_FILTER_PROTOCOL_CONNECTION: 
+    case LWS_CALLBACK_FILTER_PROTOCOL_CONNECTION:
       result = isOfOwnPage(wsi) && hasRoom() ? 0 : 1;
       return true;
     case LWS_CALLBACK_ESTABLISHED: begin(wsi, Door::Web); return true;
@@ -250,8 +249,7 @@ bool WebServer::connectToServer(const LinePointer& line) {
   const ssize_t sent = ::send(ends[0], first.data(), first.size(), MSG_NOSIGNAL);
   lws_sock_file_fd_type descriptor = {};
   descriptor.sockfd = ends[0];
-  line->inner =
-      lws_adopt_descriptor_vhost(host, LWS_ADOPT_SOCKET, descriptor, kProtocol, nullptr);
+  line->inner = lws_adopt_descriptor_vhost(host, LWS_ADOPT_SOCKET, descriptor, kProtocol, nullptr);
   if (line->inner == nullptr || sent < 0) return false;
   line->caller.forServer().drop(static_cast<std::size_t>(sent));
   lines[line->inner] = line;
