@@ -17,7 +17,6 @@ namespace brimol::pc {
 namespace {
 
 const ListenAddress kUsual = {"127.0.0.1", 5800};
-constexpr int kBacklog = 32;
 
 struct AddressDeleter {
   void operator()(addrinfo* found) const { freeaddrinfo(found); }
@@ -56,7 +55,7 @@ std::optional<Listener> listenOnOne(const ListenAddress& address) {
   const bool listens = socket.get() >= 0 &&
                        setsockopt(socket.get(), SOL_SOCKET, SO_REUSEADDR, &yes, sizeof yes) == 0 &&
                        bind(socket.get(), found->ai_addr, found->ai_addrlen) == 0 &&
-                       listen(socket.get(), kBacklog) == 0;
+                       listen(socket.get(), SOMAXCONN) == 0;
   if (!listens) return std::nullopt;
   const std::optional<uint16_t> port = portOf(socket);
   if (!port) return std::nullopt;

@@ -40,6 +40,12 @@ std::size_t encodingsBytes(std::string_view message) {
   return count <= kMaxEncodings ? kHead + kEach * count : kBroken;
 }
 
+// A negative length is that of an extension's data.
+std::size_t clipboardBytes(std::string_view head) {
+  const auto length = static_cast<int32_t>(number(head, 4, 4));
+  return length < 0 ? static_cast<std::size_t>(-int64_t{length}) : static_cast<std::size_t>(length);
+}
+
 std::size_t messageBytes(std::string_view message) {
   switch (static_cast<uint8_t>(message.front())) {
     case kPixelFormat: return 20;
@@ -102,7 +108,7 @@ bool MessageGate::pass(std::string_view message, std::string& whole) {
     case Stage::Start: stage = Stage::Normal; break;
     case Stage::Normal:
       if (message.front() != kClipboard) break;
-      toSwallow = number(message, 4, 4);
+      toSwallow = clipboardBytes(message);
       return true;
   }
   whole += message;

@@ -21,6 +21,9 @@ const std::string kKey = "\4\1\0\0\0\0\0h"s;
 const std::string kFinger = "\310\1\0\5\0\6\2\0"s;
 const std::string kEncodings = "\2\0\0\2\0\0\0\0\0\0\0\1"s;
 const std::string kClipboard = "\6\0\0\0\0\0\0\3abc"s;
+const std::string kLongClipboard =
+    "\6\0\0\0\xFF\xFF\xFF\xFE"
+    "ab"s;
 
 struct Stream {
   const char* name;
@@ -32,7 +35,8 @@ struct Stream {
 TEST(MessageGate, PassesWholeMessagesOfViewersAlone) {
   const std::string old = "RFB 003.003\n" + std::string(16, 'p') + "\1";
   const Stream streams[] = {
-      {"all messages, and no clipboard", kHandshake + kEncodings + kClipboard + kFinger + kKey,
+      {"all messages, and no clipboard",
+       kHandshake + kEncodings + kClipboard + kLongClipboard + kFinger + kKey,
        kHandshake + kEncodings + kFinger + kKey},
       {"an old viewer", old + kKey, old + kKey},
       {"half a message", kHandshake + kKey.substr(0, 7), kHandshake},
