@@ -105,13 +105,16 @@ class BrowserTest(unittest.TestCase):
             self.browser.resize(390, 844)
             self.browser.open(test.address)
             self.eventually(lambda: self.look(0, 0) and self.status() == "")
-            first, second = self.look(100, 200), self.look(700, 300)
-            self.touch("touchStart", first, second)
+            self.touch("touchStart", self.look(100, 200), self.look(700, 300))
             self.touch("touchEnd")
             self.browser.press("Left")
             recording = pathlib.Path(test.folder.name, "session.trace")
-            for line in ("down 0 100 200", "down 1 700 300", "up 0 100 200", "up 1 700 300", "keyup 276"):
-                self.eventually(lambda line=line: line in recording.read_text())
+            self.eventually(lambda: "keyup 276" in recording.read_text())
+            records = re.findall(r"^\d+ (down|up) (\d) (\d+) (\d+)$", recording.read_text(), re.MULTILINE)
+            self.assertEqual([record[:2] for record in records], [("down", "0"), ("down", "1"), ("up", "0"), ("up", "1")])
+            for (_, _, x, y), wanted in zip(records, [(100, 200), (700, 300)] * 2):
+                self.assertAlmostEqual(int(x), wanted[0], delta=8)  # a pixel of the page is about four
+                self.assertAlmostEqual(int(y), wanted[1], delta=8)
 
 
 if __name__ == "__main__":
