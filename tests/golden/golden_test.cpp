@@ -56,11 +56,19 @@ std::string drawnItems(const Case& drawn) {
   return out.str();
 }
 
+Picture cut(Picture picture, View view) {
+  const auto pixelsAbove = [&](int row) {
+    return picture.pixels.begin() + ptrdiff_t{row} * picture.size.w;
+  };
+  const int bottom = std::min(view.bottom, picture.size.h);
+  return {{picture.size.w, bottom - view.top}, {pixelsAbove(view.top), pixelsAbove(bottom)}};
+}
+
 // On a ground, so that black and shadows are seen.
 Picture drawnPicture(const Case& drawn) {
   Frame frame = frameOf(drawn);
   frame.insert(frame.begin(), boxItem({0, 0, drawn.screen.w, drawn.screen.h, 0xFF405060}));
-  return painted(frame, drawn.screen);
+  return cut(painted(frame, drawn.screen), drawn.view);
 }
 
 fs::path fileOf(const Case& drawn, const char* suffix, const fs::path& folder = GOLDEN_DATA) {
