@@ -19,20 +19,21 @@ Frame frameOf(const Case& drawn) {
   return itemsOf(platform().takeDrawings());
 }
 
-Picture cut(const Picture& picture, View view) {
-  const auto pixelsAbove = [&](int row) {
-    return picture.pixels.begin() + ptrdiff_t{row} * picture.size.width;
-  };
-  const int bottom = std::min(view.bottom, picture.size.height);
-  return {{picture.size.width, bottom - view.top}, {pixelsAbove(view.top), pixelsAbove(bottom)}};
-}
-
-// On a ground, so that black and shadows are seen.
-Picture drawnPicture(const Case& drawn) {
-  Frame frame = frameOf(drawn);
+// What the view shows of the frame, on a ground, so that black and shadows are seen.
+Frame seen(Frame frame, const Case& drawn) {
   const auto& [width, height] = drawn.screen;
   frame.insert(frame.begin(), {SKIA_BOX, {0, 0, width, height, 0xFF405060}, {}, {}});
-  return cut(paint(frame, drawn.screen), drawn.view);
+  for (SKIA_Item& item : frame) {
+    item.rect.y -= drawn.view.top;
+    item.point.y1 -= drawn.view.top;
+    item.point.y2 -= drawn.view.top;
+  }
+  return frame;
+}
+
+Picture drawnPicture(const Case& drawn) {
+  const int bottom = std::min(drawn.view.bottom, drawn.screen.height);
+  return paint(seen(frameOf(drawn), drawn), {drawn.screen.width, bottom - drawn.view.top});
 }
 
 class Golden : public testing::TestWithParam<Case> {
