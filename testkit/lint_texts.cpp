@@ -50,7 +50,7 @@ double luminanceOf(const Color& color) {
 
 double contrastOf(const Color& one, const Color& other) {
   constexpr double kGlare = 0.05;
-  const auto [dark, light] = std::minmax(luminanceOf(one), luminanceOf(other));
+  const auto [dark, light] = std::minmax({luminanceOf(one), luminanceOf(other)});
   return (light + kGlare) / (dark + kGlare);
 }
 
