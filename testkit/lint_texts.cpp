@@ -16,9 +16,10 @@ using pc::Edges;
 
 constexpr double kSmallestTextMm = 1.5;
 constexpr double kEdgeMm = 0.5;
-constexpr double kTouchMm = 0.2;  // by which letters of two texts may reach into each other
+constexpr int64_t kTouchShare = 5;  // the part of a text's height by which others may touch it
 constexpr double kContrast = 3;
 
+int64_t heightOf(const Edges& edges) { return edges.bottom - edges.top; }
 int64_t widthOf(const Edges& edges) { return edges.right - edges.left; }
 
 std::string quoted(const std::string& text) { return '"' + text + '"'; }
@@ -118,10 +119,10 @@ int64_t overlapOf(const Edges& one, const Edges& other) {
 }
 
 // What of the text is touched or hidden by what is drawn later. Empty: nothing.
-std::string whatOverlaps(const View& view, const SeenText& seen, const Scale& scale) {
+std::string whatOverlaps(const View& view, const SeenText& seen) {
   const auto touches = [&](const Edges& other) {
-    const int64_t depth = overlapOf(seen.ink, other);
-    return depth > 1 && scale.mm(static_cast<double>(depth)) > kTouchMm;
+    const int64_t lower = std::min(heightOf(seen.ink), heightOf(other));
+    return overlapOf(seen.ink, other) * kTouchShare > lower;
   };
   for (const SeenText& later : view.texts) {
     if (later.item > seen.item && touches(later.ink)) return "overlaps " + quoted(later.text);
@@ -134,8 +135,8 @@ std::string whatOverlaps(const View& view, const SeenText& seen, const Scale& sc
   return {};
 }
 
-void lintOverlap(const View& view, const SeenText& seen, const Scale& scale, Findings& findings) {
-  const std::string what = whatOverlaps(view, seen, scale);
+void lintOverlap(const View& view, const SeenText& seen, Findings& findings) {
+  const std::string what = whatOverlaps(view, seen);
   if (what.empty()) {
     findings.addGood(Check::Overlap, view, seen.item);
   } else {
@@ -148,7 +149,7 @@ void lintOverlap(const View& view, const SeenText& seen, const Scale& scale, Fin
 void lintTexts(const View& view, const Scale& scale, Findings& findings) {
   for (const SeenText& seen : view.texts) {
     lintCut(view, seen, findings);
-    lintOverlap(view, seen, scale, findings);
+    lintOverlap(view, seen, findings);
     lintPlace(view, seen, scale, findings);
     lintSize(view, seen, scale, findings);
     lintContrast(view, seen, findings);

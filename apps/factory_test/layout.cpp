@@ -1,7 +1,10 @@
 #include "layout.h"
 
 #include <MW/window.h>
+#include <brimol/display.h>
 
+#include <algorithm>
+#include <cmath>
 #include <cstdio>
 #include <cstring>
 
@@ -11,6 +14,36 @@ ScreenSize screenSize() {
   ScreenSize screen = {};
   MW::Window::getwindowsize(&screen.width, &screen.height);
   return screen;
+}
+
+int pixelsOf(double millimetres, int least, int most) {
+  constexpr double kInch = 25.4;  // mm
+  float across = 0;
+  float down = 0;
+  getDpi(&across, &down);
+  return std::clamp(static_cast<int>(std::ceil(millimetres * across / kInch)), least, most);
+}
+
+int textSize(ScreenSize screen) {
+  constexpr double kReadable = 1.6;  // mm
+  constexpr int kLeast = 50;         // of the screen's height
+  constexpr int kMost = 40;
+  return pixelsOf(kReadable, screen.height / kLeast, screen.height / kMost);
+}
+
+int smallTextSize(ScreenSize screen) {
+  constexpr double kReadable = 1.6;  // mm
+  constexpr int kPercent = 70;       // of the other texts
+  const int most = textSize(screen);
+  return pixelsOf(kReadable, percentOf(most, kPercent), most);
+}
+
+int entryHeight(ScreenSize screen) {
+  constexpr double kFinger = 7.1;  // mm
+  constexpr int kLeastPercent = 6;
+  constexpr int kMostPercent = 11;
+  return pixelsOf(kFinger, percentOf(screen.height, kLeastPercent),
+                  percentOf(screen.height, kMostPercent));
 }
 
 SKIA_Text textOf(const char* words, uint32_t color, int align, int size) {

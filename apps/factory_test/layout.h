@@ -12,7 +12,8 @@ inline constexpr uint32_t kGroundColor = 0xFF1E2430;
 inline constexpr uint32_t kTitleColor = 0xFF2F5D8A;
 inline constexpr uint32_t kLineColor = 0xFFE8ECF2;
 inline constexpr uint32_t kButtonColor = 0xFFB8C4D6;
-inline constexpr uint32_t kPassColor = 0xFF2E7D4F;
+inline constexpr uint32_t kRowColor = 0xFF606060;
+inline constexpr uint32_t kPassColor = 0xFF286E46;
 inline constexpr uint32_t kFailColor = 0xFFA63A3A;
 
 constexpr int percentOf(int length, int percent) {
@@ -23,7 +24,13 @@ constexpr int percentOf(int length, int percent) {
 /// The screen as the toolkit knows it.
 ScreenSize screenSize();
 
-constexpr int textSize(ScreenSize screen) { return screen.height / 50; }
+/// Pixels of so many millimetres, at least `least` and at most `most`.
+int pixelsOf(double millimetres, int least, int most);
+
+/// A fiftieth of the screen's height, or more where that could not be read.
+int textSize(ScreenSize screen);
+/// Of long texts.
+int smallTextSize(ScreenSize screen);
 
 /// A row of the screen between the side margins, in per cent of the screen's height.
 constexpr SKIA_Rect rowOf(ScreenSize screen, int topPercent, int heightPercent, uint32_t color) {
@@ -56,12 +63,14 @@ constexpr SKIA_Rect cellOf(ScreenSize screen, const Grid& grid, int index, uint3
                 index % grid.columns, grid.columns);
 }
 
-inline constexpr Grid kButtonGrid = {50, 12, 10, 3};
+inline constexpr Grid kButtonGrid = {50, 12, 11, 3};
 inline constexpr Grid kKeyGrid = {34, 8, 7, 3};
 
-// The rows of the menu, in per cent of the screen's height.
+/// A row of the menu between its entries, in per cent of the screen's height.
 inline constexpr int kGroupPercent = 3;
-inline constexpr int kEntryPercent = 6;
+
+/// What a finger hits on every screen: 6 per cent of its height, or more where that is too low.
+int entryHeight(ScreenSize screen);
 
 /// What every test's page has above its own content, which begins at kContentTop per cent.
 struct PageLayout {

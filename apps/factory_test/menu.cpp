@@ -17,7 +17,12 @@ namespace factory_test {
 namespace {
 
 constexpr uint32_t kFigureMs = 1000;
-constexpr uint32_t kRowColor = 0xFF787878;
+// The list's status texts: the pixels of a letter, the screens on which they have no room, and the
+// widths of their columns in per cent of the screen's.
+constexpr int kLetter = 32;
+constexpr int kNarrow = 700;  // pixels
+constexpr int kRightPercent = 40;
+constexpr int kThirdPercent = 33;
 
 struct VerdictLook {
   Verdict verdict;
@@ -40,12 +45,35 @@ int moveUpIntoView(MW::MainList& list) {
   return row;
 }
 
-// What stands in an entry's row.
+enum class Keep { Head, Tail };
+
+// Of the words what finds room in so many per cent of the screen's width, without the blank that
+// keeps it from the edge. Less than one short word of them is nothing.
+std::string fitting(const std::string& words, int percent, Keep keep) {
+  constexpr std::size_t kShort = 6;
+  const auto width = static_cast<std::size_t>(percentOf(screenSize().width, percent));
+  const std::size_t room = width / kLetter - 1;
+  if (words.size() <= room) return words;
+  const bool isTail = keep == Keep::Tail;
+  const std::size_t blank =
+      isTail ? words.find(' ', words.size() - room - 1) : words.rfind(' ', room);
+  if (blank != std::string::npos) return isTail ? words.substr(blank + 1) : words.substr(0, blank);
+  if (room < kShort) return {};
+  const std::string cut = "..";
+  const std::size_t rest = room - cut.size();
+  return isTail ? cut + words.substr(words.size() - rest) : words.substr(0, rest) + cut;
+}
+
+int modeOf(ScreenSize screen) {
+  return screen.width < kNarrow ? MW::MainList::kPlain : MW::MainList::kExtended;
+}
+
+// What stands in a row.
 std::string rowWords(const char* name) { return std::string("   ") + name; }
 
 }  // namespace
 
-Menu::Menu(const ResultBook& book) : list("Factory test", MW::MainList::kExtended) {
+Menu::Menu(const ResultBook& book) : list(" Factory test", modeOf(screenSize())) {
   const auto& entries = testEntries();
   std::optional<Group> group;
   // Of no height: the list does not draw a row that begins exactly at its top.
@@ -61,6 +89,7 @@ Menu::Menu(const ResultBook& book) : list("Factory test", MW::MainList::kExtende
     rowOfEntry.push_back(row++);
   }
   addGroup("");
+  countRow = row;
   addRow("Leave");
   leaveRow = row + 1;
   list.initFinish();
@@ -79,7 +108,8 @@ Menu::Menu(const ResultBook& book) : list("Factory test", MW::MainList::kExtende
 
 void Menu::addGroup(const char* name) {
   const ScreenSize screen = screenSize();
-  const SKIA_Text text = textOf(name, 0, SKIA_ALIGN_LEFT, textSize(screen));
+  const std::string words = rowWords(name);
+  const SKIA_Text text = textOf(words.c_str(), 0, SKIA_ALIGN_LEFT, textSize(screen));
   list.addIndex(MW::MainList::kDark, &text, percentOf(screen.height, kGroupPercent));
 }
 
@@ -87,7 +117,7 @@ void Menu::addRow(const char* name) {
   const ScreenSize screen = screenSize();
   const std::string words = rowWords(name);
   const SKIA_Text text = textOf(words.c_str(), 0, SKIA_ALIGN_LEFT, textSize(screen));
-  list.addIndex(MW::MainList::kSelectable, &text, percentOf(screen.height, kEntryPercent));
+  list.setBGColor(list.addIndex(MW::MainList::kSelectable, &text, entryHeight(screen)), kRowColor);
 }
 
 void Menu::show() {
@@ -103,21 +133,37 @@ void Menu::update(uint32_t now) {
   refreshFigures();
 }
 
+std::string Menu::verdictsText() const {
+  return std::to_string(verdicts.size()) + " of " + std::to_string(rowOfEntry.size());
+}
+
 void Menu::refreshFigures() {
   const MachineFigures figures = presentFigures();
-  const auto put = [this](MW::MainList::StatusText place, const std::string& words) {
-    // Of an unknown figure the NUL is given, which empties its place.
-    list.setTextOption(place, words.c_str(), std::max(static_cast<int>(words.size()), 1));
+  const bool isNarrow = screenSize().width < kNarrow;
+  const auto put = [&](MW::MainList::StatusText place, const std::string& words) {
+    // Of nothing the NUL is given, which empties its place.
+    const auto length = isNarrow ? 0 : static_cast<int>(words.size());
+    list.setTextOption(place, length == 0 ? "" : words.c_str(), std::max(length, 1));
   };
-  put(MW::MainList::kBattery, figures.battery);
-  put(MW::MainList::kCharger, figures.charger);
-  put(MW::MainList::kBrightness, figures.brightness);
-  put(MW::MainList::kOperator, " " + figures.hostName);
-  put(MW::MainList::kAddress, figures.address);
-  put(MW::MainList::kSignal,
-      std::to_string(verdicts.size()) + " of " + std::to_string(rowOfEntry.size()) + " ");
-  put(MW::MainList::kTestMode, " " + figures.load);
-  put(MW::MainList::kBle, "");
+  const auto putRight = [&](MW::MainList::StatusText place, const std::string& words) {
+    put(place, fitting(words, kRightPercent, Keep::Tail) + " ");
+  };
+  const auto putLeft = [&](MW::MainList::StatusText place, const std::string& words) {
+    put(place, std::string(" ").append(words));
+  };
+  putRight(MW::MainList::kBattery, figures.battery);
+  putRight(MW::MainList::kCharger, figures.charger);
+  putRight(MW::MainList::kBrightness, figures.brightness);
+  putLeft(MW::MainList::kOperator, fitting(figures.hostName, kThirdPercent, Keep::Head));
+  put(MW::MainList::kAddress, fitting(figures.address, kThirdPercent, Keep::Tail));
+  put(MW::MainList::kSignal, verdictsText());
+  const std::size_t word = std::min(figures.load.find(' '), figures.load.size());
+  putLeft(MW::MainList::kTestMode, figures.load.substr(0, word));
+  put(MW::MainList::kBle, fitting(figures.load.substr(word), kRightPercent, Keep::Head));
+  if (isNarrow) {
+    const std::string count = rowWords(verdictsText().c_str());
+    list.setText(countRow, count.c_str(), static_cast<unsigned int>(count.size()));
+  }
   MW::isDisplayUpdate(1);
 }
 

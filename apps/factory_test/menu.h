@@ -7,6 +7,7 @@
 #include <cstdint>
 #include <optional>
 #include <set>
+#include <string>
 #include <vector>
 
 #include "current.h"
@@ -42,10 +43,13 @@ class Menu {
   void choose(int row);
   void followKey(unsigned int code);
   void refreshFigures();
+  /// How many entries have a verdict.
+  std::string verdictsText() const;
 
   Current<Menu> current{this};
   std::vector<int> rowOfEntry;  // the list's rows; neither changes once the constructor is done
   int leaveRow = kNothing;
+  int countRow = kNothing;
   std::atomic<int> chosenRow = kNothing;
   std::atomic<bool> leaveAsked = false;
   int markedRow = kNothing;        // dispatch thread

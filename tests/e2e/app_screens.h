@@ -1,4 +1,4 @@
-/// Where the application's screens have what the end-to-end tests use, on a screen of 720 x 1280.
+/// Where the application's screens have what the end-to-end tests use, on the screen of the device hd-4.7.
 #pragma once
 
 #include <array>
@@ -9,7 +9,7 @@
 namespace factory_test::screens {
 
 inline constexpr ScreenSize kScreen = {720, 1280};
-inline constexpr const char* kScreenSetting = "720x1280";
+inline constexpr const char* kDevice = "hd-4.7";
 
 /// The first rows of the menu that is not scrolled: how many groups and entries stand above each.
 struct MenuRow {
@@ -25,7 +25,8 @@ constexpr SKIA_Rect areaOf(const MenuRow& row) {
   constexpr int kListTop = 510;  // of MW::MainList with its extended header
   constexpr int kGap = 3;
   const int group = percentOf(kScreen.height, kGroupPercent) + kGap;
-  const int entry = percentOf(kScreen.height, kEntryPercent) + kGap;
+  constexpr int kEntryHeight = 88;  // 7.1 mm
+  const int entry = kEntryHeight + kGap;
   return {0, kListTop + kGap + row.groupsAbove * group + row.entriesAbove * entry, kScreen.width,
           entry - kGap, 0};
 }

@@ -32,7 +32,7 @@ class Program {
  public:
   explicit Program(std::vector<std::string> options) {
     setenv("BRIMOL_DISPLAY", "window", 1);
-    setenv("BRIMOL_SCREEN", kScreenSetting, 1);
+    setenv("BRIMOL_DEVICE", kDevice, 1);
     const char* const path = std::getenv("FACTORY_TEST");
     if (path == nullptr) throw std::runtime_error("FACTORY_TEST does not name the program");
     options.emplace(options.begin(), path);
@@ -99,7 +99,7 @@ class WindowApplication : public testing::Test {
     return eventually([&] { return line() != before; });
   }
 
-  static constexpr uint32_t kRowColor = 0xFF787878;
+  static constexpr uint32_t kRowColor = 0xFF606060;
   static constexpr int kInset = 8;  // a look at an area falls this part of it from its corner
 
   /// A log of 400 lines, of which line 300 says where the needle is.

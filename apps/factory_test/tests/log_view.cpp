@@ -23,7 +23,6 @@ constexpr int kTopPercent = 34;    // of the screen's height, and so the next
 constexpr int kViewPercent = 38;   // of the viewer by itself
 constexpr int kAbovePercent = 16;  // of the viewer above the keyboard
 constexpr int kKeyboardPercent = 29;
-constexpr int kTextPercent = 70;  // of the other texts
 
 /// The viewer with what the page tells of a search.
 class Viewer : public MW::StaticText {
@@ -72,7 +71,7 @@ class LogTest : public PageTest {
     const ScreenSize screen = screenSize();
     const SKIA_Rect area = rowOf(screen, kTopPercent, kViewPercent, kPaper);
     const SKIA_Text looks =
-        textOf("", MW::kColorBlack, SKIA_ALIGN_LEFT, percentOf(textSize(screen), kTextPercent));
+        textOf("", MW::kColorBlack, SKIA_ALIGN_LEFT, smallTextSize(screen));
     viewer.emplace(&area, &looks);
     viewer->setRect(MW::kUnused, &area);  // room for the line numbers
     viewer->setText(text.c_str());

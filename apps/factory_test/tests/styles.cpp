@@ -39,13 +39,13 @@ struct StyleRow {
 
 // Events come to the last but one first, and it lets the last one have them, too.
 constexpr auto kStyles = std::to_array<StyleRow>({
-    {"Button box", 36, 9, 0, 2, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kButtonBox>},
-    {"Text box", 36, 9, 1, 2, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kTextBox>},
-    {"Box", 49, 9, 0, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kButtonBox>},
-    {"Text", 49, 9, 1, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kTextBox>},
-    {"Framed", 49, 9, 2, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kFramed>},
+    {"Button box", 36, 11, 0, 2, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kButtonBox>},
+    {"Text box", 36, 11, 1, 2, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kTextBox>},
+    {"Box", 49, 11, 0, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kButtonBox>},
+    {"Text", 49, 11, 1, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kTextBox>},
+    {"Framed", 49, 11, 2, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kFramed>},
     {"Both", 62, 17, 0, 1, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kPassOn>},
-    {"One", 72, 6, 1, 3, MW::kColorWhite, makePlain},
+    {"One", 67, 11, 1, 3, MW::kColorWhite, makePlain},
 });
 
 /// Counts the clicks of each.

@@ -27,7 +27,7 @@ class TimedTest : public PageTest {
   void enter() override {
     page.ask().otherKey = [](unsigned int code) { Current<TimedTest>::get().followKey(code); };
     const ScreenSize screen = screenSize();
-    const SKIA_Rect row = rowOf(screen, kContentTop, 9, kButtonColor);
+    const SKIA_Rect row = rowOf(screen, kContentTop, 11, kButtonColor);
     placeButton(toastButton, cellOf(row, 0, 2), "Toast");
     placeButton(progressButton, cellOf(row, 1, 2), "Progress");
     toastButton->clickCallback = [](int) { Current<TimedTest>::get().startToast(); };
