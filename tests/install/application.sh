@@ -1,7 +1,7 @@
 # The guide's application is built with pkg-config against the moved installation, too, and draws the
 # same; a C program, built both ways, calls the entry points for C; a missing component is named.
 . "$SOURCE/tests/install/common.sh"
-export PKG_CONFIG_PATH=$staged/$LIBRARIES/pkgconfig
+export BRIMOL_DISPLAY=headless PKG_CONFIG_PATH=$staged/$LIBRARIES/pkgconfig
 guide=$WORK/guide/bench
 out=$WORK/application
 rm -rf "$out"
@@ -13,9 +13,10 @@ path=-Wl,-rpath,$staged/$LIBRARIES
 "$CXX" -std=c++20 "$guide"/src/*.cpp $flags "$path" -o "$out/bench"
 grep -q "libbrimol3_widget.so.$INTERFACE => $staged/" <<<"$(ldd "$out/bench")" ||
   fail "The program does not run with the installed library."
-BRIMOL_DISPLAY=headless BRIMOL_TRACE=$guide/traces/lamp.trace BRIMOL_REPORT_DIR=$out/report "$out/bench"
+BRIMOL_TRACE=$guide/traces/lamp.trace BRIMOL_REPORT_DIR=$out/report "$out/bench"
 cmp "$out/report/menu.png" "$guide/report/menu.png"
 
+export BRIMOL_SCREEN=400x300
 cmake -S "$here/c_program" -B "$out/c_program" "-DCMAKE_PREFIX_PATH=$staged" >"$out/configured"
 cmake --build "$out/c_program"
 "$out/c_program/c_program"
