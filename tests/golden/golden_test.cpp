@@ -56,19 +56,20 @@ std::string drawnItems(const Case& drawn) {
   return out.str();
 }
 
-Picture cut(Picture picture, View view) {
-  const auto pixelsAbove = [&](int row) {
-    return picture.pixels.begin() + ptrdiff_t{row} * picture.size.w;
-  };
-  const int bottom = std::min(view.bottom, picture.size.h);
-  return {{picture.size.w, bottom - view.top}, {pixelsAbove(view.top), pixelsAbove(bottom)}};
+// What the view shows of the frame, on a ground, so that black and shadows are seen.
+Frame seen(Frame frame, const Case& drawn) {
+  frame.insert(frame.begin(), boxItem({0, 0, drawn.screen.w, drawn.screen.h, 0xFF405060}));
+  for (SKIA_Item& item : frame) {
+    item.rect.y -= drawn.view.top;
+    item.point.y1 -= drawn.view.top;
+    item.point.y2 -= drawn.view.top;
+  }
+  return frame;
 }
 
-// On a ground, so that black and shadows are seen.
 Picture drawnPicture(const Case& drawn) {
-  Frame frame = frameOf(drawn);
-  frame.insert(frame.begin(), boxItem({0, 0, drawn.screen.w, drawn.screen.h, 0xFF405060}));
-  return cut(painted(frame, drawn.screen), drawn.view);
+  const int bottom = std::min(drawn.view.bottom, drawn.screen.h);
+  return painted(seen(frameOf(drawn), drawn), {drawn.screen.w, bottom - drawn.view.top});
 }
 
 fs::path fileOf(const Case& drawn, const char* suffix, const fs::path& folder = GOLDEN_DATA) {

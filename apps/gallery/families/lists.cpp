@@ -89,8 +89,8 @@ constexpr auto kLists = std::to_array<Example>({
 }  // namespace
 
 Family lists() {
-  return {"Lists", "Lists over the whole screen, which a finger scrolls.", sourceOf("lists"),
-          kLists};
+  return {"Lists", "Lists over the whole screen, which a finger scrolls.",
+          sourceOf("families/lists.cpp"), kLists};
 }
 
 }  // namespace gallery

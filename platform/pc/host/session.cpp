@@ -49,7 +49,11 @@ bool isSameFrame(const Frame& one, const Frame& other) {
 }
 
 const char* nameOf(DisplayChoice display) {
-  return display == DisplayChoice::Headless ? "headless" : "window";
+  switch (display) {
+    case DisplayChoice::Headless: return "headless";
+    case DisplayChoice::Browser: return "browser";
+    default: return "window";
+  }
 }
 
 }  // namespace
