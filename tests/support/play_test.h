@@ -6,7 +6,7 @@
 #include <source_location>
 
 #include "support/widget_test.h"
-#include "testkit/play.h"
+#include <brimol3_widget_test/play.h>
 
 namespace brimol::test {
 
