@@ -5,7 +5,7 @@
 #include <initializer_list>
 
 #include "support/widget_test.h"
-#include "testkit/play.h"
+#include <brimol3_widget_test/play.h>
 
 namespace brimol::test {
 
