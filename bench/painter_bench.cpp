@@ -1,6 +1,6 @@
-// What painting costs on a screen of 1440 x 2560 pixels. The counter `memsets` is the time of one
-// painting, measured in memsets of such a frame: one follows each painting, and the medians of both
-// are compared.
+// What painting costs, for each scene. Each painting is followed by a memset of a frame; frames for
+// that take turns, so that none stays in the processor's cache. Least and median: microseconds, and
+// how many of the memsets' least and median that is.
 
 #include <benchmark/benchmark.h>
 
@@ -10,129 +10,118 @@
 #include <cstring>
 #include <vector>
 
+#include "allocations.h"
 #include "painter/painter.h"
 #include "percentile.h"
+#include "scenes.h"
 
 namespace {
 
-using brimol::pc::Frame;
 using brimol::pc::Painter;
 using Clock = std::chrono::steady_clock;
-using Seconds = std::chrono::duration<double>;
+using Microseconds = std::chrono::duration<double, std::micro>;
 
-constexpr brimol::pc::Size kScreen = {1440, 2560};
-constexpr std::size_t kFrameBytes = std::size_t{4} * kScreen.w * kScreen.h;
-
-constexpr uint32_t kWhite = 0xFFFFFFFF;
-constexpr uint32_t kBlack = 0xFF000000;
-constexpr uint32_t kFace = 0xFFDDE6F0;
-constexpr uint32_t kPressedFace = 0xFF87CEFA;
-constexpr uint32_t kVeil = 0x80000000;
-constexpr int32_t kCentred = 5;
-
-SKIA_Item box(SKIA_Rect rect) { return {SKIA_BOX, rect, {}, {}}; }
-
-SKIA_Item textItem(int32_t kind, SKIA_Rect rect, const char* words, int32_t size) {
-  SKIA_Item item = {kind, rect, {}, {}};
-  item.text.string_len = static_cast<int32_t>(std::strlen(words));
-  std::copy_n(words, item.text.string_len, item.text.text);
-  item.text.color = kBlack;
-  item.text.align = kCentred;
-  item.text.size = size;
-  return item;
-}
-
-Frame fillOf(uint32_t color) { return {box({0, 0, kScreen.w, kScreen.h, color})}; }
-
-// Fourteen rows of text over a ground of the given colour, scrolled by so many pixels.
-Frame menuOver(uint32_t ground, int32_t scroll = 0) {
-  constexpr auto kRows = std::to_array<const char*>(
-      {"Touch screen", "Display colours", "Camera front", "Camera back", "Vibration", "Speaker",
-       "Receiver", "Microphone", "Proximity sensor", "Light sensor", "Fingerprint", "Wireless",
-       "Satellites", "Battery"});
-  constexpr int32_t kRowHeight = 160;
-  Frame frame = fillOf(ground);
-  int32_t y = 40 - scroll;
-  for (const char* const words : kRows) {
-    frame.push_back(textItem(SKIA_TEXTBOX, {40, y, kScreen.w - 80, kRowHeight, kFace}, words, 64));
-    y += kRowHeight + 16;
-  }
-  return frame;
-}
-
-// A dialog with its frame, title, three lines and two buttons over a veil over a ground.
-Frame dialogOver(uint32_t ground) {
-  Frame frame = fillOf(ground);
-  frame.push_back(box({0, 0, kScreen.w, kScreen.h, kVeil}));
-  frame.push_back({SKIA_ROUNDBOX, {120, 760, 1200, 1000, kWhite}, {}, {}});
-  frame.push_back(textItem(SKIA_LABEL, {120, 780, 1200, 140, 0}, "Fingerprint", 72));
-  frame.push_back(textItem(SKIA_LABEL, {160, 980, 1120, 100, 0}, "The sensor did not answer.", 56));
-  frame.push_back(textItem(SKIA_LABEL, {160, 1100, 1120, 100, 0}, "Clean it and try again,", 56));
-  frame.push_back(textItem(SKIA_LABEL, {160, 1220, 1120, 100, 0}, "or mark it as failed.", 56));
-  frame.push_back(textItem(SKIA_ROUNDBUTTONBOX, {180, 1520, 500, 180, kFace}, "Fail", 64));
-  frame.push_back(textItem(SKIA_ROUNDBUTTONBOX, {760, 1520, 500, 180, kFace}, "Again", 64));
-  return frame;
-}
-
-// A menu with one button that has the given face.
-Frame menuWithButton(uint32_t face) {
-  Frame frame = menuOver(kWhite);
-  frame.push_back(textItem(SKIA_ROUNDBUTTONBOX, {420, 2300, 600, 180, face}, "Back", 64));
-  return frame;
-}
+constexpr std::size_t kFrameBytes = std::size_t{4} * scenes::kScreen.w * scenes::kScreen.h;
 
 template <typename Work>
-double secondsOf(const Work& work) {
+double microsecondsOf(const Work& work) {
   const auto start = Clock::now();
   work();
-  return Seconds(Clock::now() - start).count();
+  return Microseconds(Clock::now() - start).count();
 }
 
-// Paints the two frames by turns; they differ where the painting is to be measured.
-void paintByTurns(benchmark::State& state, const Frame& one, const Frame& other) {
-  Painter painter(kScreen);
-  painter.paint(one);
-  painter.paint(other);
-  std::vector<unsigned char> bytes(kFrameBytes);
+// Frames' worth of memory, more of it than caches hold.
+class Buffers {
+ public:
+  Buffers() {
+    for (auto& buffer : buffers) buffer.resize(kFrameBytes);
+  }
+
+  double setNext() {
+    auto& buffer = buffers.at(next % buffers.size());
+    ++next;
+    return microsecondsOf([&buffer, value = static_cast<int>(next % 2)] {
+      std::memset(buffer.data(), value, buffer.size());
+      benchmark::DoNotOptimize(buffer.data());
+      benchmark::ClobberMemory();
+    });
+  }
+
+ private:
+  static constexpr std::size_t kCount = 6;
+  std::array<std::vector<unsigned char>, kCount> buffers;
+  std::size_t next = 0;
+};
+
+void report(benchmark::State& state, std::vector<double>& paintings, std::vector<double>& memsets) {
+  const double least = percentile(paintings, 0);
+  const double middle = median(paintings);
+  state.counters["least_us"] = least;
+  state.counters["median_us"] = middle;
+  state.counters["least_memsets"] = least / percentile(memsets, 0);
+  state.counters["median_memsets"] = middle / median(memsets);
+}
+
+// The first frames fill the painter's caches and are not measured.
+void painting(benchmark::State& state, scenes::Frame (*frameOf)(int number)) {
+  constexpr int kWarmUp = 20;
+  Painter painter(scenes::kScreen);
+  Buffers buffers;
+  int number = 0;
+  while (number < kWarmUp) painter.paint(frameOf(number++));
   std::vector<double> paintings;
   std::vector<double> memsets;
+  uint64_t allocations = 0;
   while (state.KeepRunning()) {
-    const Frame& next = paintings.size() % 2 == 0 ? one : other;
-    paintings.push_back(secondsOf([&painter, &next] { painter.paint(next); }));
-    state.SetIterationTime(paintings.back());
-    const int value = static_cast<int>(paintings.size() % 2);
-    memsets.push_back(secondsOf([&bytes, value] {
-      std::memset(bytes.data(), value, bytes.size());
-      benchmark::DoNotOptimize(bytes.data());
-      benchmark::ClobberMemory();
-    }));
+    const brimol::pc::Frame frame = frameOf(number++);
+    const uint64_t before = allocationCount();
+    const double taken = microsecondsOf([&painter, &frame] { painter.paint(frame); });
+    allocations += allocationCount() - before;
+    paintings.push_back(taken);
+    memsets.push_back(buffers.setNext());
+    state.SetIterationTime(taken / Microseconds::period::den);
   }
-  state.counters["memsets"] = median(paintings) / median(memsets);
+  state.counters["allocations"] =
+      static_cast<double>(allocations) / static_cast<double>(paintings.size());
+  report(state, paintings, memsets);
 }
 
-void fullFill(benchmark::State& state) { paintByTurns(state, fillOf(kFace), fillOf(kPressedFace)); }
-
-void menu(benchmark::State& state) { paintByTurns(state, menuOver(kWhite), menuOver(kFace)); }
-
-// A finger's step: the ground stays, every row moves.
-void scrolling(benchmark::State& state) {
-  paintByTurns(state, menuOver(kWhite), menuOver(kWhite, 12));
-}
-
-void veilWithDialog(benchmark::State& state) {
-  paintByTurns(state, dialogOver(kWhite), dialogOver(kFace));
-}
-
-void oneButton(benchmark::State& state) {
-  paintByTurns(state, menuWithButton(kFace), menuWithButton(kPressedFace));
-}
-
-constexpr double kSeconds = 0.5;
-BENCHMARK(fullFill)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
-BENCHMARK(menu)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
-BENCHMARK(scrolling)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
-BENCHMARK(veilWithDialog)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
-BENCHMARK(oneButton)->UseManualTime()->MinTime(kSeconds)->Unit(benchmark::kMicrosecond);
+constexpr int kFrames = 200;
+BENCHMARK_CAPTURE(painting, fill, scenes::fill)->UseManualTime()->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, menu, scenes::menu)->UseManualTime()->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, menu_with_new_texts, scenes::menuWithNewTexts)
+    ->UseManualTime()
+    ->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, one_new_row_text, scenes::menuWithOneNewText)
+    ->UseManualTime()
+    ->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, menu_scrolled_by_12, scenes::menuScrolled)
+    ->UseManualTime()
+    ->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, press, scenes::menuWithPress)->UseManualTime()->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, menu_under_veil, scenes::menuUnderVeil)
+    ->UseManualTime()
+    ->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, list_of_64_rows, scenes::list)->UseManualTime()->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, list_scrolled_by_10, scenes::listScrolled)
+    ->UseManualTime()
+    ->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, keyboard_of_42_keys, scenes::keyboard)
+    ->UseManualTime()
+    ->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, veil_and_dialog, scenes::veilWithDialog)
+    ->UseManualTime()
+    ->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, log_of_60x80, scenes::log)->UseManualTime()->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, log_moved_by_a_line, scenes::logMovedByALine)
+    ->UseManualTime()
+    ->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, log_of_60_new_lines, scenes::logWithNewLines)
+    ->UseManualTime()
+    ->Iterations(kFrames);
+BENCHMARK_CAPTURE(painting, nothing_changed, scenes::nothingChanged)
+    ->UseManualTime()
+    ->Iterations(kFrames);
 
 }  // namespace
 

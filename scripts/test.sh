@@ -5,7 +5,7 @@
 #   asan     the same under the address and undefined-behaviour sanitizers
 #   tsan     the same under the thread sanitizer
 #   phone    the library alone, without the PC platform
-#   tidy     formatting everywhere, clang-tidy over what is shipped
+#   tidy     formatting and clang-tidy, everywhere
 set -euo pipefail
 cd "$(dirname "$0")/.."
 

@@ -1,5 +1,6 @@
 #include "application.h"
 
+#include <MW/widget.h>
 #include <MW/window.h>
 #include <brimol/host.h>
 #include <brimol/input.h>
@@ -39,7 +40,7 @@ void loop(FactoryTest& test) {
   while (!test.isEnded() && brimol_host_close_requested() == 0 && interrupted == 0) {
     test.update(GetTicks());
     if (MW::isDisplayUpdate(0) == 1) test.draw();
-    MW::Window::updateTimer(0);
+    MW::Window::updateTimer(MW::kUnused);
     Delay(kLoopMs);
   }
 }

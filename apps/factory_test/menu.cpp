@@ -31,7 +31,7 @@ constexpr auto kLooks = std::to_array<VerdictLook>({
 
 // Moving up may scroll a row to the very top of the list, where the list does not draw it.
 int moveUpIntoView(MW::MainList& list) {
-  const int row = list.move_key_up(0);
+  const int row = list.move_key_up(MW::kUnused);
   MW::mouse_event belowEdge = {};
   belowEdge.y = MW::MainList::kExtendedTitleHeight + 1;
   MW::mouse_event aPixelDown = {};
@@ -149,7 +149,7 @@ void Menu::followKey(unsigned int code) {
   switch (code) {
     case MW::kKeyDown:
       // The list's own current item is the first one already, though nothing shows it yet.
-      mark(markedRow == kNothing ? rowOfEntry.front() : list.move_key_down(0));
+      mark(markedRow == kNothing ? rowOfEntry.front() : list.move_key_down(MW::kUnused));
       break;
     case MW::kKeyUp: mark(moveUpIntoView(list)); break;
     case MW::kKeySelect: choose(markedRow); break;

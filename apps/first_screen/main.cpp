@@ -26,7 +26,7 @@ int main() {
     MW::isDisplayUpdate(1);
     while (!done && brimol_host_close_requested() == 0) {
       if (MW::isDisplayUpdate(0) == 1) drawFrame();
-      MW::Window::updateTimer(0);
+      MW::Window::updateTimer(MW::kUnused);
       Delay(5);
     }
   }

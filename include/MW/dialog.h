@@ -17,6 +17,7 @@ namespace MW {
 /// of the one before. Handlers run on the dispatch thread.
 class MW_API Dialog : public PromptDialog {
  public:
+  /// What it asks, in the words of the constant.
   enum Kind {
     kLeaveFailedTest = 0,
     kPassOrFail = 1,
@@ -59,6 +60,18 @@ class MW_API Dialog : public PromptDialog {
     kLeaveLightSensor = 39
   };
 
+  /// How the kinds are laid out; a number without a name is kStandard.
+  enum Layout {
+    kStandard = 0,      ///< one line of message, two buttons
+    kTwoLine = 1,       ///< two lines, two buttons
+    kHook = 2,          ///< one line, no button; the hook key answers
+    kEarjack = 3,       ///< two lines, no button
+    kOkOnly = 4,        ///< one line, one wide button
+    kTouchWarning = 5,  ///< one line and a progress row, on red
+    kTouchCaution = 6,  ///< two lines and a progress row, on red
+    kWait = 7           ///< one line, no button
+  };
+
   /// `dialogKind`: a Kind or any other number.
   explicit Dialog(int dialogKind);
   ~Dialog() override;
@@ -72,7 +85,7 @@ class MW_API Dialog : public PromptDialog {
   using Widget::onReleaseKey;
   using Widget::setDesc;
   using Widget::setRect;
-  /// The number of a kind's layout, 0 to 7.
+  /// The Layout of a kind.
   static int isType(int dialogKind);
   /// Lays it out on the present screen as `dialogKind`; its texts stay. Any thread.
   void setRect(int dialogKind);
@@ -80,14 +93,16 @@ class MW_API Dialog : public PromptDialog {
   void setTitle(const char* newTitle);
   /// Replaces the message, by the same rules.
   void setDesc(const char* newMessage);
+  /// Parts of onRecvEvent(); see Widget::onHover().
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key);
   /// Counts a release of the key that was released last; any other key ends the count.
   void onKeyClickCount(kbd_event key);
 
  protected:
-  int kind;
-  SKIA_Rect messageRect = {};  // these four are guarded by stateLock
+  int kind;  // as constructed
+  // Guarded by stateLock.
+  SKIA_Rect messageRect = {};
   SKIA_Text message = {};
   SKIA_Rect secondRect = {};
   SKIA_Text second = {};

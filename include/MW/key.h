@@ -22,13 +22,16 @@ namespace MW {
 /// `touchReleaseCallback`, `longPressCallback`. The record is valid for the call. They are called
 /// on the dispatch thread, and a plug event that was held back on the thread that draws.
 ///
-/// Plug events (user events) of the codes 2, 17 and 18 are held back for 100 ms, so that a plug
-/// that bounces is told once it has settled: 17 and 18 are then told as 2. Another code is told at
-/// once if the last one of these three was 2 or was told as 2; a 2 that is still held is then
-/// dropped. Before the first of the three, and while 17 or 18 is held, another code is
-/// dropped. Nothing is held while `plugCallback` is null.
+/// Plug events (user events) of a PlugCode are held back for 100 ms, so that a plug that bounces is
+/// told once it has settled: the passing ones are then told as kPlugSettled. Another code is told
+/// at once if the last PlugCode was kPlugSettled or was told as it; a kPlugSettled that is still
+/// held is then dropped. Before the first PlugCode, and while a passing one is held, another code
+/// is dropped. Nothing is held while `plugCallback` is null.
 class MW_API Key : public Widget {
  public:
+  /// Codes of user events that tell of a plug.
+  enum PlugCode { kPlugSettled = 2, kPlugPassing1 = 17, kPlugPassing2 = 18 };
+
   Key();
   ~Key() override;
 
@@ -44,6 +47,9 @@ class MW_API Key : public Widget {
   using Widget::onPressKey;
   using Widget::onPressLong;
   using Widget::onReleaseKey;
+
+  // Parts of onRecvEvent(); see Widget::onHover().
+
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key);
   void onPressLong(mouse_event mouse);

@@ -10,6 +10,15 @@
 
 namespace MW {
 
+/// What type() of a primitive says. Its kind in the display-item table (SKIA_ItemKind) is another.
+enum PrimitiveType {
+  kTypeLabel = 3,
+  kTypeImage = 5,
+  kTypeBox = 6,
+  kTypeLine = 7,
+  kTypeTextbox = 8
+};
+
 /// What labels and text boxes have in common; not used by itself.
 class MW_API TextPrimitive : public Widget {
  public:
@@ -23,6 +32,7 @@ class MW_API TextPrimitive : public Widget {
   void setBgColor(unsigned int color) override;
 
  protected:
+  /// Copies both records. `primitiveType`: a PrimitiveType.
   TextPrimitive(int primitiveType, const SKIA_Rect* area, const SKIA_Text* caption);
 };
 
@@ -71,6 +81,7 @@ class MW_API Image : public Widget {
 /// A filled rectangle.
 class MW_API Box : public Widget {
  public:
+  /// Copies the record; its colour fills the box.
   explicit Box(const SKIA_Rect* area);
   /// Draws it. Returns the platform's handle of the item.
   int show() override;
@@ -84,6 +95,7 @@ class MW_API Box : public Widget {
 /// A straight line.
 class MW_API Line : public Widget {
  public:
+  /// Copies the record.
   explicit Line(const SKIA_Point* line);
   /// Draws it. Returns the platform's handle of the item.
   int show() override;

@@ -13,6 +13,9 @@
 
 namespace MW {
 
+/// For an argument that an operation does not read.
+inline constexpr int kUnused = 0;
+
 /// Everything that can be seen or touched is a Widget.
 ///
 /// The application creates, owns and deletes widgets. A widget is drawn, timed and offered events
@@ -32,6 +35,7 @@ namespace MW {
 /// its destructor, so that no other thread meets a half-destroyed object.
 class MW_API Widget {
  public:
+  /// Inactive and in no layer.
   Widget();
   Widget(const Widget&) = delete;
   Widget& operator=(const Widget&) = delete;
@@ -64,18 +68,21 @@ class MW_API Widget {
   /// The widget's text, in its own record: valid while the widget lives. Read it on the thread
   /// that sets it.
   virtual char* getText();
+  /// Colours are 0xAARRGGBB.
   virtual unsigned int getBgColor();
   virtual unsigned int getTextColor();
+  /// In pixels.
   virtual int getFontSize();
   /// The widget's own rectangle record; as for getText().
   virtual SKIA_Rect* getPositionAndSize();
+  /// Of the widget's text.
   virtual void setFontSize(int pixels);
   /// Texts are copied, and cut to 127 bytes at a whole character. Null is the empty text.
   virtual void setText(const char* newText);
   /// enum SKIA_Align.
   virtual void setTextAlign(int align);
+  /// Colours are 0xAARRGGBB: of the text, background, border and line.
   virtual void setTextColor(unsigned int color);
-  /// Background, border and line.
   virtual void setBgColor(unsigned int color);
   virtual void setBdColor(unsigned int color);
   virtual void setLnColor(unsigned int color);
@@ -133,7 +140,8 @@ class MW_API Widget {
   /// number + 1. Any thread.
   void setSelect(int value) { select = value; }
   int isSelect() const { return select; }
-  /// The layer: 0 top (dialogs), 1 base. Set it before the widget is registered.
+  /// The layer, a LayerNumber; of a primitive its PrimitiveType. Set it before the widget is
+  /// registered.
   void setType(int value) { type_ = value; }
   int type() const { return type_; }
   /// The number that Window::registerWidget gave. After a removal two widgets may have the same.
@@ -152,8 +160,10 @@ class MW_API Widget {
   /// The colour to draw at `now` (GetTicks() milliseconds): black in the dark phase and while
   /// blinking is off. A phase lasts a little over 500 ms; the first one is dark.
   unsigned int updateBlink(unsigned int now);
-  /// Follows the left and right keys between two choices (`keyDir`), where the choice may be
-  /// taken. Returns 1 when `key` is the select key and at least one may be taken.
+  /// Which of two choices keys have taken.
+  enum KeySide { kNoSide = 0, kLeftSide = 1, kRightSide = 2 };
+  /// Follows the left and right keys between two choices (`keyDir`, a KeySide), where the choice
+  /// may be taken. Returns 1 when `key` is the select key and at least one may be taken.
   int move_key_select(int key, int canLeft, int canRight);
 
   // The application's callbacks. Null: not wanted.
@@ -208,21 +218,21 @@ class MW_API Widget {
   /// Held for a few instructions and drawing calls, never while a callback runs.
   mutable std::mutex stateLock;
 
-  int type_ = 0;
-  int blink = 0;
-  SKIA_Rect rect = {};
-  SKIA_Text text = {};
-  SKIA_Point point = {};
-  std::atomic<int> buttonType = 0;
-  std::atomic<int> id_ = 0;          // Window writes it under the layer lock
-  std::atomic<bool> active = false;  // publishes to a walk what was set before
-  std::atomic<int> select = 0;
-  std::atomic<int> ownerFinger = -1;
-  FingerHold hold{select};
-  unsigned int blinkColor = 0;
-  unsigned int blinkNext = 0;   // GetTicks() milliseconds, 0: not started
-  unsigned int blinkCount = 0;  // toggles so far
-  int keyDir = 0;               // last key selection: 0 none, 1 left, 2 right
+  int type_ = 0;                      // what setType() was given
+  int blink = 0;                      // 1: it blinks
+  SKIA_Rect rect = {};                // its place and colour
+  SKIA_Text text = {};                // its caption
+  SKIA_Point point = {};              // its line or arrow
+  std::atomic<int> buttonType = 0;    // what setButtonType() was given
+  std::atomic<int> id_ = 0;           // Window writes it under the layer lock
+  std::atomic<bool> active = false;   // publishes to a walk what was set before
+  std::atomic<int> select = 0;        // 0, or what setSelect() was given
+  std::atomic<int> ownerFinger = -1;  // what setOwnerFinger() was given
+  FingerHold hold{select};            // which finger holds it
+  unsigned int blinkColor = 0;        // 0xAARRGGBB
+  unsigned int blinkNext = 0;         // GetTicks() milliseconds, 0: not started
+  unsigned int blinkCount = 0;        // toggles so far
+  int keyDir = kNoSide;               // last key selection
 
  private:
   friend class Layers;

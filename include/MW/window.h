@@ -23,7 +23,8 @@ class MW_API Window {
   /// destroy(). Without memory or a thread for input it logs an error line and returns 1, and no
   /// input comes. A second call before destroy() changes nothing and returns 1. Any thread: a call
   /// waits while another thread is inside init() or destroy(); in a handler it returns 0 instead,
-  /// after an error line.
+  /// after an error line. If a handler calls destroy() meanwhile, the window is ended again before
+  /// init() returns.
   static int init();
   /// Stops the dispatch thread and then input, and waits for both. Returns 1. The widgets stay as
   /// they are. Any thread: a call waits while another thread is inside init() or destroy().
@@ -31,14 +32,14 @@ class MW_API Window {
   /// It may also be called in a handler or callback. There it waits for no thread that runs
   /// handlers, since that thread might be waiting for this very handler. On the dispatch thread
   /// everything ends but that thread, which ends after its callback. An init() in the same callback
-  /// starts a new dispatch thread at once, whose handlers may run beside the rest of the callback;
-  /// a later destroy() waits for the new thread alone.
+  /// starts a new dispatch thread, whose handlers begin after the callback; a later destroy() waits
+  /// for both.
   ///
   /// In a handler of a drawing or timer pass, or of a dispatch thread that init() has replaced, it
   /// only tells the dispatch thread to end and logs an error line; a later init() or destroy(),
   /// outside handlers or on the dispatch thread, does the rest. In other handlers init() returns 0
-  /// until then. If another thread is inside init() or destroy(), a handler's destroy() only logs
-  /// that line; after an init() the window runs on, and needs another destroy() to end.
+  /// until then. If another thread is inside init() or destroy(), a handler's destroy() logs that
+  /// line and leaves the end to the other thread.
   static int destroy();
   /// The running event service; null before init() and after destroy(). Valid until destroy()
   /// begins; no thread may use it from then on.
@@ -73,6 +74,7 @@ class MW_API Window {
 
   /// Logs an event of codes 0 to 5 and returns 1; 0 for any other.
   static int onRecvEvent(event_data* event, unsigned int arg);
+  // Each logs a line.
   static void onHover();
   static void onPress();
   static void onRelease();

@@ -6,6 +6,8 @@
 #include <brimol/input.h>
 #include <brimol/scene.h>
 
+#include <utility>
+
 #include "core/class_log.h"
 #include "core/layer_walk.h"
 #include "core/layers.h"
@@ -65,7 +67,8 @@ bool dispatch(event_data* event) {
 
 }  // namespace
 
-func_dispatchEvent::func_dispatchEvent() : Thread(true) {
+func_dispatchEvent::func_dispatchEvent(android::sp<func_dispatchEvent> replaced)
+    : Thread(true), before(std::move(replaced)) {
   kLog.print(LogLevel::Debug, "func_dispatchEvent start!");
 }
 
@@ -75,6 +78,12 @@ func_dispatchEvent::~func_dispatchEvent() {
 
 bool func_dispatchEvent::isOnThisThread() const {
   return thread.load() == std::this_thread::get_id();
+}
+
+android::status_t func_dispatchEvent::readyToRun() {
+  if (before != nullptr) before->join();
+  before.clear();
+  return android::OK;
 }
 
 bool func_dispatchEvent::threadLoop() {

@@ -13,8 +13,12 @@ namespace MW {
 /// and raises the redraw flag for an event that a widget took.
 class func_dispatchEvent : public android::Thread {
  public:
-  func_dispatchEvent();
+  /// It begins once `replaced`, if any, has ended.
+  explicit func_dispatchEvent(android::sp<func_dispatchEvent> replaced = nullptr);
   ~func_dispatchEvent() override;
+
+  /// Waits for the replaced one.
+  android::status_t readyToRun() override;
 
   /// One round, which ends with a pause of a millisecond. Returns true: go on.
   bool threadLoop() override;
@@ -26,6 +30,7 @@ class func_dispatchEvent : public android::Thread {
 
  private:
   std::atomic<std::thread::id> thread;
+  android::sp<func_dispatchEvent> before;  // touched by its own thread once that runs
 };
 
 }  // namespace MW

@@ -18,7 +18,6 @@ namespace MW {
 namespace {
 
 constexpr ClassLog kLog("EVENTSERVICE");
-constexpr unsigned int kInputFlags = 0x01000001;
 constexpr int kProbeDistance = 20;  // pixels
 
 constinit std::mutex EvtQL;  // the queue lock
@@ -64,7 +63,7 @@ EventService::~EventService() {
 
 int EventService::startEvent() {
   kLog.print(LogLevel::Debug, "startEvent->EventInit");
-  EventInit(kInputFlags);
+  EventInit(BRIMOL_INPUT_FLAGS);
   thread_event = createThread<func_eventLoop>();
   if (thread_event == nullptr || !startThread(*thread_event)) {
     thread_event.clear();

@@ -12,10 +12,10 @@ namespace MW {
 inline constexpr const char* kEventThreadName = "event_dispatcher";
 
 /// Null where there is no memory, which the platform's own classes tell by an exception.
-template <typename Loop>
-android::sp<Loop> createThread() {
+template <typename Loop, typename... Arguments>
+android::sp<Loop> createThread(const Arguments&... arguments) {
   try {
-    return new (std::nothrow) Loop;
+    return new (std::nothrow) Loop(arguments...);
   } catch (const std::bad_alloc&) {
     return nullptr;
   }

@@ -9,8 +9,6 @@ namespace MW {
 
 namespace {
 constexpr unsigned int kBlinkMs = 500;
-constexpr int kKeyDirLeft = 1;
-constexpr int kKeyDirRight = 2;
 }  // namespace
 
 Widget::Widget() = default;
@@ -95,8 +93,8 @@ unsigned int Widget::updateBlink(unsigned int now) {
 }
 
 int Widget::move_key_select(int key, int canLeft, int canRight) {
-  if (key == kKeyLeft && canLeft != 0) keyDir = kKeyDirLeft;
-  if (key == kKeyRight && canRight != 0) keyDir = kKeyDirRight;
+  if (key == kKeyLeft && canLeft != 0) keyDir = kLeftSide;
+  if (key == kKeyRight && canRight != 0) keyDir = kRightSide;
   return key == kKeySelect && (canLeft != 0 || canRight != 0) ? 1 : 0;
 }
 

@@ -13,6 +13,7 @@
 #include "core/geometry.h"
 #include "core/layer_walk.h"
 #include "core/layers.h"
+#include "core/life_turn.h"
 #include "core/thread_start.h"
 
 namespace MW {
@@ -24,6 +25,7 @@ constexpr int kDefaultWidth = 1440;
 constexpr int kDefaultHeight = 2560;
 constexpr double kMmPerInch = 25.4;
 constexpr double kRoundUp = 0.5;
+constexpr const char* kEndLeft = "destroy: a handler asks for it: the rest is left to another call";
 
 constinit std::mutex updateLock;
 constinit int displayUpdate = 0;  // guarded by updateLock
@@ -31,18 +33,9 @@ constinit int displayUpdate = 0;  // guarded by updateLock
 // The input thread may ask for the service while it is being created or deleted.
 constinit std::atomic<EventService*> eventService = nullptr;
 
-// Starting and ending, one at a time.
-constinit std::mutex lifeLock;
-// Guarded by lifeLock. Null until a start and after an end; one that is to end after its round
-// stands here until somebody waited for it or the window starts again.
+// Touched by the thread whose LifeTurn it is. Null until a start and after an end; one that is to
+// end after its round stands here until somebody waited for it or the window starts again.
 android::sp<func_dispatchEvent> event_dispatcher;
-
-// Not owned where this thread is inside a handler and another one starts or ends the window: that
-// one may wait for the handler.
-std::unique_lock<std::mutex> lockLife() {
-  if (LayerWalk::isOnThisThread()) return {lifeLock, std::try_to_lock};
-  return std::unique_lock(lifeLock);
-}
 
 // False: it ends after its round, which this thread cannot wait for.
 bool endDispatcher() {
@@ -60,11 +53,21 @@ void endService() {
   eventService = nullptr;
 }
 
+void end() {
+  if (!endDispatcher()) {
+    kLog.print(LogLevel::Error, kEndLeft);
+    return;
+  }
+  endService();
+  kLog.print(LogLevel::Error, "event_dispatcher End");
+}
+
+bool isRunning() { return event_dispatcher != nullptr && !event_dispatcher->isEnding(); }
+
 // Does what is left of an end that a handler asked for. False: this thread cannot wait for it.
 bool finishEnd() {
-  if (event_dispatcher == nullptr || !event_dispatcher->isEnding()) return true;
+  if (event_dispatcher == nullptr || isRunning()) return true;
   if (!endDispatcher()) return false;
-  event_dispatcher.clear();
   endService();
   return true;
 }
@@ -76,13 +79,19 @@ bool startService() {
   return false;
 }
 
+// In a dispatched handler the thread that ends after that handler is still there: the new one
+// waits for it, so that no two of them call handlers, and who waits for the new one waits for both.
 bool startDispatcher() {
-  event_dispatcher = createThread<func_dispatchEvent>();
-  if (event_dispatcher != nullptr && startThread(*event_dispatcher)) return true;
-  event_dispatcher.clear();
-  kLog.print(LogLevel::Error, "init->func_dispatchEvent failed!!");
-  return false;
+  const auto started = createThread<func_dispatchEvent>(event_dispatcher);
+  if (started == nullptr || !startThread(*started)) {
+    kLog.print(LogLevel::Error, "init->func_dispatchEvent failed!!");
+    return false;
+  }
+  event_dispatcher = started;
+  return true;
 }
+
+bool start() { return isRunning() || (startService() && startDispatcher()); }
 
 // A word that applications may set, and that any thread may read.
 template <typename Number>
@@ -112,24 +121,23 @@ float Window::xdpi = 0;
 float Window::ydpi = 0;
 
 int Window::init() {
-  const std::unique_lock life = lockLife();
-  if (!life || !finishEnd()) {
+  LifeTurn turn(LifeTurn::For::Start);
+  if (!turn.isMine() || !finishEnd()) {
     kLog.print(LogLevel::Error, "init: the window is not at its end yet");
     return 0;
   }
-  if (event_dispatcher != nullptr) return 1;
-  return startService() && startDispatcher() ? 1 : 0;
+  const bool runs = start();
+  if (!turn.giveBack()) end();
+  return runs ? 1 : 0;
 }
 
 int Window::destroy() {
-  const std::unique_lock life = lockLife();
-  if (!life || !endDispatcher()) {
-    kLog.print(LogLevel::Error,
-               "destroy: a handler asks for it: the rest is left to the next call");
-    return 1;
+  const LifeTurn turn(LifeTurn::For::End);
+  if (turn.isMine()) {
+    end();
+  } else {
+    kLog.print(LogLevel::Error, kEndLeft);
   }
-  endService();
-  kLog.print(LogLevel::Error, "event_dispatcher End");
   return 1;
 }
 

@@ -1,7 +1,5 @@
 #include "dialogs/dialog_catalogue.h"
 
-#include <MW/dialog.h>
-
 #include <algorithm>
 #include <array>
 
@@ -12,6 +10,7 @@ namespace MW {
 namespace {
 
 using enum Dialog::Kind;
+using enum Dialog::Layout;
 
 constexpr auto kLayouts = std::to_array<DialogLayout>({
     {kStandard, 3, Buttons::Two, SecondLine::Hidden, SKIA_ALIGN_LEFT, kColorShadow},

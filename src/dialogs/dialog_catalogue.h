@@ -1,6 +1,8 @@
 /// The built-in dialogs as data.
 #pragma once
 
+#include <MW/dialog.h>
+
 #include <cstdint>
 
 namespace MW {
@@ -8,21 +10,9 @@ namespace MW {
 enum class Buttons { None, One, Two, Progress };
 enum class SecondLine { Hidden, Drawn };
 
-/// Dialog::isType() tells these numbers.
-enum LayoutNumber {
-  kStandard,
-  kTwoLine,
-  kHook,
-  kEarjack,
-  kOkOnly,
-  kTouchWarning,
-  kTouchCaution,
-  kWait
-};
-
 /// What the kinds of one layout share.
 struct DialogLayout {
-  LayoutNumber number;
+  Dialog::Layout number;
   int rows;  // of the frame
   Buttons buttons;
   SecondLine secondLine;
@@ -49,7 +39,7 @@ struct ButtonRow {
 /// What one kind says. Null texts leave what stands in the dialog.
 struct CatalogueEntry {
   int kind;
-  LayoutNumber layout;
+  Dialog::Layout layout;
   const char* title;
   Lines lines;
   ButtonRow buttons;

@@ -1,3 +1,4 @@
+#include <MW/dialog.h>
 #include <MW/dialog_slide.h>
 #include <MW/window.h>
 
@@ -99,7 +100,7 @@ void DialogSlide::onHover(event_data* event) { tell(hoverCallback, event); }
 void DialogSlide::onPress(event_data* event) { tell(touchPressCallback, event); }
 void DialogSlide::onRelease(event_data* event) { tell(touchReleaseCallback, event); }
 
-int DialogSlide::isType(int) { return 0; }
+int DialogSlide::isType(int) { return Dialog::kStandard; }
 
 void DialogSlide::setRect_init(int) {
   const ScreenSize screen = presentScreen();

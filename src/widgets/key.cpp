@@ -14,12 +14,9 @@ namespace {
 
 constexpr ClassLog kLog("KEY");
 constexpr unsigned int kPlugHoldMs = 100;
-constexpr uint32_t kPlugSettled = 2;
 
 constexpr bool isPassing(uint32_t code) {
-  constexpr uint32_t kPassing1 = 17;
-  constexpr uint32_t kPassing2 = 18;
-  return code == kPassing1 || code == kPassing2;
+  return code == Key::kPlugPassing1 || code == Key::kPlugPassing2;
 }
 
 }  // namespace

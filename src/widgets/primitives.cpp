@@ -11,13 +11,6 @@ namespace MW {
 
 namespace {
 
-// The widgets' own numbers. Those of the display-item table differ from them; both are fixed.
-constexpr int kTypeLabel = 3;
-constexpr int kTypeImage = 5;
-constexpr int kTypeBox = 6;
-constexpr int kTypeLine = 7;
-constexpr int kTypeTextbox = 8;
-
 SKIA_Text imageName(const SKIA_Text* given) {
   SKIA_Text record = {};
   if (given == nullptr) return record;

@@ -15,8 +15,6 @@ namespace {
 constexpr ClassLog kLog("SLIDE_EXIT");
 constexpr const char* kMark = "EXIT";
 constexpr int kMarkPercent = 25;  // of the bar's height
-constexpr int kArrowRight = 0;    // the arrow's direction words
-constexpr int kArrowLeft = 1;
 
 constexpr bool startsAtLeft(int state) { return state == 0 || state == 2 || state == 4; }
 constexpr bool exitsAtLeft(int state) { return state == 1 || state == 3 || state == 5; }
@@ -119,7 +117,7 @@ void SlideE::setRect(int newState, const SKIA_Rect* area) {
   labelRect1 = makeRect(isAtLeft ? behindKnob : to.x, to.y, int64_t{to.w} - to.h, to.h, to.color);
   rect = makeRect(isAtLeft ? to.x : knobAtRight, to.y, to.h, to.h, kColorGrey);
   point.color = kColorRed;
-  point.width = isAtLeft ? kArrowRight : kArrowLeft;
+  point.width = isAtLeft ? SKIA_ARROW_RIGHT : SKIA_ARROW_LEFT;
 }
 
 // The bar is laid out from itself and so never moves; setRect reads it under the lock.

@@ -145,7 +145,8 @@ TEST_F(Results, MakeAWellFormedReport) {
        {R"(<testsuite name="factory_test" tests="515" failures="1" skipped="513">)",
         R"(<testcase classname="factory_test" name="colours" time="4.200">)",
         R"("started" value="2026-11-21T07:00:00Z"/>)", R"("screen" value="1440x2560"/>)",
-        R"(name="a&lt;b>&amp;&quot;'�� א" time="0.000">)", "<failure message=", "<skipped/>"}) {
+        R"(name="a&lt;b&gt;&amp;&quot;'�&#10; א" time="0.000">)",
+        "<failure message=", "<skipped/>"}) {
     EXPECT_NE(xml.find(part), std::string::npos) << part;
   }
   auto* const parser = XML_ParserCreate(nullptr);

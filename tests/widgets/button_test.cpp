@@ -5,7 +5,6 @@
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
-using ButtonPlays = PlayTest;
 using MW::Widget;
 
 constexpr SKIA_Rect kArea = {100, 200, 300, 80, 0xFF202020};
@@ -19,7 +18,7 @@ Step face() {
   });
 }
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     kButton("IsClickedByAReleaseInside", {press(100, 279), face(), release(), face(), lookAtLog()},
             "press+ <1 lit> click+ <0 plain> <[BUTTON] released!!>"),
     kButton("StaysPlainWhenTheFingerComesBackAndIsNotClickedOutside",
@@ -60,7 +59,5 @@ const std::vector<Play> kPlays = {
     kButton("IsSeenAtOnceWhereItsDelayReachesBehindTheWrap",
             {at(~15U), call(&Widget::onShowTimer, 250), lookAtDrawings()}, "<1>"),
 };
-TEST_P(ButtonPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, ButtonPlays, testing::ValuesIn(kPlays), kRowName);
 
 }  // namespace

@@ -5,7 +5,6 @@
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
-using TimedPlays = PlayTest;
 using MW::Widget;
 
 constexpr SKIA_Rect kArea = {10, 20, 503, 101, 0};
@@ -40,7 +39,7 @@ Steps stepsOfStars(int count) {
   return steps;
 }
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     kToast("AToastGoesWithoutATime", {seen()}, "<gone>"),
     kToast("AToastGoesAfterItsTime",
            {showFor(500), lookAtRedraw(), seen(), later(500), seen(), later(1), seen(), seen()},
@@ -57,7 +56,5 @@ const std::vector<Play> kPlays = {
     kBar("ABarIsTakenAway", {runFor(50), seen(), runFor(0), seen(), runFor(9), seen()},
          "<!*> <gone> <!*>"),
 };
-TEST_P(TimedPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, TimedPlays, testing::ValuesIn(kPlays), kRowName);
 
 }  // namespace

@@ -62,8 +62,8 @@ class BrightnessTest : public PageTest {
   std::optional<MW::SlideMove> slider;
 };
 
-const TestRegistration kRegistration({Group::Display, 1, "brightness", "Brightness",
-                                      makeTest<BrightnessTest>});
+const TestRegistration kBrightnessRegistration({Group::Display, 1, "brightness", "Brightness",
+                                                makeTest<BrightnessTest>});
 
 }  // namespace
 

@@ -72,7 +72,8 @@ class ButtonTest : public PageTest {
     const SKIA_Point ruler = {under.x, under.y, under.x + under.w, under.y, kRulerColor, 6};
     const SKIA_Text caption =
         textOf("Label,\npicture,\nbox, line", MW::kColorWhite, SKIA_ALIGN_LEFT, textSize(screen));
-    const SKIA_Text name = textOf(picturePath("test_card.png").c_str(), 0, 0, 0);
+    const SKIA_Text name =
+        textOf(picturePath("test_card.png").c_str(), MW::kUnused, MW::kUnused, MW::kUnused);
     MW::WidgetList::init();
     MW::Label(&words, &caption).add_MWWList();
     MW::Image(&picture, &name).add_MWWList();
@@ -121,8 +122,8 @@ const std::array<ButtonTest::ButtonRow, ButtonTest::kButtonCount> ButtonTest::kB
     {"Hide me", &Widget::clickCallback, [](int) { self().hideLate(); }},
 }};
 
-const TestRegistration kRegistration({Group::Widgets, 0, "buttons", "Buttons",
-                                      makeTest<ButtonTest>});
+const TestRegistration kButtonsRegistration({Group::Widgets, 0, "buttons", "Buttons",
+                                             makeTest<ButtonTest>});
 
 }  // namespace
 

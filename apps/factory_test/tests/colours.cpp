@@ -59,8 +59,8 @@ class ColourTest : public LookTest {
   std::optional<OnTop<MW::Key>> key;
 };
 
-const TestRegistration kRegistration({Group::Display, 0, "colours", "Display colours",
-                                      makeTest<ColourTest>});
+const TestRegistration kColoursRegistration({Group::Display, 0, "colours", "Display colours",
+                                             makeTest<ColourTest>});
 
 }  // namespace
 

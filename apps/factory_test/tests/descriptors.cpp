@@ -123,7 +123,7 @@ class DescriptorTest : public Test {
     ref.lineWidth = kLineWidth;
     ref.text = captionOf(entry.words, color == kBarColor ? MW::kColorBlack : MW::kColorWhite);
     ref.desc = entry.texts.front() != nullptr ? texts.data() : nullptr;
-    built.push_back(std::make_unique<MW::WidgetRcui>(&ref, &entry.callbacks, 0));
+    built.push_back(std::make_unique<MW::WidgetRcui>(&ref, &entry.callbacks, MW::kUnused));
     if (ref.index > 0) MW::WidgetList::show(ref.index);
   }
 
@@ -180,8 +180,8 @@ const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
     {kRcuiFullScreen, false, {}, ""},
 };
 
-const TestRegistration kRegistration({Group::Widgets, 5, "descriptors", "Descriptors",
-                                      makeTest<DescriptorTest>});
+const TestRegistration kDescriptorsRegistration({Group::Widgets, 5, "descriptors", "Descriptors",
+                                                 makeTest<DescriptorTest>});
 
 }  // namespace
 

@@ -54,8 +54,8 @@ class ExitSlideTest : public PageTest {
   std::optional<MW::SlideE> leaving;
 };
 
-const TestRegistration kRegistration({Group::Widgets, 4, "exit_slides", "Exit slides",
-                                      makeTest<ExitSlideTest>});
+const TestRegistration kExitSlidesRegistration({Group::Widgets, 4, "exit_slides", "Exit slides",
+                                                makeTest<ExitSlideTest>});
 
 }  // namespace
 

@@ -63,7 +63,7 @@ class FreeFormTest : public StepTest {
   void putProgress() {
     MW::DialogNew& made = put("Progress");
     made.setDesc("Something goes on", nullptr, nullptr);
-    made.setProgress(0);
+    made.setProgress(MW::kUnused);
   }
 
   void putSlide() {
@@ -84,8 +84,8 @@ class FreeFormTest : public StepTest {
   std::unique_ptr<MW::Widget> dialog;
 };
 
-const TestRegistration kRegistration({Group::Dialogs, 3, "free_form", "Free-form dialogs",
-                                      makeTest<FreeFormTest>});
+const TestRegistration kFreeFormRegistration({Group::Dialogs, 3, "free_form", "Free-form dialogs",
+                                              makeTest<FreeFormTest>});
 
 }  // namespace
 

@@ -70,7 +70,7 @@ class KeyboardTest : public PageTest {
 
   Current<KeyboardTest> current{this};
   std::atomic<bool> folded = false;
-  std::atomic<std::size_t> layout = 0;
+  std::atomic<std::size_t> layout = MW::Ime::kSmall;
   std::optional<MW::Ime> keyboard;
   std::optional<ButtonRow> layouts;
 };
@@ -82,8 +82,8 @@ const std::array<ButtonRow::Face, KeyboardTest::kLayoutCount> KeyboardTest::kFac
     {"123", [](int) { self().change(MW::Ime::kOnlyDigits); }},
 }};
 
-const TestRegistration kRegistration({Group::Input, 3, "keyboard", "Keyboard",
-                                      makeTest<KeyboardTest>});
+const TestRegistration kKeyboardRegistration({Group::Input, 3, "keyboard", "Keyboard",
+                                              makeTest<KeyboardTest>});
 
 }  // namespace
 

@@ -95,7 +95,7 @@ class KeyTest : public PageTest {
   std::optional<MW::Key> key;
 };
 
-const TestRegistration kRegistration({Group::Input, 1, "keys", "Keys", makeTest<KeyTest>});
+const TestRegistration kKeysRegistration({Group::Input, 1, "keys", "Keys", makeTest<KeyTest>});
 
 }  // namespace
 

@@ -55,8 +55,8 @@ class ListTest : public LookTest {
   std::optional<MW::DialogList> list;
 };
 
-const TestRegistration kRegistration({Group::Dialogs, 1, "list_choice", "List choice",
-                                      makeTest<ListTest>});
+const TestRegistration kListChoiceRegistration({Group::Dialogs, 1, "list_choice", "List choice",
+                                                makeTest<ListTest>});
 
 }  // namespace
 

@@ -48,8 +48,8 @@ class LogTest : public PageTest {
 
   void enter() override {
     page.ask().otherKey = [](unsigned int code) {
-      if (code == MW::kKeyUp) self().jump(kPrevious);
-      if (code == MW::kKeyDown) self().jump(kNext);
+      if (code == MW::kKeyUp) self().jump(Viewer::kPrevious);
+      if (code == MW::kKeyDown) self().jump(Viewer::kNext);
     };
     placeViewer();
     placeKeyboard();
@@ -64,8 +64,6 @@ class LogTest : public PageTest {
   }
 
  private:
-  enum Direction { kPrevious = 0, kNext = 1 };  // as the viewer counts them
-
   static LogTest& self() { return Current<LogTest>::get(); }
 
   static const std::array<ButtonRow::Face, 3> kFaces;
@@ -76,7 +74,7 @@ class LogTest : public PageTest {
     const SKIA_Text looks =
         textOf("", MW::kColorBlack, SKIA_ALIGN_LEFT, percentOf(textSize(screen), kTextPercent));
     viewer.emplace(&area, &looks);
-    viewer->setRect(0, &area);  // room for the line numbers
+    viewer->setRect(MW::kUnused, &area);  // room for the line numbers
     viewer->setText(text.c_str());
     viewer->setActive(1);
   }
@@ -93,7 +91,7 @@ class LogTest : public PageTest {
   void showKeyboard(bool isShown) {
     const SKIA_Rect area =
         rowOf(screenSize(), kTopPercent, isShown ? kAbovePercent : kViewPercent, kPaper);
-    viewer->setRect(0, &area);
+    viewer->setRect(MW::kUnused, &area);
     keyboard->setActive(isShown ? 1 : 0);
     buttons->setActive(!isShown);
     MW::isDisplayUpdate(1);
@@ -120,7 +118,7 @@ class LogTest : public PageTest {
     page.say((std::to_string(viewer->matches()) + " x " + wanted).c_str());
   }
 
-  void jump(Direction direction) {
+  void jump(Viewer::SearchDirection direction) {
     viewer->line_search_point(direction);
     MW::isDisplayUpdate(1);
   }
@@ -134,11 +132,11 @@ class LogTest : public PageTest {
 
 const std::array<ButtonRow::Face, 3> LogTest::kFaces = {{
     {"Search", [](int) { self().openKeyboard(); }},
-    {"Previous", [](int) { self().jump(kPrevious); }},
-    {"Next", [](int) { self().jump(kNext); }},
+    {"Previous", [](int) { self().jump(Viewer::kPrevious); }},
+    {"Next", [](int) { self().jump(Viewer::kNext); }},
 }};
 
-const TestRegistration kRegistration({Group::Reports, 0, "log", "Log", makeTest<LogTest>});
+const TestRegistration kLogViewRegistration({Group::Reports, 0, "log", "Log", makeTest<LogTest>});
 
 }  // namespace
 

@@ -74,7 +74,7 @@ class PadTest : public PageTest {
   }
 
   Current<PadTest> current{this};
-  std::atomic<int> layout = 0;
+  std::atomic<int> layout = MW::Button8::kOneCell;
   std::optional<MW::Button8> pad;
   std::optional<ButtonRow> changer;
 };
@@ -83,8 +83,8 @@ const std::array<ButtonRow::Face, 1> PadTest::kFaces = {{
     {"Next layout", [](int) { self().nextLayout(); }},
 }};
 
-const TestRegistration kRegistration({Group::Input, 2, "pad", "Multi-touch pad",
-                                      makeTest<PadTest>});
+const TestRegistration kPadRegistration({Group::Input, 2, "pad", "Multi-touch pad",
+                                         makeTest<PadTest>});
 
 }  // namespace
 

@@ -40,8 +40,8 @@ class PromptTest : public StepTest {
   std::optional<MW::Dialog> dialog;
 };
 
-const TestRegistration kRegistration({Group::Dialogs, 0, "prompts", "Built-in dialogs",
-                                      makeTest<PromptTest>});
+const TestRegistration kPromptsRegistration({Group::Dialogs, 0, "prompts", "Built-in dialogs",
+                                             makeTest<PromptTest>});
 
 }  // namespace
 

@@ -107,8 +107,8 @@ const std::array<ButtonRow::Face, 1> ResultListTest::kFaces = {{
     {"Done", [](int) { self().finishLook(); }},
 }};
 
-const TestRegistration kRegistration({Group::Reports, 1, "result_list", "Results",
-                                      makeTest<ResultListTest>});
+const TestRegistration kResultListRegistration({Group::Reports, 1, "result_list", "Results",
+                                                makeTest<ResultListTest>});
 
 }  // namespace
 

@@ -92,7 +92,8 @@ class ShellTest : public LookTest {
   std::optional<Command> command;
 };
 
-const TestRegistration kRegistration({Group::Dialogs, 4, "shell", "Shell", makeTest<ShellTest>});
+const TestRegistration kShellRegistration({Group::Dialogs, 4, "shell", "Shell",
+                                           makeTest<ShellTest>});
 
 }  // namespace
 

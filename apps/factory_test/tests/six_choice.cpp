@@ -22,7 +22,7 @@ class SixChoiceTest : public LookTest {
 
  protected:
   void beginLook() override {
-    dialog.emplace(0).setTitle("Which radio?");
+    dialog.emplace(MW::kUnused).setTitle("Which radio?");
     for (std::size_t i = 0; i < kChoices.size(); ++i) {
       dialog->setText_str(static_cast<unsigned int>(i), kChoices.at(i));
     }
@@ -52,8 +52,8 @@ class SixChoiceTest : public LookTest {
   std::optional<MW::DialogSelect> dialog;
 };
 
-const TestRegistration kRegistration({Group::Dialogs, 2, "six_choice", "Six-way choice",
-                                      makeTest<SixChoiceTest>});
+const TestRegistration kSixChoiceRegistration({Group::Dialogs, 2, "six_choice", "Six-way choice",
+                                               makeTest<SixChoiceTest>});
 
 }  // namespace
 

@@ -99,8 +99,8 @@ class StyleTest : public PageTest {
   std::array<std::unique_ptr<MW::Widget>, kStyles.size()> buttons;
 };
 
-const TestRegistration kRegistration({Group::Widgets, 1, "styles", "Button styles",
-                                      makeTest<StyleTest>});
+const TestRegistration kStylesRegistration({Group::Widgets, 1, "styles", "Button styles",
+                                            makeTest<StyleTest>});
 
 }  // namespace
 

@@ -72,8 +72,8 @@ class SwitchTest : public PageTest {
   std::optional<MW::Slide> locked;
 };
 
-const TestRegistration kRegistration({Group::Widgets, 2, "switches", "Slide switches",
-                                      makeTest<SwitchTest>});
+const TestRegistration kSwitchesRegistration({Group::Widgets, 2, "switches", "Slide switches",
+                                              makeTest<SwitchTest>});
 
 }  // namespace
 

@@ -59,7 +59,7 @@ class TimedTest : public PageTest {
 
   void placeProgress(const SKIA_Rect& area) {
     const SKIA_Text caption = captionOf("Three seconds of work", MW::kColorWhite);
-    progress.emplace(0, &area, &caption);
+    progress.emplace(MW::kUnused, &area, &caption);
   }
 
   void startToast() {
@@ -84,8 +84,8 @@ class TimedTest : public PageTest {
   std::optional<MW::Progressbar> progress;
 };
 
-const TestRegistration kRegistration({Group::Widgets, 3, "timed", "Toast and progress",
-                                      makeTest<TimedTest>});
+const TestRegistration kTimedRegistration({Group::Widgets, 3, "timed", "Toast and progress",
+                                           makeTest<TimedTest>});
 
 }  // namespace
 

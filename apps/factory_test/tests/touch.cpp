@@ -77,8 +77,8 @@ class TouchTest : public LookTest {
   std::optional<MW::Key> key;
 };
 
-const TestRegistration kRegistration({Group::Input, 0, "touch", "Touch panel",
-                                      makeTest<TouchTest>});
+const TestRegistration kTouchRegistration({Group::Input, 0, "touch", "Touch panel",
+                                           makeTest<TouchTest>});
 
 }  // namespace
 

@@ -58,8 +58,8 @@ class WarningTest : public StepTest {
   std::unique_ptr<MW::Widget> warning;
 };
 
-const TestRegistration kRegistration({Group::Dialogs, 5, "warnings", "Warning pages",
-                                      makeTest<WarningTest>});
+const TestRegistration kWarningsRegistration({Group::Dialogs, 5, "warnings", "Warning pages",
+                                              makeTest<WarningTest>});
 
 }  // namespace
 

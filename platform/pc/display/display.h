@@ -18,6 +18,7 @@ namespace brimol::pc {
 enum class DisplayChoice {
   Window,            ///< a window; an error where none can be opened
   WindowIfPossible,  ///< a window where SDL finds a video driver, headless otherwise
+  Browser,           ///< web browsers and VNC viewers; not by openDisplay()
   Headless,
 };
 

@@ -10,6 +10,7 @@
 #include "host/saved_picture.h"
 #include "host/session.h"
 #include "painter/painter.h"
+#include "remote/browser_display.h"
 
 namespace brimol::pc {
 namespace {
@@ -40,6 +41,14 @@ SKIA_Item veilOver(Size screen, int percent) {
   constexpr int kAlphaShift = 24;
   const auto alpha = static_cast<uint32_t>(percent * kOpaqueAlpha / kWhole);
   return {SKIA_BOX, {0, 0, screen.w, screen.h, alpha << kAlphaShift}, {}, {}};
+}
+
+OpenedDisplay openChosen(const Settings& settings, InputTranslator& input,
+                         const InputService& service) {
+  if (settings.display == DisplayChoice::Browser) {
+    return BrowserDisplay::open(settings.screen, settings.listen, input, service);
+  }
+  return openDisplay(settings.display, settings.screen, input, service);
 }
 
 constinit thread_local bool isPlatformThread = false;
@@ -125,7 +134,7 @@ void Platform::run(std::promise<std::string> opened) {
   isPlatformThread = true;
   if (auto* const clock = turnClock()) clock->stayOutside();
   InputTranslator input(settings.screen, service);
-  const OpenedDisplay outcome = openDisplay(settings.display, settings.screen, input, service);
+  const OpenedDisplay outcome = openChosen(settings, input, service);
   if (!outcome.display) {
     opened.set_value(outcome.error);
     return;

@@ -1,71 +1,22 @@
 #include "painter/canvas.h"
 
-#include <array>
-#include <bit>
 #include <cwchar>
 
+#include "painter/blend.h"
 #include "scene/item.h"
 
 namespace brimol::pc {
 
 namespace {
 
-constexpr int kFull = 255;
-constexpr int kHalf = 128;  // in a sum: rounds its division by 255
-
-// A sum of products of two bytes, at most 255 * 255 + kHalf, divided by 255. Every step fits 16
-// bits, so that the compiler works on eight sums at a time.
-constexpr uint8_t overFull(uint16_t sum) {
-  return static_cast<uint8_t>(static_cast<uint16_t>(sum + (sum >> 8)) >> 8);
-}
-constexpr uint16_t roundedSum(int products) { return static_cast<uint16_t>(products + kHalf); }
-static_assert(overFull(roundedSum(kFull * kFull)) == kFull);
-static_assert(overFull(roundedSum(127)) == 0 && overFull(roundedSum(128)) == 1);
-
 constexpr std::size_t kPixelBytes = sizeof(uint32_t);
-constexpr std::size_t kBlockBytes = 16;  // what the compiler turns into one step
-using PixelBytes = std::array<uint8_t, kPixelBytes>;
 
-// A colour laid over a pixel, byte by byte: (old * keep + add) / 255, the rounding being in `add`.
-struct Overlay {
-  std::array<uint16_t, kBlockBytes> add;
-  uint16_t keep;
-};
-
-Overlay overlayOf(uint32_t color, int alpha) {
-  const auto bytes = std::bit_cast<PixelBytes>(color | kOpaque << 24);
-  Overlay overlay = {};
-  overlay.keep = static_cast<uint16_t>(kFull - alpha);
-  for (std::size_t i = 0; i < kBlockBytes; ++i) {
-    overlay.add[i] = roundedSum(bytes[i % kPixelBytes] * alpha);
-  }
-  return overlay;
-}
-
-uint8_t laidOver(uint8_t old, uint16_t keep, uint16_t add) {
-  return overFull(static_cast<uint16_t>(old * keep + add));
-}
-
-// Lays the colour over every byte of a row, in blocks whose constants stay in registers.
-void layOver(uint8_t* bytes, std::size_t count, const Overlay& overlay) {
-  const Overlay constants = overlay;
-  std::size_t at = 0;
-  for (; at + kBlockBytes <= count; at += kBlockBytes) {
-    for (std::size_t i = 0; i < kBlockBytes; ++i) {
-      bytes[at + i] = laidOver(bytes[at + i], constants.keep, constants.add[i]);
-    }
-  }
-  for (std::size_t i = 0; at < count; ++at, ++i) {
-    bytes[at] = laidOver(bytes[at], constants.keep, constants.add[i]);
-  }
-}
-
-// Pixels as bytes and as wide characters: a row of one colour is what the C library writes fastest.
+// Pixels as bytes and as wide characters: an area of one colour is what the C library writes
+// fastest.
 static_assert(sizeof(wchar_t) == kPixelBytes);
 uint8_t* bytesOf(uint32_t* pixels) { return reinterpret_cast<uint8_t*>(pixels); }
-void fillRow(uint32_t* pixels, int count, uint32_t color) {
-  std::wmemset(reinterpret_cast<wchar_t*>(pixels), static_cast<wchar_t>(color),
-               static_cast<std::size_t>(count));
+void fillRun(uint32_t* pixels, std::size_t count, uint32_t color) {
+  std::wmemset(reinterpret_cast<wchar_t*>(pixels), static_cast<wchar_t>(color), count);
 }
 
 }  // namespace
@@ -89,18 +40,28 @@ cairo_t* Canvas::context() const {
 void Canvas::fill(const Pixels& area, uint32_t color) const {
   const uint32_t alpha = alphaOf(color);
   if (alpha == 0) return;
-  const int end = area.y + area.height;
-  if (alpha == kOpaque) {
-    for (int y = area.y; y < end; ++y) fillRow(row(y) + area.x, area.width, color);
-    return;
-  }
+  // Whole rows lie in memory without a gap: they are one run.
+  const bool isOneRun = area.width == extent.w && stride == extent.w;
+  const int runs = isOneRun ? 1 : area.height;
+  const std::size_t count =
+      static_cast<std::size_t>(area.width) * static_cast<std::size_t>(isOneRun ? area.height : 1);
+  const auto eachRun = [&](auto work) {
+    for (int y = area.y; y < area.y + runs; ++y) work(row(y) + area.x);
+  };
+  if (alpha == kOpaque) return eachRun([&](uint32_t* run) { fillRun(run, count, color); });
   const Overlay overlay = overlayOf(color, static_cast<int>(alpha));
-  const std::size_t bytes = static_cast<std::size_t>(area.width) * kPixelBytes;
-  for (int y = area.y; y < end; ++y) layOver(bytesOf(row(y) + area.x), bytes, overlay);
+  eachRun([&](uint32_t* run) { layOver(bytesOf(run), count * kPixelBytes, overlay); });
+}
+
+uint32_t laidOver(uint32_t below, uint32_t color) {
+  if (alphaOf(color) == kOpaque) return color;
+  layOver(bytesOf(&below), kPixelBytes, overlayOf(color, static_cast<int>(alphaOf(color))));
+  return below;
 }
 
 void Canvas::cover(int x, int y, uint32_t color, int coverage) const {
-  const int alpha = overFull(roundedSum(static_cast<int>(alphaOf(color)) * coverage));
+  const int alpha =
+      overFull(static_cast<uint16_t>(static_cast<int>(alphaOf(color)) * coverage + kHalf));
   if (alpha == 0) return;
   layOver(bytesOf(row(y) + x), kPixelBytes, overlayOf(color, alpha));
 }

@@ -38,4 +38,7 @@ class Canvas {
   Size extent;
 };
 
+/// What fill() makes of a pixel: `color` laid over `below`, whose alpha byte is opaque.
+uint32_t laidOver(uint32_t below, uint32_t color);
+
 }  // namespace brimol::pc

@@ -4,26 +4,27 @@
 
 namespace brimol::pc {
 
-void ItemPainter::draw(const SKIA_Item& item, const Pixels& clip) {
+void ItemPainter::draw(const Frame& frame, std::size_t number, const Pixels& clip, Covers& covers) {
+  const SKIA_Item& item = frame[number];
   const Pixels area = within(boundsOf(item, wholeOf(canvas.size())), clip);
-  if (isEmpty(area)) return;
-  drawGround(item, area);
-  switch (figureOf(item)) {
-    case Figure::None: return;
-    case Figure::Text: return texts.draw(canvas, item.rect, item.text, area);
-    case Figure::Picture: return drawPicture(item, area);
-    case Figure::Line: return drawLine(item, area);
-    case Figure::Arrow: return drawArrow(item, area);
+  if (isEmpty(area) || covers.hide(area, number + 1)) return;
+  const Edges box = edgesOf(item.rect);
+  if (groundOf(item) == Ground::Round) fillRoundBox({canvas, area, item.rect.color}, box);
+  if (groundOf(item) == Ground::Square && !isEmpty(within(box, area))) {
+    for (const Pixels& part : covers.partsInSight(within(box, area), number + 1)) {
+      canvas.fill(part, item.rect.color);
+    }
   }
+  drawFigure(item, area);
 }
 
-void ItemPainter::drawGround(const SKIA_Item& item, const Pixels& clip) const {
-  const Brush brush = {canvas, clip, item.rect.color};
-  const Edges box = edgesOf(item.rect);
-  switch (groundOf(item)) {
-    case Ground::None: return;
-    case Ground::Square: return brush.fill(box);
-    case Ground::Round: return fillRoundBox(brush, box);
+void ItemPainter::drawFigure(const SKIA_Item& item, const Pixels& clip) {
+  switch (figureOf(item)) {
+    case Figure::None: return;
+    case Figure::Text: return texts.draw(canvas, item.rect, item.text, clip);
+    case Figure::Picture: return drawPicture(item, clip);
+    case Figure::Line: return drawLine(item, clip);
+    case Figure::Arrow: return drawArrow(item, clip);
   }
 }
 

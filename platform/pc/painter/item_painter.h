@@ -2,6 +2,7 @@
 #pragma once
 
 #include "painter/canvas.h"
+#include "painter/covers.h"
 #include "painter/picture_cache.h"
 #include "painter/text_painter.h"
 #include "scene/item.h"
@@ -14,11 +15,12 @@ class ItemPainter {
   /// `target` outlives the painter.
   explicit ItemPainter(const Canvas& target) : canvas(target) {}
 
-  /// Draws of the item what lies in `clip`: within the canvas, not empty.
-  void draw(const SKIA_Item& item, const Pixels& clip);
+  /// Draws of the item of that number what lies in `clip`: within the canvas, not empty. What
+  /// `covers` hide may be left out.
+  void draw(const Frame& frame, std::size_t number, const Pixels& clip, Covers& covers);
 
  private:
-  void drawGround(const SKIA_Item& item, const Pixels& clip) const;
+  void drawFigure(const SKIA_Item& item, const Pixels& clip);
   void drawPicture(const SKIA_Item& item, const Pixels& clip);
   void drawLine(const SKIA_Item& item, const Pixels& clip) const;
   void drawArrow(const SKIA_Item& item, const Pixels& clip) const;

@@ -10,10 +10,35 @@ namespace {
 
 constexpr uint32_t kBlack = 0xFF000000;
 
-// Whether nothing below the item shows in `piece`.
-bool hides(const SKIA_Item& item, const Pixels& piece) {
-  return groundOf(item) == Ground::Square && alphaOf(item.rect.color) == kOpaque &&
+// A box without a figure that lies over the whole of `piece`.
+bool isFlatOver(const SKIA_Item& item, const Pixels& piece) {
+  return groundOf(item) == Ground::Square && figureOf(item) == Figure::None &&
          covers(edgesOf(item.rect), piece);
+}
+
+bool isOpaqueFlat(const SKIA_Item& item, const Pixels& piece) {
+  return alphaOf(item.rect.color) == kOpaque && isFlatOver(item, piece);
+}
+
+// What lies at the bottom of a piece: one colour, and the number of the first item above it.
+struct Backdrop {
+  uint32_t color;
+  std::size_t next;
+};
+
+// Boxes that each lie over the whole piece are one colour, which one pixel tells.
+Backdrop backdropOf(const Frame& frame, const Pixels& piece) {
+  const auto isOpaque = [&piece](const SKIA_Item& item) { return isOpaqueFlat(item, piece); };
+  const auto last = std::find_if(frame.rbegin(), frame.rend(), isOpaque);
+  Backdrop backdrop = {kBlack, static_cast<std::size_t>(last.base() - frame.begin())};
+  if (backdrop.next > 0) backdrop.color = last->rect.color;
+  for (; backdrop.next < frame.size(); ++backdrop.next) {
+    const SKIA_Item& item = frame[backdrop.next];
+    if (isEmpty(boundsOf(item, piece))) continue;
+    if (!isFlatOver(item, piece)) break;
+    if (alphaOf(item.rect.color) != 0) backdrop.color = laidOver(backdrop.color, item.rect.color);
+  }
+  return backdrop;
 }
 
 }  // namespace
@@ -22,17 +47,15 @@ struct Painter::Parts {
   explicit Parts(Size screen) : canvas(screen), items(canvas) {}
 
   void paintPiece(const Frame& frame, const Pixels& piece) {
-    const auto ground = std::find_if(frame.rbegin(), frame.rend(), [&piece](const SKIA_Item& item) {
-      return hides(item, piece);
-    });
-    if (ground == frame.rend()) canvas.fill(piece, kBlack);
-    const auto first = ground == frame.rend() ? frame.begin() : ground.base() - 1;
-    std::for_each(first, frame.end(),
-                  [this, &piece](const SKIA_Item& item) { items.draw(item, piece); });
+    covers.collect(frame, piece);
+    const auto [color, next] = backdropOf(frame, piece);
+    for (const Pixels& part : covers.partsInSight(piece, next)) canvas.fill(part, color);
+    for (std::size_t i = next; i < frame.size(); ++i) items.draw(frame, i, piece, covers);
   }
 
   Canvas canvas;
   ItemPainter items;
+  Covers covers;
   Frame shown;
 };
 

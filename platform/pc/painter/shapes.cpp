@@ -60,9 +60,14 @@ void Brush::cover(int64_t x, int64_t y, int coverage) const {
   if (!isEmpty(pixel)) canvas.cover(pixel.x, pixel.y, color, coverage);
 }
 
+Edges fullRowsOf(const Edges& box) {
+  const int64_t radius = radiusOf(box);
+  return {box.left, box.top + radius, box.right, box.bottom - radius};
+}
+
 void fillRoundBox(const Brush& brush, const Edges& box) {
   const int64_t radius = radiusOf(box);
-  brush.fill({box.left, box.top + radius, box.right, box.bottom - radius});
+  brush.fill(fullRowsOf(box));
   const Edges rows = edgesOf(within(box, brush.clip));
   for (int64_t y = rows.top; y < rows.bottom; ++y) {
     const int64_t depth = std::min(y - box.top, box.bottom - 1 - y);

@@ -20,6 +20,9 @@ struct Brush {
 /// A box with round corners.
 void fillRoundBox(const Brush& brush, const Edges& box);
 
+/// The rows of a box with round corners between its corners: all of their pixels are its own.
+Edges fullRowsOf(const Edges& box);
+
 /// The part of a polygon that lies in `limits`, which lie within the canvas.
 void fillPolygon(const Brush& brush, const Polygon& polygon, const Pixels& limits);
 

@@ -28,7 +28,8 @@ bool sameLine(const SKIA_Item& one, const SKIA_Item& other) {
 }
 
 bool sameArrow(const SKIA_Item& one, const SKIA_Item& other) {
-  return one.point.color == other.point.color && (one.point.width == 0) == (other.point.width == 0);
+  return one.point.color == other.point.color &&
+         (one.point.width == SKIA_ARROW_RIGHT) == (other.point.width == SKIA_ARROW_RIGHT);
 }
 
 // Most that a line's ascent and descent add up to, in per cent of the text's size: those of the

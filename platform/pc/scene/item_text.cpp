@@ -43,7 +43,8 @@ std::string figureText(const SKIA_Item& item) {
     }
     case Figure::Line:
       return numbers(line.x1, line.y1, line.x2, line.y2, line.width) + colour(line.color);
-    case Figure::Arrow: return (line.width == 0 ? " right" : " left") + colour(line.color);
+    case Figure::Arrow:
+      return (line.width == SKIA_ARROW_RIGHT ? " right" : " left") + colour(line.color);
     case Figure::None: break;
   }
   return {};

@@ -1,0 +1,49 @@
+#include "painter/blend.h"
+
+#include <bit>
+
+namespace brimol::pc {
+
+namespace {
+
+constexpr int kFull = 255;
+constexpr uint32_t kOpaqueByte = 0xFF000000;
+constexpr std::size_t kPixelBytes = sizeof(uint32_t);
+
+static_assert(overFull(kFull * kFull + kHalf) == kFull);
+static_assert(overFull(127 + kHalf) == 0 && overFull(128 + kHalf) == 1);
+
+inline uint8_t laidOver(uint8_t old, uint16_t keep, uint16_t add) {
+  return overFull(static_cast<uint16_t>(old * keep + add));
+}
+
+}  // namespace
+
+Overlay overlayOf(uint32_t color, int alpha) {
+  const auto bytes = std::bit_cast<std::array<uint8_t, kPixelBytes>>(color | kOpaqueByte);
+  Overlay overlay = {};
+  overlay.keep = static_cast<uint16_t>(kFull - alpha);
+  for (std::size_t i = 0; i < Overlay::kBytes; ++i) {
+    overlay.add[i] = static_cast<uint16_t>(bytes[i % kPixelBytes] * alpha + kHalf);
+  }
+  return overlay;
+}
+
+// In blocks whose constants stay in registers.
+#ifdef BRIMOL_WIDE_LOOPS
+[[gnu::target_clones("avx2", "default")]]
+#endif
+void layOver(uint8_t* bytes, std::size_t count, const Overlay& overlay) {
+  const Overlay constants = overlay;
+  std::size_t at = 0;
+  for (; at + Overlay::kBytes <= count; at += Overlay::kBytes) {
+    for (std::size_t i = 0; i < Overlay::kBytes; ++i) {
+      bytes[at + i] = laidOver(bytes[at + i], constants.keep, constants.add[i]);
+    }
+  }
+  for (std::size_t i = 0; at < count; ++at, ++i) {
+    bytes[at] = laidOver(bytes[at], constants.keep, constants.add[i]);
+  }
+}
+
+}  // namespace brimol::pc

@@ -1,0 +1,89 @@
+#!/usr/bin/env python3
+"""Runs clang-tidy over files of the build in one folder: tidy.py BUILD_FOLDER FILE...
+
+clang-tidy spends most of its time on the headers of a file. Files that are built with the same options are
+therefore looked at together, in a source that includes them; the static analyser knows such sources. Two files
+that declare the same name at the outermost level do not meet in one. A finding names the file's own line.
+"""
+
+import json
+import os
+import pathlib
+import re
+import shlex
+import subprocess
+import sys
+from concurrent.futures import ThreadPoolExecutor
+
+MOST_FILES = 12
+# Of a line that starts at the margin, as every declaration outside functions and classes does here: what
+# stands before the first sign that ends a declared name.
+DECLARED = re.compile(r'^(?!namespace\b)[A-Za-z_][\w:<>,&* ]*?(?<!:)\b(\w+)(?:\[[^\]]*\])? ?(?:[=({;]|$)', re.MULTILINE)
+# What they would find is the batch itself: that it includes sources, and that a function's name hides another
+# file's. The compiler looks for hidden names in each file by itself.
+LEFT_OUT = ('--checks=-bugprone-suspicious-include', '--extra-arg=-Wno-shadow')
+
+
+def read_units(folder, files):
+    """The options of each of the files, without its own name and what it is compiled to."""
+    units = {}
+    for entry in json.loads((folder / 'compile_commands.json').read_text()):
+        path = os.path.realpath(os.path.join(entry['directory'], entry['file']))
+        if path in files:
+            command = re.sub(r' -(o|MT|MF) \S+', '', entry['command'])
+            units[path] = tuple(word for word in shlex.split(command) if word not in ('-c', '-MD', entry['file']))
+    return units
+
+
+def make_batches(units):
+    """Lists of files, each with the options that all of its files have."""
+    batches = []
+    for path, options in sorted(units.items(), key=lambda unit: (unit[1], unit[0])):
+        names = set(DECLARED.findall(pathlib.Path(path).read_text()))
+        for batch in batches:
+            fits = batch['options'] == options and len(batch['files']) < MOST_FILES
+            if fits and not names & batch['names']:
+                break
+        else:
+            batch = {'options': options, 'files': [], 'names': set()}
+            batches.append(batch)
+        batch['files'].append(path)
+        batch['names'] |= names
+    return batches
+
+
+def write_batches(folder, batches):
+    """The batches' sources with the list of their options, as clang-tidy reads it."""
+    folder.mkdir(exist_ok=True)
+    commands = []
+    for number, batch in enumerate(batches):
+        is_c = batch['files'][0].endswith('.c')
+        source = folder / f'batch_{number}.{"c" if is_c else "cpp"}'
+        source.write_text(''.join(f'#include "{path}"\n' for path in batch['files']))
+        words = [*batch['options'], '-c', str(source)]
+        commands.append({'directory': str(folder.parent), 'file': str(source), 'arguments': words})
+        batch['source'] = source
+    (folder / 'compile_commands.json').write_text(json.dumps(commands))
+
+
+def look_at(folder, batch):
+    """Whether the batch is clean; what is not is printed."""
+    command = ['clang-tidy', '-p', folder, '--quiet', '--warnings-as-errors=*', *LEFT_OUT, batch['source']]
+    run = subprocess.run(command, stdout=subprocess.PIPE, stderr=subprocess.DEVNULL, text=True, check=False)
+    print(run.stdout, end='', flush=True)
+    return run.returncode == 0
+
+
+def main():
+    build = pathlib.Path(sys.argv[1]).resolve()
+    units = read_units(build, {os.path.realpath(name) for name in sys.argv[2:]})
+    batches = make_batches(units)
+    folder = build / 'tidy'
+    write_batches(folder, batches)
+    print(f'{len(units)} files in {len(batches)} batches', flush=True)
+    with ThreadPoolExecutor(os.cpu_count()) as workers:
+        return 0 if all(list(workers.map(lambda batch: look_at(folder, batch), batches))) else 1
+
+
+if __name__ == '__main__':
+    sys.exit(main())

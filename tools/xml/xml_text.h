@@ -1,0 +1,14 @@
+/// Texts for XML files that this project's programs write.
+#pragma once
+
+#include <string>
+#include <string_view>
+
+namespace brimol::xml {
+
+/// `bytes` as the text of an element or of an attribute in double quotes, in UTF-8. What is no
+/// character, or none that XML can hold, becomes U+FFFD; line ends and tabs keep their value in
+/// attributes, too.
+std::string escaped(std::string_view bytes);
+
+}  // namespace brimol::xml
