@@ -34,11 +34,15 @@ constexpr auto kLooks = std::to_array<VerdictLook>({
     {Verdict::Fail, kFailColor},
 });
 
+bool isNarrow(ScreenSize screen) { return screen.width < kNarrow; }
+
 // Moving up may scroll a row to the very top of the list, where the list does not draw it.
 int moveUpIntoView(MW::MainList& list) {
   const int row = list.move_key_up(MW::kUnused);
   MW::mouse_event belowEdge = {};
-  belowEdge.y = MW::MainList::kExtendedTitleHeight + 1;
+  belowEdge.y =
+      (isNarrow(screenSize()) ? MW::MainList::kTitleHeight : MW::MainList::kExtendedTitleHeight) +
+      1;
   MW::mouse_event aPixelDown = {};
   aPixelDown.yrel = 1;
   if (row >= 0 && list.position2index(belowEdge) == row) list.onHover(aPixelDown);
@@ -64,16 +68,14 @@ std::string fitting(const std::string& words, int percent, Keep keep) {
   return isTail ? cut + words.substr(words.size() - rest) : words.substr(0, rest) + cut;
 }
 
-int modeOf(ScreenSize screen) {
-  return screen.width < kNarrow ? MW::MainList::kPlain : MW::MainList::kExtended;
-}
-
 // What stands in a row.
 std::string rowWords(const char* name) { return std::string("   ") + name; }
 
 }  // namespace
 
-Menu::Menu(const ResultBook& book) : list(" Factory test", modeOf(screenSize())) {
+Menu::Menu(const ResultBook& book)
+    : list(" Factory test",
+           isNarrow(screenSize()) ? MW::MainList::kPlain : MW::MainList::kExtended) {
   const auto& entries = testEntries();
   std::optional<Group> group;
   // Of no height: the list does not draw a row that begins exactly at its top.
@@ -139,10 +141,10 @@ std::string Menu::verdictsText() const {
 
 void Menu::refreshFigures() {
   const MachineFigures figures = presentFigures();
-  const bool isNarrow = screenSize().width < kNarrow;
+  const bool hasRoom = !isNarrow(screenSize());
   const auto put = [&](MW::MainList::StatusText place, const std::string& words) {
     // Of nothing the NUL is given, which empties its place.
-    const auto length = isNarrow ? 0 : static_cast<int>(words.size());
+    const auto length = hasRoom ? static_cast<int>(words.size()) : 0;
     list.setTextOption(place, length == 0 ? "" : words.c_str(), std::max(length, 1));
   };
   const auto putRight = [&](MW::MainList::StatusText place, const std::string& words) {
@@ -160,7 +162,7 @@ void Menu::refreshFigures() {
   const std::size_t word = std::min(figures.load.find(' '), figures.load.size());
   putLeft(MW::MainList::kTestMode, figures.load.substr(0, word));
   put(MW::MainList::kBle, fitting(figures.load.substr(word), kRightPercent, Keep::Head));
-  if (isNarrow) {
+  if (!hasRoom) {
     const std::string count = rowWords(verdictsText().c_str());
     list.setText(countRow, count.c_str(), static_cast<unsigned int>(count.size()));
   }

@@ -36,14 +36,14 @@ struct Moment {
 };
 
 enum class Check {
-  Cut,         ///< a text is wider than its item, or has lines that find no room
-  Overlap,     ///< two texts touch, or a box hides a part of a text
-  OffScreen,   ///< a text or a touch target is not whole on the screen
-  AtEdge,      ///< a text is within 0.5 mm of the screen's left or right edge
-  SmallText,   ///< letters of a font under 1.5 mm
-  Contrast,    ///< text and ground differ by less than 3 to 1
-  SmallTarget, ///< a touch target under 7 mm in width or height
-  NoKey        ///< no key reaches a touch target
+  Cut,          ///< a text is wider than its item, or has lines that find no room
+  Overlap,      ///< two texts touch, or a box hides a part of a text
+  OffScreen,    ///< a text or a touch target is not whole on the screen
+  AtEdge,       ///< a text is within 0.5 mm of the screen's left or right edge
+  SmallText,    ///< letters of a font under 1.5 mm
+  Contrast,     ///< text and ground differ by less than 3 to 1
+  SmallTarget,  ///< a touch target under 7 mm in width or height
+  NoKey         ///< no key reaches a touch target
 };
 
 /// The check's name in findings: "cut", "overlap", "off-screen", "at-edge", "small-text",
@@ -68,10 +68,11 @@ std::string textOf(const Finding& finding, const Profile& profile);
 /// scrolled, and is no finding of OffScreen or Overlap.
 ///
 /// A touch target is an item of the kinds that buttons draw (SKIA_BUTTONBOX, SKIA_ROUNDBUTTONBOX),
-/// or the topmost item under a tap, if it fills less than half of the screen. What nobody tapped and
-/// is no button is not known to be one. What keys reach is known from the session alone: keys reach a
-/// target if a key changed what is drawn on or around it (a mark, another colour), or led to the
-/// texts to which a tap on it led. Pages on which no key was pressed give no findings of NoKey.
+/// or the topmost item under a tap, if it fills less than half of the screen. What nobody tapped
+/// and is no button is not known to be one. What keys reach is known from the session alone: keys
+/// reach a target if a key changed what is drawn on or around it (a mark, another colour), or led
+/// to the texts to which a tap on it led. Pages on which no key was pressed give no findings of
+/// NoKey.
 std::vector<Finding> lint(const std::vector<Moment>& moments, const Profile& profile);
 
 /// A list of findings that are accepted, each with its reason. Blank lines, and lines that begin

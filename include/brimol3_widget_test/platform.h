@@ -33,11 +33,11 @@ struct PlatformState {
   std::map<std::string, std::string> properties;
 
   // What brimol/host.h tells of.
-  int width = 1440, height = 2560;     ///< of the screen, pixels
-  bool closeRequested = false;         ///< the user has asked to close the window
-  int brightness = 100;                ///< per cent, as last set
-  int64_t utcMs = kDefaultUtcMs;       ///< since 1970, when the ticks were 0
-  uint32_t random = 1;                 ///< the next random number; the one behind it is one more
+  int width = 1440, height = 2560;  ///< of the screen, pixels
+  bool closeRequested = false;      ///< the user has asked to close the window
+  int brightness = 100;             ///< per cent, as last set
+  int64_t utcMs = kDefaultUtcMs;    ///< since 1970, when the ticks were 0
+  uint32_t random = 1;              ///< the next random number; the one behind it is one more
   std::map<std::string, std::string> figures;  ///< by name; a figure that is not here is empty
 
   static constexpr int64_t kDefaultUtcMs = 1'767'225'600'000;  ///< 2026-01-01T00:00:00Z

@@ -31,11 +31,12 @@ struct Loop {
 /// One at a time, made and used on one thread. It stands for the application's main loop, the
 /// platform and the user: it starts the toolkit and ends it. Widgets are made after it and deleted
 /// before it. Its clock, which GetTicks() says, begins at kStartTicks and moves with advance() and
-/// with taps and keys alone; handlers run on the toolkit's own thread while the test waits for them.
+/// with taps and keys alone; handlers run on the toolkit's own thread while the test waits for
+/// them.
 ///
-/// Texts are looked for among those that a user can read: on the screen, and not below a box that is
-/// drawn later. A `*` in a text that is looked for stands for any characters and `\*` for a star;
-/// apart from that the whole text has to be the same, blanks at its ends aside.
+/// Texts are looked for among those that a user can read: on the screen, and not below a box that
+/// is drawn later. A `*` in a text that is looked for stands for any characters and `\*` for a
+/// star; apart from that the whole text has to be the same, blanks at its ends aside.
 ///
 /// Whatever is not as expected throws Failure.
 class Screen {
@@ -95,11 +96,12 @@ class Screen {
   void expectTextColor(const std::string& text, uint32_t color,
                        const Here& here = Here::now()) const;
   /// Of the box on which the item draws its text.
-  void expectBoxColor(const std::string& text, uint32_t color, const Here& here = Here::now()) const;
+  void expectBoxColor(const std::string& text, uint32_t color,
+                      const Here& here = Here::now()) const;
   /// 0x00RRGGBB of the picture.
   void expectPixel(Spot spot, uint32_t rgb, const Here& here = Here::now()) const;
-  /// That a line `TAG: MESSAGE` with the text in it was logged since the last such line. Lines before
-  /// it are forgotten.
+  /// That a line `TAG: MESSAGE` with the text in it was logged since the last such line. Lines
+  /// before it are forgotten.
   void expectLog(const std::string& text, const Here& here = Here::now());
 
  private:

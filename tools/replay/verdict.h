@@ -47,7 +47,8 @@ struct ExitRow {
 };
 constexpr auto kExitRows = std::to_array<ExitRow>({
     {0, "the trace was played to its end, and all that it expects was met"},
-    {1, "an expectation failed, a frame differs, or the application failed"},
+    {1,
+     "an expectation failed, a frame differs, the layout has a fault, or the application failed"},
     {2, "the command line, the trace or the bundle is wrong, or a file cannot be written"},
     {3, "the application crashed or hung"},
     {130, "the run was interrupted"},

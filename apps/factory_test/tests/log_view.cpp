@@ -70,8 +70,7 @@ class LogTest : public PageTest {
   void placeViewer() {
     const ScreenSize screen = screenSize();
     const SKIA_Rect area = rowOf(screen, kTopPercent, kViewPercent, kPaper);
-    const SKIA_Text looks =
-        textOf("", MW::kColorBlack, SKIA_ALIGN_LEFT, smallTextSize(screen));
+    const SKIA_Text looks = textOf("", MW::kColorBlack, SKIA_ALIGN_LEFT, smallTextSize(screen));
     viewer.emplace(&area, &looks);
     viewer->setRect(MW::kUnused, &area);  // room for the line numbers
     viewer->setText(text.c_str());

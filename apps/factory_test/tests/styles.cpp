@@ -44,8 +44,8 @@ constexpr auto kStyles = std::to_array<StyleRow>({
     {"Box", 49, 11, 0, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kButtonBox>},
     {"Text", 49, 11, 1, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kTextBox>},
     {"Framed", 49, 11, 2, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kFramed>},
-    {"Both", 62, 17, 0, 1, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kPassOn>},
-    {"One", 67, 11, 1, 3, MW::kColorWhite, makePlain},
+    {"Both", 60, 20, 0, 1, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kPassOn>},
+    {"One", 72, 8, 1, 3, MW::kColorWhite, makePlain},
 });
 
 /// Counts the clicks of each.

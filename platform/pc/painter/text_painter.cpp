@@ -46,8 +46,9 @@ bool isDrawn(const SKIA_Text& text) {
 }
 
 // Visits the layout's lines with the place of each one's beginning on its baseline. Line by line,
-// since each is aligned to the box and not to the longest of them. In a box with room for fewer lines,
-// those whose middle lies outside are left out, and the others are whole. False: some are left out.
+// since each is aligned to the box and not to the longest of them. In a box with room for fewer
+// lines, those whose middle lies outside are left out, and the others are whole. False: some are
+// left out.
 template <typename Visit>
 bool visitLines(PangoLayout* layout, const Edges& box, int align, Visit visit) {
   int height = 0;
