@@ -34,7 +34,9 @@ std::vector<SeenText> textsOf(const Frame& frame, pc::Size screen, pc::TextPaint
   std::vector<SeenText> texts;
   for (const pc::ShownText& shown : pc::shownTexts(frame, screen)) {
     const SKIA_Item& item = frame.at(shown.item);
-    const pc::TextInk ink = painter.inkOf(item.rect, item.text);
+    pc::TextInk ink = painter.inkOf(item.rect, item.text);
+    if (!ink.isWhole && pc::isEmpty(ink.area))
+      ink.area = pc::edgesOf(item.rect);  // no line has room
     if (pc::isEmpty(ink.area)) continue;
     texts.push_back({shown.item, shown.text, drawnPart(ink.area, item.rect), ink});
   }
@@ -98,11 +100,13 @@ std::vector<std::size_t> targetsOf(const Moment& moment, pc::Size screen) {
 }  // namespace
 
 std::string View::nameOf(std::size_t index) const {
+  const auto own = std::ranges::find(texts, index, &SeenText::item);
+  if (own != texts.end()) return own->text;
   const Edges area = pc::edgesOf(item(index).rect);
   for (const SeenText& seen : texts) {
     const Pixels middle = {static_cast<int>((seen.ink.left + seen.ink.right) / 2),
                            static_cast<int>((seen.ink.top + seen.ink.bottom) / 2), 1, 1};
-    if (seen.item == index || pc::covers(area, middle)) return seen.text;
+    if (pc::covers(area, middle)) return seen.text;
   }
   std::string line = pc::textOfItem(item(index));
   return line.substr(0, line.find(" #"));
