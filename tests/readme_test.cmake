@@ -1,5 +1,4 @@
-# The program that the README shows is the one that is built, the index names every page, and links lead
-# somewhere: cmake -DROOT=<project> -P readme_test.cmake
+# The program that the README shows is the one that is built: cmake -DROOT=<project> -P readme_test.cmake
 
 file(READ "${ROOT}/README.md" readme)
 file(READ "${ROOT}/apps/first_screen/main.cpp" program)
@@ -7,22 +6,3 @@ string(FIND "${readme}" "```cpp\n${program}```" place)
 if(place EQUAL -1)
   message(FATAL_ERROR "README.md does not show apps/first_screen/main.cpp as it is")
 endif()
-
-file(READ "${ROOT}/docs/README.md" index)
-file(GLOB pages "${ROOT}/docs/*.md" "${ROOT}/*.md")
-foreach(page IN LISTS pages)
-  cmake_path(GET page FILENAME name)
-  string(FIND "${index}" "${name})" place)
-  if(place EQUAL -1)
-    message(SEND_ERROR "docs/README.md does not name ${page}")
-  endif()
-  cmake_path(GET page PARENT_PATH folder)
-  file(READ "${page}" text)
-  string(REGEX MATCHALL "\\]\\([^):#]+\\)" links "${text}")
-  foreach(link IN LISTS links)
-    string(REGEX REPLACE "^..(.*).$" "\\1" target "${link}")
-    if(NOT EXISTS "${folder}/${target}")
-      message(SEND_ERROR "${page}: no such file: ${target}")
-    endif()
-  endforeach()
-endforeach()
