@@ -21,20 +21,23 @@ class Screen;
 
 /// A screen that is looked at.
 struct Profile {
-  std::string name;
-  ScreenSize size;  ///< pixels
-  float dpi;        ///< dots per inch, more than 0
+  std::string name;  ///< for the findings
+  ScreenSize size;   ///< pixels
+  float dpi;         ///< dots per inch, more than 0
 };
 
 /// A frame at rest, and what the user did to it next.
 struct Moment {
+  /// What a user can do.
   enum class Deed { None, Tap, Key };
 
-  Frame frame = {};
-  Deed deed = Deed::None;
-  int x = 0, y = 0;  ///< of a tap, in pixels
+  Frame frame = {};        ///< what was on the screen
+  Deed deed = Deed::None;  ///< what came then
+  int x = 0;               ///< of a tap, in pixels
+  int y = 0;               ///< the same
 };
 
+/// What a screen is looked at for.
 enum class Check {
   Cut,          ///< a text is wider than its item, or has lines that find no room
   Overlap,      ///< two texts touch, or a box hides a part of a text
@@ -50,8 +53,9 @@ enum class Check {
 /// "contrast", "small-target", "no-key".
 const char* nameOf(Check check);
 
+/// What is wrong with one item.
 struct Finding {
-  Check check;
+  Check check;         ///< which rule it breaks
   std::string item;    ///< its text, or its kind and rectangle where it shows none
   std::string page;    ///< the text that stands highest on the screen; empty: there is none
   std::string detail;  ///< what is wrong, in words

@@ -23,6 +23,7 @@ namespace brimol::test {
 
 /// What the application does in each round of its main loop.
 struct Loop {
+  /// What comes before drawing: taking up what callbacks left behind.
   std::function<void()> update = [] {};
   /// Draws a frame, with what the application draws beside its widgets.
   std::function<void()> draw = [] { MW::Window::show(); };
@@ -43,11 +44,12 @@ class Screen {
  public:
   /// `dpi` dots per inch; 0: unknown.
   explicit Screen(ScreenSize size, Loop loop = {}, float dpi = 0);
+  /// Ends the toolkit.
   ~Screen();
   Screen(const Screen&) = delete;
   Screen& operator=(const Screen&) = delete;
 
-  static constexpr unsigned int kStartTicks = 1000;
+  static constexpr unsigned int kStartTicks = 1000;  ///< milliseconds
 
   // Time.
 
@@ -69,6 +71,7 @@ class Screen {
   void tap(const std::string& text, const Here& here = Here::now());
   /// Moves a finger in ten steps over 200 ms.
   void drag(Spot from, Spot to);
+  /// One half of key().
   void keyDown(unsigned int code);
   void keyUp(unsigned int code);
   /// Presses a key, and releases it 50 ms later.
@@ -79,13 +82,17 @@ class Screen {
   /// The newest frame. Widgets that were made since then show in the next one, which advance(),
   /// settle() and all input draw when one is due, and draw() at once.
   const Frame& frame() const { return newest; }
+  /// Draws a frame, due or not.
   void draw();
+  /// In pixels.
   ScreenSize size() const { return screen; }
   /// In the order in which they are drawn.
   std::vector<std::string> texts() const;
+  /// Whether a user can read it.
   bool shows(const std::string& text) const;
   /// The one item that shows the text.
   const SKIA_Item& itemOf(const std::string& text, const Here& here = Here::now()) const;
+  /// The newest frame, painted.
   Picture picture() const { return paint(newest, screen); }
   /// What was there whenever a finger or a key came down, and is there now: what lint() looks at.
   std::vector<Moment> moments() const;
