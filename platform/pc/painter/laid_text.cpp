@@ -1,0 +1,146 @@
+#include "painter/laid_text.h"
+
+#include <pango/pangocairo.h>
+
+#include <algorithm>
+#include <optional>
+
+#include "painter/fonts.h"
+#include "painter/glyph_run.h"
+
+namespace brimol::pc {
+
+namespace {
+
+constexpr int kFarAway = 1'000'000;  // pixels; no text reaches from there to a screen
+
+int pixelsOf(int pangoUnits) { return PANGO_PIXELS(pangoUnits); }
+
+// Where something of `size` pixels lies in the room from `low` to `high`.
+int64_t centred(int64_t low, int64_t high, int size) { return low + (high - low - size) / 2; }
+
+int64_t aligned(const Edges& box, int align, int width) {
+  if (align == SKIA_ALIGN_RIGHT) return box.right - width;
+  if (align == SKIA_ALIGN_CENTRE) return centred(box.left, box.right, width);
+  return box.left;
+}
+
+bool isNear(int64_t position) { return position >= -kFarAway && position <= kFarAway; }
+
+std::span<const PangoGlyphInfo> glyphsOf(const PangoGlyphString* glyphs) {
+  return {glyphs->glyphs, static_cast<std::size_t>(glyphs->num_glyphs)};
+}
+
+// Pango draws a box with numbers for a character without a glyph: no glyphs, so no mask.
+bool hasAllGlyphs(const PangoGlyphString* glyphs) {
+  return std::ranges::none_of(glyphsOf(glyphs), [](const PangoGlyphInfo& info) {
+    return info.glyph != PANGO_GLYPH_EMPTY && (info.glyph & PANGO_GLYPH_UNKNOWN_FLAG) != 0;
+  });
+}
+
+// None where Pango must draw the run, which begins `start` Pango units from its line's left end.
+std::optional<LineMask> maskOf(const PangoGlyphItem& item, int start, GlyphImages& images) {
+  if (!hasAllGlyphs(item.glyphs)) return std::nullopt;
+  GlyphRun run(item.item->analysis.font, images);
+  start += item.start_x_offset;
+  for (const PangoGlyphInfo& info : glyphsOf(item.glyphs)) {
+    const PangoGlyphGeometry& geometry = info.geometry;
+    if (info.glyph != PANGO_GLYPH_EMPTY)
+      run.add(info.glyph, start + geometry.x_offset, geometry.y_offset - item.y_offset);
+    start += geometry.width;
+  }
+  return run.mask();
+}
+
+TextLayout layOut(PangoContext* context, std::string_view words, int size) {
+  TextLayout layout(pango_layout_new(context));
+  const FontDescription font = projectFonts(size);
+  pango_layout_set_font_description(layout.get(), font.get());
+  const std::unique_ptr<char, decltype(&g_free)> valid(
+      g_utf8_make_valid(words.data(), static_cast<gssize>(words.size())), g_free);
+  pango_layout_set_text(layout.get(), valid.get(), -1);
+  return layout;
+}
+
+}  // namespace
+
+LaidText::LaidText(PangoContext* context, GlyphImages& images, std::string_view words, int size)
+    : layout(layOut(context, words, size)) {
+  int units = 0;
+  pango_layout_get_size(layout.get(), nullptr, &units);
+  height = pixelsOf(units);
+  const LayoutIterator iter(pango_layout_get_iter(layout.get()));
+  do {
+    addLine(iter.get(), images);
+  } while (pango_layout_iter_next_line(iter.get()) != FALSE);
+  if (std::ranges::all_of(lines, &Line::isMasked)) layout.reset();
+}
+
+void LaidText::addLine(PangoLayoutIter* iter, GlyphImages& images) {
+  PangoRectangle extents = {};
+  pango_layout_iter_get_line_extents(iter, nullptr, &extents);
+  Line line = {pixelsOf(extents.y + extents.height / 2),
+               pixelsOf(pango_layout_iter_get_baseline(iter)),
+               pixelsOf(extents.width),
+               true,
+               {}};
+  int start = 0;
+  for (const GSList* each = pango_layout_iter_get_line_readonly(iter)->runs; each != nullptr;
+       each = each->next) {
+    const auto& run = *static_cast<const PangoGlyphItem*>(each->data);
+    std::optional<LineMask> mask = maskOf(run, start, images);
+    if (!mask) {
+      line.isMasked = false;
+      line.runs.clear();
+      break;
+    }
+    line.runs.push_back(std::move(*mask));
+    start += run.start_x_offset + pango_glyph_string_get_width(run.glyphs) + run.end_x_offset;
+  }
+  lines.push_back(std::move(line));
+}
+
+// Line by line, since each is aligned to the box and not to the longest of them. In a box with room
+// for fewer lines, those whose middle lies outside are left out, and the others are whole.
+void LaidText::draw(const Canvas& canvas, const Edges& box, int align, Ink& ink,
+                    const Pixels& clip) const {
+  const int64_t top = centred(box.top, box.bottom, height);
+  for (std::size_t i = 0; i < lines.size(); ++i) {
+    const Line& line = lines[i];
+    const int64_t middle = top + line.middle;
+    if (middle < box.top || middle > box.bottom) continue;
+    const int64_t x = aligned(box, align, line.width);
+    const int64_t y = top + line.baseline;
+    if (!isNear(x) || !isNear(y)) continue;
+    const Place place = {static_cast<int>(x), static_cast<int>(y)};
+    if (!line.isMasked) drawByPango(canvas, i, place, ink.color(), clip);
+    for (const LineMask& run : line.runs) run.draw(canvas, place, ink, clip);
+  }
+}
+
+void LaidText::drawByPango(const Canvas& canvas, std::size_t line, const Place& place,
+                           uint32_t color, const Pixels& clip) const {
+  constexpr double kFull = 255;
+  const auto part = [color](int shift) { return (color >> shift & 0xFF) / kFull; };
+  cairo_t* const context = canvas.context();
+  cairo_save(context);
+  cairo_rectangle(context, clip.x, clip.y, clip.width, clip.height);
+  cairo_clip(context);
+  cairo_set_source_rgba(context, part(16), part(8), part(0), part(24));
+  cairo_move_to(context, place.x, place.y);
+  pango_cairo_show_layout_line(
+      context, pango_layout_get_line_readonly(layout.get(), static_cast<int>(line)));
+  cairo_restore(context);
+}
+
+std::size_t LaidText::bytes() const {
+  constexpr std::size_t kLayoutBytes = 8192;  // about what Pango keeps for a short text
+  std::size_t sum = sizeof *this + (layout ? kLayoutBytes : 0);
+  for (const Line& line : lines) {
+    sum += sizeof line;
+    for (const LineMask& run : line.runs) sum += sizeof run + run.bytes();
+  }
+  return sum;
+}
+
+}  // namespace brimol::pc

@@ -1,0 +1,43 @@
+/// A text in one size, laid out and ready to be drawn in any colour at any place.
+#pragma once
+
+#include <string_view>
+#include <vector>
+
+#include "painter/glyph_images.h"
+#include "painter/line_mask.h"
+#include "painter/text_handles.h"
+
+namespace brimol::pc {
+
+/// Lines of text. One thread uses it.
+class LaidText {
+ public:
+  /// `images` are asked for the glyphs, for the call.
+  LaidText(PangoContext* context, GlyphImages& images, std::string_view words, int size);
+
+  /// Draws what text_painter.h describes.
+  void draw(const Canvas& canvas, const Edges& box, int align, Ink& ink, const Pixels& clip) const;
+
+  std::size_t bytes() const;
+
+ private:
+  // In pixels; downwards from the text's top.
+  struct Line {
+    int middle;
+    int baseline;
+    int width;
+    bool isMasked;  // false: Pango draws it
+    std::vector<LineMask> runs;
+  };
+
+  void addLine(PangoLayoutIter* iter, GlyphImages& images);
+  void drawByPango(const Canvas& canvas, std::size_t line, const Place& place, uint32_t color,
+                   const Pixels& clip) const;
+
+  TextLayout layout;  // null where no line needs it
+  int height = 0;
+  std::vector<Line> lines;
+};
+
+}  // namespace brimol::pc
