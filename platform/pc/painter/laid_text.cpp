@@ -64,16 +64,38 @@ TextLayout layOut(PangoContext* context, std::string_view words, int size) {
 
 }  // namespace
 
-LaidText::LaidText(PangoContext* context, GlyphImages& images, std::string_view words, int size)
-    : layout(layOut(context, words, size)) {
+LaidText::LaidText(const Sources& sources, std::string_view words, int size) {
+  const PlainShapes::Sheet* const sheet = sources.shapes.sheetFor(words, size);
+  if (sheet != nullptr && addPlainLine(*sheet, sources.images, words)) return;
+  layout = layOut(sources.context, words, size);
   int units = 0;
   pango_layout_get_size(layout.get(), nullptr, &units);
   height = pixelsOf(units);
   const LayoutIterator iter(pango_layout_get_iter(layout.get()));
   do {
-    addLine(iter.get(), images);
+    addLine(iter.get(), sources.images);
   } while (pango_layout_iter_next_line(iter.get()) != FALSE);
+  const Line& first = lines.front();
+  sources.shapes.learn(words, size, layout.get(), {height, first.middle, first.baseline});
   if (std::ranges::all_of(lines, &Line::isMasked)) layout.reset();
+}
+
+// False, and nothing is added, where the line has no mask.
+bool LaidText::addPlainLine(const PlainShapes::Sheet& sheet, GlyphImages& images,
+                            std::string_view words) {
+  GlyphRun run(sheet.font(), images);
+  int x = 0;
+  for (std::size_t i = 0; i < words.size(); ++i) {
+    run.add(sheet.glyph(words[i]), x, 0);
+    x += sheet.advance(words[i], i + 1 < words.size() ? words[i + 1] : '\0');
+  }
+  std::optional<LineMask> mask = run.mask();
+  if (!mask) return false;
+  const LineMetrics& metrics = sheet.metrics();
+  height = metrics.height;
+  lines.push_back({metrics.middle, metrics.baseline, pixelsOf(x), true, {}});
+  lines.back().runs.push_back(std::move(*mask));
+  return true;
 }
 
 void LaidText::addLine(PangoLayoutIter* iter, GlyphImages& images) {

@@ -6,6 +6,7 @@
 
 #include "painter/glyph_images.h"
 #include "painter/line_mask.h"
+#include "painter/plain_shapes.h"
 #include "painter/text_handles.h"
 
 namespace brimol::pc {
@@ -13,8 +14,13 @@ namespace brimol::pc {
 /// Lines of text. One thread uses it.
 class LaidText {
  public:
-  /// `images` are asked for the glyphs, for the call.
-  LaidText(PangoContext* context, GlyphImages& images, std::string_view words, int size);
+  /// What a text is made from, and what is learnt for others meanwhile. Asked during the call.
+  struct Sources {
+    PangoContext* context;
+    GlyphImages& images;
+    PlainShapes& shapes;
+  };
+  LaidText(const Sources& sources, std::string_view words, int size);
 
   /// Draws what text_painter.h describes.
   void draw(const Canvas& canvas, const Edges& box, int align, Ink& ink, const Pixels& clip) const;
@@ -31,6 +37,7 @@ class LaidText {
     std::vector<LineMask> runs;
   };
 
+  bool addPlainLine(const PlainShapes::Sheet& sheet, GlyphImages& images, std::string_view words);
   void addLine(PangoLayoutIter* iter, GlyphImages& images);
   void drawByPango(const Canvas& canvas, std::size_t line, const Place& place, uint32_t color,
                    const Pixels& clip) const;

@@ -15,7 +15,7 @@ const LaidText& TextPainter::laidText(const SKIA_Text& text) {
   const KeyView key = {shownText(text), textSizeOf(text)};
   if (const LaidText* const known = texts.find(key)) return *known;
   images.trim();
-  LaidText laid(fonts->context(), images, key.text, key.size);
+  LaidText laid({fonts->context(), images, shapes}, key.text, key.size);
   const std::size_t cost = key.text.size() + laid.bytes();
   return texts.put({std::string(key.text), key.size}, std::move(laid), cost);
 }

@@ -52,6 +52,7 @@ class TextPainter {
 
   BorrowedFonts fonts;
   GlyphImages images;
+  PlainShapes shapes;
   Ink ink{0};
   LruCache<Key, LaidText, IsBefore> texts;
 };
