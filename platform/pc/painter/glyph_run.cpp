@@ -30,11 +30,15 @@ struct Sheet {
     for (int y = 0; y < at.height; ++y) {
       const int first = (at.y - area.y + y) * area.width + at.x - area.x;
       for (const CoveredGroup& group : image.row(static_cast<std::size_t>(y))) {
-        for (std::size_t i = 0; i < group.coverage.size(); ++i) {
-          if (group.coverage[i] == 0) continue;
-          putPixel(static_cast<std::size_t>(first + group.x) + i, group.coverage[i]);
-        }
+        putGroup(static_cast<std::size_t>(first + group.x), group);
       }
+    }
+  }
+
+  void putGroup(std::size_t place, const CoveredGroup& group) {
+    for (const uint8_t share : group.coverage) {
+      if (share != 0) putPixel(place, share);
+      ++place;
     }
   }
 

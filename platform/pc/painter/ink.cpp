@@ -90,18 +90,14 @@ void Ink::lay(uint32_t* row, int left, std::span<const CoveredGroup> groups) {
   if (first == candidate && (first != ground || !isLearnt)) learn(first);
   candidate = first;
   const Shares color = {parts, alpha};
-  const uint64_t pair = uint64_t{ground} << 32 | ground;
+  const GroupPixels uniform = {ground, ground, ground, ground};
   for (const CoveredGroup& group : groups) {
     uint32_t* const pixels = row + (left + group.x);
-    std::array<uint64_t, 2> old;
-    std::memcpy(old.data(), pixels, sizeof old);
-    if (((old[0] ^ pair) | (old[1] ^ pair)) != 0) {
+    if (std::memcmp(pixels, uniform.data(), sizeof uniform) != 0) {
       mix(pixels, group, color);
-    } else {
-      for (std::size_t i = 0; i < group.coverage.size(); ++i) {
-        pixels[i] = table[group.coverage[i]];
-      }
+      continue;
     }
+    for (std::size_t i = 0; i < group.coverage.size(); ++i) pixels[i] = table[group.coverage[i]];
   }
 }
 

@@ -27,6 +27,11 @@ int64_t aligned(const Edges& box, int align, int width) {
 
 bool isNear(int64_t position) { return position >= -kFarAway && position <= kFarAway; }
 
+Edges around(const Edges& one, const Edges& other) {
+  return {std::min(one.left, other.left), std::min(one.top, other.top),
+          std::max(one.right, other.right), std::max(one.bottom, other.bottom)};
+}
+
 std::span<const PangoGlyphInfo> glyphsOf(const PangoGlyphString* glyphs) {
   return {glyphs->glyphs, static_cast<std::size_t>(glyphs->num_glyphs)};
 }
@@ -93,7 +98,7 @@ bool LaidText::addPlainLine(const PlainShapes::Sheet& sheet, GlyphImages& images
   if (!mask) return false;
   const LineMetrics& metrics = sheet.metrics();
   height = metrics.height;
-  lines.push_back({metrics.middle, metrics.baseline, pixelsOf(x), true, {}});
+  lines.push_back({metrics.middle, metrics.baseline, pixelsOf(x), true, {}, {}});
   lines.back().runs.push_back(std::move(*mask));
   return true;
 }
@@ -119,25 +124,50 @@ void LaidText::addLine(PangoLayoutIter* iter, GlyphImages& images) {
     line.runs.push_back(std::move(*mask));
     start += run.start_x_offset + pango_glyph_string_get_width(run.glyphs) + run.end_x_offset;
   }
+  PangoRectangle letters = {};
+  pango_layout_line_get_pixel_extents(pango_layout_iter_get_line_readonly(iter), &letters, nullptr);
+  line.letters = {letters.x, letters.y, letters.width, letters.height};
   lines.push_back(std::move(line));
 }
 
-// Line by line, since each is aligned to the box and not to the longest of them. In a box with room
-// for fewer lines, those whose middle lies outside are left out, and the others are whole.
+// Visits the lines with the place of each one's left end on its baseline. Line by line, since each
+// is aligned to the box and not to the longest of them. In a box with room for fewer lines, those
+// whose middle lies outside are left out, and the others are whole. False: some are left out.
+template <typename Visit>
+bool LaidText::visit(const Edges& box, int align, Visit each) const {
+  const int64_t top = centred(box.top, box.bottom, height);
+  bool isWhole = true;
+  for (std::size_t i = 0; i < lines.size(); ++i) {
+    const int64_t middle = top + lines[i].middle;
+    const int64_t x = aligned(box, align, lines[i].width);
+    const int64_t y = top + lines[i].baseline;
+    const bool isInBox = middle >= box.top && middle <= box.bottom;
+    isWhole = isWhole && isInBox;
+    if (isInBox && isNear(x) && isNear(y)) {
+      each(i, Place{static_cast<int>(x), static_cast<int>(y)});
+    }
+  }
+  return isWhole;
+}
+
 void LaidText::draw(const Canvas& canvas, const Edges& box, int align, Ink& ink,
                     const Pixels& clip) const {
-  const int64_t top = centred(box.top, box.bottom, height);
-  for (std::size_t i = 0; i < lines.size(); ++i) {
-    const Line& line = lines[i];
-    const int64_t middle = top + line.middle;
-    if (middle < box.top || middle > box.bottom) continue;
-    const int64_t x = aligned(box, align, line.width);
-    const int64_t y = top + line.baseline;
-    if (!isNear(x) || !isNear(y)) continue;
-    const Place place = {static_cast<int>(x), static_cast<int>(y)};
-    if (!line.isMasked) drawByPango(canvas, i, place, ink.color(), clip);
-    for (const LineMask& run : line.runs) run.draw(canvas, place, ink, clip);
-  }
+  visit(box, align, [&](std::size_t i, const Place& place) {
+    if (!lines[i].isMasked) drawByPango(canvas, i, place, ink.color(), clip);
+    for (const LineMask& run : lines[i].runs) run.draw(canvas, place, ink, clip);
+  });
+}
+
+TextInk LaidText::ink(const Edges& box, int align) const {
+  TextInk found;
+  found.isWhole = visit(box, align, [&](std::size_t i, const Place& place) {
+    Pixels letters = lines[i].letters;
+    if (letters.width == 0) return;
+    letters.x += place.x;
+    letters.y += place.y;
+    found.area = isEmpty(found.area) ? edgesOf(letters) : around(found.area, edgesOf(letters));
+  });
+  return found;
 }
 
 void LaidText::drawByPango(const Canvas& canvas, std::size_t line, const Place& place,

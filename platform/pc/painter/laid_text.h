@@ -11,6 +11,12 @@
 
 namespace brimol::pc {
 
+/// What the letters of a text touch.
+struct TextInk {
+  Edges area = {0, 0, 0, 0};  // screen pixels
+  bool isWhole = true;        // false: lines are left out for lack of height
+};
+
 /// Lines of text. One thread uses it.
 class LaidText {
  public:
@@ -25,6 +31,9 @@ class LaidText {
   /// Draws what text_painter.h describes.
   void draw(const Canvas& canvas, const Edges& box, int align, Ink& ink, const Pixels& clip) const;
 
+  /// Where the letters' outlines lie. Only for a text that Pango has shaped.
+  TextInk ink(const Edges& box, int align) const;
+
   std::size_t bytes() const;
 
  private:
@@ -35,8 +44,11 @@ class LaidText {
     int width;
     bool isMasked;  // false: Pango draws it
     std::vector<LineMask> runs;
+    Pixels letters = {};  // where the outlines lie, from the line's left end and baseline
   };
 
+  template <typename Visit>
+  bool visit(const Edges& box, int align, Visit each) const;
   bool addPlainLine(const PlainShapes::Sheet& sheet, GlyphImages& images, std::string_view words);
   void addLine(PangoLayoutIter* iter, GlyphImages& images);
   void drawByPango(const Canvas& canvas, std::size_t line, const Place& place, uint32_t color,

@@ -47,30 +47,37 @@ void drawRow(const Row& row, std::span<const CoveredGroup> groups, Ink& ink) {
   }
 }
 
+// Visits a part's rows by their numbers in the mask.
+template <typename Work>
+void eachRow(const LineMask::Part& part, const Pixels& area, Work work) {
+  const auto first = static_cast<std::size_t>(part.area.y - area.y);
+  for (std::size_t y = 0; y < static_cast<std::size_t>(part.area.height); ++y) {
+    work(first + y, part.image->row(y));
+  }
+}
+
 }  // namespace
 
 // First how many groups each row has, then where they begin, then the groups.
 LineMask::LineMask(std::span<const Part> parts, const Pixels& area)
     : box(area), rows(static_cast<std::size_t>(area.height) + 1) {
-  const auto eachRow = [&](auto work) {
-    for (const Part& part : parts) {
-      const auto first = static_cast<std::size_t>(part.area.y - area.y);
-      for (std::size_t y = 0; y < static_cast<std::size_t>(part.area.height); ++y) {
-        work(first + y, part.image->row(y), part.area.x - area.x);
-      }
-    }
-  };
-  eachRow([this](std::size_t row, std::span<const CoveredGroup> more, int) {
-    rows[row + 1] += static_cast<uint32_t>(more.size());
-  });
+  for (const Part& part : parts) {
+    eachRow(part, area, [this](std::size_t row, std::span<const CoveredGroup> more) {
+      rows[row + 1] += static_cast<uint32_t>(more.size());
+    });
+  }
   std::partial_sum(rows.begin(), rows.end(), rows.begin());
   groups.resize(rows.back());
   std::vector<uint32_t> next(rows.begin(), rows.end() - 1);
-  eachRow([&](std::size_t row, std::span<const CoveredGroup> more, int left) {
-    for (const CoveredGroup& group : more) {
-      groups[next[row]++] = {static_cast<uint16_t>(group.x + left), group.coverage};
-    }
-  });
+  for (const Part& part : parts) {
+    const auto toRight = [by = part.area.x - area.x](const CoveredGroup& group) {
+      return CoveredGroup{static_cast<uint16_t>(group.x + by), group.coverage};
+    };
+    eachRow(part, area, [&](std::size_t row, std::span<const CoveredGroup> more) {
+      std::ranges::transform(more, groups.begin() + next[row], toRight);
+      next[row] += static_cast<uint32_t>(more.size());
+    });
+  }
 }
 
 void LineMask::draw(const Canvas& canvas, const Place& origin, Ink& ink, const Pixels& clip) const {

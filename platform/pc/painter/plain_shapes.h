@@ -7,6 +7,7 @@
 #include <cstdint>
 #include <memory>
 #include <string_view>
+#include <tuple>
 
 #include "painter/lru_cache.h"
 
@@ -70,7 +71,9 @@ class PlainShapes {
   struct Key {
     int size;
     bool hasLetters;
-    friend auto operator<=>(const Key&, const Key&) = default;
+    friend bool operator<(const Key& one, const Key& other) {
+      return std::tie(one.size, one.hasLetters) < std::tie(other.size, other.hasLetters);
+    }
   };
   static constexpr std::size_t kMostSheets = 8;
 

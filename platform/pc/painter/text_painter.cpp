@@ -4,11 +4,29 @@
 
 namespace brimol::pc {
 
+namespace {
+
+// Whether the text is one that draws something.
+bool isDrawn(const SKIA_Text& text) {
+  return textSizeOf(text) != 0 && alphaOf(text.color) != 0 && !shownText(text).empty();
+}
+
+}  // namespace
+
 void TextPainter::draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_Text& text,
                        const Pixels& clip) {
-  if (textSizeOf(text) == 0 || alphaOf(text.color) == 0 || shownText(text).empty()) return;
+  if (!isDrawn(text)) return;
   if (ink.color() != text.color) ink = Ink(text.color);
   laidText(text).draw(canvas, edgesOf(rect), text.align, ink, clip);
+}
+
+// From Pango itself, which knows where the outlines lie.
+TextInk TextPainter::inkOf(const SKIA_Rect& rect, const SKIA_Text& text) {
+  if (!isDrawn(text)) return {};
+  images.trim();
+  PlainShapes none;
+  const LaidText laid({fonts->context(), images, none}, shownText(text), textSizeOf(text));
+  return laid.ink(edgesOf(rect), text.align);
 }
 
 const LaidText& TextPainter::laidText(const SKIA_Text& text) {

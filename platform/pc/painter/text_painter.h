@@ -12,6 +12,7 @@
 #include "painter/ink.h"
 #include "painter/laid_text.h"
 #include "painter/lru_cache.h"
+#include "scene/rectangles.h"
 
 namespace brimol::pc {
 
@@ -25,6 +26,10 @@ class TextPainter {
   /// item's bounds, or a part of them within the canvas. Bytes that are no UTF-8 draw the
   /// replacement character.
   void draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_Text& text, const Pixels& clip);
+
+  /// Where the text's letters lie, though the rectangle's sides may cut them; empty for a text that
+  /// draws nothing.
+  TextInk inkOf(const SKIA_Rect& rect, const SKIA_Text& text);
 
   /// Of what is kept, bounded by kMostBytes.
   std::size_t bytes() const { return texts.cost(); }
