@@ -2,9 +2,10 @@
 #include <android/log.h>
 
 #include <array>
+#include <thread>
 
 #include "support/play_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace {
 
@@ -14,7 +15,7 @@ using MainListTest = WidgetTest;
 // Items 100 high, captioned by their numbers. On the default screen of 1440 x 2560 the list begins
 // at 340 and is 2220 high.
 struct Menu : MW::MainList {
-  using MainList::items;
+  using MainList::items, MainList::shown, MainList::stateLock;
   explicit Menu(const std::vector<int>& kinds, int listMode = kPlain) : MainList("Menu", listMode) {
     for (const int kind : kinds) add(kind);
     initFinish();
@@ -96,6 +97,22 @@ TEST_F(MainListTest, LogsWhatItIsByThen) {
   EXPECT_EQ(played(kShort.make, {hear, draw(), draw(), press(9, 400), hide, hide}),
             "[MAINLIST] SHOW->Menu active0 [MAINLIST] position2index= 0340 < 0400 > 0440 active1 "
             "press+ [MAINLIST] HIDE<-Menu0");
+}
+
+// Hidden while a pass draws it, it is inactive first: no later pass takes it for shown again.
+TEST_F(MainListTest, IsInactiveBeforeItIsNotShown) {
+  Menu menu({1});
+  menu.setActive(1);
+  menu.show(0);
+  std::jthread hiding;
+  {
+    const std::lock_guard drawing(menu.stateLock);
+    hiding = std::jthread([&] { menu.hide(); });
+    while (menu.isActive()) std::this_thread::yield();  // for ever in another order
+    EXPECT_EQ(menu.shown, 1);
+  }
+  hiding.join();
+  EXPECT_EQ(menu.shown, 0);
 }
 
 TEST_F(MainListTest, KeysScrollTheirItemIntoView) {

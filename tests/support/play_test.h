@@ -3,10 +3,9 @@
 
 #include <filesystem>
 #include <initializer_list>
-#include <source_location>
 
 #include "support/widget_test.h"
-#include "testkit/play.h"
+#include <brimol3_widget_test/play.h>
 
 namespace brimol::test {
 
@@ -39,12 +38,11 @@ struct PlaysOn {
 ///     const PlayTests kPlays = {kSlide("IsGrabbed", {press(1, 1)}, "+")};
 class PlayTests {
  public:
-  PlayTests(std::initializer_list<Play> plays,
-            std::source_location place = std::source_location::current()) {
-    const std::string suite = std::filesystem::path(place.file_name()).stem();
+  PlayTests(std::initializer_list<Play> plays, const char* file = __builtin_FILE(),
+            int line = __builtin_LINE()) {
+    const std::string suite = std::filesystem::path(file).stem();
     for (const Play& play : plays) {
-      testing::RegisterTest(suite.c_str(), play.name, nullptr, nullptr, place.file_name(),
-                            static_cast<int>(place.line()),
+      testing::RegisterTest(suite.c_str(), play.name, nullptr, nullptr, file, line,
                             [play]() -> WidgetTest* { return new Test(play); });
     }
   }

@@ -3,7 +3,7 @@
 #include <array>
 
 #include "support/play_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace {
 

@@ -18,6 +18,15 @@ Step face() {
   });
 }
 
+// The drawing calls of show() without a time.
+Step untimed() {
+  return look([](Widget& button) {
+    platform().takeDrawings();
+    button.show();
+    return platform().takeDrawings().size();
+  });
+}
+
 const PlayTests kPlays = {
     kButton("IsClickedByAReleaseInside", {press(100, 279), face(), release(), face(), lookAtLog()},
             "press+ <1 lit> click+ <0 plain> <[BUTTON] released!!>"),
@@ -56,8 +65,10 @@ const PlayTests kPlays = {
              lookAtRedraw(), later(249), timer(), lookAtRedraw(), lookAtDrawings(), later(1),
              press(100, 279), timer(), lookAtRedraw(), lookAtDrawings(), press()},
             "<1> <redraw> <still> <0> - <redraw> <1> press+"),
-    kButton("IsSeenAtOnceWhereItsDelayReachesBehindTheWrap",
-            {at(~15U), call(&Widget::onShowTimer, 250), lookAtDrawings()}, "<1>"),
+    kButton("IsSeenAfterItsDelayOverTheWrapAndNeverWithoutATime",
+            {at(~15U), call(&Widget::onShowTimer, 250), later(249), lookAtDrawings(), later(1),
+             untimed(), lookAtDrawings(), untimed()},
+            "<0> <0> <1> <1>"),
 };
 
 }  // namespace

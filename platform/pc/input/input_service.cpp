@@ -34,6 +34,7 @@ void InputService::deliver(const Event& record) {
     const std::lock_guard lock(mutex);
     if (!isOpen) return;
     queue.push(record);
+    if (!firstArrival) firstArrival = std::chrono::steady_clock::now();
   }
   wake.notify_all();
 }
@@ -42,6 +43,11 @@ bool InputService::poll(Event& record) {
   const std::lock_guard lock(mutex);
   poller = std::this_thread::get_id();
   return queue.take(record);
+}
+
+std::optional<std::chrono::steady_clock::time_point> InputService::takeFirstArrival() {
+  const std::lock_guard lock(mutex);
+  return std::exchange(firstArrival, std::nullopt);
 }
 
 uint32_t InputService::now() const {

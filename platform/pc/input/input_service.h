@@ -1,10 +1,12 @@
 /// What the input calls work on: the queue of records, the clock and its pauses.
 #pragma once
 
+#include <chrono>
 #include <condition_variable>
 #include <cstdint>
 #include <functional>
 #include <mutex>
+#include <optional>
 #include <thread>
 
 #include "clock/clock.h"
@@ -39,6 +41,10 @@ class InputService {
   /// calling thread is the polling thread from here on.
   bool poll(Event& record);
 
+  /// When the first record came since this was last asked, by the steady clock; none where none
+  /// came.
+  std::optional<std::chrono::steady_clock::time_point> takeFirstArrival();
+
   /// Milliseconds; wraps.
   uint32_t now() const;
   /// Pauses the calling thread for `ms` milliseconds of the clock. Ends early on the polling thread
@@ -62,6 +68,7 @@ class InputService {
   Clock clock;
   InputQueue queue;
   bool isOpen = false;
+  std::optional<std::chrono::steady_clock::time_point> firstArrival;
   uint32_t handChanges = 0;  // how often the hand was put on or taken off
   std::thread::id poller;
 

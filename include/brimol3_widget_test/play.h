@@ -16,7 +16,7 @@
 #include <string>
 #include <vector>
 
-#include "testkit/input.h"
+#include <brimol3_widget_test/input.h>
 
 namespace brimol::test {
 

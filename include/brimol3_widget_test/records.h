@@ -9,6 +9,7 @@
 #include <iomanip>
 #include <ostream>
 #include <string>
+#include <vector>
 
 /// The records have no operators of their own: they are C.
 // The records are nothing but words, without gaps.
@@ -71,7 +72,7 @@ struct Drawing {
   SKIA_Rect rect = {};
   SKIA_Point line = {};
   DrawnText text = {};
-  int32_t kind = 0;  // of an item record
+  int32_t kind = 0;  ///< of an item record
 
   bool operator==(const Drawing&) const = default;
 };
@@ -82,9 +83,18 @@ inline std::ostream& operator<<(std::ostream& out, const Drawing& drawing) {
              << drawing.text.align << " size " << drawing.text.size;
 }
 
+/// The display items of one picture, in the order in which they are drawn.
+using Frame = std::vector<SKIA_Item>;
+
+/// The item that the call adds.
+SKIA_Item itemOf(const Drawing& drawing);
+Frame itemsOf(const std::vector<Drawing>& drawings);
+/// A line for each item: its kind, rectangle, line and text, as far as it has them.
+std::string textOf(const Frame& frame);
+
 /// One log line; its text is what stands behind the tag.
 struct LogLine {
-  int priority;  // 3 debug, 5 warning, 6 error
+  int priority;  ///< 3 debug, 5 warning, 6 error
   std::string tag;
   std::string message;
 

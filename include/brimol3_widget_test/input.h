@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-#include "testkit/recording_platform.h"
+#include <brimol3_widget_test/platform.h>
 
 namespace brimol::test {
 
@@ -25,6 +25,14 @@ inline MW::event_data keyEvent(MW::EventCode code, unsigned int key) {
 inline Event pointerInput(BrimolEventType type, Spot spot) {
   const auto place = [](int pixels) { return static_cast<uint16_t>(pixels); };
   return {.pointer = {static_cast<uint8_t>(type), 0, 0, 0, place(spot.x), place(spot.y), 0, 0}};
+}
+/// The platform's record of a key.
+inline Event keyInput(BrimolEventType type, unsigned int code) {
+  Event event = {};
+  event.key.type = static_cast<uint8_t>(type);
+  event.key.state = type == BRIMOL_KEY_DOWN ? 1 : 0;
+  event.key.code = code;
+  return event;
 }
 
 /// Offers a widget an event as the dispatcher does. The widget's answer.

@@ -3,6 +3,8 @@
 #pragma once
 
 #include <brimol/input.h>
+#include <brimol3_widget_test/records.h>
+#include <brimol3_widget_test/turns.h>
 
 #include <atomic>
 #include <deque>
@@ -13,11 +15,9 @@
 #include <utility>
 #include <vector>
 
-#include "testkit/records.h"
-
 namespace brimol::test {
 
-/// What a test sets and reads while no other thread runs or all of them are parked.
+/// What a test sets and reads while no other thread runs or all of them are held.
 struct PlatformState {
   bool records = true;       ///< false: drawings and log lines are dropped
   int live = 1;              ///< what skia_live_widget_c() returns
@@ -31,6 +31,16 @@ struct PlatformState {
   std::vector<LogLine> lines;
   std::deque<Event> fed;
   std::map<std::string, std::string> properties;
+
+  // What brimol/host.h tells of.
+  int width = 1440, height = 2560;     ///< of the screen, pixels
+  bool closeRequested = false;         ///< the user has asked to close the window
+  int brightness = 100;                ///< per cent, as last set
+  int64_t utcMs = kDefaultUtcMs;       ///< since 1970, when the ticks were 0
+  uint32_t random = 1;                 ///< the next random number; the one behind it is one more
+  std::map<std::string, std::string> figures;  ///< by name; a figure that is not here is empty
+
+  static constexpr int64_t kDefaultUtcMs = 1'767'225'600'000;  ///< 2026-01-01T00:00:00Z
 };
 
 /// The one platform. The platform's calls may come from any thread, and so may these.
@@ -48,14 +58,11 @@ struct RecordingPlatform : PlatformState {
     fed.push_back(event);
   }
 
-  std::atomic<unsigned int> ticks = 0;  ///< what GetTicks() returns
-
-  /// Whether threads other than the test's stay in Delay, and how many are there.
-  std::atomic<bool> parks = false;
-  std::atomic<int> parked = 0;
+  std::atomic<unsigned int> ticks = 0;  ///< what GetTicks() returns, in milliseconds
+  Turns turns;                          ///< of the other threads, in Delay
 
   std::thread::id testThread;
-  std::mutex lock;  // guards `records`, the lists and the properties
+  std::mutex lock;  ///< guards `records`, the lists and the properties
 
  private:
   template <typename List>
@@ -65,6 +72,7 @@ struct RecordingPlatform : PlatformState {
   }
 };
 
+/// The platform, from the process's start to its end.
 RecordingPlatform& platform();
 
 }  // namespace brimol::test

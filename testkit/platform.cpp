@@ -1,7 +1,8 @@
-#include "testkit/recording_platform.h"
+#include <brimol3_widget_test/platform.h>
 
 #include <android/log.h>
 #include <brimol/display.h>
+#include <brimol/frame.h>
 #include <brimol/properties.h>
 
 #include <chrono>
@@ -60,6 +61,10 @@ using brimol::test::Call;
 using brimol::test::draw;
 using brimol::test::platform;
 
+// What was drawn before goes into no frame.
+void skia_begin_frame_c() { platform().takeDrawings(); }
+void skia_end_frame_c() {}
+
 int skia_add_box_c(SKIA_Rect rect) { return draw(Call::Box, rect); }
 int skia_add_roundbox_c(SKIA_Rect rect) { return draw(Call::RoundBox, rect); }
 int skia_add_line_c(SKIA_Point line) { return draw(Call::Line, {}, {}, line); }
@@ -113,11 +118,9 @@ void Delay(unsigned int ms) {
     platform().paused += ms;
     return;
   }
-  ++platform().parked;
-  platform().parked.notify_all();
-  platform().parks.wait(true);
-  --platform().parked;
-  std::this_thread::sleep_for(brimol::test::kShortPause);
+  if (!platform().turns.pause(platform().ticks, ms)) {
+    std::this_thread::sleep_for(brimol::test::kShortPause);
+  }
 }
 
 void getDpi(float* xdpi, float* ydpi) {

@@ -1,4 +1,4 @@
-#include "display/downscaler.h"
+#include "display/scaler.h"
 
 #include <algorithm>
 #include <array>
@@ -55,14 +55,14 @@ Shares::Shares(int sourceSide, int targetSide, std::uint32_t whole) {
   }
 }
 
-Downscaler::Downscaler(Size source, Size target)
+Scaler::Scaler(Size source, Size target)
     : isCopy(source == target),
       across(source.w, target.w, kWholeAcross),
       down(source.h, target.h, kWholeDown),
       sums(bytesOf(source.w)) {}
 
-void Downscaler::scale(cairo_surface_t* from, const cairo_rectangle_int_t& part,
-                       unsigned char* origin, int stride) {
+void Scaler::scale(cairo_surface_t* from, const cairo_rectangle_int_t& part, unsigned char* origin,
+                   int stride) {
   if (part.width <= 0) return;
   if (isCopy) return copy(from, part, origin, stride);
   const auto share = [this](int column) { return across.shares[static_cast<std::size_t>(column)]; };
@@ -76,7 +76,7 @@ void Downscaler::scale(cairo_surface_t* from, const cairo_rectangle_int_t& part,
   }
 }
 
-void Downscaler::addUpRows(cairo_surface_t* from, int row, int firstColumn, int endColumn) {
+void Scaler::addUpRows(cairo_surface_t* from, int row, int firstColumn, int endColumn) {
   const Shares::Share share = down.shares[static_cast<std::size_t>(row)];
   const std::size_t start = bytesOf(firstColumn);
   const std::size_t count = bytesOf(endColumn - firstColumn);
@@ -92,7 +92,7 @@ void Downscaler::addUpRows(cairo_surface_t* from, int row, int firstColumn, int 
   }
 }
 
-void Downscaler::writePixel(int column, unsigned char* pixel) const {
+void Scaler::writePixel(int column, unsigned char* pixel) const {
   const Shares::Share share = across.shares[static_cast<std::size_t>(column)];
   std::array<std::uint32_t, kPixelBytes> colour;
   colour.fill(1U << (kWholeBits - 1));

@@ -8,7 +8,7 @@
 #include <climits>
 #include <sstream>
 
-#include "testkit/input.h"
+#include <brimol3_widget_test/input.h>
 
 namespace brimol::test {
 
