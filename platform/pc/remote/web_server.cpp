@@ -254,7 +254,10 @@ int WebServer::hearViewer(Line& line, std::string_view bytes) {
 int WebServer::hearServer(Line& line, std::string_view bytes) const {
   const bool wasEmpty = line.caller.forViewer().isEmpty();
   line.caller.answer(bytes);
-  if (line.caller.forViewer().size() > maxQueued) return 1;
+  if (line.caller.forViewer().size() > maxQueued) {
+    shutdown(lws_get_socket_fd(line.inner), SHUT_RDWR);  // the server must not wait for it
+    return 1;
+  }
   if (wasEmpty) watch(line);
   lws_callback_on_writable(line.outer);
   return 0;
@@ -300,17 +303,19 @@ int WebServer::sendToViewer(Line& line) {
   return 0;
 }
 
+// Not by libwebsockets, which reads nothing more from a connection while some of what it sends
+// there waits: the server, which takes nothing while it sends, and it would wait for each other.
 int WebServer::sendToServer(Line& line) {
   ByteQueue& queue = line.caller.forServer();
   const std::string_view chunk = queue.front(kChunk);
-  if (chunk.empty()) return 0;
-  std::ranges::copy(chunk, buffer.begin() + LWS_PRE);
-  if (lws_write(line.inner, buffer.data() + LWS_PRE, chunk.size(), LWS_WRITE_RAW) < 0) return 1;
-  queue.drop(chunk.size());
-  if (queue.isEmpty()) {
-    lws_rx_flow_control(line.outer, 1);
-  } else {
+  const ssize_t sent =
+      ::send(lws_get_socket_fd(line.inner), chunk.data(), chunk.size(), MSG_NOSIGNAL);
+  if (sent < 0 && errno != EAGAIN) return 1;
+  if (sent > 0) queue.drop(static_cast<std::size_t>(sent));
+  if (!queue.isEmpty()) {
     lws_callback_on_writable(line.inner);
+  } else if (line.outer != nullptr) {
+    lws_rx_flow_control(line.outer, 1);
   }
   return 0;
 }
