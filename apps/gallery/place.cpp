@@ -2,6 +2,7 @@
 
 #include <MW/window.h>
 
+#include <algorithm>
 #include <filesystem>
 #include <mutex>
 #include <system_error>
@@ -15,6 +16,10 @@ constinit std::mutex lineLock;
 std::string spoken;  // guarded by lineLock
 
 }  // namespace
+
+int atLeastMm(int pixels, float mm) {
+  return std::max(pixels, MW::Window::getMura(nullptr, nullptr, mm));
+}
 
 std::string pictureFile(const std::string& name) {
   std::error_code failed;

@@ -27,6 +27,12 @@ inline SKIA_Text words(const std::string& text, uint32_t color = MW::kColorBlack
   return record;
 }
 
+inline constexpr float kTouchMm = 7.2F;  ///< what a finger hits
+inline constexpr float kReadMm = 1.6F;   ///< letters that can be read
+
+/// So many pixels, or those of a length in millimetres where that is more, and known.
+int atLeastMm(int pixels, float mm);
+
 /// The path of a picture of the program: one in the working directory, or beside the program, or
 /// where it is installed.
 std::string pictureFile(const std::string& name);
