@@ -65,7 +65,6 @@ Painter::~Painter() = default;
 
 Region Painter::paint(const Frame& next) {
   Region changed = changedRegion(parts->shown, next, parts->canvas.size());
-  if (changed.empty()) return changed;  // the frame shown before stands for this one
   for (const Pixels& piece : changed) parts->paintPiece(next, piece);
   parts->shown = next;
   cairo_surface_mark_dirty(picture());
