@@ -11,17 +11,20 @@ if(BRIMOL_INSTALL)
   set(BRIMOL_INSTALL_CMAKEDIR "${CMAKE_INSTALL_LIBDIR}/cmake/brimol3_widget")
 endif()
 
-# brimol_install_library(<target> <component>): the library, and a CMake file that imports it as
-# brimol3_widget::<component>.
+# brimol_install_library(<target> <component> [<where>]): the library, and a CMake file that imports it
+# as brimol3_widget::<component>. What programs of users run with is installed as `runtime`, unless
+# <where> says otherwise.
 function(brimol_install_library target component)
   if(NOT BRIMOL_INSTALL)
     return()
   endif()
+  set(where runtime ${ARGN})
+  list(POP_BACK where where)
   install(
     TARGETS ${target}
     EXPORT brimol3_widget-${component}
     LIBRARY DESTINATION "${CMAKE_INSTALL_LIBDIR}"
-            COMPONENT runtime
+            COMPONENT ${where}
             NAMELINK_COMPONENT development
     INCLUDES DESTINATION "${CMAKE_INSTALL_INCLUDEDIR}")
   install(

@@ -6,9 +6,9 @@ else()
   set(BRIMOL_INTERFACE_VERSION "${PROJECT_VERSION_MAJOR}")
 endif()
 
-# brimol_shared_library(<target> <component> <map>): what the shared libraries have in common. Users
-# link brimol3_widget::<component>, be it built or installed. The linker's map <map> names what the
-# library exports.
+# brimol_shared_library(<target> <component> <map> [<where>]): what the shared libraries have in common.
+# Users link brimol3_widget::<component>, be it built or installed. The linker's map <map> names what the
+# library exports. <where>: as for brimol_install_library.
 function(brimol_shared_library target component map)
   add_library(brimol3_widget::${component} ALIAS ${target})
   set(map "${CMAKE_CURRENT_SOURCE_DIR}/${map}")
@@ -21,5 +21,5 @@ function(brimol_shared_library target component map)
   target_include_directories(${target} PUBLIC "$<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/include>")
   target_compile_features(${target} PUBLIC cxx_std_20)
   target_link_options(${target} PRIVATE "LINKER:--version-script=${map}")
-  brimol_install_library(${target} ${component})
+  brimol_install_library(${target} ${component} ${ARGN})
 endfunction()

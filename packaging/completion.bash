@@ -12,4 +12,4 @@ _brimol_options() {
     mapfile -t COMPREPLY < <(compgen -f -- "$word")
   fi
 }
-complete -F _brimol_options factory_test brimol-replay
+complete -F _brimol_options factory_test brimol_gallery brimol-replay

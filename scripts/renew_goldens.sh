@@ -9,10 +9,9 @@ echo "== Building in build/release"
 cmake --preset release >/dev/null
 cmake --build --preset release --target golden_test brimol_gallery
 echo "== Drawing into tests/golden/data"
-mkdir -p tests/golden/data
-data=$PWD/tests/golden/data
-# In the build's folder, where the picture widget finds its picture; without the widgets' log.
-(cd build/release/tests/golden && ./golden_test --renew "$data" 2> >(grep -v '^BRIMOL_' >&2))
+# In the build's folder, where the picture widget finds its picture.
+(cd build/release/tests/golden && BRIMOL_RENEW_GOLDENS=1 ./golden_test --gtest_brief=1 \
+  --gtest_filter='*Golden*')
 echo "== Writing docs/gallery.md"
 build/release/apps/gallery/brimol_gallery --document >docs/gallery.md
 echo "== Changed"

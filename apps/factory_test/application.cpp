@@ -85,7 +85,7 @@ int runApplication(const Options& options) {
     surroundings.logText = readText(options.log, error);
     if (!surroundings.logText) return fail(error);
   }
-  if (brimol_host_open() == 0) return fail(brimol_host_error());
+  if (brimol_host_open() == 0) return EXIT_FAILURE;
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;

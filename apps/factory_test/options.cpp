@@ -117,7 +117,9 @@ std::string usage() {
   }
   text +=
       "\nEnvironment:\n"
-      "  BRIMOL_DISPLAY=window|headless   where to draw; a window when there is a display\n"
+      "  BRIMOL_DISPLAY=window|browser|headless\n"
+      "                                   where to draw; a window when there is a display\n"
+      "  BRIMOL_LISTEN=ADDRESS:PORT       where browsers connect\n"
       "  BRIMOL_DEVICE=NAME               as --device; 1440x2560 pixels when not set\n"
       "  BRIMOL_SCREEN=WIDTHxHEIGHT       screen size in pixels, instead of the device's\n"
       "\nDevices:\n";

@@ -32,9 +32,25 @@ constexpr auto kKeys = std::to_array<KeyRow>({
     {MW::kKeyRight, Wish::Next},
 });
 
+// The buttons stand at the foot, high enough for a finger.
 SKIA_Rect buttonPlace(int column) {
   constexpr int kPitch = 24;  // per cent of the screen's width
-  return place(2 + column * kPitch, 93, kPitch - 1, 6);
+  SKIA_Rect area = place(2 + column * kPitch, 99, kPitch - 1, 6);
+  area.h = atLeastMm(area.h, kTouchMm);
+  area.y -= area.h;
+  return area;
+}
+
+// Two lines of text stand above them; 0 is the lower one.
+SKIA_Rect linePlace(int number) {
+  SKIA_Rect area = place(2, 0, 96, 3);
+  area.y = buttonPlace(0).y - (number + 1) * area.h;
+  return area;
+}
+
+SKIA_Rect groundPlace() {
+  const int top = linePlace(1).y;
+  return {0, top, MW::Window::width, MW::Window::height - top, kBarColor};
 }
 
 template <typename Primitive>
@@ -73,9 +89,9 @@ bool BarKeys::onRecvEvent(MW::event_data* event, unsigned int) {
 }
 
 Bar::Bar(const std::string& title, const std::string& other, MW::LayerNumber layer)
-    : ground(make<MW::Textbox>(place(0, 87, 100, 14, kBarColor), words(""))),
-      heading(make<MW::Label>(place(2, 87, 96, 3), words(title, MW::kColorWhite))),
-      line(make<MW::Label>(place(2, 90, 96, 3), words("", MW::kColorHighlight))),
+    : ground(make<MW::Textbox>(groundPlace(), words(""))),
+      heading(make<MW::Label>(linePlace(1), words(title, MW::kColorWhite))),
+      line(make<MW::Label>(linePlace(0), words("", MW::kColorHighlight))),
       back(buttonPlace(0), words("Menu"), layer, [](int) { ask(Wish::Back); }),
       previous(buttonPlace(1), words("Previous"), layer, [](int) { ask(Wish::Previous); }),
       switcher(buttonPlace(2), words(other), layer, [](int) { ask(Wish::Other); }),

@@ -50,7 +50,7 @@ void showCode(const std::string& code, BrowserLoop& loop) {
   constexpr int kTextPercent = 45;
   const SKIA_Rect area = place(1, 1, 98, 85, kPaper);
   SKIA_Text looks = words("", MW::kColorBlack, SKIA_ALIGN_LEFT);
-  looks.size = looks.size * kTextPercent / 100;
+  looks.size = atLeastMm(looks.size * kTextPercent / 100, kReadMm);
   MW::StaticText viewer(&area, &looks);
   viewer.setText(code.c_str());
   viewer.setActive(1);

@@ -14,6 +14,8 @@ namespace {
 
 constexpr int kNothing = -1;
 constexpr int kBack = -2;
+constexpr uint32_t kRowColor = 0xFF787878;  // as the list draws it
+constexpr uint32_t kMarkColor = 0xFF1F4E8C;
 constexpr int kRowPercent = 6;  // of the screen's height
 
 // What the list's callbacks leave behind. Rows count from 1: the first has no height.
@@ -22,9 +24,9 @@ int markedRow = kNothing;  // dispatch thread, once the list is active
 
 void mark(MW::MainList& list, int row) {
   if (row < 1) return;
-  if (markedRow != kNothing) list.setTextColor(markedRow, MW::kColorWhite);
+  if (markedRow != kNothing) list.setBGColor(markedRow, kRowColor);
   markedRow = row;
-  list.setTextColor(row, MW::kColorHighlight);
+  list.setBGColor(row, kMarkColor);
 }
 
 // The list does not draw a row that stands exactly at its top, where going up may bring it.
@@ -46,7 +48,7 @@ void followKey(MW::kbd_event* event, MW::MainList* list) {
 }
 
 void fill(MW::MainList& list, const std::vector<std::string>& rows) {
-  const int height = place(0, 0, 0, kRowPercent).h;
+  const int height = atLeastMm(place(0, 0, 0, kRowPercent).h, kTouchMm);
   const SKIA_Text nothing = {};
   list.addIndex(MW::MainList::kDark, &nothing, 0);
   for (const std::string& row : rows) {
@@ -60,7 +62,7 @@ void fill(MW::MainList& list, const std::vector<std::string>& rows) {
 
 std::optional<std::size_t> choose(const std::string& title, const std::vector<std::string>& rows,
                                   std::size_t marked) {
-  MW::MainList list(title.c_str(), MW::MainList::kPlain);
+  MW::MainList list((" " + title).c_str(), MW::MainList::kPlain);
   fill(list, rows);
   list.clickCallback = [](MW::mouse_event* event, MW::MainList* from) {
     chosen = from->position2index(*event);

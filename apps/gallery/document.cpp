@@ -15,13 +15,14 @@ constexpr std::size_t kColumns = 4;
 
 constexpr const char* kOpening = R"(# Gallery
 
-Every widget and every dialog with the code that makes it. Pictures and code come from the examples in
-`apps/gallery/families/`, which `brimol_gallery` shows in a window: there they can be touched. This page is
-written by `scripts/renew_goldens.sh`.
+Every widget and every dialog with the code that makes it. Code and pictures come from the examples in
+`apps/gallery/families/`, which `brimol_gallery` shows in a window, where they can be touched.
+`scripts/renew_goldens.sh` writes this page.
 
 An example makes its widgets and runs the application's main loop, `loop()`. In each frame the loop calls
-what it is given, and then `MW::Window::show()`; the README's first screen has such a loop. `say()` shows a
-line: an application does there what the answer asks for. `place()` and `words()` make records:
+what it is given, and then `MW::Window::show()`; the README's first screen has such a loop. Where an
+application does what an answer asks for, an example calls `say()`, which shows a line. Rectangles and
+texts come from two functions:
 
 )";
 
@@ -66,9 +67,9 @@ std::string sideBySide(const Family& family) {
 
 std::string document() {
   std::string page = kOpening;
-  const std::string_view place = sourceOf("place");
-  page +=
-      fenced(functionIn(place, "SKIA_Rect place(") + '\n' + functionIn(place, "SKIA_Text words("));
+  const std::string_view helpers = sourceOf("place.h");
+  page += fenced(functionIn(helpers, "inline constexpr") + '\n' +
+                 functionIn(helpers, "/// A text record"));
   for (const Family& family : families()) {
     page.append("\n## ").append(family.name).append("\n\n").append(family.about).append("\n");
     if (family.shared != nullptr) {

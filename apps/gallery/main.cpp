@@ -27,10 +27,7 @@ constexpr const char* kUsage =
 // Without the toolkit's log.
 int run() {
   __android_log_set_minimum_priority(ANDROID_LOG_SILENT);
-  if (brimol_host_open() == 0) {
-    std::fprintf(stderr, "brimol_gallery: %s\n", brimol_host_error());
-    return EXIT_FAILURE;
-  }
+  if (brimol_host_open() == 0) return EXIT_FAILURE;
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   if (MW::Window::init() == 1) gallery::browse();
   MW::Window::destroy();

@@ -2,6 +2,7 @@
 
 #include <MW/window.h>
 
+#include <algorithm>
 #include <filesystem>
 #include <mutex>
 #include <system_error>
@@ -10,25 +11,14 @@ namespace gallery {
 
 namespace {
 
-constexpr int kHundred = 100;
-constexpr int kLettersInHeight = 36;
-
 constinit std::mutex lineLock;
 
 std::string spoken;  // guarded by lineLock
 
 }  // namespace
 
-SKIA_Rect place(int left, int top, int width, int height, uint32_t color) {
-  const auto x = [](int percent) { return MW::Window::width * percent / kHundred; };
-  const auto y = [](int percent) { return MW::Window::height * percent / kHundred; };
-  return {x(left), y(top), x(width), y(height), color};
-}
-
-SKIA_Text words(const std::string& text, uint32_t color, int32_t align) {
-  SKIA_Text record = {{}, 0, color, align, MW::Window::height / kLettersInHeight};
-  record.string_len = static_cast<int32_t>(text.copy(record.text, SKIA_TEXT_BYTES - 1));
-  return record;
+int atLeastMm(int pixels, float mm) {
+  return std::max(pixels, MW::Window::getMura(nullptr, nullptr, mm));
 }
 
 std::string pictureFile(const std::string& name) {

@@ -10,6 +10,7 @@ namespace MW {
 /// and size as they are: empty at first.
 class MW_API Button3 : public PushButton {
  public:
+  /// Where on the screen it stands.
   enum Position {
     kBottomLeft = 1,
     kBottomRight = 2,

@@ -21,7 +21,7 @@ namespace MW {
 /// the held cells: bit 0 for the first cell, bit 1 for the second and so on.
 class MW_API Button8 : public ButtonFace {
  public:
-  static constexpr int kCells = 8;
+  static constexpr int kCells = 8;  ///< the most that a pad has
   /// Rows by columns; cells are numbered row by row, from the left. Any other number leaves the
   /// shape as it is: no cells at first.
   enum Layout {
@@ -61,6 +61,7 @@ class MW_API Button8 : public ButtonFace {
   int getButtonSelect(const event_data* event) const;
 
  protected:
+  /// A word for each cell.
   using Holders = std::array<int, kCells>;
 
   // Guarded by stateLock.

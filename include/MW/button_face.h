@@ -28,9 +28,10 @@ class MW_API ButtonFace : public Widget {
   ButtonFace(const char* logWord, const SKIA_Rect* area, const SKIA_Text* caption);
   /// Registers the button, with a log line that names the constructor.
   void enterWindow(int constructorNumber);
+  /// Gives it its normal colour, and asks for nothing.
   void restoreFace();
 
-  const char* word;
+  const char* word;              // begins the log lines
   unsigned int normalColor = 0;  // 0xAARRGGBB; guarded by stateLock
 };
 

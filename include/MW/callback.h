@@ -23,27 +23,34 @@ namespace MW {
 /// meanwhile.
 class Callback {
  public:
+  /// No function.
   constexpr Callback() = default;
   constexpr Callback(std::nullptr_t) {}  // NOLINT(google-explicit-constructor): assigned from null
+  /// A copy of the function.
   constexpr Callback(const Callback&) = default;
 
+  /// From a function or a captureless lambda.
   template <typename Function>
   requires(std::convertible_to<Function, void (*)(int)>)
       Callback(Function function)  // NOLINT(bugprone-forwarding-reference-overload)
       : word(erase(static_cast<void (*)(int)>(function))) {}
 
+  /// The same.
   template <typename Function>
   requires(std::convertible_to<Function, void (*)(mouse_event*)>) Callback(Function function)
       : word(erase(static_cast<void (*)(mouse_event*)>(function))) {}
 
+  /// The same.
   template <typename Function>
   requires(std::convertible_to<Function, void (*)(kbd_event*)>) Callback(Function function)
       : word(erase(static_cast<void (*)(kbd_event*)>(function))) {}
 
+  /// The same.
   template <typename Function>
   requires(std::convertible_to<Function, void (*)(int*)>) Callback(Function function)
       : word(erase(static_cast<void (*)(int*)>(function))) {}
 
+  /// No function any more.
   Callback& operator=(std::nullptr_t) {
     store({});
     return *this;
@@ -59,8 +66,10 @@ class Callback {
   // there every source comes to the template.
   Callback& operator=(const Callback&) && = delete;
 
+  /// Whether there is a function.
   explicit operator bool() const { return load() != nullptr; }
 
+  /// Calls the function, on the calling thread, with what it takes.
   void operator()(int value) const { call(value); }
   void operator()(mouse_event* event) const { call(event); }
   void operator()(kbd_event* event) const { call(event); }

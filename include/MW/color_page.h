@@ -20,7 +20,7 @@ namespace MW {
 /// event. Touches and setters (any thread) raise no redraw flag: call isDisplayUpdate(1).
 class MW_API ColorPage : public Widget {
  public:
-  static constexpr unsigned int kTexts = 4;
+  static constexpr unsigned int kTexts = 4;  ///< text boxes of a page
   /// The most bytes of text that a box takes. A longer text, or a record without a NUL, is ignored.
   static constexpr std::size_t kPageTextMax = 123;
 
@@ -51,6 +51,7 @@ class MW_API ColorPage : public Widget {
   void setBg_title(unsigned int color);
   /// Text box `index`, 0 to 3: its place and colour, and its text; any other index: nothing.
   void setText(unsigned int index, SKIA_Rect area, SKIA_Text caption);
+  /// Parts of onRecvEvent(); see Widget::onHover().
   void onPressKey(kbd_event key) const;
   void onReleaseKey(kbd_event key);
   /// Counts a release of the key that was released last; any other key ends the count.
@@ -70,8 +71,8 @@ class MW_API ColorPage : public Widget {
  protected:
   /// A text box of a page.
   struct TextBox {
-    SKIA_Rect area = {};
-    SKIA_Text text = {};
+    SKIA_Rect area = {};  // its place and colour
+    SKIA_Text text = {};  // what it says
   };
 
   /// `color`: as for setBg_title(). The derived class registers the page.
@@ -81,7 +82,7 @@ class MW_API ColorPage : public Widget {
 
   std::atomic<int> timerOn = 0;            // for derived classes; nothing here sets it
   std::atomic<unsigned int> lastTick = 0;  // GetTicks() milliseconds of the last key release
-  std::atomic<int> lcdOnFlag = 1;
+  std::atomic<int> lcdOnFlag = 1;          // what lcdOn() was told
   // The rest is guarded by stateLock, and so is `rect`: the page in its drawn colour.
   unsigned int bgColor;
   unsigned int textCount = 0;  // boxes drawn

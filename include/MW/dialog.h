@@ -17,6 +17,7 @@ namespace MW {
 /// of the one before. Handlers run on the dispatch thread.
 class MW_API Dialog : public PromptDialog {
  public:
+  /// What it asks, in the words of the constant.
   enum Kind {
     kLeaveFailedTest = 0,
     kPassOrFail = 1,
@@ -92,14 +93,16 @@ class MW_API Dialog : public PromptDialog {
   void setTitle(const char* newTitle);
   /// Replaces the message, by the same rules.
   void setDesc(const char* newMessage);
+  /// Parts of onRecvEvent(); see Widget::onHover().
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key);
   /// Counts a release of the key that was released last; any other key ends the count.
   void onKeyClickCount(kbd_event key);
 
  protected:
-  int kind;
-  SKIA_Rect messageRect = {};  // these four are guarded by stateLock
+  int kind;  // as constructed
+  // Guarded by stateLock.
+  SKIA_Rect messageRect = {};
   SKIA_Text message = {};
   SKIA_Rect secondRect = {};
   SKIA_Text second = {};

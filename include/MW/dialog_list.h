@@ -26,8 +26,8 @@ namespace MW {
 /// are.
 class MW_API DialogList : public FramedDialog {
  public:
-  static constexpr int kRows = 8;
-  static constexpr int kNoRow = -100;
+  static constexpr int kRows = 8;      ///< the most that a list has
+  static constexpr int kNoRow = -100;  ///< in the place of a row's number
 
   /// At most 127 bytes of the title are taken. Null is the empty text.
   explicit DialogList(const char* title);
@@ -59,15 +59,17 @@ class MW_API DialogList : public FramedDialog {
   void setRect_static(int rowCount, int index);
   /// The row at a touch on its check box, its text or between them; kNoRow elsewhere.
   int position2index(mouse_event mouse);
+  /// Parts of onRecvEvent(); see Widget::onHover().
   void onListPress(mouse_event mouse);
   void onBtn1Released(mouse_event mouse);
   void onBtn2Released(mouse_event mouse);
 
  protected:
+  /// A row of the list.
   struct Row {
-    SKIA_Rect box = {};
-    SKIA_Rect area = {};
-    SKIA_Text text = {};
+    SKIA_Rect box = {};   // the check box
+    SKIA_Rect area = {};  // of the text
+    SKIA_Text text = {};  // what is chosen
   };
 
   // All are guarded by stateLock.

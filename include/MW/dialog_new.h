@@ -17,7 +17,7 @@ struct DialogGrid;
 /// (isDisplayUpdate(1) does). Texts are copied, and cut to 127 bytes at a whole character.
 class MW_API DialogNew : public PromptDialog {
  public:
-  static constexpr int kLines = 3;
+  static constexpr int kLines = 3;  ///< the most that a dialog shows
 
   /// `align`: SKIA_ALIGN_LEFT, SKIA_ALIGN_RIGHT or SKIA_ALIGN_CENTRE. `color`: 0xAARRGGBB. `size`:
   /// pixels; 0 is 70. With a null title there is none, and the other arguments are not used.
@@ -38,6 +38,7 @@ class MW_API DialogNew : public PromptDialog {
 
   using Widget::onPressKey;
   using Widget::setRect;
+  /// A part of onRecvEvent(); see Widget::onHover().
   void onPressKey(kbd_event key);
   /// What the constructors do first: no title, lines, buttons or callbacks. The layout stays.
   void DialogNew_init();
@@ -61,7 +62,7 @@ class MW_API DialogNew : public PromptDialog {
   /// What stands below the lines. A derived class that sets another number leaves that row empty,
   /// and with kHookMode gets the hook key.
   enum ButtonMode { kOneButton = 0, kTwoButtons = 1, kProgressRow = 3, kNoButtons = 4 };
-  static constexpr int kNoLines = 4;
+  static constexpr int kNoLines = 4;  // in the place of the last line's number
 
   // All are guarded by stateLock.
   int buttonMode = kNoButtons;

@@ -25,8 +25,8 @@ namespace MW {
 /// after setButtonType(kHookVariant). Records are copies, valid for the call.
 class MW_API DialogSelect : public Widget {
  public:
-  static constexpr unsigned int kChoices = 6;
-  static constexpr int kHookVariant = 13;  ///< setButtonType(): the hook key answers
+  static constexpr unsigned int kChoices = 6;  ///< buttons of a dialog
+  static constexpr int kHookVariant = 13;      ///< setButtonType(): the hook key answers
 
   /// `kind` has no meaning here: a derived class finds it in `selectKind`.
   explicit DialogSelect(unsigned int kind);
@@ -60,6 +60,7 @@ class MW_API DialogSelect : public Widget {
   void onBtnReleased(mouse_event mouse, int index);
   /// In variant kHookVariant the hook key goes to onHookKeyPressed(); otherwise it is ignored.
   void onPressKey(kbd_event key);
+  /// Parts of onRecvEvent(); see Widget::onHover().
   void onReleaseKey(kbd_event key) const;
   void onHookKeyPressed();
 
@@ -68,6 +69,7 @@ class MW_API DialogSelect : public Widget {
 
   /// The answer: the release, its `state` the number of the choice, 1 to 6 row by row.
   void (*choiceCallback)(mouse_event*) = nullptr;
+  /// Every key but a press of the hook key.
   void (*keyPressCallback)(kbd_event*) = nullptr;
   void (*keyReleaseCallback)(kbd_event*) = nullptr;
   /// Every touch, at any place.
@@ -75,14 +77,15 @@ class MW_API DialogSelect : public Widget {
   void (*touchReleaseCallback)(mouse_event*) = nullptr;
 
  protected:
+  /// A button of the dialog.
   struct Choice {
-    SKIA_Rect face = {};
-    SKIA_Text caption = {};
+    SKIA_Rect face = {};     // its place, in the colour it has now
+    SKIA_Text caption = {};  // what it says
   };
 
-  unsigned int selectKind;
-  unsigned int optionColor = kColorWhite;
-  std::atomic<int> enabled = 1;
+  unsigned int selectKind;                 // as constructed
+  unsigned int optionColor = kColorWhite;  // of a button that is not pressed
+  std::atomic<int> enabled = 1;            // 0: touches choose nothing
   // Guarded by stateLock.
   SKIA_Rect border = {};  // the visible panel
   SKIA_Rect backdrop = {};

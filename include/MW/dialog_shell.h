@@ -15,8 +15,8 @@ namespace MW {
 /// and the button answers any finger that lifts on it.
 class MW_API DialogShell : public FramedDialog {
  public:
-  static constexpr int kLines = 25;
-  static constexpr int kNoLine = -1;
+  static constexpr int kLines = 25;   ///< the most that it shows
+  static constexpr int kNoLine = -1;  ///< in the place of a line's number
 
   /// At most 127 bytes of the title are taken. Null is the empty text.
   explicit DialogShell(const char* title);

@@ -21,6 +21,7 @@ namespace MW {
 /// so is one of more than 127 bytes.
 class MW_API DialogSlide : public Widget {
  public:
+  /// What it asks.
   enum Kind {
     kOwnTexts = 0,         ///< the setters give the texts; so is any number without a name
     kRepeatPassedTest = 3  ///< asks whether a passed test is to be repeated; 4 and 5 say the same
@@ -52,15 +53,18 @@ class MW_API DialogSlide : public Widget {
   void setRect_init(int dialogKind);
   /// Puts the thumb back to the middle, for any kind.
   void setRect(int dialogKind);
+  /// Replaces the title; the message.
   void setTitle(const char* newTitle);
   void setDesc(const char* newMessage);
   /// A second message, which no kind draws.
   void setDesc2(const char* newMessage);
+  /// The captions at the ends.
   void setLeft(const char* caption);
   void setRight(const char* caption);
   /// The thumb's caption, and its width in pixels from the next time that it goes back to the
   /// middle; 0 keeps the width.
   void setSlide(const char* caption, int width);
+  /// Parts of onRecvEvent(); see Widget::onHover().
   void onSlidePressed(mouse_event mouse);
   void onSlideHover(mouse_event mouse);
   void onSlideReleased(mouse_event mouse);
@@ -82,7 +86,7 @@ class MW_API DialogSlide : public Widget {
   /// What `slideState` says.
   enum SlideState { kBetween = 0, kAtLeft = 1, kAtRight = 2 };
 
-  int kind;
+  int kind;  // as constructed
   // Guarded by stateLock, except for lcdOnFlag.
   DialogFrame frame;
   SKIA_Rect messageRect = {};

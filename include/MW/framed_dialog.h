@@ -42,6 +42,9 @@ class MW_API FramedDialog : public Widget {
 
   using Widget::onPressKey;
   using Widget::onReleaseKey;
+
+  // Parts of onRecvEvent(); see Widget::onHover().
+
   void onBtn1Pressed(mouse_event mouse);
   void onBtn2Pressed(mouse_event mouse);
   void onBtn1Released(mouse_event mouse);

@@ -63,6 +63,7 @@ class MW_API Ime : public TextPanel {
   /// "enter". Only kSmall takes the grey away. Another number: nothing. Presses are read as before:
   /// a keyboard of digits alone needs presskey_set(kOnlyDigits), too.
   void keyboard_change(unsigned int type);
+  /// Whether "fold" was typed since this was last set to false.
   bool get_fold_status();
   void set_fold_status(bool folded);
 
@@ -75,6 +76,8 @@ class MW_API Ime : public TextPanel {
   void onPressKey_only_num(event_data* event);
   /// Writes a log line.
   void onHover(mouse_event mouse);
+
+  // TextPanel and the class comment say when they are called.
 
   void (*press_cb)(int zero, Ime* keyboard) = nullptr;
   void (*release_cb)(int zero, Ime* keyboard) = nullptr;

@@ -47,6 +47,9 @@ class MW_API Key : public Widget {
   using Widget::onPressKey;
   using Widget::onPressLong;
   using Widget::onReleaseKey;
+
+  // Parts of onRecvEvent(); see Widget::onHover().
+
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key);
   void onPressLong(mouse_event mouse);

@@ -27,11 +27,11 @@ class RowColumn;
 /// Assign them before the list becomes active.
 class MW_API MainList : public RowList {
  public:
-  static constexpr int kItems = 64;
-  static constexpr int kOptions = 8;
-  static constexpr int kNotMoved = -100;
+  static constexpr int kItems = 64;         ///< the most that a list has
+  static constexpr int kOptions = 8;        ///< status texts
+  static constexpr int kNotMoved = -100;    ///< in the place of an item's number
   static constexpr int kTitleHeight = 340;  ///< pixels, of the title bar: the list begins below it
-  static constexpr int kExtendedTitleHeight = 510;
+  static constexpr int kExtendedTitleHeight = 510;  ///< the same with kExtended
 
   /// What stands in the title bar.
   enum Mode {
@@ -106,7 +106,9 @@ class MW_API MainList : public RowList {
   /// there, and the length alone says where the text ends. To empty an item give ("", 1). Null, or
   /// any other length: nothing.
   void setText(int item, const char* newText, unsigned int length);
+  /// Of its text.
   void setFontSize(int item, int pixels);
+  /// Colours are 0xAARRGGBB.
   void setTextColor(int item, unsigned int color);
   void setBGColor(int item, unsigned int color);
   /// Changes what the item is, not its colours.
@@ -140,22 +142,27 @@ class MW_API MainList : public RowList {
 
   /// A selectable item was pressed and released. list->position2index(*event) says which.
   void (*clickCallback)(mouse_event* event, MainList* list) = nullptr;
+  /// Every key, pressed and released.
   void (*keyPressCallback)(kbd_event* event, MainList* list) = nullptr;
   void (*keyReleaseCallback)(kbd_event* event, MainList* list) = nullptr;
+  /// Every touch that is the list's. A release comes after the click.
   void (*pressCallback)(mouse_event* event, MainList* list) = nullptr;
   void (*releaseCallback)(mouse_event* event, MainList* list) = nullptr;
+  /// A motion has scrolled the list, or reached its end.
   void (*scrollCallback)(mouse_event* event, MainList* list) = nullptr;
 
  protected:
+  /// An item of the list.
   struct Item {
-    int kind = kEnd;
-    int height = 0;  // pixels
-    unsigned int bgColor = 0;
-    SKIA_Text text = {};
+    int kind = kEnd;           // an ItemKind
+    int height = 0;            // pixels
+    unsigned int bgColor = 0;  // 0xAARRGGBB
+    SKIA_Text text = {};       // what it says, in its colour
   };
+  /// A status text.
   struct Option {
-    SKIA_Rect rect = {};
-    SKIA_Text text = {};
+    SKIA_Rect rect = {};  // its place
+    SKIA_Text text = {};  // what it says
   };
 
   // Guarded by stateLock.

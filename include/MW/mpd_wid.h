@@ -13,14 +13,14 @@ class RowColumn;
 
 /// A line of a result text, taken apart. Texts are cut to 255 bytes at a whole character.
 struct MpdLine {
-  static constexpr int kFieldBytes = 256;
-  using Field = std::array<char, kFieldBytes>;
+  static constexpr int kFieldBytes = 256;       ///< of a text, its NUL included
+  using Field = std::array<char, kFieldBytes>;  ///< a text of the line
 
-  bool details;  // the next line has a higher level
-  int level;
-  Field head;
-  Field name;
-  Field value;
+  bool details;  ///< the next line has a higher level
+  int level;     ///< from 1
+  Field head;    ///< the line's first 18 bytes
+  Field name;    ///< of the result
+  Field value;   ///< of the result
 };
 static_assert(sizeof(MpdLine) == 776, "flag, level and three texts");
 
@@ -42,7 +42,7 @@ static_assert(sizeof(MpdLine) == 776, "flag, level and three texts");
 /// event may arrive as soon as the constructor has returned.
 class MW_API MpdWid : public RowList {
  public:
-  static constexpr int kItems = 64;
+  static constexpr int kItems = 64;  ///< the most rows that a list has
 
   /// What setListType() takes.
   enum ListType {
@@ -120,6 +120,8 @@ class MW_API MpdWid : public RowList {
   /// Scrolls back to where rows are.
   void onHover_temp();
 
+  // Parts of onRecvEvent(); see Widget::onHover().
+
   void onPressKey(kbd_event key);
   void onReleaseKey(kbd_event key);
   void onPress(mouse_event mouse);
@@ -149,22 +151,26 @@ class MW_API MpdWid : public RowList {
   /// -1. So a list with a row of kHitEnd is clicked wherever position2index() finds none of the
   /// rows before it; a list without one, never.
   void (*click_cb)(mouse_event* event, MpdWid* list) = nullptr;
+  /// Every key, pressed and released.
   void (*key_press_cb)(kbd_event* event, MpdWid* list) = nullptr;
   void (*key_release_cb)(kbd_event* event, MpdWid* list) = nullptr;
+  /// Every touch that is the list's. A release comes after the click.
   void (*press_cb)(mouse_event* event, MpdWid* list) = nullptr;
   void (*release_cb)(mouse_event* event, MpdWid* list) = nullptr;
   void (*hover_cb)(mouse_event* event, MpdWid* list) = nullptr;
 
  protected:
-  static constexpr int kCells = 5;
+  static constexpr int kCells = 5;  // of a row
 
+  /// A row of the list.
   struct Item {
-    int listType = kHitEnd;
-    int y = 0;       // pixels, by the last drawing
-    int height = 0;  // pixels
-    unsigned int color = 0;
-    int level = 0;
-    SKIA_Text marker = {};  // says whether it is expanded
+    int listType = kHitEnd;  // a ListType
+    int y = 0;               // pixels, by the last drawing
+    int height = 0;          // pixels
+    unsigned int color = 0;  // 0xAARRGGBB
+    int level = 0;           // from 1
+    // The cells, from the left; the marker says whether the row is expanded.
+    SKIA_Text marker = {};
     SKIA_Text levelText = {};
     SKIA_Text head = {};
     SKIA_Text name = {};

@@ -32,6 +32,7 @@ class MW_API TextPrimitive : public Widget {
   void setBgColor(unsigned int color) override;
 
  protected:
+  /// Copies both records. `primitiveType`: a PrimitiveType.
   TextPrimitive(int primitiveType, const SKIA_Rect* area, const SKIA_Text* caption);
 };
 
@@ -80,6 +81,7 @@ class MW_API Image : public Widget {
 /// A filled rectangle.
 class MW_API Box : public Widget {
  public:
+  /// Copies the record; its colour fills the box.
   explicit Box(const SKIA_Rect* area);
   /// Draws it. Returns the platform's handle of the item.
   int show() override;
@@ -93,6 +95,7 @@ class MW_API Box : public Widget {
 /// A straight line.
 class MW_API Line : public Widget {
  public:
+  /// Copies the record.
   explicit Line(const SKIA_Point* line);
   /// Draws it. Returns the platform's handle of the item.
   int show() override;

@@ -17,6 +17,7 @@ class MW_API PromptDialog : public FramedDialog {
   bool onRecvEvent(event_data* event, unsigned int arg) override;
   void onPlugKey(kbd_event key) override;
 
+  /// A part of onRecvEvent(): the hook key answers.
   void onHookKeyPressed();
   /// Draws the progress row in the place of button 1, whether the dialog is active or not: one to
   /// ten asterisks, one more every 100 ms. `ticks`: GetTicks() milliseconds. show() calls it where
@@ -27,11 +28,13 @@ class MW_API PromptDialog : public FramedDialog {
   /// The mode in which the hook key answers.
   static constexpr int kHookMode = 13;
 
+  /// See FramedDialog.
   explicit PromptDialog(const char* logWord);
 
   /// A key's press. The hook key answers if `mode` is kHookMode.
   void pressKey(const kbd_event& key, int mode);
-  void drawProgress(unsigned int ticks);  // under stateLock
+  /// As updateProgress(). Call it under stateLock.
+  void drawProgress(unsigned int ticks);
 
   StarRow progress;  // guarded by stateLock
 };

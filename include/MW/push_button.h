@@ -25,7 +25,7 @@ namespace MW {
 class MW_API PushButton : public ButtonFace {
  public:
   using Widget::show;
-  /// show(0), which draws unless a delayed show is pending. Returns 1.
+  /// show(0), but nothing while a delayed show is pending, due or not. Returns 1.
   int show() override;
   /// Raises the redraw flag once a delayed show is due.
   void updateTimer(unsigned int ticks) override;

@@ -41,16 +41,16 @@ enum KeyCode {
 struct mouse_event {
   uint32_t state;   ///< the platform's pointer state
   uint32_t finger;  ///< 0 for the first finger
-  int32_t x;
-  int32_t y;
-  int32_t xrel;  ///< motion since the finger's previous report; 0 except for kEventMotion
-  int32_t yrel;
+  int32_t x;        ///< from the left edge
+  int32_t y;        ///< from the top edge
+  int32_t xrel;     ///< motion since the finger's previous report; 0 except for kEventMotion
+  int32_t yrel;     ///< the same, downwards
 };
 
 /// A key, or the two words of a user event.
 struct kbd_event {
-  uint32_t state;
-  uint32_t code;  ///< enum BrimolKeyCode, or any other code of the platform
+  uint32_t state;  ///< the platform's key state
+  uint32_t code;   ///< enum BrimolKeyCode, or any other code of the platform
 };
 
 /// One event as widgets receive it.

@@ -33,6 +33,7 @@ class MW_API RowList : public Widget {
   bool takesTouch(const event_data& event, const SKIA_Rect& area, EventCode last) const;
   /// From here on the release of the finger that holds the list may be a click on `row`.
   void pressRow(int row);
+  // Log lines.
   void logKeyPress(const kbd_event& key) const;
   void logKeyRelease(const kbd_event& key) const;
   void logHit(int64_t top, const mouse_event& mouse, int64_t bottom) const;

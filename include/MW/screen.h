@@ -49,7 +49,7 @@ class MW_API Screen : public Widget {
 
  protected:
   int screenW = 0;  // pixels
-  int screenH = 0;
+  int screenH = 0;  // pixels
   // `clicks` and `rect` (the square) are used on the dispatch thread only.
   DoubleTap clicks;
 };
@@ -64,6 +64,7 @@ class MW_API FullScreen : public Widget {
   /// What it is filled with; any other number is grey as well.
   enum Fill { kWhite = 0, kRed = 1, kGreen = 2, kBlue = 3, kGrey = 4 };
 
+  /// `color`: a Fill.
   explicit FullScreen(int color);
   ~FullScreen() override;
 
@@ -79,9 +80,9 @@ class MW_API FullScreen : public Widget {
   void setRect(int color);
 
  protected:
-  int colorIndex;
-  int screenW = 0;  // pixels
-  int screenH = 0;
+  int colorIndex;                 // as constructed
+  int screenW = 0;                // pixels
+  int screenH = 0;                // pixels
   SKIA_Rect fillRect = {};        // guarded by stateLock
   std::atomic<int> lcdState = 1;  // 1: the panel is on
 };

@@ -54,6 +54,7 @@ class MW_API Slide : public Widget {
   using Widget::onTouchClickCount;
   /// Drags the knob by the event's relative motion.
   void onHover(mouse_event mouse);
+  /// A part of onRecvEvent(): a tap on the knob ended, which may be the second of two.
   void onTouchClickCount(mouse_event mouse);
 
   /// A State. Dragging changes it on the dispatch thread, where a callback may read it plainly.
@@ -63,14 +64,15 @@ class MW_API Slide : public Widget {
  protected:
   /// What the two classes of switches differ in.
   enum class Look { Legends, Plain };
+  /// As the public constructor.
   Slide(Look switchLook, int startState, const SKIA_Rect* area, const SKIA_Text* first,
         const SKIA_Text* second);
 
-  Look look;
-  std::atomic<int> locked = 0;
-  KnobHold knobHold{hold, ownerFinger};
-  DoubleTap clicks;  // dispatch thread
-  int captionCount;  // 1 or 2
+  Look look;                             // of the class
+  std::atomic<int> locked = 0;           // 1: locked
+  KnobHold knobHold{hold, ownerFinger};  // dispatch thread
+  DoubleTap clicks;                      // dispatch thread
+  int captionCount;                      // 1 or 2
   // The rest, and `rect`, the knob, is guarded by stateLock.
   int unit = 0;  // pixels, a fifth of the width
   SKIA_Rect track = {};
@@ -93,6 +95,7 @@ class MW_API Slide : public Widget {
 /// The same without legends, and with a knob that covers the whole area at the left.
 class MW_API SlideV : public Slide {
  public:
+  /// As Slide.
   SlideV(int startState, const SKIA_Rect* area, const SKIA_Text* first, const SKIA_Text* second);
   ~SlideV() override;
 };

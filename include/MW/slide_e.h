@@ -43,6 +43,7 @@ class MW_API SlideE : public Widget {
   using Widget::onHover;
   using Widget::onPress;
   using Widget::onRelease;
+  /// Parts of onRecvEvent(); see Widget::onHover().
   void onPress(mouse_event mouse);
   void onRelease(mouse_event mouse);
   /// Drags the knob by the event's relative motion.
@@ -57,7 +58,7 @@ class MW_API SlideE : public Widget {
   int state;
 
  protected:
-  KnobHold knobHold{hold, ownerFinger};
+  KnobHold knobHold{hold, ownerFinger};  // dispatch thread
   // The rest, `rect`, the knob, and `point`, its arrow, is guarded by stateLock.
   int unit = 0;  // pixels, the knob's side
   SKIA_Rect track = {};

@@ -49,6 +49,7 @@ class MW_API SlideMove : public Widget {
   /// Lays the fill out up to that rectangle's left edge, and the knob's frame there. It draws
   /// nothing, and the next drawing pass lays both out by the knob again. Null: no change.
   void setRect_Slide(const SKIA_Rect* knob);
+  /// The value that the knob shows.
   int getValue() const;
   /// Sets the value without clamping it (read as an int) and moves the knob there: off the bar if
   /// out of range, to its left end if the knob has no room to move.
@@ -61,9 +62,10 @@ class MW_API SlideMove : public Widget {
   int setValue2Move(unsigned int ofValue);
 
  protected:
-  std::atomic<int> locked = 0;
-  KnobHold knobHold{hold, ownerFinger};
-  int minValue;  // these four never change after construction
+  std::atomic<int> locked = 0;           // 1: locked
+  KnobHold knobHold{hold, ownerFinger};  // dispatch thread
+  // These four never change after construction.
+  int minValue;
   int maxValue;
   int knobPercent;
   int showValue;  // 1: the value stands on the knob

@@ -79,13 +79,15 @@ class MW_API StaticText : public TextPanel {
   /// line.
   int find_real_num(int real);
 
+  // TextPanel says when they are called.
+
   void (*press_cb)(int zero) = nullptr;
   void (*release_cb)(int zero) = nullptr;
   void (*long_press_cb)(int zero) = nullptr;
   void (*double_tap_cb)(int zero) = nullptr;
 
  protected:
-  static constexpr int kInfoBytes = 100;
+  static constexpr int kInfoBytes = 100;  // of `info_type`
 
   // Set before the first event.
   bool is_line_num = false;

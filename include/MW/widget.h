@@ -35,6 +35,7 @@ inline constexpr int kUnused = 0;
 /// its destructor, so that no other thread meets a half-destroyed object.
 class MW_API Widget {
  public:
+  /// Inactive and in no layer.
   Widget();
   Widget(const Widget&) = delete;
   Widget& operator=(const Widget&) = delete;
@@ -67,18 +68,21 @@ class MW_API Widget {
   /// The widget's text, in its own record: valid while the widget lives. Read it on the thread
   /// that sets it.
   virtual char* getText();
+  /// Colours are 0xAARRGGBB.
   virtual unsigned int getBgColor();
   virtual unsigned int getTextColor();
+  /// In pixels.
   virtual int getFontSize();
   /// The widget's own rectangle record; as for getText().
   virtual SKIA_Rect* getPositionAndSize();
+  /// Of the widget's text.
   virtual void setFontSize(int pixels);
   /// Texts are copied, and cut to 127 bytes at a whole character. Null is the empty text.
   virtual void setText(const char* newText);
   /// enum SKIA_Align.
   virtual void setTextAlign(int align);
+  /// Colours are 0xAARRGGBB: of the text, background, border and line.
   virtual void setTextColor(unsigned int color);
-  /// Background, border and line.
   virtual void setBgColor(unsigned int color);
   virtual void setBdColor(unsigned int color);
   virtual void setLnColor(unsigned int color);
@@ -214,21 +218,21 @@ class MW_API Widget {
   /// Held for a few instructions and drawing calls, never while a callback runs.
   mutable std::mutex stateLock;
 
-  int type_ = 0;
-  int blink = 0;
-  SKIA_Rect rect = {};
-  SKIA_Text text = {};
-  SKIA_Point point = {};
-  std::atomic<int> buttonType = 0;
-  std::atomic<int> id_ = 0;          // Window writes it under the layer lock
-  std::atomic<bool> active = false;  // publishes to a walk what was set before
-  std::atomic<int> select = 0;
-  std::atomic<int> ownerFinger = -1;
-  FingerHold hold{select};
-  unsigned int blinkColor = 0;
-  unsigned int blinkNext = 0;   // GetTicks() milliseconds, 0: not started
-  unsigned int blinkCount = 0;  // toggles so far
-  int keyDir = kNoSide;         // last key selection
+  int type_ = 0;                      // what setType() was given
+  int blink = 0;                      // 1: it blinks
+  SKIA_Rect rect = {};                // its place and colour
+  SKIA_Text text = {};                // its caption
+  SKIA_Point point = {};              // its line or arrow
+  std::atomic<int> buttonType = 0;    // what setButtonType() was given
+  std::atomic<int> id_ = 0;           // Window writes it under the layer lock
+  std::atomic<bool> active = false;   // publishes to a walk what was set before
+  std::atomic<int> select = 0;        // 0, or what setSelect() was given
+  std::atomic<int> ownerFinger = -1;  // what setOwnerFinger() was given
+  FingerHold hold{select};            // which finger holds it
+  unsigned int blinkColor = 0;        // 0xAARRGGBB
+  unsigned int blinkNext = 0;         // GetTicks() milliseconds, 0: not started
+  unsigned int blinkCount = 0;        // toggles so far
+  int keyDir = kNoSide;               // last key selection
 
  private:
   friend class Layers;

@@ -13,7 +13,7 @@ namespace MW {
 /// operations that draw or change items return 0 and do nothing.
 class MW_API WidgetList {
  public:
-  static constexpr int kSlots = 128;
+  static constexpr int kSlots = 128;  ///< of the table
   /// Result codes.
   static constexpr int kFull = -100;
   static constexpr int kIndexesUsedUp = -101;
@@ -21,6 +21,7 @@ class MW_API WidgetList {
   static constexpr int kNotFound = -104;
   static constexpr int kNotInitialised = -1024;
 
+  /// A place in the table.
   struct Slot {
     int index;        ///< 0: free
     int shown;        ///< 1: drawn by show()
@@ -62,8 +63,10 @@ class MW_API WidgetList {
   /// The first `len` bytes of `s`, NULs among them, cut to 127 bytes at a whole character. Null `s`
   /// is the empty text; `len` 0 changes nothing.
   static int setText(int index, const char* s, unsigned int len);
+  /// Of its text, its box and its line, 0xAARRGGBB.
   static int setColor(int index, unsigned int textColor, unsigned int fillColor,
                       unsigned int lineColor);
+  /// Its place and colour; the size of its text in pixels.
   static int setRect(int index, SKIA_Rect newRect);
   static int setFontSize(int index, int pixels);
 

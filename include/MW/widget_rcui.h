@@ -38,13 +38,13 @@ enum RcuiKind {
 struct ref_t {
   int32_t index = 0;  ///< kinds 0 to 9: the index in the display-item table; the toolkit writes it
   int32_t kind = 0;   ///< RcuiKind
-  int32_t unread8 = 0;
-  int32_t dialogKind = 0;  ///< of kRcuiDialog
-  uint8_t unread16 = 0;
-  uint8_t visible = 0;  ///< not 0: stands in the column, or the widget is active
-  uint8_t unread18 = 0;
-  uint8_t cbIndex = 0;  ///< not 0: the widget gets the callbacks
-  int32_t unread20 = 0;
+  int32_t unread8 = 0;       ///< not read
+  int32_t dialogKind = 0;    ///< of kRcuiDialog
+  uint8_t unread16 = 0;      ///< not read
+  uint8_t visible = 0;       ///< not 0: stands in the column, or the widget is active
+  uint8_t unread18 = 0;      ///< not read
+  uint8_t cbIndex = 0;       ///< not 0: the widget gets the callbacks
+  int32_t unread20 = 0;      ///< not read
   SKIA_Rect rect = {};       ///< of a line: x1, y1, x2, y2 and the colour
   int32_t lineWidth = 0;     ///< pixels
   int32_t unread48[3] = {};  // NOLINT(modernize-avoid-c-arrays): a record's words
@@ -73,12 +73,12 @@ struct ref_cb_t {
   Callback cbRight = {};         ///< rightCallback, button2Callback, callbackWord18
   Callback cbKeyPress = {};      ///< keyPressCallback
   Callback cbKeyRelease = {};    ///< keyReleaseCallback
-  Callback unread9 = {};
-  Callback cbDoubleKey = {};  ///< doubleKeyCallback
-  Callback cbTripleKey = {};  ///< tripleKeyCallback
-  Callback cbExtra = {};      ///< hookKeyCallback
-  Callback cbPlug = {};       ///< plugCallback
-  Callback cbHover = {};      ///< hoverCallback
+  Callback unread9 = {};         ///< not read
+  Callback cbDoubleKey = {};     ///< doubleKeyCallback
+  Callback cbTripleKey = {};     ///< tripleKeyCallback
+  Callback cbExtra = {};         ///< hookKeyCallback
+  Callback cbPlug = {};          ///< plugCallback
+  Callback cbHover = {};         ///< hoverCallback
 };
 static_assert(sizeof(ref_cb_t) == 15 * sizeof(Callback));
 static_assert(offsetof(ref_cb_t, cbTouchRelease) == 5 * sizeof(Callback));
@@ -118,7 +118,7 @@ class MW_API WidgetRcui : public Widget {
   Widget* getPointer() const;
 
  protected:
-  std::unique_ptr<Widget> w;
+  std::unique_ptr<Widget> w;  // what was built
 };
 
 }  // namespace MW

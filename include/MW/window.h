@@ -74,6 +74,7 @@ class MW_API Window {
 
   /// Logs an event of codes 0 to 5 and returns 1; 0 for any other.
   static int onRecvEvent(event_data* event, unsigned int arg);
+  // Each logs a line.
   static void onHover();
   static void onPress();
   static void onRelease();

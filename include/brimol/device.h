@@ -13,9 +13,9 @@ typedef struct BrimolDevice {
   const char* name;  /* its class of resolution and its diagonal in inches: "wvga-4.0" */
   const char* title; /* a few words for people */
   int width;         /* pixels */
-  int height;
-  float density; /* dots per inch, across and down */
-  int year;      /* when such screens were common */
+  int height;        /* pixels */
+  float density;     /* dots per inch, across and down */
+  int year;          /* when such screens were common */
 } BrimolDevice;
 
 /* All profiles, oldest first, as an array that lasts as long as the process. Stores how many there

@@ -40,43 +40,43 @@ enum BrimolKeyCode {
 
 /* Types 4, 5, 6 and 18. Positions are in screen pixels. */
 typedef struct BrimolPointerEvent {
-  uint8_t type;
-  uint8_t reserved;
-  uint8_t finger; /* 0 for the first finger */
-  uint8_t state;
-  uint16_t x;
-  uint16_t y;
-  int16_t xrel; /* motion since the finger's previous record; type 4 only */
-  int16_t yrel;
+  uint8_t type;     /* enum BrimolEventType */
+  uint8_t reserved; /* not read */
+  uint8_t finger;   /* 0 for the first finger */
+  uint8_t state;    /* handed on to the application */
+  uint16_t x;       /* from the left edge */
+  uint16_t y;       /* from the top edge */
+  int16_t xrel;     /* motion since the finger's previous record; type 4 only */
+  int16_t yrel;     /* the same, downwards */
 } BrimolPointerEvent;
 
 /* Types 2 and 3. */
 typedef struct BrimolKeyEvent {
-  uint8_t type;
-  uint8_t reserved;
-  uint8_t state;
-  uint8_t reserved2;
-  uint32_t reserved3;
-  uint32_t code;
+  uint8_t type;       /* enum BrimolEventType */
+  uint8_t reserved;   /* not read */
+  uint8_t state;      /* handed on to the application */
+  uint8_t reserved2;  /* not read */
+  uint32_t reserved3; /* not read */
+  uint32_t code;      /* enum BrimolKeyCode, or another */
 } BrimolKeyEvent;
 
 /* Type 24: two words whose meaning the sender and the receiver agree on. */
 typedef struct BrimolUserEvent {
-  uint8_t type;
-  uint8_t reserved[3];
-  uint32_t word1;
-  uint32_t word2;
+  uint8_t type;        /* enum BrimolEventType */
+  uint8_t reserved[3]; /* not read */
+  uint32_t word1;      /* a widget gets it as the second word, its key's code */
+  uint32_t word2;      /* a widget gets it as the first word, its key's state */
 } BrimolUserEvent;
 
-enum { BRIMOL_EVENT_BYTES = 64 };
+enum { BRIMOL_EVENT_BYTES = 64 }; /* what an input record holds */
 
 /* One input record. The toolkit reads its first 12 bytes, a platform may use those behind them. */
 typedef union Event {
-  uint8_t type; /* enum BrimolEventType; every form begins with it */
-  BrimolPointerEvent pointer;
-  BrimolKeyEvent key;
-  BrimolUserEvent user;
-  uint8_t bytes[BRIMOL_EVENT_BYTES];
+  uint8_t type;                      /* enum BrimolEventType; every form begins with it */
+  BrimolPointerEvent pointer;        /* types 4, 5, 6 and 18 */
+  BrimolKeyEvent key;                /* types 2 and 3 */
+  BrimolUserEvent user;              /* type 24 */
+  uint8_t bytes[BRIMOL_EVENT_BYTES]; /* all of it */
 } Event;
 
 BRIMOL_STATIC_ASSERT(sizeof(BrimolPointerEvent) == 12 && offsetof(BrimolPointerEvent, type) == 0 &&

@@ -20,24 +20,24 @@ extern "C" {
 
 /* A rectangle in pixels. A point is inside when x <= px < x + w and y <= py < y + h. */
 typedef struct SKIA_Rect {
-  int32_t x;
-  int32_t y;
-  int32_t w;
-  int32_t h;
+  int32_t x;      /* left edge */
+  int32_t y;      /* top edge */
+  int32_t w;      /* width */
+  int32_t h;      /* height */
   uint32_t color; /* 0xAARRGGBB, the fill where the rectangle is drawn as a box */
 } SKIA_Rect;
 
 /* A line between two points, in pixels. */
 typedef struct SKIA_Point {
-  int32_t x1;
-  int32_t y1;
-  int32_t x2;
-  int32_t y2;
+  int32_t x1;     /* one end */
+  int32_t y1;     /* the same */
+  int32_t x2;     /* the other end */
+  int32_t y2;     /* the same */
   uint32_t color; /* 0xAARRGGBB */
   int32_t width;  /* thickness in pixels; of an arrow its direction */
 } SKIA_Point;
 
-enum { SKIA_TEXT_BYTES = 128 };
+enum { SKIA_TEXT_BYTES = 128 }; /* what a text record holds, its NUL included */
 
 /* Where a text stands in its rectangle; any other code means left. */
 enum SKIA_Align { SKIA_ALIGN_LEFT = 1, SKIA_ALIGN_RIGHT = 2, SKIA_ALIGN_CENTRE = 5 };
@@ -47,11 +47,11 @@ enum SKIA_ArrowDirection { SKIA_ARROW_RIGHT = 0, SKIA_ARROW_LEFT = 1 };
 
 /* A text of at most 127 bytes of UTF-8 and a NUL. */
 typedef struct SKIA_Text {
-  char text[SKIA_TEXT_BYTES];
-  int32_t string_len; /* bytes of `text` that are drawn */
-  uint32_t color;     /* 0xAARRGGBB */
-  int32_t align;      /* enum SKIA_Align */
-  int32_t size;       /* font size in pixels */
+  char text[SKIA_TEXT_BYTES]; /* the characters */
+  int32_t string_len;         /* bytes of `text` that are drawn */
+  uint32_t color;             /* 0xAARRGGBB */
+  int32_t align;              /* enum SKIA_Align */
+  int32_t size;               /* font size in pixels */
 } SKIA_Text;
 
 /* What an item record shows; each kind names the drawing call that adds the same picture. */
@@ -71,10 +71,10 @@ enum SKIA_ItemKind {
 
 /* A whole display item: its kind and the records that this kind reads. */
 typedef struct SKIA_Item {
-  int32_t kind; /* enum SKIA_ItemKind */
-  SKIA_Rect rect;
-  SKIA_Point point;
-  SKIA_Text text;
+  int32_t kind;     /* enum SKIA_ItemKind */
+  SKIA_Rect rect;   /* of all kinds but SKIA_LINE */
+  SKIA_Point point; /* of SKIA_LINE and SKIA_ARROW */
+  SKIA_Text text;   /* of the kinds that show a text or a picture */
 } SKIA_Item;
 
 /* Other languages and the platform rely on these layouts. */
@@ -97,15 +97,19 @@ BRIMOL_STATIC_ASSERT(sizeof(SKIA_Item) == 192 && offsetof(SKIA_Item, kind) == 0 
                          offsetof(SKIA_Item, text) == 48,
                      "SKIA_Item");
 
+/* A rectangle of its colour; with round corners. */
 int skia_add_box_c(SKIA_Rect rect);
 int skia_add_roundbox_c(SKIA_Rect rect);
-int skia_add_line_c(SKIA_Point line);
+int skia_add_line_c(SKIA_Point line); /* a straight line */
+/* A text in a rectangle that is not drawn. */
 int skia_add_label_c(SKIA_Rect rect, SKIA_Text text);
+/* A text on a rectangle of its colour; with round corners. */
 int skia_add_textbox_c(SKIA_Rect rect, SKIA_Text text);
 int skia_add_roundtextbox_c(SKIA_Rect rect, SKIA_Text text);
+/* A button's face with its caption; with round corners. */
 int skia_add_buttonbox_c(SKIA_Rect rect, SKIA_Text text);
 int skia_add_roundbuttonbox_c(SKIA_Rect rect, SKIA_Text text);
-int skia_add_staticbox_c(SKIA_Rect rect, SKIA_Text text);
+int skia_add_staticbox_c(SKIA_Rect rect, SKIA_Text text); /* a text on a box that is no button */
 /* An arrow within the rectangle, in the point record's colour. The record's `width` says where it
  * points: enum SKIA_ArrowDirection. */
 int skia_add_arrow_c(SKIA_Rect rect, SKIA_Point direction);

@@ -153,10 +153,7 @@ void Ime::onRelease(event_data* event) {
   const LifeGuard self(this);
   const TextTouch what = takeRelease(event);
   tell(what);
-  if (what == TextTouch::Release && self.isAlive() && double_tap_cb != nullptr &&
-      gesture.isTapAwaited()) {
-    onTouchClickCount();
-  }
+  if (self.isAlive() && double_tap_cb != nullptr && gesture.isTapDue(what)) onTouchClickCount();
   kLog.print(LogLevel::Debug, "released!!");
 }
 

@@ -22,9 +22,15 @@ void TextPanel::takeLooks(const SKIA_Rect* area, const SKIA_Text* looks) {
 
 int TextPanel::show() { return show(0); }
 
-// The time is never taken back, so that every later pass asks, too.
+// The time is never taken back, so that every later pass asks, too. Once reached it goes along with
+// the clock, or half a turn of that later it would lie ahead again.
 void TextPanel::updateTimer(unsigned int ticks) {
-  if (read(showTimer).isDue(ticks)) isDisplayUpdate_c(1);
+  {
+    const std::lock_guard guard(stateLock);
+    if (!showTimer.isDue(ticks)) return;
+    showTimer.start(ticks, 0);
+  }
+  isDisplayUpdate_c(1);
 }
 
 int TextPanel::hide() {

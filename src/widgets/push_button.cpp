@@ -8,7 +8,8 @@
 
 namespace MW {
 
-int PushButton::show() { return show(0); }
+// 0 is no time here: half of the clock's times are earlier.
+int PushButton::show() { return read(delayedShow).isPending() ? 1 : show(0); }
 
 void PushButton::updateTimer(unsigned int ticks) {
   if (read(delayedShow).isDue(ticks)) isDisplayUpdate_c(1);

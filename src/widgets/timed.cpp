@@ -1,7 +1,10 @@
 #include <MW/c_api.h>
+#include <MW/detail/clock_order.h>
 #include <MW/timed.h>
 #include <MW/window.h>
 #include <brimol/input.h>
+
+#include <algorithm>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
@@ -45,7 +48,7 @@ void Toastbox::init(const SKIA_Rect* area, const SKIA_Text* line, const SKIA_Tex
 
 int Toastbox::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
-  if (hideAt < ticks) {
+  if (hideAt == 0 || isLater(ticks, hideAt)) {
     hideAt = 0;
     setActive(0);
     return 1;
@@ -62,7 +65,7 @@ int Toastbox::show(unsigned int ticks) {
 
 void Toastbox::updateTimer(unsigned int ticks) {
   const unsigned int end = read(hideAt);
-  if (end != 0 && ticks > end) isDisplayUpdate_c(1);
+  if (end != 0 && isLater(ticks, end)) isDisplayUpdate_c(1);
 }
 
 void Toastbox::setText(const char* newText) {
@@ -80,7 +83,8 @@ void Toastbox::onHideTimer(int ms) {
   {
     // Together, so that a drawing pass that ends the time before does not end this one.
     const std::lock_guard guard(stateLock);
-    hideAt = GetTicks() + static_cast<unsigned int>(ms);
+    // An end at 0, which stands for none, comes a millisecond later.
+    hideAt = std::max(GetTicks() + static_cast<unsigned int>(ms), 1U);
     setActive(1);
   }
   askForRedraw();
@@ -114,7 +118,7 @@ Progressbar::~Progressbar() { leaveWindow(); }
 int Progressbar::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
   if (running == 0) return 1;
-  if (endAt < ticks) {
+  if (isLater(ticks, endAt)) {
     setActive(0);
     endAt = 0;
     running = 0;
@@ -132,7 +136,7 @@ int Progressbar::show(unsigned int ticks) {
 void Progressbar::updateTimer(unsigned int ticks) {
   const bool changes = [&] {
     const std::lock_guard guard(stateLock);
-    return running != 0 && (ticks > endAt || stars.isDue(ticks));
+    return running != 0 && (isLater(ticks, endAt) || stars.isDue(ticks));
   }();
   if (changes) isDisplayUpdate_c(1);
 }

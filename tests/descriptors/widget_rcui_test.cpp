@@ -5,7 +5,7 @@
 #include <bit>
 
 #include "support/widget_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace {
 

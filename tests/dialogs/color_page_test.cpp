@@ -19,17 +19,14 @@ std::unique_ptr<MW::Widget> warning() {
 }
 
 const PlaysOn kWarning = {warning};
-const auto kPlays = std::to_array<Play>({
+const PlayTests kPlays = {
     kWarning("TouchesAreToldAndPassedOn",
              {press(1, 1), drag(1, 0), release(), longPress(1, 1), lcdOn(0), press()},
              "touch- - lift- - touch-"),
     kWarning("KeysAreTakenAndCounted",
              {keyDown(323), keyUp(5), keyUp(5), keyUp(5), keyUp(6), plug(7), appEvent(1)},
              "down323+ up5+ twice5 up5+ thrice5 up5+ up6+ - -"),
-});
-using ColorPagePlays = PlayTest;
-TEST_P(ColorPagePlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, ColorPagePlays, testing::ValuesIn(kPlays), kRowName);
+};
 
 TEST_F(ColorPageTest, TakesTextsThatFitItsFourBoxes) {
   MW::DialogWarn page(MW::kColorRed);

@@ -10,7 +10,7 @@ using DialogListTest = WidgetTest;
 
 const PlaysOn kList = {threeRows};
 const PlaysOn kWithoutCancel = {without(&MW::Widget::button1Callback, threeRows)};
-const auto kPlays = std::to_array<Play>({
+const PlayTests kPlays = {
     kList(
         "CancelMarksTheConfirmedRowAndOkConfirmsTheMarkedOne",
         {press(172, 1384), release(), press(154, 1514), release(), lookAtLog(), press(172, 1384),
@@ -36,10 +36,7 @@ const auto kPlays = std::to_array<Play>({
     kList("InTheDarkNothingAnswers",
           {lcdOn(0), press(172, 1384), release(), lcdOn(1), press(), lcdOn(0), drag(1, 0)},
           "press- click+ press r2+ hover-"),
-});
-using DialogListPlays = PlayTest;
-TEST_P(DialogListPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, DialogListPlays, testing::ValuesIn(kPlays), kRowName);
+};
 
 TEST_F(DialogListTest, RefusesRowsThatAreTooLongTooManyOrLate) {
   DialogList dialog(nullptr);

@@ -9,16 +9,13 @@ using MW::DialogNew;
 using DialogNewTest = WidgetTest;
 
 const PlaysOn kDialog = {makes<DialogNew>("Title", 5, 7)};
-const auto kPlays = std::to_array<Play>({
+const PlayTests kPlays = {
     kDialog("AProgressRowAnswersNoTouch",
             {call(&MW::Widget::setbutton, "1", "2"), press(722, 1400), release(), lookAtLog(),
              call<DialogNew>(&DialogNew::setProgress, 0U), press(), release()},
             "press+ button2 click+ <[DIALOGNEW] btn2 released!!> press- click+"),
     kDialog("OnlyTheHookKeyIsIgnored", {keyDown(323), keyDown(5), keyUp(323)}, "+ down5+ up323+"),
-});
-using DialogNewPlays = PlayTest;
-TEST_P(DialogNewPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, DialogNewPlays, testing::ValuesIn(kPlays), kRowName);
+};
 
 TEST_F(DialogNewTest, TextsEndAtTheFirstNull) {
   DialogNew dialog(kTooLong.c_str(), 5, 7);

@@ -4,7 +4,7 @@
 #include <MW/dialog_list.h>
 
 #include "support/play_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace brimol::test {
 

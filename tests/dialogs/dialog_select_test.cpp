@@ -19,7 +19,7 @@ std::unique_ptr<MW::Widget> choices() {
 Step select(int value) { return call(&MW::Widget::setSelect, value); }
 
 const PlaysOn kChoices = {choices};
-const auto kPlays = std::to_array<Play>({
+const PlayTests kPlays = {
     kChoices("TheFirstChoiceAnswers",
              {press(288, 624), lookAtHold(), lookAtFaces(), release(), lookAtLog(), lookAtFaces()},
              "touch+ <held 1> <lit 1> choice1 lift- <[BUTTON] onBtnReleased!! 0 > <lit 0>"),
@@ -42,9 +42,6 @@ const auto kPlays = std::to_array<Play>({
              {keyDown(5), keyUp(6), appEvent(1), plug(7), keyDown(323),
               call(&MW::Widget::setButtonType, DialogSelect::kHookVariant), keyDown(323)},
              "down5+ up6+ - plug7+ + hook+"),
-});
-using DialogSelectPlays = PlayTest;
-TEST_P(DialogSelectPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, DialogSelectPlays, testing::ValuesIn(kPlays), kRowName);
+};
 
 }  // namespace

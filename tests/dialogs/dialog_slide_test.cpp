@@ -23,7 +23,7 @@ Step lookAtThumb() {
 }
 
 const PlaysOn kPrompt = {prompt};
-const auto kPlays = std::to_array<Play>({
+const PlayTests kPlays = {
     kPrompt("DraggedToTheLeftEndItAnswersAndGoesHome",
             {press(905, 1623), drag(-381, 0), drag(INT_MIN, 0), lookAtThumb(), release(),
              lookAtThumb(), lookAtLog()},
@@ -43,10 +43,7 @@ const auto kPlays = std::to_array<Play>({
     kPrompt("InTheDarkTheThumbIsIgnoredUntilItIsHidden",
             {press(526, 1396), lcdOn(0), drag(9, 0), release(), press(), hide(), press()},
             "touch+ hover- lift- touch- touch+"),
-});
-using DialogSlidePlays = PlayTest;
-TEST_P(DialogSlidePlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, DialogSlidePlays, testing::ValuesIn(kPlays), kRowName);
+};
 
 TEST_F(DialogSlideTest, TakesTextsThatFitAndTheThumbsWidth) {
   DialogSlide slide(5);

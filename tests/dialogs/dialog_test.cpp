@@ -24,7 +24,7 @@ const PlaysOn kPrompt = {prompt};
 const PlaysOn kBadGyro = {makes<Dialog>(Dialog::kBadGyroValue)};
 const PlaysOn kHookKey = {makes<Dialog>(Dialog::kPushHookKey)};
 const PlaysOn kStars = {makes<Dialog>(Dialog::kDoNotTouch)};
-const auto kPlays = std::to_array<Play>({
+const PlayTests kPlays = {
     kPrompt(
         "TheLeftButtonAnswersAndStaysUp",
         {finger(2), press(154, 1400), lookAtHold(), lookAtFaces(), release(714, 1619), lookAtLog()},
@@ -53,10 +53,7 @@ const auto kPlays = std::to_array<Play>({
            {later(101), lookAtStars(), later(100), keyUp(5), keyUp(5), keyUp(5), later(100),
             lookAtStars(), later(1), lookAtStars()},
            "<*> up5+ twice5 up5+ thrice5 up5+ <*> <**>"),
-});
-using DialogPlays = PlayTest;
-TEST_P(DialogPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, DialogPlays, testing::ValuesIn(kPlays), kRowName);
+};
 
 TEST_F(DialogTest, StarsStartAnewAfterTen) {
   Dialog dialog(Dialog::kDoNotTouch);

@@ -1,28 +1,29 @@
 // The gallery's examples as golden cases: what a phone's screen shows of each.
+#include <brimol/frame.h>
+#include <brimol3_widget_test/platform.h>
+
 #include "example.h"
 #include "golden/golden_cases.h"
-#include "input/input_service.h"
-#include "scene/recorder.h"
 
-namespace brimol::pc {
+namespace brimol::test {
 
 namespace {
 
 constexpr int kHundred = 100;
 constexpr unsigned int kFrameMs = 101;  // a row of stars grows once in more than 100 ms
 
-/// Draws frames until the example has its age, and leaves the last one in the recorder.
+/// Draws frames until the example has its age, and leaves the last one in the platform.
 class PictureLoop : public gallery::Loop {
  public:
   explicit PictureLoop(unsigned int picturesAge) : age(picturesAge) {}
 
   void operator()(const Draw& draw) override {
     for (unsigned int now = 0;; now += kFrameMs) {
-      beginRecording();
+      skia_begin_frame_c();
       draw();
       MW::Window::show(kNow + now);
       if (now >= age) return;
-      inputService().advance(kFrameMs);
+      platform().ticks += kFrameMs;
     }
   }
 
@@ -41,13 +42,13 @@ std::vector<Case> galleryCases() {
   std::vector<Case> cases;
   for (const gallery::Family& family : gallery::families()) {
     for (const gallery::Example& example : family.examples) {
-      const Size screen = {example.screen.width, example.screen.height};
+      const ScreenSize screen = {example.screen.width, example.screen.height};
       const auto& [top, bottom] = example.view;
-      const View view = {screen.h * top / kHundred, screen.h * bottom / kHundred};
+      const View view = {screen.height * top / kHundred, screen.height * bottom / kHundred};
       cases.push_back({example.name, screen, [&example] { show(example); }, view});
     }
   }
   return cases;
 }
 
-}  // namespace brimol::pc
+}  // namespace brimol::test

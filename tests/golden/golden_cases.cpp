@@ -1,45 +1,43 @@
 #include "golden/golden_cases.h"
 
+#include <brimol/frame.h>
+
 #include <algorithm>
 #include <iterator>
 
-#include "scene/recorder.h"
 #include "support/widget_test.h"
 
-namespace brimol::pc {
+namespace brimol::test {
 
 namespace {
 
-constexpr Size kSmall = {360, 240};
-constexpr Size kStrip = {720, 160};
-constexpr Size kPhone = {720, 1280};
+SKIA_Text textOf(const std::string& words, int32_t size, uint32_t color = MW::kColorWhite,
+                 int32_t align = SKIA_ALIGN_LEFT) {
+  return textRecord(words, color, align, size);
+}
+
+constexpr ScreenSize kSmall = {360, 240};
+constexpr ScreenSize kStrip = {720, 160};
+constexpr ScreenSize kPhone = {720, 1280};
 
 constexpr SKIA_Rect kArea = {40, 60, 280, 80, 0xFF00A000};
 constexpr SKIA_Rect kTrack = {60, 20, 600, 120, 0xFF808000};
 constexpr SKIA_Rect kPage = {0, 0, 360, 240, 0xFFE0E0E0};
 constexpr SKIA_Rect kPad = {20, 20, 200, 400, 0xFFB0C0D0};
-constexpr test::Spot kInside = {100, 100};  // the area and the left end of the track
-constexpr test::Spot kOnThumb = {720, 940};
-const SKIA_Text kTitle = textOf("Saved", 40, kWhite, SKIA_ALIGN_CENTRE);
-const SKIA_Text kLetters = textOf("", 20, kBlack);
+constexpr Spot kInside = {100, 100};  // the area and the left end of the track
+constexpr Spot kOnThumb = {720, 940};
+const SKIA_Text kTitle = textOf("Saved", 40, MW::kColorWhite, SKIA_ALIGN_CENTRE);
+const SKIA_Text kLetters = textOf("", 20, MW::kColorBlack);
 constexpr const char* kLog = "1\nin a long list, still filling two rows\n한국어\n\n\n\n\n\n\n\n";
 constexpr const char* kResults =
     "[1] 10:01 [MPDIA] Board]PASS\n[2] 10:02 [MPDIA] Power]3.9 V\n[1] 10:03\n"
     "[1] 10:04\n[1] 10:05 [MPDIA] Camera]FAIL\n[3] 10:06\n[1] 10:07\n";
 
 // While a finger holds it where it was pressed, or has moved it from there.
-void showHeld(MW::Widget&& held, test::Spot spot, int by = 0) {
-  test::press(held, spot);
-  if (by != 0) test::offer(held, {.type = MW::kEventMotion, .mouse = {1, 0, 0, 0, by, 0}});
+void showHeld(MW::Widget&& held, Spot spot, int by = 0) {
+  press(held, spot);
+  if (by != 0) offer(held, {.type = MW::kEventMotion, .mouse = {1, 0, 0, 0, by, 0}});
   held.show(kNow);
-}
-
-void drawCanary() {
-  skia_add_roundbox_c({6, 6, 60, 40, kRed});
-  skia_add_roundbox_c({40, 20, 51, 33, 0x8000FF00});
-  skia_add_line_c({70, 50, 150, 22, kBlue, 5});
-  skia_add_label_c({4, 54, 90, 40, 0}, textOf("Rag 47%", 22));
-  skia_add_label_c({94, 54, 64, 40, 0}, textOf("한국어", 20));
 }
 
 void drawMainList(int mode) {
@@ -67,7 +65,7 @@ void drawViewer() {
 // Types a digit, a letter and the digit again.
 void drawKeyboard() {
   MW::Ime keyboard(&kPage, &kLetters);
-  for (const int y : {60, 100, 60}) test::press(keyboard, {50, y});
+  for (const int y : {60, 100, 60}) press(keyboard, {50, y});
   keyboard.show(kNow);
 }
 
@@ -76,8 +74,8 @@ void drawResults(int tapped, int scroll) {
   MW::MpdWid list("");
   list.cal_line(kResults, INT_MAX);
   list.show(kNow);
-  beginRecording();
-  MW::event_data tap = test::pointerEvent(MW::kEventRelease, {100, tapped});
+  skia_begin_frame_c();
+  MW::event_data tap = pointerEvent(MW::kEventRelease, {100, tapped});
   list.depth_cal(&tap);
   list.onHover({1, 0, 0, 0, 0, -scroll});
   list.show(kNow);
@@ -99,12 +97,11 @@ void drawSelect() {
 
 void drawPad() {
   MW::Button8 pad(3, &kPad, nullptr);
-  test::press(pad, {70, 70});
+  press(pad, {70, 70});
   showHeld(std::move(pad), {170, 270});
 }
 
 const auto kStates = std::to_array<Case>({
-    {"canary", {160, 96}, drawCanary},
     {"button_held", kSmall, [] { showHeld(MW::Button(&kArea, &kTitle), kInside); }},
     {"button8_held", {240, 440}, drawPad},
     {"slide_e_held", kStrip, [] { showHeld(MW::SlideE(0, &kTrack, &kTitle, ""), kInside, 250); }},
@@ -130,4 +127,4 @@ const std::vector<Case>& goldenCases() {
   return kCases;
 }
 
-}  // namespace brimol::pc
+}  // namespace brimol::test

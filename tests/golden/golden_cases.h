@@ -2,14 +2,13 @@
 #pragma once
 
 #include <MW/MW.h>
+#include <brimol3_widget_test/picture.h>
 
 #include <climits>
 #include <functional>
 #include <vector>
 
-#include "pc/support/painting.h"
-
-namespace brimol::pc {
+namespace brimol::test {
 
 /// A part of a screen: from one row of pixels up to, without it, another one.
 struct View {
@@ -19,16 +18,15 @@ struct View {
 
 struct Case {
   const char* name;            // of its files
-  Size screen;                 // pixels
+  ScreenSize screen;           // pixels
   std::function<void()> draw;  // into the frame that is recorded; GetTicks() is kNow at first
   View view = {};              // what the picture shows
 };
 inline std::ostream& operator<<(std::ostream& out, const Case& drawn) { return out << drawn.name; }
 inline constexpr unsigned int kNow = 1000;  // milliseconds
 
-/// First the canary: it tells whether this machine renders as the one that made the pictures did.
 const std::vector<Case>& goldenCases();
 /// The examples of the gallery.
 std::vector<Case> galleryCases();
 
-}  // namespace brimol::pc
+}  // namespace brimol::test

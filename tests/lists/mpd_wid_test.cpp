@@ -1,12 +1,11 @@
 #include <MW/mpd_wid.h>
 
 #include "support/play_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
-using MpdWidPlays = PlayTest;
 using MpdWidTest = WidgetTest;
 
 constexpr int kTop = 561;  // of the list on the default screen; it is 1999 high
@@ -59,8 +58,8 @@ std::unique_ptr<MW::Widget> tree() {
   return results;
 }
 const Maker kTree = tree;
-const Maker kTwenty = resultsOf(std::string(21, '\n'));  // 2839 high, 840 too many
-const Maker kClickable = resultsOf("a\nb\n", MW::MpdWid::kHitEnd);
+const PlaysOn kTwenty = {resultsOf(std::string(21, '\n'))};  // 2839 high, 840 too many
+const PlaysOn kClickable = {resultsOf("a\nb\n", MW::MpdWid::kHitEnd)};
 
 // A tap on so many pixels below the list's top.
 struct Tap {
@@ -76,39 +75,31 @@ Play tapped(const char* name, std::initializer_list<Tap> taps, const char* journ
   return {name, kTree, steps, journal};
 }
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     tapped("ADoubleTapOpensARow", {{0, 1}, {499, 141}}, "+ + + + <[V][>][*][>][*]>"),
     tapped("TheSecondTapSaysWhichRow", {{0, 1}, {1, 143}}, "+ + + + <[>][V][>][*]>"),
     tapped("AnEdgeIsNoRows", {{0, 142}, {1, 142}}, "+ + + + <[>][>][*]>"),
     tapped("TheLastRowDoesNotChange", {{0, 285}, {1, 285}}, "+ + + + <[>][>][*]>"),
-    {"ScrollsBetweenItsEnds",
-     kTwenty,
-     {draw(), press(30, kTop), drag(0, -143), top(), drag(0, 93), top(), drag(0, INT_MAX), top(),
-      drag(0, INT_MIN), top()},
-     "press+ hover+ <-1> hover+ <-50> hover+ <0> hover+ <-130>"},
-    {"FewRowsComeBackFromAboveAtOnceOrNotAtAll",
-     kTwenty,
-     {draw(), press(30, kTop), drag(0, -500),
-      call<Results>([](Results& results) { results.read("a\nb\n"); }), top(), drag(0, 499), top(),
-      drag(0, 500), top()},
-     "press+ hover+ <none> hover+ <none> hover+ <0>"},
-    {"OnlyBeforeAnEndOfHitsItIsClicked",
-     kClickable,
-     {press(30, kTop), release(30, 0)},
-     "press+ click release+"},
-    {"ALongDragIsNoClick",
-     kClickable,
-     {press(30, kTop), drag(0, -29), release()},
-     "press+ hover+ release+"},
-    {"OneFingerHoldsItAndIsFollowed",
-     kClickable,
-     {finger(3), press(30, kTop - 1), press(30, kTop), lookAtHold(), finger(1), drag(1, 1),
-      longPress(), lookAtLog(), finger(3), longPress(), release(0, 0), lookAtHold()},
-     "- press+ <held 4> - - <[MPDWID] onRecvEvent-> T:3, F:1> - click release+ <held 0>"},
-    {"KeysAreTold", kClickable, {keyDown(9), keyUp(9), plug(9)}, "down9+ up9+ -"},
+    kTwenty("ScrollsBetweenItsEnds",
+            {draw(), press(30, kTop), drag(0, -143), top(), drag(0, 93), top(), drag(0, INT_MAX),
+             top(), drag(0, INT_MIN), top()},
+            "press+ hover+ <-1> hover+ <-50> hover+ <0> hover+ <-130>"),
+    kTwenty("FewRowsComeBackFromAboveAtOnceOrNotAtAll",
+            {draw(), press(30, kTop), drag(0, -500),
+             call<Results>([](Results& results) { results.read("a\nb\n"); }), top(), drag(0, 499),
+             top(), drag(0, 500), top()},
+            "press+ hover+ <none> hover+ <none> hover+ <0>"),
+    kClickable("OnlyBeforeAnEndOfHitsItIsClicked", {press(30, kTop), release(30, 0)},
+               "press+ click release+"),
+    kClickable("ALongDragIsNoClick", {press(30, kTop), drag(0, -29), release()},
+               "press+ hover+ release+"),
+    kClickable(
+        "OneFingerHoldsItAndIsFollowed",
+        {finger(3), press(30, kTop - 1), press(30, kTop), lookAtHold(), finger(1), drag(1, 1),
+         longPress(), lookAtLog(), finger(3), longPress(), release(0, 0), lookAtHold()},
+        "- press+ <held 4> - - <[MPDWID] onRecvEvent-> T:3, F:1> - click release+ <held 0>"),
+    kClickable("KeysAreTold", {keyDown(9), keyUp(9), plug(9)}, "down9+ up9+ -"),
 };
-TEST_P(MpdWidPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, MpdWidPlays, testing::ValuesIn(kPlays), kRowName);
 
 const std::string kWide = "\u00e4\u00e4\u00e4\u00e4\u00e4\u00e4\u00e4";
 const std::string kLong(300, 'x');

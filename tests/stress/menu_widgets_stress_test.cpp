@@ -10,7 +10,7 @@
 #include <thread>
 
 #include "support/widget_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace {
 

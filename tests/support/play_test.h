@@ -1,8 +1,11 @@
 /// Tables of plays, for tests of widgets.
 #pragma once
 
+#include <filesystem>
+#include <initializer_list>
+
 #include "support/widget_test.h"
-#include "testkit/play.h"
+#include <brimol3_widget_test/play.h>
 
 namespace brimol::test {
 
@@ -29,16 +32,30 @@ struct PlaysOn {
     return {name, make, steps, journal};
   }
 };
-/// Plays a row, and again for each of its callbacks, which then deletes the widget.
-inline void expectJournal(const Play& play) {
-  EXPECT_EQ(played(play.make, play.steps), play.journal);
-  expectCallbacksMayDelete(play.make, play.steps);
-}
-/// The fixture of such a table:
+/// A table of plays, each of which becomes a test named after its row, in a suite named after its
+/// file: it plays the row, and again for each of its callbacks, which then deletes the widget.
 ///
-///     using SlidePlays = PlayTest;
-///     TEST_P(SlidePlays, TellTheirJournal) { expectJournal(GetParam()); }
-///     INSTANTIATE_TEST_SUITE_P(, SlidePlays, testing::ValuesIn(kPlays), kRowName);
-class PlayTest : public WidgetTest, public testing::WithParamInterface<Play> {};
+///     const PlayTests kPlays = {kSlide("IsGrabbed", {press(1, 1)}, "+")};
+class PlayTests {
+ public:
+  PlayTests(std::initializer_list<Play> plays, const char* file = __builtin_FILE(),
+            int line = __builtin_LINE()) {
+    const std::string suite = std::filesystem::path(file).stem();
+    for (const Play& play : plays) {
+      testing::RegisterTest(suite.c_str(), play.name, nullptr, nullptr, file, line,
+                            [play]() -> WidgetTest* { return new Test(play); });
+    }
+  }
+
+ private:
+  struct Test : WidgetTest {
+    explicit Test(Play row) : play(std::move(row)) {}
+    void TestBody() override {
+      EXPECT_EQ(played(play.make, play.steps), play.journal);
+      expectCallbacksMayDelete(play.make, play.steps);
+    }
+    Play play;
+  };
+};
 
 }  // namespace brimol::test

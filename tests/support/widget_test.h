@@ -10,7 +10,7 @@
 #include <memory>
 #include <utility>
 
-#include "testkit/input.h"
+#include <brimol3_widget_test/input.h>
 
 namespace brimol::test {
 
@@ -83,19 +83,18 @@ class WidgetTest : public testing::Test {
   }
 };
 
-/// With Window::init done and both of its threads parked after their first round, so that the test
+/// With Window::init done and both of its threads held after their first round, so that the test
 /// takes the rounds itself.
 class LiveWindowTest : public WidgetTest {
  protected:
   void SetUp() override {
     WidgetTest::SetUp();
-    platform().parks = true;
+    platform().turns.hold();
     ASSERT_EQ(MW::Window::init(), 1);
-    for (int parked = 0; parked != 2; parked = platform().parked) platform().parked.wait(parked);
+    platform().turns.await(2);
   }
   void TearDown() override {
-    platform().parks = false;
-    platform().parks.notify_all();
+    platform().turns.letGo();
     MW::Window::destroy();
     WidgetTest::TearDown();
   }

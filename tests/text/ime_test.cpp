@@ -3,12 +3,11 @@
 #include <array>
 
 #include "support/play_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
-using ImePlays = PlayTest;
 using ImeTest = WidgetTest;
 using MW::Ime;
 
@@ -70,23 +69,18 @@ Step pressByHand() {
   });
 }
 
-const std::vector<Play> kPlays = {
-    {"ReleaseFollowsAKey",
-     keyboard,
-     {press(9, 150), release(9, 600), release(9, 9)},
-     "+ - release+"},
-    {"ALongPressIsTold", keyboard, {longPress(9, 150), moveTo(9, 151)}, "long+ -"},
-    {"APressByHandHoldsAndCountsTaps",
-     keyboard,
-     {pressByHand(), lookAtHold(), moveTo(900, 900), release(9, 9), pressByHand(), release()},
-     "press <held 1> + release+ press release double+"},
-    {"TakesNothingOnceItHasATime",
-     keyboard,
-     {call(&MW::Widget::onShowTimer, 5), press(9, 150)},
-     "-"},
+const PlaysOn kKeyboard = {keyboard};
+const PlayTests kPlays = {
+    kKeyboard("ReleaseFollowsAKey", {press(9, 150), release(9, 600), release(9, 9)},
+              "+ - release+"),
+    kKeyboard("ALongPressIsTold", {longPress(9, 150), moveTo(9, 151)}, "long+ -"),
+    kKeyboard(
+        "APressByHandHoldsAndCountsTaps",
+        {pressByHand(), lookAtHold(), moveTo(900, 900), release(9, 9), pressByHand(), release()},
+        "press <held 1> + release+ press release double+"),
+    kKeyboard("TakesNothingOnceItHasATime", {call(&MW::Widget::onShowTimer, 5), press(9, 150)},
+              "-"),
 };
-TEST_P(ImePlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, ImePlays, testing::ValuesIn(kPlays), kRowName);
 
 TEST_F(ImeTest, DigitsAloneGreyTheRest) {
   Keyboard keyboard;

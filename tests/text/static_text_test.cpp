@@ -4,12 +4,11 @@
 #include <array>
 
 #include "support/play_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
-using StaticTextPlays = PlayTest;
 using StaticTextTest = WidgetTest;
 
 constexpr SKIA_Rect kFourRows = {0, 0, 20, 60, 3};  // of ten bytes
@@ -120,33 +119,29 @@ Step top() {
   return look<Viewer>([](Viewer& viewer) { return viewer.top_index; });
 }
 
-const std::vector<Play> kPlays = {
-    {"EveryFourthMotionScrolls",
-     sixRows,
-     {press(5, 5), drag(0, -9), drag(0, -9), drag(0, -9), top(), drag(0, -9), top(), drag(0, -9),
-      drag(0, -9), drag(0, -9), drag(0, 1), top()},
-     "press+ + + + <0> + <1> + + + + <0>"},
-    {"TellsTheSecondOfTwoTaps",
-     sixRows,
-     {press(5, 5), release(90, 90), press(5, 5), release(), press(), release(), press(), release()},
-     "press+ + press+ release+ press+ release double+ press+ release+"},
-    {"CallbacksThatCallOnTakeNoTapAway",
-     callingOn,
-     {press(5, 5), release(), press(), release()},
-     "press long+ release long+ press long+ release long double+"},
-    {"ALongPressIsTold", sixRows, {longPress(5, 5), moveTo(6, 6)}, "long+ -"},
-    {"TakesNothingOnceItHasATime",
-     sixRows,
-     {call(&MW::Widget::onShowTimer, 100), lookAtRedraw(), press(5, 5), later(100), timer(),
-      lookAtRedraw()},
-     "<redraw> - <redraw>"},
-    {"WithoutScrollItTakesAllAndDoesNothing",
-     withoutScroll,
-     {press(900, 900), lookAtHold(), keyDown(5)},
-     "+ <held 0> +"},
+const PlaysOn kSixRows = {sixRows};
+const PlaysOn kCallingOn = {callingOn};
+const PlaysOn kWithoutScroll = {withoutScroll};
+
+const PlayTests kPlays = {
+    kSixRows("EveryFourthMotionScrolls",
+             {press(5, 5), drag(0, -9), drag(0, -9), drag(0, -9), top(), drag(0, -9), top(),
+              drag(0, -9), drag(0, -9), drag(0, -9), drag(0, 1), top()},
+             "press+ + + + <0> + <1> + + + + <0>"),
+    kSixRows("TellsTheSecondOfTwoTaps",
+             {press(5, 5), release(90, 90), press(5, 5), release(), press(), release(), press(),
+              release()},
+             "press+ + press+ release+ press+ release double+ press+ release+"),
+    kCallingOn("CallbacksThatCallOnTakeNoTapAway", {press(5, 5), release(), press(), release()},
+               "press long+ release long+ press long+ release long double+"),
+    kSixRows("ALongPressIsTold", {longPress(5, 5), moveTo(6, 6)}, "long+ -"),
+    kSixRows("TakesNothingOnceItHasATime",
+             {call(&MW::Widget::onShowTimer, 100), lookAtRedraw(), press(5, 5), later(100), timer(),
+              lookAtRedraw()},
+             "<redraw> - <redraw>"),
+    kWithoutScroll("WithoutScrollItTakesAllAndDoesNothing",
+                   {press(900, 900), lookAtHold(), keyDown(5)}, "+ <held 0> +"),
 };
-TEST_P(StaticTextPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, StaticTextPlays, testing::ValuesIn(kPlays), kRowName);
 
 TEST_F(StaticTextTest, NoSizeLeadsOutOfBounds) {
   SKIA_Text looks = {};

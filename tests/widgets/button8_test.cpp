@@ -1,13 +1,12 @@
 #include <MW/button8.h>
 
 #include "support/play_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 using Button8Test = WidgetTest;
-using Button8Plays = PlayTest;
 using MW::Button8;
 
 constexpr SKIA_Rect kArea = {0, 0, 400, 800, 5};
@@ -25,7 +24,7 @@ PlaysOn pad(int layout) {
 }
 const PlaysOn kPad = pad(Button8::kFourByTwo);
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     kPad("EachCellHasItsOwnFinger",
          {press(21, 25), finger(4), press(379, 387), lookAtLog(), finger(0), release(21, 25)},
          "held1+ held9+ <[BUTTON8] pressed (3) - state = 9  1,0,0,5,0,0,0,0!!> held8+"),
@@ -40,8 +39,6 @@ const std::vector<Play> kPlays = {
          {press(100, 300), call(&MW::Widget::hide), look(&MW::Widget::isActive), press(300, 300)},
          "held4+ <0> held8+"),
 };
-TEST_P(Button8Plays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, Button8Plays, testing::ValuesIn(kPlays), kRowName);
 
 TEST_F(Button8Test, AnUnknownLayoutKeepsTheShape) {
   Button8 pad(6, &kArea, nullptr);

@@ -22,7 +22,8 @@ static_assert(draws(startedAt(1000, 250), {1249, 1250, 0}) == 11);
 static_assert(!startedAt(1000, 250).isDue(1249) && startedAt(1000, 250).isDue(1250));
 static_assert(startedAt(1000, 250).isPending() && !MW::DelayedShow().isDue(9));
 
-// A due time beyond the wrap of the clock counts as reached.
-static_assert(startedAt(~15U, 250).isDue(~15U));
+// Over the wrap of the clock, and from its start.
+static_assert(draws(startedAt(~15U, 250), {~15U, ~0U, 233, 234}) == 1);
+static_assert(draws(startedAt(0, 0), {0}) == 1 && draws(startedAt(0, 5), {0, 4, 5}) == 1);
 
 }  // namespace

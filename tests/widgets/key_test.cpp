@@ -6,12 +6,11 @@ namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 using KeyTest = WidgetTest;
-using KeyPlays = PlayTest;
 
 const PlaysOn kKey = {makes<MW::Key>()};
 const PlaysOn kNoPlug = {without(&MW::Widget::plugCallback, kKey.make)};
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     kKey("TakesAllButTouches",
          {press(1, 2), moveTo(5, 5), release(3, 4), longPress(5, 6), lookAtLog(), keyDown(10),
           keyUp(11), appEvent(12), plug(13)},
@@ -30,8 +29,6 @@ const std::vector<Play> kPlays = {
              later(200), draw()},
             "+"),
 };
-TEST_P(KeyPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, KeyPlays, testing::ValuesIn(kPlays), kRowName);
 
 // A callback that deletes the widget can still read its record.
 TEST_F(KeyTest, ARecordOutlivesItsWidget) {

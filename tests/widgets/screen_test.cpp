@@ -6,13 +6,12 @@ namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 using ScreenTest = WidgetTest;
-using ScreenPlays = PlayTest;
 using MW::Screen;
 
 const PlaysOn kScreen = {makes<Screen>()};  // 1440 x 2560
 Step passOn() { return call(&MW::Widget::setButtonType, Screen::kPassOn); }
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     kScreen("TellsEveryTouchAndLeavesKeysAlone",
             {finger(2), press(-5, 9000), moveTo(1, 2), longPress(3, 4), finger(7), release(5, 6),
              keyDown(5), keyUp(5), plug(17)},
@@ -29,8 +28,6 @@ const std::vector<Play> kPlays = {
             {press(500, 500), call(&MW::Widget::hide), look(&MW::Widget::isActive), lookAtHold()},
             "press+ <0> <held 1>"),
 };
-TEST_P(ScreenPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, ScreenPlays, testing::ValuesIn(kPlays), kRowName);
 
 // Near an edge of the screen, or released beside the square around the press.
 TEST_F(ScreenTest, CountsNoTapBesideItsSquare) {

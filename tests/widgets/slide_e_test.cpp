@@ -7,7 +7,6 @@
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
-using SlideEPlays = PlayTest;
 using MW::SlideE;
 
 constexpr SKIA_Rect kBar = {0, 0, 600, 100, 7};  // the knob goes from 0 to 500
@@ -24,7 +23,7 @@ Step knob() {
   });
 }
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     kLeft("ExitsAtTheRight", {press(99, 99), drag(499, 0), knob(), drag(1, 0), knob()},
           "+ + <0 at 499 held> exit+ <0 at 0>"),
     from(SlideE::kFromRight)(
@@ -44,7 +43,5 @@ const std::vector<Play> kPlays = {
         {press(0, 0), drag(50, 0), finger(2), press(300, 9), lookAtLog(), knob()},
         "+ + + <[SLIDE_EXIT] Another touch finger pressed!\nDisabled button selection!> <0 at 0>"),
 };
-TEST_P(SlideEPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, SlideEPlays, testing::ValuesIn(kPlays), kRowName);
 
 }  // namespace

@@ -8,7 +8,6 @@ namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 using SlideMoveTest = WidgetTest;
-using SlideMovePlays = PlayTest;
 using MW::SlideMove;
 
 constexpr SKIA_Rect kBar = {0, 0, 600, 100, 7};
@@ -24,7 +23,7 @@ Step value() {
   });
 }
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     slide(SlideMove::kValueKnob, 0, 100, 50)(
         "TruncatesToTheValueAtTheKnob",
         {value(), press(240, 9), drag(239, 0), value(), drag(1, 0), value(), release(), value()},
@@ -50,8 +49,6 @@ const std::vector<Play> kPlays = {
         {press(240, 0), drag(INT_MAX, 0), value(), drag(INT_MIN, 0), value()},
         "+ + <100 at 480> + <-2147483648 at 0>"),
 };
-TEST_P(SlideMovePlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, SlideMovePlays, testing::ValuesIn(kPlays), kRowName);
 
 TEST_F(SlideMoveTest, AKnobWithoutRoomKeepsItsValue) {
   for (const int width : {0, -1, INT_MIN}) {

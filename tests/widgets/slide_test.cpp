@@ -4,13 +4,12 @@
 #include <climits>
 
 #include "support/play_test.h"
-#include "testkit/drawings.h"
+#include <brimol3_widget_test/drawings.h>
 
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
 using SlideTest = WidgetTest;
-using SlidePlays = PlayTest;
 using MW::Slide;
 
 constexpr SKIA_Rect kArea = {10, 20, 503, 100, 0};  // the knob, 200 wide, goes from 10 to 310
@@ -39,7 +38,7 @@ Step knob() {
   });
 }
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     kFullOff("FullTravelSwitchesOnAtTheEnd",
              {press(209, 79), drag(298, 0), knob(), drag(1, 0), knob(), drag(1, 0)},
              "+ + <0 at 308 held> right+ <1 at 310> -"),
@@ -70,8 +69,6 @@ const std::vector<Play> kPlays = {
                                         {press(512, 119), drag(299, 0), knob()},
                                         "+ right+ <1 at 310>"),
 };
-TEST_P(SlidePlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, SlidePlays, testing::ValuesIn(kPlays), kRowName);
 
 // A second caption has its record's length, but only as many bytes as its size says.
 TEST_F(SlideTest, CutsItsSecondCaptionByItsSize) {

@@ -6,7 +6,6 @@
 namespace {
 
 using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
-using StyledButtonPlays = PlayTest;
 using ButtonNewTest = WidgetTest;
 using MW::ButtonNew;
 using MW::ButtonS;
@@ -17,7 +16,7 @@ const PlaysOn kTaking = {makes<ButtonS, Told::Zero>(4, &kArea, kNoText)};
 const PlaysOn kPassing = {makes<ButtonS, Told::Zero>(ButtonS::kPassOn, &kArea, kNoText)};
 const PlaysOn kNew = {makes<ButtonNew, Told::Zero>(ButtonNew::kTextBox, &kArea, kNoText)};
 
-const std::vector<Play> kPlays = {
+const PlayTests kPlays = {
     kTaking("TakesItsEvents",
             {press(10, 20), look(&MW::Widget::getBgColor), moveTo(112, 20), release(), lookAtLog()},
             "press+ <5> + + <[BUTTONS] released!!>"),
@@ -39,8 +38,6 @@ const std::vector<Play> kPlays = {
           release(), release(50, 40), lookAtLog()},
          "press+ - <5> long+ <held 0> - click+ <[BUTTONNEW] released!!>"),
 };
-TEST_P(StyledButtonPlays, TellTheirJournal) { expectJournal(GetParam()); }
-INSTANTIATE_TEST_SUITE_P(, StyledButtonPlays, testing::ValuesIn(kPlays), kRowName);
 
 TEST_F(ButtonNewTest, AStyleOfNoNameHasNoFrame) {
   EXPECT_EQ(shown(*std::make_unique<ButtonNew>(3, &kArea, nullptr)).size(), 1U);

@@ -53,6 +53,16 @@ bool setAction(Options& options, std::string_view) {
   return true;
 }
 
+bool setDevice(Options& options, std::string_view value) {
+  options.device = value;
+  return !value.empty();
+}
+
+bool setLint(Options& options, std::string_view) {
+  options.lints = true;
+  return true;
+}
+
 struct OptionRow {
   std::string_view name;
   std::string_view value;  // what its value is called; empty: it takes none
@@ -73,6 +83,10 @@ constexpr auto kOptions = std::to_array<OptionRow>({
     {"--against", "DIR", "compare with the run in DIR; a difference is a failure",
      setFile<&Options::against>},
     {"--screen", "WIDTHxHEIGHT", "the screen's size in pixels", setScreen},
+    {"--device", "NAME", "the screen of a phone: its size and density", setDevice},
+    {"--lint", "", "look for faults of the layout; one is a failure", setLint},
+    {"--accepted", "FILE", "findings of the lint that are accepted; one that is gone is a failure",
+     setFile<&Options::accepted>},
     {"--speed", "1", "in a window and in real time, to watch it", setSpeed},
     {"--timeout", "SECONDS",
      "how long nothing may happen before it counts as hung: 60; 0: for ever", setTimeout},
@@ -127,6 +141,7 @@ std::string whatIsWrong(const Options& options) {
   if (options.command.empty() || options.command.front().empty()) {
     return "which application? Give -- APP ARGS behind the trace, see --help";
   }
+  if (!options.accepted.empty() && !options.lints) return "--accepted goes with --lint alone";
   const std::array files = {options.report, options.junit, options.bundle};
   for (std::size_t one = 0; one < files.size(); ++one) {
     if (files[one].empty() || std::count(files.begin(), files.end(), files[one]) == 1) continue;

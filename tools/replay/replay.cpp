@@ -8,6 +8,7 @@
 #include "bundle.h"
 #include "compare.h"
 #include "junit.h"
+#include "layout_lint.h"
 #include "picture.h"
 #include "progress.h"
 #include "report.h"
@@ -36,6 +37,7 @@ struct Plan {
   Options options;
   fs::path folder;  // of the run
   RunRecord record;
+  test::AcceptedFindings accepted;
 };
 
 // A word of a command as a shell would take it.
@@ -99,6 +101,7 @@ void takeSettings(Plan& plan) {
     if (plan.options.fromBundle.empty() && value != nullptr) settings[name] = value;
   }
   if (!plan.options.screen.empty()) settings["BRIMOL_SCREEN"] = plan.options.screen;
+  if (!plan.options.device.empty()) settings["BRIMOL_DEVICE"] = plan.options.device;
 }
 
 std::optional<Plan> prepare(Options options, std::string& error) {
@@ -107,7 +110,8 @@ std::optional<Plan> prepare(Options options, std::string& error) {
   const fs::path& named = options.trace.empty() ? options.fromBundle : options.trace;
   const auto folder = prepareRunDirectory(options.directory, named.stem(), error);
   if (!folder) return {};
-  Plan plan{std::move(options), *folder, {}};
+  Plan plan{std::move(options), *folder, {}, {}};
+  if (!plan.options.accepted.empty()) plan.accepted = test::AcceptedFindings(plan.options.accepted);
   if (!plan.options.fromBundle.empty() && !takeFromBundle(plan, error)) return {};
   takeSettings(plan);
   plan.record.version = kVersion;
@@ -132,6 +136,7 @@ Launch launchOf(const Plan& plan) {
   launch.environment["BRIMOL_TRACE"] = plan.record.trace;
   launch.environment["BRIMOL_RECORD"] = std::nullopt;
   launch.environment["BRIMOL_REPORT_DIR"] = plan.folder.native();
+  if (plan.options.lints) launch.environment["BRIMOL_REPORT_ITEMS"] = "changed";
   launch.environment["BRIMOL_DISPLAY"] = isWatched ? "window" : "headless";
   launch.environment["BRIMOL_CLOCK"] = isWatched ? "paced" : "simulated";
   return launch;
@@ -168,7 +173,11 @@ Outcome runAndJudge(const Plan& plan) {
     outcome.other = PlayedRun{against, readSession(against / kSessionName)};
     outcome.comparison = compare(outcome.run, *outcome.other, kMostPairs);
   }
-  outcome.judgement = judge(outcome.run.session, outcome.end, outcome.comparison.differences);
+  const Session& session = outcome.run.session;
+  outcome.judgement = judge(session, outcome.end, outcome.comparison.differences);
+  if (plan.options.lints) {
+    outcome.judgement = judgeLayout(outcome.judgement, session, plan.accepted);
+  }
   return outcome;
 }
 

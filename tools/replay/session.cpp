@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <bit>
 #include <fstream>
 #include <iterator>
 #include <limits>
@@ -58,10 +59,34 @@ SessionStart startOf(const json& line) {
   const json& screen = memberOf(line, "screen");
   start.width = std::max(numberIn(screen, "width"), 0);
   start.height = std::max(numberIn(screen, "height"), 0);
+  const json& density = memberOf(screen, "density");
+  if (density.is_number()) start.density = density.get<float>();
   const json& environment = memberOf(line, "environment");
   if (!environment.is_object()) return start;
   for (const auto& [name, value] : environment.items()) start.environment[name] = textOf(value);
   return start;
+}
+
+// The numbers of a list, as many as are wanted; one that is missing or no whole number is 0.
+template <std::size_t count>
+std::array<int32_t, count> wordsIn(const json& object, const char* name) {
+  std::array<int32_t, count> words = {};
+  const json& list = memberOf(object, name);
+  for (std::size_t i = 0; i < count && list.is_array() && i < list.size(); ++i) {
+    if (list[i].is_number_integer()) words[i] = static_cast<int32_t>(list[i].get<int64_t>());
+  }
+  return words;
+}
+
+SKIA_Item itemOf(const json& object) {
+  SKIA_Item item = {numberIn(object, "kind"), {}, {}, {}};
+  item.rect = std::bit_cast<SKIA_Rect>(wordsIn<5>(object, "rect"));
+  item.point = std::bit_cast<SKIA_Point>(wordsIn<6>(object, "line"));
+  const auto [color, align, size] = wordsIn<3>(object, "font");
+  item.text = {{}, 0, static_cast<uint32_t>(color), align, size};
+  const auto length = textIn(object, "text").copy(item.text.text, SKIA_TEXT_BYTES - 1);
+  item.text.string_len = static_cast<int32_t>(length);
+  return item;
 }
 
 Frame frameOf(const json& line) {
@@ -72,6 +97,9 @@ Frame frameOf(const json& line) {
   frame.items = numberIn(line, "items");
   frame.picture = textIn(line, "picture");
   frame.paintMs = static_cast<double>(timeIn(line, "paint_us")) / kMicrosecondsPerMs;
+  if (const json& drawn = memberOf(line, "drawn"); drawn.is_array()) {
+    std::ranges::transform(drawn, std::back_inserter(frame.drawn), itemOf);
+  }
   const json& texts = memberOf(line, "texts");
   if (!texts.is_array()) return frame;
   for (const json& text : texts) frame.texts.push_back(textIn(text, "text"));

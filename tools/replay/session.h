@@ -1,6 +1,8 @@
 /// What a session's file says: docs/traces.md describes it.
 #pragma once
 
+#include <brimol/scene.h>
+
 #include <cstdint>
 #include <map>
 #include <optional>
@@ -23,6 +25,7 @@ struct Place {
 struct SessionStart {
   std::string program, version, screen, display, clock, utc;
   int width = 0, height = 0;  // of the screen; 0 if the session did not say
+  float density = 0;          // dots per inch; 0 if the session did not say
   std::map<std::string, std::string> environment;
 };
 
@@ -32,6 +35,7 @@ struct Frame {
   std::string hash = {};
   int items = 0;
   std::vector<std::string> texts = {};
+  std::vector<SKIA_Item> drawn = {};  // empty if the session does not list them
   std::string picture = {};  // a file in the session's folder
   double paintMs = 0;
 };

@@ -124,8 +124,8 @@ constexpr auto kButtons = std::to_array<Example>({
 }  // namespace
 
 Family buttons() {
-  return {"Buttons", "What is pressed. Callbacks come on the dispatch thread.", sourceOf("buttons"),
-          kButtons};
+  return {"Buttons", "What is pressed. Callbacks come on the dispatch thread.",
+          sourceOf("families/buttons.cpp"), kButtons};
 }
 
 }  // namespace gallery

@@ -82,7 +82,7 @@ constexpr auto kDescriptors = std::to_array<Example>({
 
 Family descriptors() {
   return {"Descriptors", "Screens described as data: `WidgetRcui` builds what `ref_t` says.",
-          sourceOf("descriptors"), kDescriptors};
+          sourceOf("families/descriptors.cpp"), kDescriptors};
 }
 
 }  // namespace gallery

@@ -131,7 +131,7 @@ constexpr auto kDialogs = std::to_array<Example>({
 
 Family dialogs() {
   return {"Dialogs", "They stand in the top layer: while one is active, nothing below gets events.",
-          sourceOf("dialogs"), kDialogs};
+          sourceOf("families/dialogs.cpp"), kDialogs};
 }
 
 }  // namespace gallery

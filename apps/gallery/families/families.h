@@ -16,7 +16,7 @@ Family dialogs();
 Family prompts();
 Family descriptors();
 
-/// The source of a family as it was built, by the name of its file without ".cpp".
-std::string_view sourceOf(std::string_view family);
+/// A source as it was built: that of a family, or place.h. `file` stands in the gallery's folder.
+std::string_view sourceOf(std::string_view file);
 
 }  // namespace gallery

@@ -22,7 +22,7 @@ constexpr auto kLists = std::to_array<Example>({
      "top is not drawn.",
      {0, 65},
      [](Loop& loop) {
-       MW::MainList list("Menu", MW::MainList::kPlain);
+       MW::MainList list(" Menu", MW::MainList::kPlain);
        const SKIA_Text nothing = {};
        const SKIA_Text group = words(" Sensors", 0, SKIA_ALIGN_LEFT);
        list.addIndex(MW::MainList::kDark, &nothing, 0);
@@ -34,8 +34,8 @@ constexpr auto kLists = std::to_array<Example>({
        const SKIA_Text absent = words("   Barometer", 0, SKIA_ALIGN_LEFT);
        list.addIndex(MW::MainList::kGrey, &absent, place(0, 0, 0, 8).h);
        list.initFinish();
-       list.setTextBattery("BAT 87%", 7);
-       list.setTextBrightness("LCD 120", 7);
+       list.setTextBattery("BAT 87% ", 8);
+       list.setTextBrightness("LCD 120 ", 8);
        list.clickCallback = [](MW::mouse_event* mouse, MW::MainList* from) {
          say("Row", from->position2index(*mouse));
        };
@@ -47,7 +47,7 @@ constexpr auto kLists = std::to_array<Example>({
      "A verdict is told by the colour of a row. An item of the kind `kEnd` would end the list.",
      {0, 60},
      [](Loop& loop) {
-       MW::MainList list("Menu", MW::MainList::kExtended);
+       MW::MainList list(" Menu", MW::MainList::kExtended);
        const SKIA_Text nothing = {};
        list.addIndex(MW::MainList::kDark, &nothing, 0);
        for (const char* const name : {"   Light", "   Proximity", "   Gyro", "   Compass"}) {
@@ -57,7 +57,7 @@ constexpr auto kLists = std::to_array<Example>({
        list.initFinish();
        list.setBGColor(1, 0xFF107010);
        list.setText(1, "   Light: PASS", 14);
-       list.setTextColor(2, MW::kColorHighlight);
+       list.setTextColor(2, 0xFFFFE060);
        list.setTextOption(MW::MainList::kOperator, " Carrier", 8);
        list.setTextOption(MW::MainList::kAddress, "00:11:22", 8);
        list.setTextOption(MW::MainList::kSignal, "-71 dBm ", 8);
@@ -89,8 +89,8 @@ constexpr auto kLists = std::to_array<Example>({
 }  // namespace
 
 Family lists() {
-  return {"Lists", "Lists over the whole screen, which a finger scrolls.", sourceOf("lists"),
-          kLists};
+  return {"Lists", "Lists over the whole screen, which a finger scrolls.",
+          sourceOf("families/lists.cpp"), kLists};
 }
 
 }  // namespace gallery

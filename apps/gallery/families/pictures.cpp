@@ -98,7 +98,7 @@ constexpr auto kPictures = std::to_array<Example>({
 Family pictures() {
   return {"Drawing elements",
           "They are in no layer and get no events: the application shows them in each frame.",
-          sourceOf("pictures"), kPictures};
+          sourceOf("families/pictures.cpp"), kPictures};
 }
 
 }  // namespace gallery

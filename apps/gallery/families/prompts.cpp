@@ -102,9 +102,12 @@ constexpr auto kPrompts = std::to_array<Example>({
 }  // namespace
 
 Family prompts() {
-  return {"Built-in prompts",  "The kind alone says what is asked, and which buttons there are.",
-          sourceOf("prompts"), kPrompts,
-          Shelf::Grid,         "void prompt("};
+  return {"Built-in prompts",
+          "The kind alone says what is asked, and which buttons there are.",
+          sourceOf("families/prompts.cpp"),
+          kPrompts,
+          Shelf::Grid,
+          "void prompt("};
 }
 
 }  // namespace gallery

@@ -82,7 +82,7 @@ constexpr auto kScreens = std::to_array<Example>({
 
 Family screens() {
   return {"Whole screens", "What covers the screen, and what takes input without being seen.",
-          sourceOf("screens"), kScreens};
+          sourceOf("families/screens.cpp"), kScreens};
 }
 
 }  // namespace gallery

@@ -110,7 +110,7 @@ constexpr auto kSlides = std::to_array<Example>({
 }  // namespace
 
 Family slides() {
-  return {"Switches and sliders", "What is dragged.", sourceOf("slides"), kSlides};
+  return {"Switches and sliders", "What is dragged.", sourceOf("families/slides.cpp"), kSlides};
 }
 
 }  // namespace gallery

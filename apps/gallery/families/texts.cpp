@@ -3,6 +3,7 @@
 #include <MW/static_text.h>
 
 #include <array>
+#include <string>
 
 #include "families/families.h"
 #include "place.h"
@@ -11,43 +12,42 @@ namespace gallery {
 
 namespace {
 
-constexpr uint32_t kPaper = 0xFFF4F4EC;
-constexpr uint32_t kKeys = 0xFF8090A4;
-constexpr const char* kLog =
-    "boot: 3 cores\nclock: 2026-11-22\ncamera: lens found\ncamera: lens moved by 3 steps\n"
-    "display: 720 x 1280\nbattery: 87 %\nbattery: charger found\ncamera: closed\nradio: 2G 3G 4G\n"
-    "radio: registered\ntouch: 10 fingers\nproximity: near\nproximity: far\nlight: 320 lux\n"
-    "gyro: calibrated\nwifi: 5 networks\nbluetooth: on\nspeaker: 440 Hz\nmicrophone: 440 Hz\n"
-    "vibration: felt\nend of the log\n";
-
 constexpr auto kTexts = std::to_array<Example>({
     {"static_text", "StaticText",
      "A long text that a finger scrolls, with line numbers, a scroll bar, and the lines in red "
      "that a search has found. `setRect()` before the text makes room for the line numbers.",
      kThird,
      [](Loop& loop) {
-       const SKIA_Rect area = place(5, 2, 90, 30, kPaper);
+       std::string log;
+       for (int step = 1; step <= 30; ++step) {
+         log += "step " + std::to_string(step) + (step % 7 == 0 ? ": failed\n" : ": passed\n");
+       }
+       const SKIA_Rect area = place(5, 2, 90, 30, 0xFFF4F4EC);
        const SKIA_Text looks = words("", MW::kColorBlack, SKIA_ALIGN_LEFT);
        MW::StaticText viewer(&area, &looks, true, true, true);
        viewer.setRect(0, &area);
-       viewer.setText(kLog);
-       viewer.get_ime_result("battery");
-       viewer.line_search(kLog);
+       viewer.setText(log.c_str());
+       viewer.get_ime_result("failed");
+       viewer.line_search(log.c_str());
        viewer.setActive(1);
        loop();
      }},
     {"static_text_plain", "StaticText without extras", "With a scroll bar only.", kThird,
      [](Loop& loop) {
-       const SKIA_Rect area = place(5, 2, 90, 30, kPaper);
+       std::string log;
+       for (int step = 1; step <= 30; ++step) {
+         log += "step " + std::to_string(step) + (step % 7 == 0 ? ": failed\n" : ": passed\n");
+       }
+       const SKIA_Rect area = place(5, 2, 90, 30, 0xFFF4F4EC);
        const SKIA_Text looks = words("", MW::kColorBlack, SKIA_ALIGN_LEFT);
        MW::StaticText viewer(&area, &looks);
-       viewer.setText(kLog);
+       viewer.setText(log.c_str());
        viewer.setActive(1);
        loop();
      }},
     {"static_text_empty", "StaticText without a text", "", kThird,
      [](Loop& loop) {
-       const SKIA_Rect area = place(5, 2, 90, 30, kPaper);
+       const SKIA_Rect area = place(5, 2, 90, 30, 0xFFF4F4EC);
        const SKIA_Text looks = words("", MW::kColorBlack, SKIA_ALIGN_LEFT);
        MW::StaticText viewer(&area, &looks);
        viewer.setText("");
@@ -59,7 +59,7 @@ constexpr auto kTexts = std::to_array<Example>({
      "after enter, what was typed is there to be read.",
      kHalf,
      [](Loop& loop) {
-       const SKIA_Rect area = place(0, 5, 100, 40, kKeys);
+       const SKIA_Rect area = place(0, 5, 100, 40, 0xFF8090A4);
        const SKIA_Text looks = words("");
        MW::Ime keyboard(&area, &looks);
        keyboard.release_cb = [](int, MW::Ime* from) {
@@ -72,7 +72,7 @@ constexpr auto kTexts = std::to_array<Example>({
      }},
     {"ime_capitals", "Ime, capitals", "", kHalf,
      [](Loop& loop) {
-       const SKIA_Rect area = place(0, 5, 100, 40, kKeys);
+       const SKIA_Rect area = place(0, 5, 100, 40, 0xFF8090A4);
        const SKIA_Text looks = words("");
        MW::Ime keyboard(&area, &looks);
        keyboard.presskey_set(MW::Ime::kCapitals);
@@ -82,7 +82,7 @@ constexpr auto kTexts = std::to_array<Example>({
      }},
     {"ime_special", "Ime, other characters", "", kHalf,
      [](Loop& loop) {
-       const SKIA_Rect area = place(0, 5, 100, 40, kKeys);
+       const SKIA_Rect area = place(0, 5, 100, 40, 0xFF8090A4);
        const SKIA_Text looks = words("");
        MW::Ime keyboard(&area, &looks);
        keyboard.presskey_set(MW::Ime::kSpecial);
@@ -92,7 +92,7 @@ constexpr auto kTexts = std::to_array<Example>({
      }},
     {"ime_digits", "Ime, digits alone", "All other keys are grey, and type nothing.", kHalf,
      [](Loop& loop) {
-       const SKIA_Rect area = place(0, 5, 100, 40, kKeys);
+       const SKIA_Rect area = place(0, 5, 100, 40, 0xFF8090A4);
        const SKIA_Text looks = words("");
        MW::Ime keyboard(&area, &looks);
        keyboard.presskey_set(MW::Ime::kOnlyDigits);
@@ -105,7 +105,8 @@ constexpr auto kTexts = std::to_array<Example>({
 }  // namespace
 
 Family texts() {
-  return {"Texts", "Long texts, and a keyboard to type short ones.", sourceOf("texts"), kTexts};
+  return {"Texts", "Long texts, and a keyboard to type short ones.", sourceOf("families/texts.cpp"),
+          kTexts};
 }
 
 }  // namespace gallery

@@ -43,8 +43,8 @@ constexpr auto kTimed = std::to_array<Example>({
 }  // namespace
 
 Family timed() {
-  return {"For a while", "What shows for a given time and takes no input.", sourceOf("timed"),
-          kTimed};
+  return {"For a while", "What shows for a given time and takes no input.",
+          sourceOf("families/timed.cpp"), kTimed};
 }
 
 }  // namespace gallery

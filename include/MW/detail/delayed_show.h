@@ -1,13 +1,14 @@
 /// A widget that appears some time after it was told to.
 #pragma once
 
+#include <MW/detail/clock_order.h>
+
 #include <cstdint>
 
 namespace MW {
 
 /// Until the first drawing pass at or after the due time the widget is not drawn and takes no
-/// events. Times are GetTicks() milliseconds and are compared as they are: a due time beyond the
-/// clock's wrap counts as reached at once. The holder's lock guards it.
+/// events. Times are GetTicks() milliseconds, compared by isLater(). The holder's lock guards it.
 class DelayedShow {
  public:
   constexpr void start(uint32_t now, uint32_t delayMs) {
@@ -15,7 +16,7 @@ class DelayedShow {
     pending = true;
   }
   constexpr bool isPending() const { return pending; }
-  constexpr bool isDue(uint32_t now) const { return pending && now >= due; }
+  constexpr bool isDue(uint32_t now) const { return pending && !isLater(due, now); }
   /// A drawing pass: whether the widget is drawn in it.
   constexpr bool draws(uint32_t now) {
     if (isDue(now)) pending = false;

@@ -16,8 +16,10 @@ class TextGesture {
  public:
   /// To be called after each press if the panel wants double taps.
   constexpr void awaitTap(uint32_t now) { taps.press(now); }
-  /// Whether a release may end a tap, which tap() is then told of.
-  constexpr bool isTapAwaited() const { return taps.isRunning(); }
+  /// Whether what has happened ends a tap, which tap() is then told of.
+  constexpr bool isTapDue(TextTouch what) const {
+    return what == TextTouch::Release && taps.isRunning();
+  }
   /// A tap: the second of a series is a double tap, a third is not.
   constexpr TextTouch tap(uint32_t now) {
     counted = taps.tap(now);

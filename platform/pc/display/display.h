@@ -8,6 +8,7 @@
 #include <optional>
 #include <string>
 
+#include "display/frame_figures.h"
 #include "input/input_service.h"
 #include "input/input_translator.h"
 #include "scene/geometry.h"
@@ -17,6 +18,7 @@ namespace brimol::pc {
 enum class DisplayChoice {
   Window,            ///< a window; an error where none can be opened
   WindowIfPossible,  ///< a window where SDL finds a video driver, headless otherwise
+  Browser,           ///< web browsers and VNC viewers; not by openDisplay()
   Headless,
 };
 
@@ -33,6 +35,9 @@ class Display {
   /// stays the caller's; it must live, at the same address, until the last wait() has returned.
   virtual void present(cairo_surface_t* picture, const Region& changed) = 0;
 
+  /// What is known of the frame that is presented next, for a display that shows it.
+  virtual void note(const FrameFigures&) {}
+
   /// Sleeps until the user does something, wake() was called, or `ms` milliseconds have passed,
   /// where they are given. Tells the input what the user did.
   virtual void wait(std::optional<uint32_t> ms) = 0;
@@ -42,6 +47,9 @@ class Display {
 
   /// True once the user has asked to close the window.
   virtual bool isCloseRequested() const = 0;
+
+  /// True once each time the user has asked for a picture of the screen.
+  virtual bool takePictureWish() { return false; }
 };
 
 /// An open display, or one line that says why there is none.

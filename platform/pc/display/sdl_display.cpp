@@ -7,14 +7,11 @@
 #include <limits>
 #include <string>
 #include <utility>
-#include <vector>
-
-#include "display/sdl_input.h"
 
 namespace brimol::pc {
 namespace {
 
-constexpr const char* kTitle = "brimol";
+constexpr const char* kTitle = "brimol (F1: keys)";
 constexpr Uint32 kWakeEvent = SDL_USEREVENT;
 // One wait passes on no more than this many events, so that frames get their turn in a flood.
 constexpr int kEventsPerWait = 256;
@@ -36,9 +33,7 @@ void setHints() {
   SDL_SetHint(SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0");
 }
 
-// On X11 the server takes the pixels as they are. The detour over a texture, which SDL prefers,
-// brings the whole window across for every change, and threads and start-up time of a graphics
-// driver. The other drivers know no other way.
+// The detour over a texture, which SDL prefers, costs what WindowPixels says.
 void chooseShortWay() {
   const std::string driver = SDL_GetCurrentVideoDriver();
   if (driver == "x11") {
@@ -61,8 +56,9 @@ Size desktopRoom(SDL_Window* window) {
   return {std::max(usable.w - left - right, 1), std::max(usable.h - top - bottom, 1)};
 }
 
-SDL_Rect toSdl(const cairo_rectangle_int_t& part) {
-  return {part.x, part.y, part.width, part.height};
+// No larger than the screen, nor than the desktop's room.
+Size openingSize(Size screen, Size room) {
+  return fittedSize(screen, {std::min(room.w, screen.w), std::min(room.h, screen.h)});
 }
 
 }  // namespace
@@ -85,28 +81,36 @@ OpenedDisplay SdlDisplay::open(Size screen, InputTranslator& input, const InputS
 }
 
 SdlDisplay::SdlDisplay(Size screenSize, InputTranslator& target, const InputService& clock)
-    : screen(screenSize), input(target), service(clock) {
+    : screen(screenSize), input(screenSize, target), service(clock) {
   if (!video.isOpen) return;
-  wantedSize = fittedSize(screen, desktopRoom(nullptr));
+  wantedSize = openingSize(screen, desktopRoom(nullptr));
   window.reset(SDL_CreateWindow(kTitle, SDL_WINDOWPOS_UNDEFINED, SDL_WINDOWPOS_UNDEFINED,
-                                wantedSize.w, wantedSize.h, 0));
-  if (window) takeWindowSize();
+                                wantedSize.w, wantedSize.h,
+                                SDL_WINDOW_RESIZABLE | SDL_WINDOW_ALLOW_HIGHDPI));
+  if (!window) return;
+  pixels = WindowPixels::of(window.get());
+  takeWindowSize();
 }
 
 void SdlDisplay::present(cairo_surface_t* picture, const Region& changed) {
   latest = picture;
-  show(canvas->update(picture, changed));
+  const Region parts = canvas->update(picture, changed);
+  overlay.isEmpty() ? pixels->show(canvas->pixels(), parts) : showAll();
 }
 
 void SdlDisplay::wait(std::optional<uint32_t> ms) {
-  const uint32_t longest = std::numeric_limits<int>::max();
+  constexpr uint32_t kLongest = std::numeric_limits<int>::max();
+  const std::optional<uint32_t> tick = input.msToTick(service.now());
+  const uint32_t least = std::min({ms.value_or(kLongest), tick.value_or(kLongest), kLongest});
   SDL_Event event;
-  int isEvent = ms ? SDL_WaitEventTimeout(&event, static_cast<int>(std::min(*ms, longest)))
-                   : SDL_WaitEvent(&event);
+  int isEvent =
+      ms || tick ? SDL_WaitEventTimeout(&event, static_cast<int>(least)) : SDL_WaitEvent(&event);
   for (int count = 1; isEvent != 0; ++count) {
     handle(event);
     isEvent = count < kEventsPerWait ? SDL_PollEvent(&event) : 0;
   }
+  input.tick(service.now());
+  if (overlay.setFingers(input.fingers())) showAll();
 }
 
 void SdlDisplay::wake() {
@@ -122,8 +126,13 @@ void SdlDisplay::handle(const SDL_Event& event) {
     case kWakeEvent: wakeIsComing = false; return;
     case SDL_WINDOWEVENT: return handleWindow(event.window);
     case SDL_QUIT: closeRequested = true; return input.releaseAll();
-    default: return passOn(event, canvas->fit(), service.now(), input);
+    case SDL_KEYDOWN:
+    case SDL_KEYUP:
+      if (takeDisplayKey(event.key)) return;
+      break;
+    default: break;
   }
+  input.take(event, {canvas->fit(), points}, service.now());
 }
 
 void SdlDisplay::handleWindow(const SDL_WindowEvent& event) {
@@ -137,41 +146,48 @@ void SdlDisplay::handleWindow(const SDL_WindowEvent& event) {
   }
 }
 
-// The borders are known only once a window manager has put them around the window.
+bool SdlDisplay::takeDisplayKey(const SDL_KeyboardEvent& event) {
+  const std::optional<DisplayKey> key = displayKey(event.keysym.sym);
+  if (key && event.type == SDL_KEYDOWN && event.repeat == 0) play(*key);
+  return key.has_value();
+}
+
+void SdlDisplay::play(DisplayKey key) {
+  switch (key) {
+    case DisplayKey::ListKeys: overlay.toggleKeys(); return showAll();
+    case DisplayKey::ShowFigures: overlay.toggleFigures(); return showAll();
+    case DisplayKey::FullScreen: return toggleFullScreen();
+    case DisplayKey::SavePicture: wantsPicture = true; return;
+  }
+}
+
+void SdlDisplay::toggleFullScreen() {
+  const bool isFull = (SDL_GetWindowFlags(window.get()) & SDL_WINDOW_FULLSCREEN_DESKTOP) != 0;
+  SDL_SetWindowFullscreen(window.get(), isFull ? 0 : SDL_WINDOW_FULLSCREEN_DESKTOP);
+}
+
+// The borders are known only once a window manager has put them around the window. A window that
+// has another size than it was asked to have was sized by somebody else, and stays so.
 void SdlDisplay::fitToDesktop() {
-  const Size fitted = fittedSize(screen, desktopRoom(window.get()));
-  if (fitted == wantedSize) return;
+  const Size fitted = openingSize(screen, desktopRoom(window.get()));
+  if (fitted == wantedSize || points != wantedSize) return;
   wantedSize = fitted;
   SDL_SetWindowSize(window.get(), fitted.w, fitted.h);
 }
 
 void SdlDisplay::takeWindowSize() {
-  Size size = {};
-  SDL_GetWindowSize(window.get(), &size.w, &size.h);
-  canvas.emplace(screen, size);
-  cairo_surface_t* const pixels = canvas->pixels();
-  content.reset(SDL_CreateRGBSurfaceWithFormatFrom(
-      cairo_image_surface_get_data(pixels), canvas->fit().window.w, canvas->fit().window.h,
-      SDL_BITSPERPIXEL(SDL_PIXELFORMAT_RGB888), cairo_image_surface_get_stride(pixels),
-      SDL_PIXELFORMAT_RGB888));
+  SDL_GetWindowSize(window.get(), &points.w, &points.h);
+  canvas.emplace(screen, pixels->size());
   if (latest != nullptr) canvas->update(latest, {{0, 0, screen.w, screen.h}});
   showAll();
 }
 
-void SdlDisplay::showAll() { show({{0, 0, canvas->fit().window.w, canvas->fit().window.h}}); }
-
-// Where SDL has no surface for the window at the moment, it will expose the window later.
-void SdlDisplay::show(const Region& parts) {
-  SDL_Surface* const shown = SDL_GetWindowSurface(window.get());
-  if (shown == nullptr || !content || parts.empty()) return;
-  std::vector<SDL_Rect> updated;
-  for (const cairo_rectangle_int_t& part : parts) {
-    const SDL_Rect from = toSdl(part);
-    SDL_Rect to = from;
-    SDL_BlitSurface(content.get(), &from, shown, &to);  // leaves in `to` what the window has of it
-    updated.push_back(to);
-  }
-  SDL_UpdateWindowSurfaceRects(window.get(), updated.data(), static_cast<int>(updated.size()));
+void SdlDisplay::showAll() {
+  const WindowFit& fit = canvas->fit();
+  cairo_surface_t* const dressed =
+      overlay.isEmpty() ? nullptr : overlay.drawOver(canvas->pixels(), fit);
+  pixels->show(dressed == nullptr ? canvas->pixels() : dressed,
+               {{0, 0, fit.window.w, fit.window.h}});
 }
 
 }  // namespace brimol::pc

@@ -1,14 +1,14 @@
 /// The pixels of a window that shows the screen's picture.
 #pragma once
 
-#include "display/downscaler.h"
+#include "display/scaler.h"
 #include "display/window_fit.h"
 #include "scene/cairo_handles.h"
 #include "scene/geometry.h"
 
 namespace brimol::pc {
 
-/// A window's content: the picture, scaled down to fit, on black. One thread uses it.
+/// A window's content: the picture, scaled to fit, on black. One thread uses it.
 class WindowCanvas {
  public:
   /// Black, of the window's size; window sides below 1 count as 1.
@@ -25,7 +25,7 @@ class WindowCanvas {
 
  private:
   WindowFit placement;
-  Downscaler scaler;
+  Scaler scaler;
   CairoSurface content;
 };
 

@@ -42,7 +42,6 @@ bool hasProportionsOf(Size screen, Size window) {
 }  // namespace
 
 Size fittedSize(Size screen, Size area) {
-  if (screen.w <= area.w && screen.h <= area.h) return screen;
   const bool widthDecides = std::int64_t{area.w} * screen.h <= std::int64_t{area.h} * screen.w;
   return widthDecides ? Size{area.w, sideFor(area.w, screen.h, screen.w)}
                       : Size{sideFor(area.h, screen.w, screen.h), area.h};
@@ -50,8 +49,7 @@ Size fittedSize(Size screen, Size area) {
 
 WindowFit WindowFit::of(Size screen, Size window) {
   const Size area = {std::max(window.w, 1), std::max(window.h, 1)};
-  const bool isSmaller = area.w <= screen.w && area.h <= screen.h;
-  const Size fitted = isSmaller && hasProportionsOf(screen, area) ? area : fittedSize(screen, area);
+  const Size fitted = hasProportionsOf(screen, area) ? area : fittedSize(screen, area);
   return {screen, area, {(area.w - fitted.w) / 2, (area.h - fitted.h) / 2, fitted.w, fitted.h}};
 }
 

@@ -15,11 +15,10 @@ struct WindowPoint {
 };
 
 /// The largest picture of `screen` that fits into `area`, whose sides are at least 1, in the same
-/// proportions: never larger than the screen itself, and at least one pixel each way. What is not
-/// whole is rounded down.
+/// proportions, at least one pixel each way. What is not whole is rounded down.
 Size fittedSize(Size screen, Size area);
 
-/// The screen's picture, scaled down to fit a window and centred in it.
+/// The screen's picture, scaled to fit a window and centred in it.
 struct WindowFit {
   Size screen;
   Size window;

@@ -5,6 +5,7 @@
 #include <brimol/scene.h>
 
 #include <chrono>
+#include <iostream>
 #include <string>
 
 #include "clock/inside_wait.h"
@@ -43,7 +44,11 @@ std::string writeScreenshot(const char* path) {
 
 using brimol::pc::openedPlatform;
 
-int brimol_host_open() { return brimol::pc::resultOf(brimol::pc::openPlatform()); }
+int brimol_host_open() {
+  const int result = brimol::pc::resultOf(brimol::pc::openPlatform());
+  if (result == 0) std::cerr << brimol_host_error() << '\n';
+  return result;
+}
 
 const char* brimol_host_error() { return brimol::pc::lastError.c_str(); }
 

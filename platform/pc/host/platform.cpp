@@ -2,14 +2,25 @@
 
 #include <cstdio>
 #include <cstdlib>
+#include <ctime>
+#include <filesystem>
 #include <utility>
 
 #include "clock/process_clock.h"
+#include "host/saved_picture.h"
 #include "host/session.h"
 #include "painter/painter.h"
+#include "remote/browser_display.h"
 
 namespace brimol::pc {
 namespace {
+
+using std::chrono::duration_cast;
+using std::chrono::microseconds;
+using std::chrono::steady_clock;
+
+// A frame that comes later than this after an event is none that the event caused.
+constexpr std::chrono::seconds kLongestAnswer{1};
 
 CairoSurface copyOf(cairo_surface_t* picture) {
   CairoSurface copy(cairo_image_surface_create(CAIRO_FORMAT_RGB24,
@@ -30,6 +41,14 @@ SKIA_Item veilOver(Size screen, int percent) {
   constexpr int kAlphaShift = 24;
   const auto alpha = static_cast<uint32_t>(percent * kOpaqueAlpha / kWhole);
   return {SKIA_BOX, {0, 0, screen.w, screen.h, alpha << kAlphaShift}, {}, {}};
+}
+
+OpenedDisplay openChosen(const Settings& settings, InputTranslator& input,
+                         const InputService& service) {
+  if (settings.display == DisplayChoice::Browser) {
+    return BrowserDisplay::open(settings.screen, settings.listen, input, service);
+  }
+  return openDisplay(settings.display, settings.screen, input, service);
 }
 
 constinit thread_local bool isPlatformThread = false;
@@ -115,7 +134,7 @@ void Platform::run(std::promise<std::string> opened) {
   isPlatformThread = true;
   if (auto* const clock = turnClock()) clock->stayOutside();
   InputTranslator input(settings.screen, service);
-  const OpenedDisplay outcome = openDisplay(settings.display, settings.screen, input, service);
+  const OpenedDisplay outcome = openChosen(settings, input, service);
   if (!outcome.display) {
     opened.set_value(outcome.error);
     return;
@@ -131,17 +150,36 @@ void Platform::run(std::promise<std::string> opened) {
 void Platform::serve(Display& display, InputTranslator& input) {
   Painter painter(settings.screen);
   for (auto work = takeWork(); work; work = takeWork()) {
-    if (work->frame) {
-      const Region changed = painter.paint(*work->frame);
-      display.present(painter.picture(), changed);
-    }
+    if (work->frame) show(*work->frame, painter, display);
     for (const Action& action : work->actions) action(input);
     for (auto& picture : work->pictures) picture.set_value(copyOf(painter.picture()));
     input.tick(service.now());
     display.wait(input.msToLongPress(service.now()));
-    if (display.isCloseRequested() && !closeRequested.exchange(true)) {
-      if (Session* const recorded = session()) recorded->userCloses();
-    }
+    attend(display, painter);
+  }
+}
+
+void Platform::show(const Frame& frame, Painter& painter, Display& display) const {
+  const auto start = steady_clock::now();
+  const Region changed = painter.paint(frame);
+  const auto end = steady_clock::now();
+  FrameFigures figures = {painter.frame(), changed, duration_cast<microseconds>(end - start), {}};
+  if (const auto arrival = service.takeFirstArrival(); arrival && end - *arrival < kLongestAnswer) {
+    figures.sinceInput = duration_cast<microseconds>(end - *arrival);
+  }
+  display.note(figures);
+  display.present(painter.picture(), changed);
+}
+
+// To what the user asked of the display.
+void Platform::attend(Display& display, const Painter& painter) {
+  if (display.takePictureWish()) {
+    const std::string outcome =
+        savePicture(painter.picture(), std::filesystem::current_path(), std::time(nullptr));
+    std::fprintf(stderr, "brimol: %s\n", outcome.c_str());
+  }
+  if (display.isCloseRequested() && !closeRequested.exchange(true)) {
+    if (Session* const recorded = session()) recorded->userCloses();
   }
 }
 

@@ -22,6 +22,8 @@
 
 namespace brimol::pc {
 
+class Painter;
+
 /// An open screen. Its thread sleeps until a frame, the user or a long press that falls due gives
 /// it something to do. Any thread may call any operation; a closed platform ignores them.
 class Platform {
@@ -75,6 +77,8 @@ class Platform {
   Platform(const Settings& wanted, InputService& target) : settings(wanted), service(target) {}
   void run(std::promise<std::string> opened);
   void serve(Display& display, InputTranslator& input);
+  void show(const Frame& frame, Painter& painter, Display& display) const;
+  void attend(Display& display, const Painter& painter);
   std::optional<Work> takeWork();
   void setDisplay(Display* display);
   template <typename Change>

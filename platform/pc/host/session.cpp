@@ -49,7 +49,11 @@ bool isSameFrame(const Frame& one, const Frame& other) {
 }
 
 const char* nameOf(DisplayChoice display) {
-  return display == DisplayChoice::Headless ? "headless" : "window";
+  switch (display) {
+    case DisplayChoice::Headless: return "headless";
+    case DisplayChoice::Browser: return "browser";
+    default: return "window";
+  }
 }
 
 }  // namespace
@@ -75,6 +79,7 @@ Session::Session(SessionSettings wanted) : settings(std::move(wanted)), problem(
 void Session::takeScreen() {
   const SettingsResult wanted = readSettings();
   screenSize = wanted.settings.screen;
+  density = wanted.settings.density;
   display = wanted.settings.display;
   if (problem.empty()) problem = wanted.error;
   const std::optional<Size>& size = parsed.trace.screen;
@@ -88,7 +93,8 @@ void Session::takeScreen() {
 
 void Session::startReport() {
   report.emplace(settings.reportFolder, problem);
-  report->start(settings, screenSize, nameOf(display), turns ? turns->ticksAtStart() : 0);
+  report->start(settings, {screenSize, density, nameOf(display)},
+                turns ? turns->ticksAtStart() : 0);
 }
 
 void Session::startClock() {

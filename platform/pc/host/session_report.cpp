@@ -13,6 +13,7 @@
 #include "host/png_file.h"
 #include "input/trace_recorder.h"
 #include "input/trace_steps.h"
+#include "scene/item.h"
 #include "scene/item_text.h"
 #include "scene/shown_texts.h"
 
@@ -82,6 +83,16 @@ const char* nameOf(ClockChoice clock) {
   return "real";
 }
 
+ordered_json wordsOf(const SKIA_Item& item) {
+  const auto& [x, y, w, h, ground] = item.rect;
+  const auto& [x1, y1, x2, y2, color, width] = item.point;
+  return {{"kind", item.kind},
+          {"rect", {x, y, w, h, ground}},
+          {"line", {x1, y1, x2, y2, color, width}},
+          {"text", shownText(item.text)},
+          {"font", {item.text.color, item.text.align, item.text.size}}};
+}
+
 }  // namespace
 
 SessionReport::SessionReport(std::filesystem::path where, std::string& error)
@@ -92,16 +103,18 @@ SessionReport::SessionReport(std::filesystem::path where, std::string& error)
   if (!file) error = "BRIMOL_REPORT_DIR=" + folder.native() + ": cannot be written";
 }
 
-void SessionReport::start(const SessionSettings& settings, Size screen, const char* display,
+void SessionReport::start(const SessionSettings& settings, const SessionScreen& screen,
                           uint32_t clockStart) {
+  listsItems = settings.listsItems;
   std::error_code failure;
   ordered_json line = lineOf("start", 0);
   line["format"] = kFormat;
   line["program"] = std::filesystem::read_symlink("/proc/self/exe", failure).native();
   line["arguments"] = argumentsOfProcess();
   line["version"] = BRIMOL_VERSION;
-  line["screen"] = {{"width", screen.w}, {"height", screen.h}};
-  line["display"] = display;
+  line["screen"] = {
+      {"width", screen.size.w}, {"height", screen.size.h}, {"density", screen.density}};
+  line["display"] = screen.display;
   line["clock"] = nameOf(settings.clock);
   line["clock_start"] = clockStart;
   line["trace"] = orNull(settings.trace);
@@ -149,9 +162,13 @@ void SessionReport::frame(const SessionFrame& shown, Size screen, cairo_surface_
   line["hash"] = hashText(hashOf(shown.items));
   line["items"] = shown.items.size();
   line["texts"] = ordered_json::array();
-  for (const auto& [text, area] : shownTexts(shown.frame, screen)) {
+  for (const auto& [text, area, item] : shownTexts(shown.frame, screen)) {
     line["texts"].push_back(
         {{"text", text}, {"x", area.x}, {"y", area.y}, {"w", area.width}, {"h", area.height}});
+  }
+  if (listsItems) {
+    line["drawn"] = ordered_json::array();
+    for (const SKIA_Item& item : shown.frame) line["drawn"].push_back(wordsOf(item));
   }
   const std::string name = pictureName(shown.number);
   const bool isWritten = picture != nullptr && writePng(picture, folder / name).empty();

@@ -23,6 +23,13 @@ struct SessionFrame {
   const std::vector<std::string>& items;
 };
 
+/// The screen of a session, known before it opens.
+struct SessionScreen {
+  Size size = {};
+  float density = 0;  // dots per inch
+  const char* display = "";
+};
+
 /// Writes into a folder that it makes, each line when it happens. Not guarded: Session is. Times
 /// are milliseconds since the start.
 class SessionReport {
@@ -30,8 +37,7 @@ class SessionReport {
   /// `error` says in one line why the folder cannot be used.
   SessionReport(std::filesystem::path where, std::string& error);
 
-  void start(const SessionSettings& settings, Size screen, const char* display,
-             uint32_t clockStart);
+  void start(const SessionSettings& settings, const SessionScreen& screen, uint32_t clockStart);
   void step(uint64_t time, const TraceLine& place);
   void event(uint64_t time, const Event& record, const TraceLine* place);
   void close(uint64_t time, const TraceLine* place);
@@ -50,6 +56,7 @@ class SessionReport {
  private:
   std::filesystem::path folder;
   std::ofstream file;
+  bool listsItems = false;
 };
 
 }  // namespace brimol::pc

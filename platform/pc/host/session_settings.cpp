@@ -13,6 +13,7 @@ namespace {
 constexpr const char* kClockVariable = "BRIMOL_CLOCK";
 constexpr const char* kStartVariable = "BRIMOL_CLOCK_START";
 constexpr const char* kPicturesVariable = "BRIMOL_REPORT_PICTURES";
+constexpr const char* kItemsVariable = "BRIMOL_REPORT_ITEMS";
 
 std::string valueOf(const VariableLookup& lookup, const char* name) {
   const char* const value = lookup(name);
@@ -69,6 +70,13 @@ std::string readPictures(const VariableLookup& lookup, SessionSettings& settings
   return std::string(kPicturesVariable) + "=" + value + ": wanted changed or none";
 }
 
+std::string readItems(const VariableLookup& lookup, SessionSettings& settings) {
+  const std::string value = valueOf(lookup, kItemsVariable);
+  settings.listsItems = value == "changed";
+  if (value.empty() || value == "none" || value == "changed") return {};
+  return std::string(kItemsVariable) + "=" + value + ": wanted changed or none";
+}
+
 }  // namespace
 
 SessionSettings readSessionSettings(const VariableLookup& lookup) {
@@ -78,7 +86,8 @@ SessionSettings readSessionSettings(const VariableLookup& lookup) {
   settings.reportFolder = valueOf(lookup, "BRIMOL_REPORT_DIR");
   const std::string clockError = readClock(lookup, settings);
   for (const std::string& error :
-       {clockError, readStart(lookup, settings), readPictures(lookup, settings)}) {
+       {clockError, readStart(lookup, settings), readPictures(lookup, settings),
+        readItems(lookup, settings)}) {
     if (settings.error.empty()) settings.error = error;
   }
   if (!settings.trace.empty() && !settings.recording.empty()) {

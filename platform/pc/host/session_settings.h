@@ -18,11 +18,12 @@ struct SessionSettings {
   std::string recording;      // what is recorded into; empty: nothing
   std::string reportFolder;   // empty: none
   bool keepsPictures = true;  // of the frames, in that folder
+  bool listsItems = false;    // of the frames, in the session's file
   std::string error;          // one line about the first wrong value; empty: none is wrong
 };
 
 /// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_TRACE, BRIMOL_RECORD,
-/// BRIMOL_REPORT_DIR and BRIMOL_REPORT_PICTURES; an empty value is no value.
+/// BRIMOL_REPORT_DIR, BRIMOL_REPORT_PICTURES and BRIMOL_REPORT_ITEMS; an empty value is no value.
 SessionSettings readSessionSettings(const VariableLookup& lookup);
 
 }  // namespace brimol::pc

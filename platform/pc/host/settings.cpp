@@ -14,6 +14,7 @@ namespace brimol::pc {
 namespace {
 
 constexpr const char* kDisplayVariable = "BRIMOL_DISPLAY";
+constexpr const char* kListenVariable = "BRIMOL_LISTEN";
 constexpr const char* kDeviceVariable = "BRIMOL_DEVICE";
 constexpr const char* kScreenVariable = "BRIMOL_SCREEN";
 constexpr std::array kDesktopVariables = {"DISPLAY", "WAYLAND_DISPLAY"};
@@ -63,10 +64,12 @@ std::string readDisplay(const VariableLookup& lookup, DisplayChoice& display) {
   const std::string_view value = valueOf(lookup, kDisplayVariable);
   if (value == "headless") {
     display = DisplayChoice::Headless;
+  } else if (value == "browser") {
+    display = DisplayChoice::Browser;
   } else if (value == "window" || (value.empty() && hasDesktop(lookup))) {
     display = DisplayChoice::Window;
   } else if (!value.empty()) {
-    return wrongValue(kDisplayVariable, value, "window or headless");
+    return wrongValue(kDisplayVariable, value, "window, browser or headless");
   }
   return {};
 }
@@ -80,6 +83,14 @@ std::string readDevice(const VariableLookup& lookup, Settings& settings) {
   settings.density = device->density;
   settings.isSizeGiven = true;
   return {};
+}
+
+std::string readListen(const VariableLookup& lookup, std::optional<ListenAddress>& listen) {
+  const std::string_view value = valueOf(lookup, kListenVariable);
+  if (value.empty()) return {};
+  listen = parseListenAddress(value);
+  if (listen) return {};
+  return wrongValue(kListenVariable, value, "ADDRESS:PORT, such as 127.0.0.1:5800 or [::1]:0");
 }
 
 std::string readScreen(const VariableLookup& lookup, Settings& settings) {
@@ -100,8 +111,8 @@ std::string readScreen(const VariableLookup& lookup, Settings& settings) {
 SettingsResult readSettings(const VariableLookup& lookup) {
   SettingsResult result;
   for (const std::string& error :
-       {readDisplay(lookup, result.settings.display), readDevice(lookup, result.settings),
-        readScreen(lookup, result.settings)}) {
+       {readDisplay(lookup, result.settings.display), readListen(lookup, result.settings.listen),
+        readDevice(lookup, result.settings), readScreen(lookup, result.settings)}) {
     if (result.error.empty()) result.error = error;
   }
   return result;

@@ -3,7 +3,8 @@
 ///
 /// | variable | value | without it |
 /// |---|---|---|
-/// | BRIMOL_DISPLAY | window or headless | a window where SDL finds a driver for one |
+/// | BRIMOL_DISPLAY | window, browser or headless | a window where SDL finds a driver for one |
+/// | BRIMOL_LISTEN | ADDRESS:PORT, where browsers connect | 127.0.0.1, port 5800 or a free one |
 /// | BRIMOL_DEVICE | a name of brimol/device.h: size and density | 1440x2560, 489.5 dots per inch |
 /// | BRIMOL_SCREEN | WIDTHxHEIGHT in pixels, each 1 to 16384; the density stays | the device's |
 /// | BRIMOL_TRACE | the trace that is played | none is |
@@ -16,9 +17,11 @@
 #pragma once
 
 #include <functional>
+#include <optional>
 #include <string>
 
 #include "display/display.h"
+#include "remote/listener.h"
 #include "scene/geometry.h"
 
 namespace brimol::pc {
@@ -34,6 +37,7 @@ struct Settings {
   Size screen = kDefaultScreen;  // pixels, each side 1 to kMaxScreenSide
   float density = kDefaultDensity;
   bool isSizeGiven = false;  // by BRIMOL_DEVICE or BRIMOL_SCREEN
+  std::optional<ListenAddress> listen;
 };
 
 struct SettingsResult {
@@ -44,8 +48,8 @@ struct SettingsResult {
 /// Gives the value of a variable, or null where it is not set.
 using VariableLookup = std::function<const char*(const char* name)>;
 
-/// Reads BRIMOL_DISPLAY, BRIMOL_DEVICE and BRIMOL_SCREEN. DISPLAY or WAYLAND_DISPLAY tell of a
-/// desktop. Opens nothing.
+/// Reads BRIMOL_DISPLAY, BRIMOL_LISTEN, BRIMOL_DEVICE and BRIMOL_SCREEN. DISPLAY or WAYLAND_DISPLAY
+/// tell of a desktop. Opens nothing.
 SettingsResult readSettings(const VariableLookup& lookup);
 
 /// The same from the process's own environment.

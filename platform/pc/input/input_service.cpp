@@ -40,6 +40,7 @@ void InputService::deliver(const Event& record) {
     if (!isOpen) return;
     queue.push(record);
     lastActivity = steady_clock::now();
+    if (!firstArrival) firstArrival = lastActivity;
   }
   wake.notify_all();
 }
@@ -50,6 +51,11 @@ bool InputService::poll(Event& record) {
   const bool isGiven = queue.take(record);
   earlyEnds.hearOfPoll(isGiven);
   return isGiven;
+}
+
+std::optional<std::chrono::steady_clock::time_point> InputService::takeFirstArrival() {
+  const std::lock_guard lock(mutex);
+  return std::exchange(firstArrival, std::nullopt);
 }
 
 uint32_t InputService::now() const {

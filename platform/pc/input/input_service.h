@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <functional>
 #include <mutex>
+#include <optional>
 #include <thread>
 
 #include "clock/clock.h"
@@ -40,6 +41,10 @@ class InputService {
   /// Moves the next record to `record` and returns true, or returns false when none waits. The
   /// calling thread is the polling thread from here on.
   bool poll(Event& record);
+
+  /// When the first record came since this was last asked, by the steady clock; none where none
+  /// came.
+  std::optional<std::chrono::steady_clock::time_point> takeFirstArrival();
 
   /// Milliseconds; wraps.
   uint32_t now() const;
@@ -79,6 +84,7 @@ class InputService {
   Clock clock;
   InputQueue queue;
   bool isOpen = false;
+  std::optional<std::chrono::steady_clock::time_point> firstArrival;
   uint32_t handChanges = 0;  // how often the hand was put on or taken off
   std::thread::id poller;
   Time lastActivity;  // a record arrived, or something was drawn

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <array>
 #include <string_view>
+#include <utility>
 
 #include "input/long_press.h"
 
@@ -36,21 +37,49 @@ constexpr auto kKeyTable = std::to_array<KeyRow>({
     {SDLK_BACKSPACE, BRIMOL_CODE_BACK, "Backspace", "back"},
 });
 
-constexpr std::size_t kLabelColumns = 20;
+struct DisplayKeyRow {
+  SDL_Keycode key;
+  DisplayKey means;
+  std::string_view label;
+  std::string_view does;
+};
 
-std::string helpLine(std::string_view label, const std::string& meaning) {
-  std::string line = "  ";
-  line += label;
-  line.append(kLabelColumns - std::min(label.size(), kLabelColumns - 1), ' ');
-  return line + meaning + "\n";
+// In the order of the help. None is a key of the phone.
+constexpr auto kDisplayKeys = std::to_array<DisplayKeyRow>({
+    {SDLK_F1, DisplayKey::ListKeys, "F1", "list the keys, or hide the list"},
+    {SDLK_F10, DisplayKey::ShowFigures, "F10", "show what was repainted and how fast, or hide it"},
+    {SDLK_F11, DisplayKey::FullScreen, "F11", "full screen, or a window again"},
+    {SDLK_F12, DisplayKey::SavePicture, "F12", "save a picture in the working directory"},
+});
+
+constexpr std::size_t kLabelColumns = 20;
+constexpr std::size_t kMeaningColumns = 56;
+
+// In lines of kMeaningColumns, where its words allow it.
+std::string helpLines(const HelpRow& row) {
+  std::string lines;
+  std::string_view rest = row.meaning;
+  for (std::string_view label = row.label; !rest.empty(); label = {}) {
+    std::size_t end = rest.size();
+    if (end > kMeaningColumns) end = std::min(rest.rfind(' ', kMeaningColumns), end);
+    lines.append("  ").append(label).append(kLabelColumns - label.size(), ' ');
+    lines.append(rest.substr(0, end)).append("\n");
+    rest.remove_prefix(std::min(end + 1, rest.size()));
+  }
+  return lines;
 }
 
-std::string mouseHelp() {
+std::vector<HelpRow> mouseRows() {
   const std::string hold = std::to_string(LongPress::kHoldMs) + " ms";
-  return helpLine("Left button", "the first finger; held still for " + hold + ": a long press") +
-         helpLine("Shift", "held as the button is released: the finger stays down,") +
-         helpLine("", "and the button plays the next one, until Shift is up") +
-         helpLine("Touch", "every touch is a finger of its own");
+  return {{"Left button", "the first finger; held still for " + hold + ": a long press"},
+          {"Shift",
+           "held as the button is released: the finger stays down, and the button plays the next "
+           "one, until Shift is up"},
+          {"Ctrl",
+           "held as the button is pressed: a second finger, opposite the mouse as seen from where "
+           "it was when Ctrl went down"},
+          {"Wheel", "a finger that drags from where the mouse is"},
+          {"Touch", "every touch is a finger of its own"}};
 }
 
 }  // namespace
@@ -73,12 +102,28 @@ std::optional<uint32_t> phoneKeyNamed(std::string_view name) {
   return row->code;
 }
 
+std::optional<DisplayKey> displayKey(SDL_Keycode key) {
+  const auto* const row = std::ranges::find(kDisplayKeys, key, &DisplayKeyRow::key);
+  if (row == kDisplayKeys.end()) return std::nullopt;
+  return row->means;
+}
+
+std::vector<HelpRow> helpRows() {
+  std::vector<HelpRow> rows;
+  for (const KeyRow& row : kKeyTable) {
+    rows.push_back({row.label, std::string(row.plays) + " (" + std::to_string(row.code) + ")"});
+  }
+  rows.push_back({});
+  for (HelpRow& row : mouseRows()) rows.push_back(std::move(row));
+  rows.push_back({});
+  for (const DisplayKeyRow& row : kDisplayKeys) rows.push_back({row.label, std::string(row.does)});
+  return rows;
+}
+
 std::string helpText() {
   std::string text;
-  for (const KeyRow& row : kKeyTable) {
-    text += helpLine(row.label, std::string(row.plays) + " (" + std::to_string(row.code) + ")");
-  }
-  return text + mouseHelp();
+  for (const HelpRow& row : helpRows()) text += helpLines(row);
+  return text;
 }
 
 }  // namespace brimol::pc

@@ -7,6 +7,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace brimol::pc {
 
@@ -17,7 +18,23 @@ std::optional<uint32_t> phoneKey(SDL_Keycode key);
 /// any other text.
 std::optional<uint32_t> phoneKeyNamed(std::string_view name);
 
-/// The keys and the rules of the mouse, a line each, every line with its line end.
+/// What a key does to the display and not to the phone.
+enum class DisplayKey { ListKeys, ShowFigures, FullScreen, SavePicture };
+
+/// None where the key is none of the display's.
+std::optional<DisplayKey> displayKey(SDL_Keycode key);
+
+/// A key or a way to use the mouse, and what it does.
+struct HelpRow {
+  std::string_view label;
+  std::string meaning;
+};
+
+/// The phone's keys, the rules of the mouse, and the display's keys, in this order, with a row
+/// without words between them.
+std::vector<HelpRow> helpRows();
+
+/// The same as lines, every line with its line end.
 std::string helpText();
 
 }  // namespace brimol::pc

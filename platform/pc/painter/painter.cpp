@@ -71,6 +71,8 @@ Region Painter::paint(const Frame& next) {
   return changed;
 }
 
+const Frame& Painter::frame() const { return parts->shown; }
+
 cairo_surface_t* Painter::picture() const { return parts->canvas.surface(); }
 
 }  // namespace brimol::pc

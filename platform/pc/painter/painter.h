@@ -23,6 +23,9 @@ class Painter {
   /// Makes `next` the picture shown and returns the pixels that were repainted.
   Region paint(const Frame& next);
 
+  /// What the picture shows, as it was given.
+  const Frame& frame() const;
+
   /// The picture: CAIRO_FORMAT_RGB24 in the screen's size, owned by the painter, flushed.
   cairo_surface_t* picture() const;
 

@@ -40,38 +40,72 @@ int64_t aligned(const Edges& box, int align, int width) {
 
 bool isNear(int64_t position) { return position >= -kFarAway && position <= kFarAway; }
 
-// Line by line, since each is aligned to the box and not to the longest of them. In a box with room
-// for fewer lines, those whose middle lies outside are left out, and the others are whole.
-void showLines(cairo_t* context, PangoLayout* layout, const Edges& box, int align) {
+// Whether the text is one that draws something.
+bool isDrawn(const SKIA_Text& text) {
+  return textSizeOf(text) != 0 && alphaOf(text.color) != 0 && !shownText(text).empty();
+}
+
+// Visits the layout's lines with the place of each one's beginning on its baseline. Line by line,
+// since each is aligned to the box and not to the longest of them. In a box with room for fewer lines,
+// those whose middle lies outside are left out, and the others are whole. False: some are left out.
+template <typename Visit>
+bool visitLines(PangoLayout* layout, const Edges& box, int align, Visit visit) {
   int height = 0;
   pango_layout_get_size(layout, nullptr, &height);
   const int64_t top = centred(box.top, box.bottom, pixelsOf(height));
   const LayoutIterator iter(pango_layout_get_iter(layout));
+  bool isWhole = true;
   do {
     PangoRectangle extents;
     pango_layout_iter_get_line_extents(iter.get(), nullptr, &extents);
     const int64_t middle = top + pixelsOf(extents.y + extents.height / 2);
-    if (middle < box.top || middle > box.bottom) continue;
     const int64_t x = aligned(box, align, pixelsOf(extents.width));
     const int64_t y = top + pixelsOf(pango_layout_iter_get_baseline(iter.get()));
-    if (!isNear(x) || !isNear(y)) continue;
-    cairo_move_to(context, static_cast<double>(x), static_cast<double>(y));
-    pango_cairo_show_layout_line(context, pango_layout_iter_get_line_readonly(iter.get()));
+    const bool isInBox = middle >= box.top && middle <= box.bottom;
+    isWhole = isWhole && isInBox;
+    if (isInBox && isNear(x) && isNear(y)) {
+      visit(pango_layout_iter_get_line_readonly(iter.get()), x, y);
+    }
   } while (pango_layout_iter_next_line(iter.get()) != FALSE);
+  return isWhole;
+}
+
+Edges around(const Edges& one, const Edges& other) {
+  if (isEmpty(one)) return other;
+  return {std::min(one.left, other.left), std::min(one.top, other.top),
+          std::max(one.right, other.right), std::max(one.bottom, other.bottom)};
 }
 
 }  // namespace
 
 void TextPainter::draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_Text& text,
                        const Pixels& clip) {
-  if (textSizeOf(text) == 0 || alphaOf(text.color) == 0 || shownText(text).empty()) return;
+  if (!isDrawn(text)) return;
   PangoLayout* const layout = layoutOf(text);
   cairo_t* const context = canvas.context();
   cairo_save(context);
   cairo_rectangle(context, clip.x, clip.y, clip.width, clip.height);
   cairo_clip(context);
-  showLines(context, layout, edgesOf(rect), text.align);
+  visitLines(layout, edgesOf(rect), text.align, [&](PangoLayoutLine* line, int64_t x, int64_t y) {
+    cairo_move_to(context, static_cast<double>(x), static_cast<double>(y));
+    pango_cairo_show_layout_line(context, line);
+  });
   cairo_restore(context);
+}
+
+TextInk TextPainter::inkOf(const SKIA_Rect& rect, const SKIA_Text& text) {
+  TextInk ink;
+  if (!isDrawn(text)) return ink;
+  const auto add = [&ink](PangoLayoutLine* line, int64_t x, int64_t y) {
+    PangoRectangle letters;
+    pango_layout_line_get_pixel_extents(line, &letters, nullptr);
+    if (letters.width == 0) return;
+    const int64_t left = x + letters.x;
+    const int64_t top = y + letters.y;
+    ink.area = around(ink.area, {left, top, left + letters.width, top + letters.height});
+  };
+  ink.isWhole = visitLines(layoutOf(text), edgesOf(rect), text.align, add);
+  return ink;
 }
 
 PangoLayout* TextPainter::layoutOf(const SKIA_Text& text) {

@@ -9,8 +9,15 @@
 #include "painter/canvas.h"
 #include "painter/fonts.h"
 #include "painter/lru_cache.h"
+#include "scene/rectangles.h"
 
 namespace brimol::pc {
+
+/// What the letters of a text touch.
+struct TextInk {
+  Edges area = {0, 0, 0, 0};  // screen pixels
+  bool isWhole = true;        // false: lines are left out for lack of height
+};
 
 /// Draws texts and keeps the layouts of the recent ones. One thread uses it.
 class TextPainter {
@@ -22,6 +29,10 @@ class TextPainter {
   /// item's bounds, or a part of them within the canvas. Bytes that are no UTF-8 draw the
   /// replacement character.
   void draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_Text& text, const Pixels& clip);
+
+  /// Where the text's letters lie, though the rectangle's sides may cut them; empty for a text that
+  /// draws nothing.
+  TextInk inkOf(const SKIA_Rect& rect, const SKIA_Text& text);
 
   /// Bounded by kMostLayouts.
   std::size_t layoutCount() const { return layouts.size(); }

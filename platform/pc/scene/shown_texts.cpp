@@ -37,7 +37,8 @@ std::vector<ShownText> shownTexts(const Frame& frame, Size screen) {
     const auto hides = [middle = pointIn(area)](const SKIA_Item& later) {
       return hidesMiddle(later, middle);
     };
-    if (std::none_of(item + 1, frame.end(), hides)) texts.push_back({std::string(text), area});
+    if (std::any_of(item + 1, frame.end(), hides)) continue;
+    texts.push_back({std::string(text), area, static_cast<std::size_t>(item - frame.begin())});
   }
   return texts;
 }

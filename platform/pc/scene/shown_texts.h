@@ -13,6 +13,7 @@ namespace brimol::pc {
 struct ShownText {
   std::string text;  // without blanks at its ends
   Pixels area;       // of the item, as far as it is on the screen
+  std::size_t item;  // its number in the frame
 };
 
 /// In drawing order. A text counts if something of its item is on the screen, and if no box that is

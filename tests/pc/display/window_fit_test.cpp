@@ -17,7 +17,7 @@ struct FitCase {
 };
 
 constexpr auto kFitCases = std::to_array<FitCase>({
-    {"never larger than the screen", {100, 200}, {300, 300}, {100, 200}},
+    {"larger than the screen", {100, 200}, {300, 300}, {150, 300}},
     {"a low desktop", {1440, 2560}, {1920, 1040}, {585, 1040}},
     {"a narrow desktop", {1440, 2560}, {360, 2000}, {360, 640}},
     {"at least a pixel high", {16384, 1}, {10, 10}, {10, 1}},
@@ -36,8 +36,8 @@ TEST(WindowFit, KeepsTheProportionsAndFillsAWindowOfThatSize) {
 }
 
 TEST(WindowFit, MeansThePicturesEdgeBesideIt) {
-  const WindowFit centred = WindowFit::of({100, 100}, {200, 120});
-  EXPECT_EQ(centred.toScreen({51, 109}), (ScreenPoint{1, 99}));
+  const WindowFit centred = WindowFit::of({100, 100}, {400, 300});
+  EXPECT_EQ(centred.toScreen({50 + 3, 299}), (ScreenPoint{1, 99}));
   EXPECT_EQ(centred.toScreen({-5, 500}), (ScreenPoint{0, 99}));
   EXPECT_EQ(WindowFit::of(kScreen, {0, -3}).toScreen({0, 0}), (ScreenPoint{0, 0}));
 }

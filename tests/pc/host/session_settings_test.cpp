@@ -35,6 +35,8 @@ TEST(SessionSettings, SayWhatIsWrong) {
             "BRIMOL_CLOCK_START=4294967296: wanted milliseconds, 0 to 4294967295");
   EXPECT_EQ(errorWith({{"BRIMOL_REPORT_PICTURES", "all"}}),
             "BRIMOL_REPORT_PICTURES=all: wanted changed or none");
+  EXPECT_EQ(errorWith({{"BRIMOL_REPORT_ITEMS", "1"}}),
+            "BRIMOL_REPORT_ITEMS=1: wanted changed or none");
   EXPECT_NE(errorWith({{"BRIMOL_TRACE", "a"}, {"BRIMOL_CLOCK", "real"}}), "");
   EXPECT_NE(errorWith({{"BRIMOL_TRACE", "a"}, {"BRIMOL_RECORD", "b"}}), "");
 }

@@ -24,16 +24,17 @@ struct SettingsCase {
 };
 
 constexpr DisplayChoice kIfPossible = DisplayChoice::WindowIfPossible;
-constexpr const char* kWrongWord = "BRIMOL_DISPLAY=Window: wanted window or headless";
+constexpr const char* kWrongWord = "BRIMOL_DISPLAY=Window: wanted window, browser or headless";
 constexpr const char* kWrongDevice =
     "BRIMOL_DEVICE=wvga: wanted hvga-3.2, wvga-4.0, hd-4.7, fhd-5.0, wqhd-5.5, hdplus-6.5, "
     "fhdplus-6.5 or wqhdplus-6.8";
-constexpr const char* kWrongBytes = "BRIMOL_DISPLAY=a??: wanted window or headless";
+constexpr const char* kWrongBytes = "BRIMOL_DISPLAY=a??: wanted window, browser or headless";
 constexpr auto kCases = std::to_array<SettingsCase>({
     {"nothing is set", nullptr, nullptr, nullptr, nullptr, kIfPossible, kDefaultScreen},
     {"on a desktop", "", "", "", ":0", DisplayChoice::Window, kDefaultScreen},
     {"a window", "window", nullptr, "7x9", nullptr, DisplayChoice::Window, {7, 9}},
     {"headless", "headless", "", "1x16384", ":0", DisplayChoice::Headless, {1, 16384}},
+    {"a browser", "browser", "", "", ":0", DisplayChoice::Browser, kDefaultScreen},
     {"a device", "", "wvga-4.0", "", "", kIfPossible, {480, 800}, 233.2f},
     {"its size alone", "", "wvga-4.0", "9x9", "", kIfPossible, {9, 9}, 233.2f},
     {"no device", "", "wvga", "1x", "", kIfPossible, kDefaultScreen, kDefaultDensity, kWrongDevice},
@@ -70,6 +71,18 @@ TEST(Settings, TellASizeThatIsNone) {
     EXPECT_EQ(read("", "", size, "").error,
               std::string("BRIMOL_SCREEN=") + size + ": wanted WIDTHxHEIGHT, each 1 to 16384");
   }
+}
+
+TEST(Settings, TellWhereBrowsersConnect) {
+  const auto listenAt = [](const char* value) {
+    return readSettings([value](const std::string& name) -> const char* {
+      return name == "BRIMOL_LISTEN" ? value : nullptr;
+    });
+  };
+  EXPECT_FALSE(listenAt("").settings.listen);
+  EXPECT_EQ(listenAt("10.0.0.7:0").settings.listen->host, "10.0.0.7");
+  EXPECT_EQ(listenAt("bench:1").error,
+            "BRIMOL_LISTEN=bench:1: wanted ADDRESS:PORT, such as 127.0.0.1:5800 or [::1]:0");
 }
 
 TEST(Devices, HaveTheDiagonalThatTheirNamesSay) {

@@ -3,7 +3,9 @@
 
 #include <gmock/gmock.h>
 
+#include <algorithm>
 #include <array>
+#include <iterator>
 #include <limits>
 
 #include "display/sdl_input.h"
@@ -27,6 +29,13 @@ SDL_Event mouse(Uint32 type, int x, int y, Uint8 which = SDL_BUTTON_LEFT, Uint32
 SDL_Event touch(Uint32 type, SDL_FingerID finger, float x, float y, SDL_TouchID device = 7) {
   SDL_Event event = {};
   event.tfinger = {type, 0, device, finger, x, y, 0, 0, 0, 0};
+  return event;
+}
+SDL_Event wheel(float right, float up) {
+  SDL_Event event = {};
+  event.wheel.type = SDL_MOUSEWHEEL;
+  event.wheel.preciseX = right;
+  event.wheel.preciseY = up;
   return event;
 }
 SDL_Event key(Uint32 type, SDL_Keycode code) {
@@ -65,6 +74,13 @@ const auto kPlays = std::to_array<Play>({
       mouse(kUp, 0, 0)},
      {"down 0 at 0,0", "motion 0 at 999,0 by 999,0", "down 1 at 0,1999", "down 2 at 0,0",
       "up 2 at 0,0", "motion 1 at 0,0 by 0,-1999", "up 0 at 999,0", "up 1 at 0,0"}},
+    {"Ctrl plays a second finger opposite the place where the mouse was",
+     {mouse(kMove, 50, 60), key(SDL_KEYDOWN, SDLK_LCTRL), mouse(kMove, 60, 60),
+      mouse(kDown, 60, 60), key(SDL_KEYUP, SDLK_LCTRL), mouse(kMove, 160, 60), mouse(kUp, 160, 60),
+      mouse(kDown, 0, 0)},
+     {"down 0 at 120,120", "down 1 at 80,120", "motion 0 at 320,120 by 200,0",
+      "motion 1 at 0,120 by -80,0", "up 0 at 320,120", "up 1 at 0,120", "down 0 at 0,0",
+      "up 0 at 0,0"}},
     {"keys, once however they repeat",
      {key(SDL_KEYUP, SDLK_UP), key(SDL_KEYDOWN, SDLK_UP), key(SDL_KEYDOWN, SDLK_UP),
       key(SDL_KEYDOWN, SDLK_q), key(SDL_KEYDOWN, SDLK_RETURN), key(SDL_KEYDOWN, SDLK_KP_ENTER),
@@ -87,11 +103,42 @@ class TranslatorTest : public testing::Test {
 
 TEST_F(TranslatorTest, MakesRecordsOfWhatTheUserDoes) {
   for (const auto& [name, events, records] : kPlays) {
-    for (const SDL_Event& event : events) passOn(event, WindowFit::of(kScreen, kWindow), 0, input);
-    input.releaseAll();
+    SdlInput sdl(kScreen, input);
+    for (const SDL_Event& event : events) {
+      sdl.take(event, {WindowFit::of(kScreen, kWindow), kWindow}, 0);
+    }
+    sdl.releaseAll();
     input.tick(1000);
     EXPECT_EQ(takeTexts(service), records) << name;
   }
+}
+
+TEST_F(TranslatorTest, DragsByWheelAndGoesOnFromTheEdge) {
+  const WindowView view = {WindowFit::of(kScreen, kWindow), kWindow};
+  SdlInput sdl(kScreen, input);
+  uint32_t now = 0xFFFFFFF0;
+  const auto play = [&] {
+    auto texts = takeTexts(service);
+    for (auto ms = sdl.msToTick(now); ms; ms = sdl.msToTick(now)) {
+      sdl.tick(now += *ms);
+      std::ranges::move(takeTexts(service), std::back_inserter(texts));
+    }
+    return texts;
+  };
+  sdl.take(mouse(kMove, 0, 70), view, now);
+  sdl.take(wheel(0, -0.2F), view, now);
+  EXPECT_THAT(play(), ElementsAre()) << "less than a drag";
+  sdl.take(wheel(0, -0.3F), view, now);
+  EXPECT_THAT(play(), ElementsAre("down 0 at 0,140", "motion 0 at 0,120 by 0,-20",
+                                  "motion 0 at 0,100 by 0,-20", "motion 0 at 0,80 by 0,-20",
+                                  "motion 0 at 0,60 by 0,-20", "up 0 at 0,60"));
+  sdl.take(wheel(0, -1), view, now);
+  const auto records = play();
+  EXPECT_EQ(std::ranges::count(records, "down 0 at 0,140"), 2);
+  EXPECT_EQ(std::ranges::count(records, "up 0 at 0,0"), 1);
+  EXPECT_EQ(records.back(), "up 0 at 0,120");
+  sdl.take(wheel(5, 0), view, now);
+  EXPECT_THAT(play(), ElementsAre()) << "no room, and no tap";
 }
 
 TEST_F(TranslatorTest, ReportsLongPressesInTheOrderOfTime) {

@@ -48,17 +48,6 @@ Picture pictureOf(cairo_surface_t* surface) {
   return picture;
 }
 
-Picture readPicture(const std::string& file) {
-  return pictureOf(CairoSurface(cairo_image_surface_create_from_png(file.c_str())).get());
-}
-
-bool writePicture(Picture picture, const std::string& file) {
-  const CairoSurface surface(cairo_image_surface_create_for_data(
-      reinterpret_cast<unsigned char*>(picture.pixels.data()), CAIRO_FORMAT_RGB24, picture.size.w,
-      picture.size.h, picture.size.w * static_cast<int>(sizeof(uint32_t))));
-  return cairo_surface_write_to_png(surface.get(), file.c_str()) == CAIRO_STATUS_SUCCESS;
-}
-
 Picture painted(const Frame& frame, Size screen) {
   Painter painter(screen);
   painter.paint(frame);

@@ -43,10 +43,6 @@ struct Picture {
 };
 
 Picture pictureOf(cairo_surface_t* surface);
-/// Without a size where there is no such picture.
-Picture readPicture(const std::string& file);
-/// As PNG. Whether it could be written.
-bool writePicture(Picture picture, const std::string& file);
 /// What a new painter shows of the frame.
 Picture painted(const Frame& frame, Size screen = {100, 60});
 

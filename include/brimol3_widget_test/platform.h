@@ -1,0 +1,78 @@
+/// A platform for tests: it draws nothing and remembers everything, its clock stands still until it
+/// is set, and its input is what a test feeds.
+#pragma once
+
+#include <brimol/input.h>
+#include <brimol3_widget_test/records.h>
+#include <brimol3_widget_test/turns.h>
+
+#include <atomic>
+#include <deque>
+#include <map>
+#include <mutex>
+#include <string>
+#include <thread>
+#include <utility>
+#include <vector>
+
+namespace brimol::test {
+
+/// What a test sets and reads while no other thread runs or all of them are held.
+struct PlatformState {
+  bool records = true;       ///< false: drawings and log lines are dropped
+  int live = 1;              ///< what skia_live_widget_c() returns
+  int liveAsked = 0;         ///< how often it was asked
+  int nextHandle = 0;        ///< what drawing calls return
+  float xdpi = 0, ydpi = 0;  ///< 0: unknown
+  int inits = 0, quits = 0;  ///< of the input service
+  unsigned int initFlags = 0;
+  unsigned int paused = 0;  ///< milliseconds that the test's thread spent in Delay
+  std::vector<Drawing> drawings;
+  std::vector<LogLine> lines;
+  std::deque<Event> fed;
+  std::map<std::string, std::string> properties;
+
+  // What brimol/host.h tells of.
+  int width = 1440, height = 2560;     ///< of the screen, pixels
+  bool closeRequested = false;         ///< the user has asked to close the window
+  int brightness = 100;                ///< per cent, as last set
+  int64_t utcMs = kDefaultUtcMs;       ///< since 1970, when the ticks were 0
+  uint32_t random = 1;                 ///< the next random number; the one behind it is one more
+  std::map<std::string, std::string> figures;  ///< by name; a figure that is not here is empty
+
+  static constexpr int64_t kDefaultUtcMs = 1'767'225'600'000;  ///< 2026-01-01T00:00:00Z
+};
+
+/// The one platform. The platform's calls may come from any thread, and so may these.
+struct RecordingPlatform : PlatformState {
+  /// As new. The calling thread is from here on the test's.
+  void reset();
+
+  /// What happened since the reset or the last take, oldest first. Taking forgets it.
+  std::vector<Drawing> takeDrawings() { return take(drawings); }
+  std::vector<LogLine> takeLog() { return take(lines); }
+
+  /// PollEvent returns it after those that were fed before.
+  void feed(const Event& event) {
+    const std::lock_guard guard(lock);
+    fed.push_back(event);
+  }
+
+  std::atomic<unsigned int> ticks = 0;  ///< what GetTicks() returns, in milliseconds
+  Turns turns;                          ///< of the other threads, in Delay
+
+  std::thread::id testThread;
+  std::mutex lock;  ///< guards `records`, the lists and the properties
+
+ private:
+  template <typename List>
+  List take(List& list) {
+    const std::lock_guard guard(lock);
+    return std::exchange(list, {});
+  }
+};
+
+/// The platform, from the process's start to its end.
+RecordingPlatform& platform();
+
+}  // namespace brimol::test

@@ -1,0 +1,323 @@
+#include "remote/web_server.h"
+
+#include <netinet/in.h>
+#include <netinet/tcp.h>
+#include <sys/socket.h>
+
+#include <algorithm>
+#include <array>
+#include <cerrno>
+#include <chrono>
+#include <cstdlib>
+#include <optional>
+#include <utility>
+
+#include "remote/hosts.h"
+#include "remote/web_answers.h"
+
+namespace brimol::pc {
+namespace {
+
+constexpr std::size_t kMaxConnections = 64;
+constexpr std::size_t kMaxViewers = 16;
+constexpr int kSecondsToIntroduce = 5;  // for a request, and for a viewer's password
+constexpr int kSecondsToRead = 20;      // something of what waits
+constexpr std::size_t kChunk = std::size_t{1} << 16;
+constexpr std::size_t kEnoughForServer = std::size_t{1} << 16;
+constexpr const char* kProtocol = "screen";
+
+constexpr lws_retry_bo_t kNoProbes = {};
+
+bool isOutOfResources(int error) { return error != EAGAIN && error != ECONNABORTED; }
+
+std::optional<std::string> header(lws* wsi, lws_token_indexes token) {
+  constexpr int kLongest = 256;
+  std::array<char, kLongest> text = {};
+  const int length = lws_hdr_copy(wsi, text.data(), kLongest, token);
+  if (length <= 0) return std::nullopt;
+  return std::string(text.data(), static_cast<std::size_t>(length));
+}
+
+std::string_view bytesAt(const void* in, std::size_t length) {
+  return in == nullptr ? std::string_view()
+                       : std::string_view(static_cast<const char*>(in), length);
+}
+
+int sendText(lws* wsi, const WebAnswer& answer) {
+  constexpr std::size_t kHeadBytes = 2048;
+  std::array<unsigned char, LWS_PRE + kHeadBytes> head = {};
+  unsigned char* const start = head.data() + LWS_PRE;
+  unsigned char* place = start;
+  unsigned char* const end = head.data() + head.size();
+  if (lws_add_http_common_headers(wsi, HTTP_STATUS_OK, answer.type, answer.text.size(), &place,
+                                  end) != 0 ||
+      lws_finalize_write_http_header(wsi, start, &place, end) != 0) {
+    return 1;
+  }
+  std::vector<unsigned char> body(LWS_PRE);
+  body.insert(body.end(), answer.text.begin(), answer.text.end());
+  const int sent = lws_write(wsi, body.data() + LWS_PRE, answer.text.size(), LWS_WRITE_HTTP_FINAL);
+  return sent < 0 || lws_http_transaction_completed(wsi) != 0 ? 1 : 0;
+}
+
+int sendFile(lws* wsi, const WebAnswer& answer) {
+  const int result = lws_serve_http_file(wsi, answer.file.c_str(), answer.type, nullptr, 0);
+  return result < 0 || (result > 0 && lws_http_transaction_completed(wsi) != 0) ? 1 : 0;
+}
+
+int refuse(lws* wsi, unsigned int status) {
+  return lws_return_http_status(wsi, status, nullptr) != 0 ||
+                 lws_http_transaction_completed(wsi) != 0
+             ? 1
+             : 0;
+}
+
+}  // namespace
+
+WebServer::WebServer(Listeners listeners, std::size_t queueBytes, ViewerService target)
+    : maxQueued(queueBytes),
+      service(std::move(target)),
+      ownName(ownHostName()),
+      buffer(LWS_PRE + kChunk) {
+  createContext();
+  listen(std::move(listeners.web), Door::Web);
+  listen(std::move(listeners.vnc), Door::Vnc);
+  thread = std::thread([this] { run(); });
+}
+
+WebServer::~WebServer() {
+  isOver = true;
+  lws_cancel_service(context.get());
+  thread.join();
+}
+
+const lws_protocols* WebServer::protocols() {
+  static const std::array<lws_protocols, 2> kTable = {
+      {{kProtocol, callback, 0, 0, 0, nullptr, 0}, {nullptr, nullptr, 0, 0, 0, nullptr, 0}}};
+  return kTable.data();
+}
+
+void WebServer::createContext() {
+  lws_set_log_level(0, nullptr);
+  lws_context_creation_info info = {};
+  info.options = LWS_SERVER_OPTION_EXPLICIT_VHOSTS |
+                 LWS_SERVER_OPTION_HTTP_HEADERS_SECURITY_BEST_PRACTICES_ENFORCE;
+  info.port = CONTEXT_PORT_NO_LISTEN_SERVER;
+  info.protocols = protocols();
+  info.user = this;
+  info.fd_limit_per_thread = kMaxConnections + kMaxViewers + 8;  // and libwebsockets' own
+  info.timeout_secs = kSecondsToIntroduce;
+  info.keepalive_timeout = kSecondsToIntroduce;
+  info.retry_and_idle_policy = &kNoProbes;
+  info.vhost_name = "brimol";
+  context.reset(lws_create_context(&info));
+  if (context) host = lws_create_vhost(context.get(), &info);
+  if (host == nullptr) std::abort();  // no memory or no descriptor is left
+}
+
+void WebServer::listen(Listener listener, Door door) {
+  lws_sock_file_fd_type descriptor = {};
+  descriptor.filefd = listener.socket.release();
+  lws* const wsi =
+      lws_adopt_descriptor_vhost(host, LWS_ADOPT_RAW_FILE_DESC, descriptor, kProtocol, nullptr);
+  if (wsi == nullptr) std::abort();  // no memory is left
+  doors[wsi] = door;
+}
+
+void WebServer::run() {
+  while (!isOver) lws_service(context.get(), 0);
+}
+
+int WebServer::callback(lws* wsi, lws_callback_reasons reason, void* user, void* in,
+                        std::size_t length) {
+  auto* const server = static_cast<WebServer*>(lws_context_user(lws_get_context(wsi)));
+  int result = 0;
+  if (server->isHandled(wsi, reason, bytesAt(in, length), result)) return result;
+  return lws_callback_http_dummy(wsi, reason, user, in, length);
+}
+
+bool WebServer::isHandled(lws* wsi, lws_callback_reasons reason, std::string_view in, int& result) {
+  switch (reason) {
+    case LWS_CALLBACK_RAW_RX_FILE: accept(wsi); return true;
+    case LWS_CALLBACK_HTTP: result = answer(wsi, in); return true;
+    case LWS_CALLBACK_FILTER_PROTOCOL_CONNECTION:
+      result = isOfOwnPage(wsi) && hasRoom() ? 0 : 1;
+      return true;
+    case LWS_CALLBACK_ESTABLISHED: begin(wsi, Door::Web); return true;
+    case LWS_CALLBACK_RECEIVE:
+    case LWS_CALLBACK_RAW_RX: result = hear(wsi, in); return true;
+    case LWS_CALLBACK_SERVER_WRITEABLE:
+    case LWS_CALLBACK_RAW_WRITEABLE: result = send(wsi); return true;
+    case LWS_CALLBACK_CLOSED:
+    case LWS_CALLBACK_RAW_CLOSE: end(wsi); return true;
+    case LWS_CALLBACK_WSI_DESTROY: connections.erase(wsi); return true;
+    default: return false;
+  }
+}
+
+void WebServer::accept(lws* wsi) {
+  const Door door = doors.at(wsi);
+  const int listener = lws_get_socket_fd(wsi);
+  while (true) {
+    Socket connection(::accept4(listener, nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
+    if (connection.get() >= 0) {
+      receive(std::move(connection), door);
+      continue;
+    }
+    // Without descriptors the listener stays ready: trying at once would only heat the processor.
+    if (isOutOfResources(errno)) std::this_thread::sleep_for(std::chrono::milliseconds(100));
+    return;
+  }
+}
+
+void WebServer::receive(Socket connection, Door door) {
+  if (connections.size() >= kMaxConnections || (door == Door::Vnc && !hasRoom())) return;
+  const int yes = 1;
+  setsockopt(connection.get(), IPPROTO_TCP, TCP_NODELAY, &yes, sizeof yes);
+  lws_sock_file_fd_type descriptor = {};
+  descriptor.sockfd = connection.release();
+  const auto kind = static_cast<lws_adoption_type>(
+      door == Door::Web ? LWS_ADOPT_SOCKET | LWS_ADOPT_HTTP : LWS_ADOPT_SOCKET);
+  lws* const wsi = lws_adopt_descriptor_vhost(host, kind, descriptor,
+                                              door == Door::Web ? nullptr : kProtocol, nullptr);
+  if (wsi == nullptr) return;
+  connections.insert(wsi);
+  if (door == Door::Vnc) begin(wsi, door);
+}
+
+int WebServer::answer(lws* wsi, std::string_view path) {
+  const std::optional<std::string> asked = header(wsi, WSI_TOKEN_HOST);
+  if (!asked || !isTrustedHost(*asked, ownName)) return refuse(wsi, HTTP_STATUS_FORBIDDEN);
+  const std::optional<WebAnswer> found = webAnswer(path);
+  if (!found) return refuse(wsi, HTTP_STATUS_NOT_FOUND);
+  return found->file.empty() ? sendText(wsi, *found) : sendFile(wsi, *found);
+}
+
+bool WebServer::isOfOwnPage(lws* wsi) const {
+  const std::optional<std::string> asked = header(wsi, WSI_TOKEN_HOST);
+  const std::optional<std::string> origin = header(wsi, WSI_TOKEN_ORIGIN);
+  return asked && origin && isTrustedHost(*asked, ownName) && isSameOrigin(*origin, *asked);
+}
+
+bool WebServer::hasRoom() const {
+  const auto isOuter = [](const auto& line) { return line.first == line.second->outer; };
+  return static_cast<std::size_t>(std::ranges::count_if(lines, isOuter)) < kMaxViewers;
+}
+
+void WebServer::begin(lws* wsi, Door door) {
+  lines[wsi] = std::make_shared<Line>(Line{{}, door, wsi});
+  lws_set_timeout(wsi, PENDING_TIMEOUT_USER_OK, kSecondsToIntroduce);
+  lws_callback_on_writable(wsi);
+}
+
+int WebServer::hear(lws* wsi, std::string_view bytes) {
+  const auto found = lines.find(wsi);
+  if (found == lines.end()) return 1;
+  const LinePointer line = found->second;  // held: `lines` may change
+  if (line->outer == nullptr) return 1;
+  if (wsi == line->inner) return hearServer(*line, bytes);
+  const int result = hearViewer(*line, bytes);
+  if (result != 0 || line->inner != nullptr || !line->caller.isReadyForServer()) return result;
+  return connectToServer(line) ? 0 : 1;
+}
+
+int WebServer::hearViewer(Line& line, std::string_view bytes) {
+  if (line.isEnding) return 0;
+  if (!line.caller.hear(bytes)) return 1;
+  if (line.caller.forServer().size() > kEnoughForServer) lws_rx_flow_control(line.outer, 0);
+  if (line.inner != nullptr) lws_callback_on_writable(line.inner);
+  return 0;
+}
+
+int WebServer::hearServer(Line& line, std::string_view bytes) {
+  const bool wasEmpty = line.caller.forViewer().isEmpty();
+  line.caller.answer(bytes);
+  if (line.caller.forViewer().size() > maxQueued) return 1;
+  if (wasEmpty) watch(line);
+  lws_callback_on_writable(line.outer);
+  return 0;
+}
+
+bool WebServer::connectToServer(const LinePointer& line) {
+  std::array<int, 2> ends = {-1, -1};
+  if (socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0, ends.data()) != 0) {
+    return false;
+  }
+  Socket other(ends[1]);
+  // What has arrived must be there when the server looks: it would wait for it.
+  const std::string_view first = line->caller.forServer().front(kEnoughForServer);
+  const ssize_t sent = ::send(ends[0], first.data(), first.size(), MSG_NOSIGNAL);
+  lws_sock_file_fd_type descriptor = {};
+  descriptor.sockfd = ends[0];
+  line->inner = lws_adopt_descriptor_vhost(host, LWS_ADOPT_SOCKET, descriptor, kProtocol, nullptr);
+  if (line->inner == nullptr || sent < 0) return false;
+  line->caller.forServer().drop(static_cast<std::size_t>(sent));
+  lines[line->inner] = line;
+  lws_callback_on_writable(line->inner);
+  service.attach(std::move(other), line->caller.shared());
+  return true;
+}
+
+int WebServer::send(lws* wsi) {
+  const auto found = lines.find(wsi);
+  if (found == lines.end()) return 0;
+  const LinePointer line = found->second;
+  return wsi == line->inner ? sendToServer(*line) : sendToViewer(*line);
+}
+
+int WebServer::sendToViewer(Line& line) {
+  const std::string_view chunk = line.caller.forViewer().front(kChunk);
+  if (chunk.empty()) return line.isEnding ? 1 : 0;
+  std::ranges::copy(chunk, buffer.begin() + LWS_PRE);
+  const auto kind = line.door == Door::Web ? LWS_WRITE_BINARY : LWS_WRITE_RAW;
+  if (lws_write(line.outer, buffer.data() + LWS_PRE, chunk.size(), kind) < 0) return 1;
+  line.caller.drop(chunk.size());
+  watch(line);
+  service.lookAgain();
+  if (!line.caller.forViewer().isEmpty() || line.isEnding) lws_callback_on_writable(line.outer);
+  return 0;
+}
+
+int WebServer::sendToServer(Line& line) {
+  ByteQueue& queue = line.caller.forServer();
+  const std::string_view chunk = queue.front(kChunk);
+  if (chunk.empty()) return 0;
+  std::ranges::copy(chunk, buffer.begin() + LWS_PRE);
+  if (lws_write(line.inner, buffer.data() + LWS_PRE, chunk.size(), LWS_WRITE_RAW) < 0) return 1;
+  queue.drop(chunk.size());
+  if (queue.isEmpty()) {
+    lws_rx_flow_control(line.outer, 1);
+  } else {
+    lws_callback_on_writable(line.inner);
+  }
+  return 0;
+}
+
+// Who is not admitted yet keeps the time limit of the beginning.
+void WebServer::watch(const Line& line) {
+  if (!line.caller.shared()->isAdmitted) return;
+  if (line.caller.forViewer().isEmpty()) {
+    lws_set_timeout(line.outer, NO_PENDING_TIMEOUT, 0);
+  } else {
+    lws_set_timeout(line.outer, PENDING_TIMEOUT_USER_OK, kSecondsToRead);
+  }
+}
+
+void WebServer::end(lws* wsi) {
+  const auto found = lines.find(wsi);
+  if (found == lines.end()) return;
+  const LinePointer line = found->second;
+  lines.erase(found);
+  if (wsi == line->inner) {
+    line->inner = nullptr;
+    line->isEnding = true;
+    if (line->outer != nullptr) lws_callback_on_writable(line->outer);
+    return;
+  }
+  line->outer = nullptr;
+  line->caller.shared()->queuedBytes = 0;
+  // Both sides of the pair see its end.
+  if (line->inner != nullptr) shutdown(lws_get_socket_fd(line->inner), SHUT_RDWR);
+}
+
+}  // namespace brimol::pc

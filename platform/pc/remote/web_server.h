@@ -1,0 +1,96 @@
+/// libwebsockets, on a thread of its own: the page, and the connections of all viewers.
+#pragma once
+
+#include <libwebsockets.h>
+
+#include <atomic>
+#include <cstddef>
+#include <functional>
+#include <map>
+#include <memory>
+#include <set>
+#include <string>
+#include <string_view>
+#include <thread>
+#include <vector>
+
+#include "remote/caller.h"
+#include "remote/listener.h"
+
+namespace brimol::pc {
+
+/// What the web server asks of who serves the viewers, on its own thread.
+struct ViewerService {
+  /// Serve the viewer at the other end of `end`.
+  std::function<void(Socket end, std::shared_ptr<Viewer> viewer)> attach;
+  /// A viewer has read what waited for it.
+  std::function<void()> lookAgain;
+};
+
+struct WebContextDeleter {
+  void operator()(lws_context* context) const { lws_context_destroy(context); }
+};
+
+/// Answers browsers with the page, and stands between viewers and the VNC server: it takes whatever
+/// they send at whatever pace, and keeps what waits for them. It limits how many they are, how long
+/// they take to say who they are, and how long they may read nothing.
+class WebServer {
+ public:
+  /// `queueBytes` is what may wait for one viewer: more ends its connection.
+  WebServer(Listeners listeners, std::size_t queueBytes, ViewerService target);
+  ~WebServer();
+  WebServer(const WebServer&) = delete;
+  WebServer& operator=(const WebServer&) = delete;
+
+ private:
+  enum class Door { Web, Vnc };
+  // A viewer's two lines: `outer` to it, `inner` to the VNC server.
+  struct Line {
+    Caller caller;
+    Door door;
+    lws* outer;  // null once it is closed
+    lws* inner = nullptr;
+    bool isEnding = false;  // once the viewer has what waits for it
+  };
+  using LinePointer = std::shared_ptr<Line>;
+
+  // libwebsockets' own signature, which is why there are two void*.
+  static int callback(lws* wsi, lws_callback_reasons reason, void* user, void* in,
+                      std::size_t length);
+  static const lws_protocols* protocols();
+  void createContext();
+  void listen(Listener listener, Door door);
+  void run();
+
+  bool isHandled(lws* wsi, lws_callback_reasons reason, std::string_view in, int& result);
+  void accept(lws* wsi);
+  void receive(Socket connection, Door door);
+  int answer(lws* wsi, std::string_view path);
+  bool isOfOwnPage(lws* wsi) const;
+
+  bool hasRoom() const;
+  void begin(lws* wsi, Door door);
+  int hear(lws* wsi, std::string_view bytes);
+  int hearViewer(Line& line, std::string_view bytes);
+  int hearServer(Line& line, std::string_view bytes);
+  bool connectToServer(const LinePointer& line);
+  int send(lws* wsi);
+  int sendToViewer(Line& line);
+  int sendToServer(Line& line);
+  static void watch(const Line& line);
+  void end(lws* wsi);
+
+  const std::size_t maxQueued;
+  const ViewerService service;
+  const std::string ownName;
+  std::map<lws*, Door> doors;         // the listeners
+  std::set<lws*> connections;         // of browsers and viewers
+  std::map<lws*, LinePointer> lines;  // by both of their ends
+  std::vector<unsigned char> buffer;  // what is sent, behind room for libwebsockets
+  std::unique_ptr<lws_context, WebContextDeleter> context;
+  lws_vhost* host = nullptr;  // the context's
+  std::atomic<bool> isOver = false;
+  std::thread thread;
+};
+
+}  // namespace brimol::pc

@@ -1,0 +1,145 @@
+#include <brimol3_widget_test/platform.h>
+
+#include <android/log.h>
+#include <brimol/display.h>
+#include <brimol/frame.h>
+#include <brimol/properties.h>
+
+#include <chrono>
+#include <new>
+
+namespace brimol::test {
+
+namespace {
+
+constexpr std::chrono::microseconds kShortPause{20};
+
+// Never deleted: threads still log while the program ends.
+RecordingPlatform& thePlatform = *new RecordingPlatform;
+
+// A line that finds no memory is lost: tests let allocations fail.
+void receiveLog(const __android_logger_data* data, const char* message) {
+  const std::lock_guard guard(thePlatform.lock);
+  if (!thePlatform.records) return;
+  try {
+    thePlatform.lines.push_back({data->priority, data->tag, message});
+  } catch (const std::bad_alloc&) {
+    return;
+  }
+}
+
+DrawnText drawn(const SKIA_Text& text) {
+  const auto length = static_cast<std::size_t>(text.string_len);
+  // A length outside the record is kept as text that no expectation names.
+  if (length >= SKIA_TEXT_BYTES) return {"length outside the record", 0, 0, text.string_len};
+  return {std::string(text.text, length), text.color, text.align, text.size};
+}
+
+int draw(Call call, const SKIA_Rect& rect, const SKIA_Text& text = {}, const SKIA_Point& line = {},
+         int kind = 0) {
+  const std::lock_guard guard(thePlatform.lock);
+  if (thePlatform.records) thePlatform.drawings.push_back({call, rect, line, drawn(text), kind});
+  return thePlatform.nextHandle;
+}
+
+}  // namespace
+
+RecordingPlatform& platform() { return thePlatform; }
+
+void RecordingPlatform::reset() {
+  __android_log_set_logger(receiveLog);
+  __android_log_set_minimum_priority(ANDROID_LOG_VERBOSE);
+  const std::lock_guard guard(lock);
+  static_cast<PlatformState&>(*this) = {};
+  ticks = 0;
+  testThread = std::this_thread::get_id();
+}
+
+}  // namespace brimol::test
+
+using brimol::test::Call;
+using brimol::test::draw;
+using brimol::test::platform;
+
+// What was drawn before goes into no frame.
+void skia_begin_frame_c() { platform().takeDrawings(); }
+void skia_end_frame_c() {}
+
+int skia_add_box_c(SKIA_Rect rect) { return draw(Call::Box, rect); }
+int skia_add_roundbox_c(SKIA_Rect rect) { return draw(Call::RoundBox, rect); }
+int skia_add_line_c(SKIA_Point line) { return draw(Call::Line, {}, {}, line); }
+int skia_add_label_c(SKIA_Rect rect, SKIA_Text text) { return draw(Call::Label, rect, text); }
+int skia_add_textbox_c(SKIA_Rect rect, SKIA_Text text) { return draw(Call::Textbox, rect, text); }
+int skia_add_roundtextbox_c(SKIA_Rect rect, SKIA_Text text) {
+  return draw(Call::RoundTextbox, rect, text);
+}
+int skia_add_buttonbox_c(SKIA_Rect rect, SKIA_Text text) {
+  return draw(Call::ButtonBox, rect, text);
+}
+int skia_add_roundbuttonbox_c(SKIA_Rect rect, SKIA_Text text) {
+  return draw(Call::RoundButtonBox, rect, text);
+}
+int skia_add_staticbox_c(SKIA_Rect rect, SKIA_Text text) {
+  return draw(Call::StaticBox, rect, text);
+}
+int skia_add_arrow_c(SKIA_Rect rect, SKIA_Point direction) {
+  return draw(Call::Arrow, rect, {}, direction);
+}
+int skia_add_widget_c(const SKIA_Item* item) {
+  if (item == nullptr) return -1;
+  return draw(Call::Item, item->rect, item->text, item->point, item->kind);
+}
+
+int skia_live_widget_c() {
+  ++platform().liveAsked;
+  return platform().live;
+}
+
+int EventInit(unsigned int flags) {
+  ++platform().inits;
+  platform().initFlags = flags;
+  return 1;
+}
+
+void EventQuit() { ++platform().quits; }
+
+int PollEvent(Event* event) {
+  const std::lock_guard guard(platform().lock);
+  if (platform().fed.empty()) return 0;
+  *event = platform().fed.front();
+  platform().fed.pop_front();
+  return 1;
+}
+
+unsigned int GetTicks() { return platform().ticks; }
+
+void Delay(unsigned int ms) {
+  if (std::this_thread::get_id() == platform().testThread) {
+    platform().paused += ms;
+    return;
+  }
+  if (!platform().turns.pause(platform().ticks, ms)) {
+    std::this_thread::sleep_for(brimol::test::kShortPause);
+  }
+}
+
+void getDpi(float* xdpi, float* ydpi) {
+  *xdpi = platform().xdpi;
+  *ydpi = platform().ydpi;
+}
+
+// NOLINTNEXTLINE(readability-identifier-naming): the parameters are named as in the contract
+int property_get(const char* key, char* value, const char* default_value) {
+  const std::lock_guard guard(platform().lock);
+  const auto found = platform().properties.find(key);
+  const std::string text = found != platform().properties.end() ? found->second : default_value;
+  const std::size_t length = text.copy(value, BRIMOL_PROPERTY_BYTES - 1);
+  value[length] = '\0';
+  return static_cast<int>(length);
+}
+
+int property_set(const char* key, const char* value) {
+  const std::lock_guard guard(platform().lock);
+  platform().properties.insert_or_assign(key, value);
+  return 0;
+}
