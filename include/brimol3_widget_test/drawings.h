@@ -12,6 +12,7 @@
 
 namespace brimol::test {
 
+/// Tells the toolkit the screen's size, in pixels.
 inline void setScreen(int w, int h) {
   MW::Window::width = w;
   MW::Window::height = h;

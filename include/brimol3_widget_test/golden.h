@@ -19,17 +19,17 @@ enum class Compared {
   OtherRenderer
 };
 
-/// Compares frames with files: NAME.items.txt, the list of display items, which is the same on every
-/// machine, and NAME.png. Where the environment sets BRIMOL_RENEW_GOLDENS to anything but 0, the
-/// files are written instead and nothing fails: look at each of them before you commit it.
+/// Compares frames with files: NAME.items.txt, the list of display items, which is the same on
+/// every machine, and NAME.png. Where the environment sets BRIMOL_RENEW_GOLDENS to anything but 0,
+/// the files are written instead and nothing fails: look at each of them before you commit it.
 ///
 /// canary.png in the same folder tells whether this machine paints as the one did that made the
 /// pictures. Where it does not, pictures are not compared, unless the environment sets
 /// BRIMOL_REFERENCE_RENDERER: then it is a failure.
 class Goldens {
  public:
-  /// `goldenFolder` holds the files, and is made when they are renewed. What differs is written into
-  /// `resultFolder`, which is made for it.
+  /// `goldenFolder` holds the files, and is made when they are renewed. What differs is written
+  /// into `resultFolder`, which is made for it.
   explicit Goldens(std::filesystem::path goldenFolder,
                    std::filesystem::path resultFolder = "golden_results");
 

@@ -12,9 +12,11 @@ namespace brimol::test {
 
 /// A place on the screen, in pixels.
 struct Spot {
-  int x, y;
+  int x;  ///< from the left edge
+  int y;  ///< from the top edge
 };
 
+/// Events as widgets receive them: a touch; a key.
 inline MW::event_data pointerEvent(MW::EventCode code, Spot spot, unsigned int finger = 0) {
   return {.type = code, .mouse = {0, finger, spot.x, spot.y, 0, 0}};
 }
@@ -39,6 +41,7 @@ inline Event keyInput(BrimolEventType type, unsigned int code) {
 inline bool offer(MW::Widget& widget, MW::event_data event) {
   return widget.onRecvEvent(&event, 0);
 }
+/// The same for a finger's event at a place.
 inline bool press(MW::Widget& widget, Spot spot, unsigned int finger = 0) {
   return offer(widget, pointerEvent(MW::kEventPress, spot, finger));
 }
@@ -66,6 +69,7 @@ inline std::vector<LogLine> logLines(int priority, const std::vector<std::string
   for (const std::string& message : messages) lines.push_back({priority, "BRIMOL_WIDGET", message});
   return lines;
 }
+/// Priorities of log lines.
 inline constexpr int kDebug = 3;
 inline constexpr int kWarning = 5;
 inline constexpr int kError = 6;

@@ -21,37 +21,41 @@ class Screen;
 
 /// A screen that is looked at.
 struct Profile {
-  std::string name;
-  ScreenSize size;  ///< pixels
-  float dpi;        ///< dots per inch, more than 0
+  std::string name;  ///< for the findings
+  ScreenSize size;   ///< pixels
+  float dpi;         ///< dots per inch, more than 0
 };
 
 /// A frame at rest, and what the user did to it next.
 struct Moment {
+  /// What a user can do.
   enum class Deed { None, Tap, Key };
 
-  Frame frame = {};
-  Deed deed = Deed::None;
-  int x = 0, y = 0;  ///< of a tap, in pixels
+  Frame frame = {};        ///< what was on the screen
+  Deed deed = Deed::None;  ///< what came then
+  int x = 0;               ///< of a tap, in pixels
+  int y = 0;               ///< the same
 };
 
+/// What a screen is looked at for.
 enum class Check {
-  Cut,         ///< a text is wider than its item, or has lines that find no room
-  Overlap,     ///< two texts touch, or a box hides a part of a text
-  OffScreen,   ///< a text or a touch target is not whole on the screen
-  AtEdge,      ///< a text is within 0.5 mm of the screen's left or right edge
-  SmallText,   ///< letters of a font under 1.5 mm
-  Contrast,    ///< text and ground differ by less than 3 to 1
-  SmallTarget, ///< a touch target under 7 mm in width or height
-  NoKey        ///< no key reaches a touch target
+  Cut,          ///< a text is wider than its item, or has lines that find no room
+  Overlap,      ///< two texts touch, or a box hides a part of a text
+  OffScreen,    ///< a text or a touch target is not whole on the screen
+  AtEdge,       ///< a text is within 0.5 mm of the screen's left or right edge
+  SmallText,    ///< letters of a font under 1.5 mm
+  Contrast,     ///< text and ground differ by less than 3 to 1
+  SmallTarget,  ///< a touch target under 7 mm in width or height
+  NoKey         ///< no key reaches a touch target
 };
 
 /// The check's name in findings: "cut", "overlap", "off-screen", "at-edge", "small-text",
 /// "contrast", "small-target", "no-key".
 const char* nameOf(Check check);
 
+/// What is wrong with one item.
 struct Finding {
-  Check check;
+  Check check;         ///< which rule it breaks
   std::string item;    ///< its text, or its kind and rectangle where it shows none
   std::string page;    ///< the text that stands highest on the screen; empty: there is none
   std::string detail;  ///< what is wrong, in words
@@ -68,10 +72,11 @@ std::string textOf(const Finding& finding, const Profile& profile);
 /// scrolled, and is no finding of OffScreen or Overlap.
 ///
 /// A touch target is an item of the kinds that buttons draw (SKIA_BUTTONBOX, SKIA_ROUNDBUTTONBOX),
-/// or the topmost item under a tap, if it fills less than half of the screen. What nobody tapped and
-/// is no button is not known to be one. What keys reach is known from the session alone: keys reach a
-/// target if a key changed what is drawn on or around it (a mark, another colour), or led to the
-/// texts to which a tap on it led. Pages on which no key was pressed give no findings of NoKey.
+/// or the topmost item under a tap, if it fills less than half of the screen. What nobody tapped
+/// and is no button is not known to be one. What keys reach is known from the session alone: keys
+/// reach a target if a key changed what is drawn on or around it (a mark, another colour), or led
+/// to the texts to which a tap on it led. Pages on which no key was pressed give no findings of
+/// NoKey.
 std::vector<Finding> lint(const std::vector<Moment>& moments, const Profile& profile);
 
 /// A list of findings that are accepted, each with its reason. Blank lines, and lines that begin

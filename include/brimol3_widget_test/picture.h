@@ -11,14 +11,15 @@ namespace brimol::test {
 
 /// In pixels.
 struct ScreenSize {
-  int width, height;
+  int width;   ///< across
+  int height;  ///< down
   friend bool operator==(const ScreenSize&, const ScreenSize&) = default;
 };
 
 /// Pixels by rows, 0x00RRGGBB.
 struct Picture {
-  ScreenSize size = {0, 0};
-  std::vector<uint32_t> pixels = {};
+  ScreenSize size = {0, 0};           ///< in pixels
+  std::vector<uint32_t> pixels = {};  ///< `width` times `height`
 
   /// Throws std::out_of_range for a place outside the picture.
   uint32_t at(int x, int y) const;

@@ -19,25 +19,27 @@ namespace brimol::test {
 
 /// What a test sets and reads while no other thread runs or all of them are held.
 struct PlatformState {
-  bool records = true;       ///< false: drawings and log lines are dropped
-  int live = 1;              ///< what skia_live_widget_c() returns
-  int liveAsked = 0;         ///< how often it was asked
-  int nextHandle = 0;        ///< what drawing calls return
-  float xdpi = 0, ydpi = 0;  ///< 0: unknown
-  int inits = 0, quits = 0;  ///< of the input service
-  unsigned int initFlags = 0;
-  unsigned int paused = 0;  ///< milliseconds that the test's thread spent in Delay
-  std::vector<Drawing> drawings;
-  std::vector<LogLine> lines;
-  std::deque<Event> fed;
-  std::map<std::string, std::string> properties;
+  bool records = true;            ///< false: drawings and log lines are dropped
+  int live = 1;                   ///< what skia_live_widget_c() returns
+  int liveAsked = 0;              ///< how often it was asked
+  int nextHandle = 0;             ///< what drawing calls return
+  float xdpi = 0;                 ///< dots per inch, 0: unknown
+  float ydpi = 0;                 ///< the same
+  int inits = 0;                  ///< of the input service
+  int quits = 0;                  ///< the same
+  unsigned int initFlags = 0;     ///< of the last EventInit
+  unsigned int paused = 0;        ///< milliseconds that the test's thread spent in Delay
+  std::vector<Drawing> drawings;  ///< calls that nobody has taken
+  std::vector<LogLine> lines;     ///< the same of the log
+  std::deque<Event> fed;          ///< what PollEvent has not returned yet
+  std::map<std::string, std::string> properties;  ///< the system properties
 
   // What brimol/host.h tells of.
-  int width = 1440, height = 2560;     ///< of the screen, pixels
-  bool closeRequested = false;         ///< the user has asked to close the window
-  int brightness = 100;                ///< per cent, as last set
-  int64_t utcMs = kDefaultUtcMs;       ///< since 1970, when the ticks were 0
-  uint32_t random = 1;                 ///< the next random number; the one behind it is one more
+  int width = 1440, height = 2560;  ///< of the screen, pixels
+  bool closeRequested = false;      ///< the user has asked to close the window
+  int brightness = 100;             ///< per cent, as last set
+  int64_t utcMs = kDefaultUtcMs;    ///< since 1970, when the ticks were 0
+  uint32_t random = 1;              ///< the next random number; the one behind it is one more
   std::map<std::string, std::string> figures;  ///< by name; a figure that is not here is empty
 
   static constexpr int64_t kDefaultUtcMs = 1'767'225'600'000;  ///< 2026-01-01T00:00:00Z
@@ -61,8 +63,8 @@ struct RecordingPlatform : PlatformState {
   std::atomic<unsigned int> ticks = 0;  ///< what GetTicks() returns, in milliseconds
   Turns turns;                          ///< of the other threads, in Delay
 
-  std::thread::id testThread;
-  std::mutex lock;  ///< guards `records`, the lists and the properties
+  std::thread::id testThread;  ///< the one that called reset()
+  std::mutex lock;             ///< guards `records`, the lists and the properties
 
  private:
   template <typename List>

@@ -22,12 +22,13 @@ namespace brimol::test {
 
 /// The widget under test, the finger that plays on it, and what was told so far.
 struct Stage {
-  std::unique_ptr<MW::Widget> widget;
-  std::string journal;
-  MW::mouse_event finger = {};
-  int calls = 0;         ///< callbacks so far
-  int deletingCall = 0;  ///< the callback that deletes the widget; 0: none does
+  std::unique_ptr<MW::Widget> widget;  ///< under test
+  std::string journal;                 ///< what was told so far
+  MW::mouse_event finger = {};         ///< where it was last
+  int calls = 0;                       ///< callbacks so far
+  int deletingCall = 0;                ///< the callback that deletes the widget; 0: none does
 };
+/// The stage of the process.
 inline Stage stage;
 
 /// Begins a word of the journal, where one has not just begun.
@@ -50,6 +51,7 @@ inline void noteTouch(const std::string& word, const MW::mouse_event* mouse) {
 /// The same with a "!" where the value is not 0.
 inline void noteZero(const std::string& word, int value) { note(word + (value == 0 ? "" : "!")); }
 
+/// Something that a test does on the stage; several in a row.
 using Step = std::function<void()>;
 using Steps = std::vector<Step>;
 
@@ -102,6 +104,7 @@ inline Step finger(unsigned int number) {
   return [number] { stage.finger.finger = number; };
 }
 
+/// A key goes down, and up; a user event; an application event.
 inline Step keyDown(unsigned int code) { return detail::keyStep(MW::kEventKeyPress, code); }
 inline Step keyUp(unsigned int code) { return detail::keyStep(MW::kEventKeyRelease, code); }
 inline Step plug(unsigned int code) { return detail::keyStep(MW::kEventUser, code); }
@@ -113,9 +116,11 @@ inline Step appEvent(int value) {
 inline Step at(unsigned int ticks) {
   return [ticks] { platform().ticks = ticks; };
 }
+/// So many milliseconds later.
 inline Step later(unsigned int ms) {
   return [ms] { platform().ticks += ms; };
 }
+/// When the clock starts, in milliseconds.
 inline constexpr unsigned int kStartTicks = 1000;
 
 /// An operation on the widget: call(&MW::Widget::onHideTimer, 500), or any function of it. That of
@@ -165,6 +170,7 @@ inline Step lookAtLog() {
   });
 }
 
+/// What makes a widget for the stage.
 using Maker = std::function<std::unique_ptr<MW::Widget>()>;
 
 /// The journal of the steps, played on a new widget; they end where the widget is deleted.

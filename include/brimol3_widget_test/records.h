@@ -42,6 +42,7 @@ inline std::ostream& operator<<(std::ostream& out, const SKIA_Text& text) {
 
 namespace brimol::test {
 
+/// The drawing call that was made.
 enum class Call {
   Box,
   RoundBox,
@@ -58,21 +59,21 @@ enum class Call {
 
 /// A text record as it is drawn: its first `string_len` bytes.
 struct DrawnText {
-  std::string text;
-  uint32_t color = 0;
-  int32_t align = 0;
-  int32_t size = 0;
+  std::string text;    ///< the bytes
+  uint32_t color = 0;  ///< 0xAARRGGBB
+  int32_t align = 0;   ///< enum SKIA_Align
+  int32_t size = 0;    ///< pixels
 
   bool operator==(const DrawnText&) const = default;
 };
 
 /// One drawing call. What a call does not take stays zero.
 struct Drawing {
-  Call call = Call::Item;
-  SKIA_Rect rect = {};
-  SKIA_Point line = {};
-  DrawnText text = {};
-  int32_t kind = 0;  ///< of an item record
+  Call call = Call::Item;  ///< which one
+  SKIA_Rect rect = {};     ///< what it was given
+  SKIA_Point line = {};    ///< the same
+  DrawnText text = {};     ///< the same
+  int32_t kind = 0;        ///< of an item record
 
   bool operator==(const Drawing&) const = default;
 };
@@ -88,15 +89,16 @@ using Frame = std::vector<SKIA_Item>;
 
 /// The item that the call adds.
 SKIA_Item itemOf(const Drawing& drawing);
+/// The items of several calls.
 Frame itemsOf(const std::vector<Drawing>& drawings);
 /// A line for each item: its kind, rectangle, line and text, as far as it has them.
 std::string textOf(const Frame& frame);
 
 /// One log line; its text is what stands behind the tag.
 struct LogLine {
-  int priority;  ///< 3 debug, 5 warning, 6 error
-  std::string tag;
-  std::string message;
+  int priority;         ///< 3 debug, 5 warning, 6 error
+  std::string tag;      ///< who logged
+  std::string message;  ///< what
 
   bool operator==(const LogLine&) const = default;
 };

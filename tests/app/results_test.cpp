@@ -3,6 +3,7 @@
 #include <sys/mman.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
+#include <sys/time.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -201,21 +202,22 @@ TEST_F(Results, LoseAtMostTheRunningTestOfAKilledWriter) {
   // The number of the last record that was written.
   auto* const safe = static_cast<std::atomic<int>*>(shared);
   std::mt19937 random(20261121);
-  std::uniform_int_distribution<useconds_t> lives(0, 20'000);
+  std::uniform_int_distribution<suseconds_t> lives(1, 20'000);
   for (int kill = 0; kill < 50; ++kill) {
     SCOPED_TRACE(kill);
     const int before = *safe;
+    const itimerval life = {{}, {0, lives(random)}};  // its alarm ends the writer in any moment
     const pid_t writer = ::fork();
     if (writer == 0) {
       auto book = ResultBook::open(file, error);
-      while (book && book->record(resultOf(*safe + 1), error)) ++*safe;
+      while (book && book->record(resultOf(*safe + 1), error)) {
+        if (++*safe == before + 1) ::setitimer(ITIMER_REAL, &life, nullptr);
+      }
       ::_exit(1);
     }
-    for (int wait = 0; *safe == before && wait < 100'000; ++wait) ::usleep(100);
-    ASSERT_GT(*safe, before) << "the writer ended by itself";
-    ::usleep(lives(random));  // any moment of its loop
-    ::kill(writer, SIGKILL);
-    ::waitpid(writer, nullptr, 0);
+    int end = 0;
+    ::waitpid(writer, &end, 0);
+    ASSERT_TRUE(WIFSIGNALED(end) && WTERMSIG(end) == SIGALRM) << "it ended by itself";
     const auto book = ResultBook::open(file, error);
     ASSERT_TRUE(book) << error;
     for (int number = std::max(1, *safe - kTests + 2); number <= *safe; ++number) {

@@ -2,6 +2,9 @@
 #include <brimol/frame.h>
 #include <brimol3_widget_test/platform.h>
 
+#include <algorithm>
+#include <iterator>
+
 #include "example.h"
 #include "golden/golden_cases.h"
 
@@ -36,17 +39,18 @@ void show(const gallery::Example& example) {
   example.run(loop);
 }
 
+Case caseOf(const gallery::Example& example) {
+  const auto& [width, height] = example.screen;
+  const View view = {height * example.view.top / kHundred, height * example.view.bottom / kHundred};
+  return {example.name, {width, height}, [&example] { show(example); }, view};
+}
+
 }  // namespace
 
 std::vector<Case> galleryCases() {
   std::vector<Case> cases;
   for (const gallery::Family& family : gallery::families()) {
-    for (const gallery::Example& example : family.examples) {
-      const ScreenSize screen = {example.screen.width, example.screen.height};
-      const auto& [top, bottom] = example.view;
-      const View view = {screen.height * top / kHundred, screen.height * bottom / kHundred};
-      cases.push_back({example.name, screen, [&example] { show(example); }, view});
-    }
+    std::ranges::transform(family.examples, std::back_inserter(cases), caseOf);
   }
   return cases;
 }

@@ -114,7 +114,7 @@ TEST_F(SessionReplay, PlaysWhatAUserDidInAWindow) {
   {
     Program program(
         folder,
-        {{"BRIMOL_RECORD", trace}, {"BRIMOL_DISPLAY", "window"}, {"BRIMOL_SCREEN", "720x1280"}},
+        {{"BRIMOL_RECORD", trace}, {"BRIMOL_DISPLAY", "window"}, {"BRIMOL_DEVICE", "hd-4.7"}},
         {"--results", results});
     while (readAll(trace).find(" frame ") == std::string::npos) {
       std::this_thread::sleep_for(std::chrono::milliseconds(50));
@@ -126,6 +126,7 @@ TEST_F(SessionReplay, PlaysWhatAUserDidInAWindow) {
   const std::string recorded = readAll(results);
   const std::string text = readAll(trace);
   EXPECT_NE(recorded.find("\"verdict\""), std::string::npos) << recorded;
+  EXPECT_NE(text.find("\nscreen 720x1280\ndensity 312.5\n"), std::string::npos);
   EXPECT_NE(text.find(" long 0 "), std::string::npos);
   EXPECT_NE(text.find(" end\n"), std::string::npos);
   for (int round = 0; round < 5 * QUIET_ROUNDS; ++round) {

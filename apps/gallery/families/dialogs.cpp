@@ -112,7 +112,7 @@ constexpr auto kDialogs = std::to_array<Example>({
      MW::kTopLayer},
     {"dialog_slide_own", "DialogSlide with words of the application", "", kMiddle,
      [](Loop& loop) {
-       MW::DialogSlide dialog(0);
+       MW::DialogSlide dialog(MW::DialogSlide::kOwnTexts);
        dialog.setTitle("Torch");
        dialog.setDesc("Is the torch bright?");
        dialog.setLeft("DARK");

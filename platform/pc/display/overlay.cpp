@@ -1,9 +1,9 @@
 #include "display/overlay.h"
 
 #include <algorithm>
-#include <cstdint>
-#include <cstdio>
+#include <iomanip>
 #include <numbers>
+#include <sstream>
 #include <string>
 #include <utility>
 
@@ -85,22 +85,23 @@ void drawOutlines(cairo_t* context, const Frame& items, const WindowFit& fit) {
   }
 }
 
+std::string withOneDecimal(double number) {
+  std::ostringstream text;
+  text << std::fixed << std::setprecision(1) << number;
+  return text.str();
+}
+
 std::string inMs(std::chrono::microseconds time) {
   constexpr double kUsPerMs = 1000;
-  char text[32];
-  std::snprintf(text, sizeof text, "%.1f ms", static_cast<double>(time.count()) / kUsPerMs);
-  return text;
+  return withOneDecimal(static_cast<double>(time.count()) / kUsPerMs) + " ms";
 }
 
 std::string shareOf(const Region& changed, Size screen) {
   constexpr double kWhole = 100;
   double pixels = 0;
   for (const Pixels& part : changed) pixels += double{1} * part.width * part.height;
-  char text[64];
-  std::snprintf(text, sizeof text, "%.1f %% in %zu %s",
-                pixels * kWhole / (double{1} * screen.w * screen.h), changed.size(),
-                changed.size() == 1 ? "part" : "parts");
-  return text;
+  return withOneDecimal(pixels * kWhole / (double{1} * screen.w * screen.h)) + " % in " +
+         std::to_string(changed.size()) + (changed.size() == 1 ? " part" : " parts");
 }
 
 void drawFinger(cairo_t* context, ScreenPoint at, const WindowFit& fit, bool isDown) {

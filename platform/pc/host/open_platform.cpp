@@ -36,6 +36,7 @@ std::string openPlatform() {
     std::string problem = played->prepare();
     if (!problem.empty()) return problem;
     wanted.settings.screen = played->screen();
+    wanted.settings.density = played->dotsPerInch();
   }
   if (!wanted.error.empty()) return wanted.error;
   InputService& input = inputService();

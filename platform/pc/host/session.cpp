@@ -79,15 +79,25 @@ Session::Session(SessionSettings wanted) : settings(std::move(wanted)), problem(
 void Session::takeScreen() {
   const SettingsResult wanted = readSettings();
   screenSize = wanted.settings.screen;
-  density = wanted.settings.density;
   display = wanted.settings.display;
   if (problem.empty()) problem = wanted.error;
+  takeDensity(wanted.settings);
   const std::optional<Size>& size = parsed.trace.screen;
   if (!size) return;
   if (!wanted.settings.isSizeGiven) screenSize = *size;
   if (*size != screenSize && parsed.error.empty()) {
     parsed.error = settings.trace + ": it is for a screen of " + std::to_string(size->w) + 'x' +
                    std::to_string(size->h) + ", and the environment asks for another";
+  }
+}
+
+void Session::takeDensity(const Settings& wanted) {
+  density = wanted.density;
+  const std::optional<float>& recorded = parsed.trace.density;
+  if (!recorded) return;
+  if (!wanted.isDensityGiven) density = *recorded;
+  if (*recorded != density && parsed.error.empty()) {
+    parsed.error = settings.trace + ": BRIMOL_DEVICE asks for another density";
   }
 }
 
@@ -124,6 +134,7 @@ void Session::startRecording() {
   world.change({WorldChange::Kind::Random, seed, {}, {}}, 0);
   recorder->start(turns->ticksAtStart(), static_cast<uint64_t>(utc), seed);
   recorder->screen(screenSize);
+  if (density != kDefaultDensity) recorder->density(density);
 }
 
 std::string Session::prepare() {

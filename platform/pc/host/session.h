@@ -34,6 +34,7 @@ class Session {
 
   /// What the environment asks, or else the trace.
   Size screen() const { return screenSize; }
+  float dotsPerInch() const { return density; }
   /// The screen is about to open. One line that says why it cannot; a trace that cannot be played
   /// ends the process.
   std::string prepare();
@@ -69,6 +70,7 @@ class Session {
   void startClock();
   void startRecording();
   void takeScreen();
+  void takeDensity(const Settings& wanted);
   void startReport();
   TraceStage stage();
   std::optional<uint64_t> due(uint64_t soonest);

@@ -81,6 +81,7 @@ std::string readDevice(const VariableLookup& lookup, Settings& settings) {
   if (device == nullptr) return wrongValue(kDeviceVariable, value, namesOfDevices());
   settings.screen = {device->width, device->height};
   settings.density = device->density;
+  settings.isDensityGiven = true;
   settings.isSizeGiven = true;
   return {};
 }

@@ -36,7 +36,8 @@ struct Settings {
   DisplayChoice display = DisplayChoice::WindowIfPossible;
   Size screen = kDefaultScreen;  // pixels, each side 1 to kMaxScreenSide
   float density = kDefaultDensity;
-  bool isSizeGiven = false;  // by BRIMOL_DEVICE or BRIMOL_SCREEN
+  bool isSizeGiven = false;     // by BRIMOL_DEVICE or BRIMOL_SCREEN
+  bool isDensityGiven = false;  // by BRIMOL_DEVICE
   std::optional<ListenAddress> listen;
 };
 

@@ -111,6 +111,7 @@ struct Trace {
   bool leavesRunning = false;
   std::string cutAt;  // a recording without an end: where it stops, for the user
   std::optional<Size> screen;
+  std::optional<float> density;  // dots per inch
   std::optional<uint32_t> clockStart;
   std::vector<TraceStep> steps;
   std::vector<RecordedFrame> frames;

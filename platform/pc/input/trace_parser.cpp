@@ -1,11 +1,13 @@
 #include "input/trace_parser.h"
 
 #include <algorithm>
+#include <charconv>
 #include <filesystem>
 #include <fstream>
 #include <limits>
 #include <sstream>
 #include <string_view>
+#include <system_error>
 #include <utility>
 
 #include "input/trace_steps.h"
@@ -31,6 +33,16 @@ std::string_view trimmed(std::string_view line) {
 }
 
 bool isDigit(char letter) { return letter >= '0' && letter <= '9'; }
+
+float readDensity(std::string_view word) {
+  constexpr float kMost = 10000;
+  float density = 0;
+  const char* const end = word.data() + word.size();
+  const auto [stop, problem] = std::from_chars(word.data(), end, density);
+  const bool isNumber = problem == std::errc() && stop == end;
+  if (!isNumber || !(density > 0 && density <= kMost)) throw BadLine{"no number of dots per inch"};
+  return density;
+}
 
 /// Reads files into one trace.
 class TraceParser {
@@ -199,6 +211,9 @@ bool TraceParser::readSetting(const TraceLine& line, TraceWords& words) {
     const int width = side();
     trace.screen = Size{width, side()};
     sides.expectEnd();
+  } else if (words.takes("density")) {
+    mustComeFirst();
+    trace.density = readDensity(words.word("dots per inch"));
   } else if (words.takes("clock")) {
     mustComeFirst();
     words.expect("start");

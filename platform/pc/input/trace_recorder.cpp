@@ -2,6 +2,7 @@
 
 #include <array>
 #include <cerrno>
+#include <charconv>
 #include <system_error>
 
 #include "input/trace_steps.h"
@@ -60,6 +61,12 @@ void TraceRecorder::start(uint32_t clockStart, uint64_t utcMs, uint64_t seed) {
 
 void TraceRecorder::screen(Size size) {
   write("screen " + std::to_string(size.w) + 'x' + std::to_string(size.h));
+}
+
+void TraceRecorder::density(float dotsPerInch) {
+  std::array<char, 32> digits = {};
+  const auto end = std::to_chars(digits.data(), digits.data() + digits.size(), dotsPerInch).ptr;
+  write("density " + std::string(digits.data(), end));
 }
 
 void TraceRecorder::input(uint64_t time, const Event& record) {

@@ -22,6 +22,7 @@ class TraceRecorder {
   /// The lines at the head, to be written first. Time of day in milliseconds since 1970.
   void start(uint32_t clockStart, uint64_t utcMs, uint64_t seed);
   void screen(Size size);
+  void density(float dotsPerInch);
   void input(uint64_t time, const Event& record);
   void close(uint64_t time);
   void figure(uint64_t time, const std::string& name, const std::string& value);

@@ -91,12 +91,13 @@ INSTANTIATE_TEST_SUITE_P(
         WrongLine{"5 frame 0123 1", "a hash of 16 digits"},
         WrongLine{"| 0 box", "an item without a frame"},
         WrongLine{"screen 720", "a side in pixels"}, WrongLine{"screen 0x5", "without pixels"},
+        WrongLine{"density 0", "no number of dots"}, WrongLine{"density 1x", "no number of dots"},
         WrongLine{"include gone.trace", "'t/gone.trace' cannot be read"},
         WrongLine{"include main.trace", "includes itself"}));
 
 TEST(TraceParserTest, ReadsStepsWithTheirTimesAndOperands) {
   const ParsedTrace parsed = parseLines(
-      "screen 720x1280\nclock start 4294960000\n"
+      "screen 720x1280\ndensity 312.5\nclock start 4294960000\n"
       "1500 tap \"a*\\*\" for 700 finger 9 # a comment\n"
       "+20 move by -5 10% over 30\n"
       "key down\nkey down up\nkey volume-up for 5\n"
@@ -106,6 +107,7 @@ TEST(TraceParserTest, ReadsStepsWithTheirTimesAndOperands) {
   const auto& steps = parsed.trace.steps;
   ASSERT_EQ(steps.size(), 8U);
   EXPECT_EQ(parsed.trace.screen, (Size{720, 1280}));
+  EXPECT_EQ(parsed.trace.density, 312.5F);
   EXPECT_EQ(parsed.trace.clockStart, 4294960000U);
   const auto& tap = std::get<Touch>(steps[0].action);
   EXPECT_EQ(steps[0].time, 1500U);
