@@ -11,6 +11,7 @@
 #include <optional>
 #include <string>
 #include <thread>
+#include <utility>
 #include <vector>
 
 #include "display/display.h"
@@ -74,7 +75,7 @@ class Platform {
 
   static constexpr int kFullLight = 100;  // per cent
 
-  Platform(const Settings& wanted, InputService& target) : settings(wanted), service(target) {}
+  Platform(Settings wanted, InputService& target) : settings(std::move(wanted)), service(target) {}
   void run(std::promise<std::string> opened);
   void serve(Display& display, InputTranslator& input);
   void show(const Frame& frame, Painter& painter, Display& display) const;

@@ -4,6 +4,7 @@
 #include <netdb.h>
 #include <sys/socket.h>
 
+#include <array>
 #include <cerrno>
 #include <charconv>
 #include <cstring>
@@ -28,22 +29,23 @@ Address resolve(const ListenAddress& address) {
   hints.ai_flags = AI_NUMERICHOST | AI_NUMERICSERV | AI_PASSIVE;
   hints.ai_socktype = SOCK_STREAM;
   addrinfo* found = nullptr;
-  getaddrinfo(address.host.c_str(), std::to_string(address.port).c_str(), &hints, &found);
+  const std::string port = std::to_string(address.port);
+  if (getaddrinfo(address.host.c_str(), port.c_str(), &hints, &found) != 0) return nullptr;
   return Address(found);
 }
 
 std::optional<uint16_t> portOf(const Socket& socket) {
   sockaddr_storage name = {};
   socklen_t length = sizeof name;
-  char digits[NI_MAXSERV] = {};
+  std::array<char, NI_MAXSERV> digits = {};
   uint16_t port = 0;
-  // The casts are those of the socket calls: every kind of address begins like a sockaddr.
+  // The cast is that of the socket calls: every kind of address begins like a sockaddr.
   auto* const any = reinterpret_cast<sockaddr*>(&name);
   if (getsockname(socket.get(), any, &length) != 0) return std::nullopt;
-  if (getnameinfo(any, length, nullptr, 0, digits, sizeof digits, NI_NUMERICSERV) != 0) {
+  if (getnameinfo(any, length, nullptr, 0, digits.data(), digits.size(), NI_NUMERICSERV) != 0) {
     return std::nullopt;
   }
-  std::from_chars(digits, digits + std::strlen(digits), port);
+  std::from_chars(digits.data(), digits.data() + std::strlen(digits.data()), port);
   return port;
 }
 

@@ -27,7 +27,7 @@ class Socket {
   int release() { return std::exchange(number, -1); }
 
  private:
-  void close() {
+  void close() const {
     if (number >= 0) ::close(number);
   }
   int number;

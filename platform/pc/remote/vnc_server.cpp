@@ -1,17 +1,16 @@
 #include "remote/vnc_server.h"
 
 #include <poll.h>
-#include <pthread.h>
 #include <sys/eventfd.h>
 #include <sys/select.h>
 
 #include <algorithm>
 #include <array>
-#include <csignal>
 #include <cstdlib>
 #include <utility>
 
 #include "remote/message_gate.h"
+#include "remote/signals.h"
 
 namespace brimol::pc {
 namespace {
@@ -45,14 +44,6 @@ constexpr const char* kArrow =
     "x  x..x "
     "    xx  ";
 
-// A write to a viewer who has gone raises a signal in the thread that writes.
-void blockBrokenPipes() {
-  sigset_t signals;
-  sigemptyset(&signals);
-  sigaddset(&signals, SIGPIPE);
-  pthread_sigmask(SIG_BLOCK, &signals, nullptr);
-}
-
 bool isBehind(const Viewer& viewer) { return viewer.queuedBytes > kEnoughQueued; }
 
 // The outline is black and the inside white: the mask has both.
@@ -65,6 +56,16 @@ rfbCursor* makeArrow() {
   arrow->foreRed = arrow->foreGreen = arrow->foreBlue = 0;
   arrow->backRed = arrow->backGreen = arrow->backBlue = 0xFFFF;
   return arrow;
+}
+
+// Fingers are messages that the protocol does not have. LibVNCServer's list of such extensions is
+// the process's, and so is this one.
+rfbProtocolExtension fingers = {};
+
+// LibVNCServer does not.
+void freeExtensions(rfbClientPtr client) {
+  rfbExtensionData* each = std::exchange(client->extensions, nullptr);
+  while (each != nullptr) std::free(std::exchange(each, each->next));
 }
 
 rfbBool welcome(rfbClientPtr, void**) { return TRUE; }
@@ -91,8 +92,6 @@ void VncServer::stop() {
 }
 
 void VncServer::setUpServer(Size size) {
-  // Fingers are messages that the protocol does not have. The list of extensions is the process's.
-  static rfbProtocolExtension fingers = {};
   fingers.newClient = welcome;
   fingers.handleMessage = takeFinger;
   rfbLogEnable(0);
@@ -175,7 +174,7 @@ void VncServer::takeNewcomers() {
     taken.swap(newcomers);
   }
   for (auto& [end, viewer] : taken) {
-    rfbClientPtr const client = rfbNewClient(server.get(), end.release());
+    rfbClientRec* const client = rfbNewClient(server.get(), end.release());
     if (client == nullptr) continue;
     guests.push_back({client, std::move(viewer), ViewerHands(++guestsSoFar, actions)});
     client->clientData = &guests.back();
@@ -202,6 +201,7 @@ void VncServer::removeGone() {
       continue;
     }
     guest->hands.letGo();
+    freeExtensions(guest->client);
     rfbClientConnectionGone(guest->client);
     guest = guests.erase(guest);
   }

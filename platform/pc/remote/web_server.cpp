@@ -13,6 +13,7 @@
 #include <utility>
 
 #include "remote/hosts.h"
+#include "remote/signals.h"
 #include "remote/web_answers.h"
 
 namespace brimol::pc {
@@ -27,6 +28,26 @@ constexpr std::size_t kEnoughForServer = std::size_t{1} << 16;
 constexpr const char* kProtocol = "screen";
 
 constexpr lws_retry_bo_t kNoProbes = {};
+
+struct SocketOption {
+  int level;
+  int name;
+  int value;
+};
+// Small messages go at once, and a viewer whose machine is gone is noticed within a minute.
+constexpr auto kSocketOptions = std::to_array<SocketOption>({
+    {IPPROTO_TCP, TCP_NODELAY, 1},
+    {SOL_SOCKET, SO_KEEPALIVE, 1},
+    {IPPROTO_TCP, TCP_KEEPIDLE, 30},
+    {IPPROTO_TCP, TCP_KEEPINTVL, 10},
+    {IPPROTO_TCP, TCP_KEEPCNT, 3},
+});
+
+void setUp(int connection) {
+  for (const auto& [level, name, value] : kSocketOptions) {
+    setsockopt(connection, level, name, &value, sizeof value);
+  }
+}
 
 bool isOutOfResources(int error) { return error != EAGAIN && error != ECONNABORTED; }
 
@@ -110,6 +131,7 @@ void WebServer::createContext() {
   info.keepalive_timeout = kSecondsToIntroduce;
   info.retry_and_idle_policy = &kNoProbes;
   info.vhost_name = "brimol";
+  const BrokenPipeKeeper keeper;  // libwebsockets has it ignored in the whole process
   context.reset(lws_create_context(&info));
   if (context) host = lws_create_vhost(context.get(), &info);
   if (host == nullptr) std::abort();  // no memory or no descriptor is left
@@ -125,6 +147,7 @@ void WebServer::listen(Listener listener, Door door) {
 }
 
 void WebServer::run() {
+  blockBrokenPipes();
   while (!isOver) lws_service(context.get(), 0);
 }
 
@@ -172,8 +195,7 @@ void WebServer::accept(lws* wsi) {
 
 void WebServer::receive(Socket connection, Door door) {
   if (connections.size() >= kMaxConnections || (door == Door::Vnc && !hasRoom())) return;
-  const int yes = 1;
-  setsockopt(connection.get(), IPPROTO_TCP, TCP_NODELAY, &yes, sizeof yes);
+  setUp(connection.get());
   lws_sock_file_fd_type descriptor = {};
   descriptor.sockfd = connection.release();
   const auto kind = static_cast<lws_adoption_type>(
@@ -229,10 +251,13 @@ int WebServer::hearViewer(Line& line, std::string_view bytes) {
   return 0;
 }
 
-int WebServer::hearServer(Line& line, std::string_view bytes) {
+int WebServer::hearServer(Line& line, std::string_view bytes) const {
   const bool wasEmpty = line.caller.forViewer().isEmpty();
   line.caller.answer(bytes);
-  if (line.caller.forViewer().size() > maxQueued) return 1;
+  if (line.caller.forViewer().size() > maxQueued) {
+    shutdown(lws_get_socket_fd(line.inner), SHUT_RDWR);  // the server must not wait for it
+    return 1;
+  }
   if (wasEmpty) watch(line);
   lws_callback_on_writable(line.outer);
   return 0;
@@ -278,17 +303,19 @@ int WebServer::sendToViewer(Line& line) {
   return 0;
 }
 
+// Not by libwebsockets, which reads nothing more from a connection while some of what it sends
+// there waits: the server, which takes nothing while it sends, and it would wait for each other.
 int WebServer::sendToServer(Line& line) {
   ByteQueue& queue = line.caller.forServer();
   const std::string_view chunk = queue.front(kChunk);
-  if (chunk.empty()) return 0;
-  std::ranges::copy(chunk, buffer.begin() + LWS_PRE);
-  if (lws_write(line.inner, buffer.data() + LWS_PRE, chunk.size(), LWS_WRITE_RAW) < 0) return 1;
-  queue.drop(chunk.size());
-  if (queue.isEmpty()) {
-    lws_rx_flow_control(line.outer, 1);
-  } else {
+  const ssize_t sent =
+      ::send(lws_get_socket_fd(line.inner), chunk.data(), chunk.size(), MSG_NOSIGNAL);
+  if (sent < 0 && errno != EAGAIN) return 1;
+  if (sent > 0) queue.drop(static_cast<std::size_t>(sent));
+  if (!queue.isEmpty()) {
     lws_callback_on_writable(line.inner);
+  } else if (line.outer != nullptr) {
+    lws_rx_flow_control(line.outer, 1);
   }
   return 0;
 }

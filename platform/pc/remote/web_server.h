@@ -71,8 +71,8 @@ class WebServer {
   bool hasRoom() const;
   void begin(lws* wsi, Door door);
   int hear(lws* wsi, std::string_view bytes);
-  int hearViewer(Line& line, std::string_view bytes);
-  int hearServer(Line& line, std::string_view bytes);
+  static int hearViewer(Line& line, std::string_view bytes);
+  int hearServer(Line& line, std::string_view bytes) const;
   bool connectToServer(const LinePointer& line);
   int send(lws* wsi);
   int sendToViewer(Line& line);

@@ -19,6 +19,7 @@ VncViewer::VncViewer(int port, std::string password)
     : client(rfbGetClient(8, 3, 4)), secret(std::move(password)) {
   rfbEnableClientLogging = FALSE;
   rfbClientSetClientData(client, &tag, this);
+  std::free(client->serverHost);
   client->serverHost = strdup("127.0.0.1");
   client->serverPort = port;
   client->GetPassword = [](rfbClient* asking) {
