@@ -74,13 +74,15 @@ class KeyReach {
     auto changes = missingIn(after.frame(), before.frame());
     const auto appeared = missingIn(before.frame(), after.frame());
     changes.insert(changes.end(), appeared.begin(), appeared.end());
-    for (const View* const view : {&before, &after}) {
-      for (const std::size_t target : view->targets) {
-        const auto marks = [&](const SKIA_Item& change) {
-          return isAround(change, view->item(target));
-        };
-        if (std::ranges::any_of(changes, marks)) marked.insert(targetOf(*view, target));
-      }
+    addMarked(before, changes);
+    addMarked(after, changes);
+  }
+
+  void addMarked(const View& view, const std::vector<SKIA_Item>& changes) {
+    for (const std::size_t target : view.targets) {
+      const SKIA_Item& item = view.item(target);
+      const auto marks = [&](const SKIA_Item& change) { return isAround(change, item); };
+      if (std::ranges::any_of(changes, marks)) marked.insert(targetOf(view, target));
     }
   }
 

@@ -2,6 +2,7 @@
 #include <brimol3_widget_test/screen.h>
 
 #include <algorithm>
+#include <iterator>
 #include <sstream>
 #include <utility>
 
@@ -207,18 +208,17 @@ void Screen::expectPixel(Spot spot, uint32_t rgb, const Here& here) const {
 }
 
 void Screen::expectLog(const std::string& text, const Here& here) {
-  const std::lock_guard guard(platform().lock);
-  std::vector<LogLine>& lines = platform().lines;
-  const auto found = std::ranges::find_if(lines, [&](const LogLine& line) {
+  std::ranges::move(platform().takeLog(), std::back_inserter(unread));
+  const auto found = std::ranges::find_if(unread, [&](const LogLine& line) {
     return (line.tag + ": " + line.message).find(text) != std::string::npos;
   });
-  if (found == lines.end()) {
+  if (found == unread.end()) {
     std::ostringstream said;
-    for (const LogLine& line : lines) said << "\n  " << line;
+    for (const LogLine& line : unread) said << "\n  " << line;
     throw Failure(
         here, "no line of the log has " + quoted(text) + " in it; since then it says" + said.str());
   }
-  lines.erase(lines.begin(), found + 1);
+  unread.erase(unread.begin(), found + 1);
 }
 
 void expectLayout(const Screen& screen, const Profile& profile, const AcceptedFindings& accepted,

@@ -122,6 +122,7 @@ class Screen {
   Loop loop;
   Frame newest;
   std::vector<Moment> before;
+  std::vector<LogLine> unread;  // of the log
   std::vector<Spot> fingers;
 };
 
