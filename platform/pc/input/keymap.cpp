@@ -109,7 +109,9 @@ std::optional<DisplayKey> displayKey(SDL_Keycode key) {
 }
 
 std::vector<HelpRow> helpRows() {
+  constexpr std::size_t kMouseRowsAndGaps = 8;
   std::vector<HelpRow> rows;
+  rows.reserve(kKeyTable.size() + kDisplayKeys.size() + kMouseRowsAndGaps);
   for (const KeyRow& row : kKeyTable) {
     rows.push_back({row.label, std::string(row.plays) + " (" + std::to_string(row.code) + ")"});
   }

@@ -73,13 +73,14 @@ ScreenPoint WheelDrag::next(ScreenPoint from) const {
 // A finger that goes down moves at once: one that lifted where it went down would be a tap. Without
 // room to move, the rest of the way is dropped.
 void WheelDrag::press(ScreenPoint at, uint32_t now) {
-  if (next(at) == at) {
+  const ScreenPoint first = next(at);
+  if (first == at) {
     right = down = 0;
     return;
   }
   grip = {at, at};
   input.pointerDown(kWheel, at, now);
-  step(now);
+  moveTo(first, now);
 }
 
 void WheelDrag::lift(uint32_t now) {
@@ -93,8 +94,12 @@ void WheelDrag::step(uint32_t now) {
     const ScreenPoint start = grip->start;
     lift(now);
     press(start, now);
-    return;
+  } else {
+    moveTo(to, now);
   }
+}
+
+void WheelDrag::moveTo(ScreenPoint to, uint32_t now) {
   right -= to.x - grip->at.x;
   down -= to.y - grip->at.y;
   grip->at = to;

@@ -42,6 +42,7 @@ class WheelDrag {
   void press(ScreenPoint at, uint32_t now);
   void lift(uint32_t now);
   void step(uint32_t now);
+  void moveTo(ScreenPoint to, uint32_t now);
 
   Size screen;
   InputTranslator& input;

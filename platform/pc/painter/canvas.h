@@ -17,6 +17,7 @@ class Canvas {
 
   Size size() const { return extent; }
   cairo_surface_t* surface() const { return picture.get(); }
+  uint32_t* row(int y) const { return pixels + static_cast<std::ptrdiff_t>(y) * stride; }
   /// Ready for drawing after the canvas's own writes.
   cairo_t* context() const;
 
@@ -29,8 +30,6 @@ class Canvas {
   void cover(const Pixels& area, const Pixels& corner, cairo_surface_t* mask, uint32_t color) const;
 
  private:
-  uint32_t* row(int y) const { return pixels + static_cast<std::ptrdiff_t>(y) * stride; }
-
   CairoSurface picture;
   CairoContext drawing;
   uint32_t* pixels;

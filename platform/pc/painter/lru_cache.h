@@ -1,20 +1,23 @@
 /// A bounded cache that forgets first what was asked for least recently.
 #pragma once
 
+#include <functional>
 #include <list>
 #include <map>
 #include <utility>
 
 namespace brimol::pc {
 
-/// Values by key, each with a cost; together they cost at most `bound`. One thread uses it.
-template <class Key, class Value>
+/// Values by key, each with a cost; together they cost at most `bound`. Keys are ordered by `Less`,
+/// which may take what stands for a key. One thread uses it.
+template <class Key, class Value, class Less = std::less<>>
 class LruCache {
  public:
   explicit LruCache(std::size_t costBound) : bound(costBound) {}
 
   /// The value, valid until the next put(), or null.
-  Value* find(const Key& key) {
+  template <class Wanted>
+  Value* find(const Wanted& key) {
     const auto found = places.find(key);
     if (found == places.end()) return nullptr;
     entries.splice(entries.begin(), entries, found->second);
@@ -52,7 +55,7 @@ class LruCache {
   }
 
   std::list<Entry> entries;  // the most recently used first
-  std::map<Key, typename std::list<Entry>::iterator> places;
+  std::map<Key, typename std::list<Entry>::iterator, Less> places;
   std::size_t bound;
   std::size_t total = 0;
 };

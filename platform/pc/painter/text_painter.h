@@ -4,25 +4,22 @@
 #include <brimol/scene.h>
 
 #include <string>
+#include <string_view>
 #include <tuple>
 
 #include "painter/canvas.h"
 #include "painter/fonts.h"
+#include "painter/ink.h"
+#include "painter/laid_text.h"
 #include "painter/lru_cache.h"
 #include "scene/rectangles.h"
 
 namespace brimol::pc {
 
-/// What the letters of a text touch.
-struct TextInk {
-  Edges area = {0, 0, 0, 0};  // screen pixels
-  bool isWhole = true;        // false: lines are left out for lack of height
-};
-
-/// Draws texts and keeps the layouts of the recent ones. One thread uses it.
+/// Draws texts and keeps what was laid out for the recent ones. One thread uses it.
 class TextPainter {
  public:
-  TextPainter() : fonts(borrowFonts()), layouts(kMostLayouts) {}
+  TextPainter() : fonts(borrowFonts()), texts(kMostBytes) {}
 
   /// Draws the text in the middle of the rectangle's height, aligned as the record asks. Lines
   /// whose middle lies above or below the rectangle are left out. Only pixels in `clip` change: the
@@ -34,26 +31,35 @@ class TextPainter {
   /// draws nothing.
   TextInk inkOf(const SKIA_Rect& rect, const SKIA_Text& text);
 
-  /// Bounded by kMostLayouts.
-  std::size_t layoutCount() const { return layouts.size(); }
-  static constexpr std::size_t kMostLayouts = 1024;
+  /// Of what is kept, bounded by kMostBytes.
+  std::size_t bytes() const { return texts.cost(); }
+  static constexpr std::size_t kMostBytes = std::size_t{4} << 20;
 
  private:
+  // A key, and what stands for it in a look-up.
+  struct KeyView {
+    std::string_view text;
+    int size;
+  };
   struct Key {
     std::string text;
     int size;
-    uint32_t color;
-    friend bool operator<(const Key& one, const Key& other) {
-      return std::tie(one.text, one.size, one.color) <
-             std::tie(other.text, other.size, other.color);
+    operator KeyView() const { return {text, size}; }
+  };
+  struct IsBefore {
+    using is_transparent = void;
+    bool operator()(const KeyView& one, const KeyView& other) const {
+      return std::tie(one.size, one.text) < std::tie(other.size, other.text);
     }
   };
 
-  PangoLayout* layoutOf(const SKIA_Text& text);
-  TextLayout makeLayout(const Key& key) const;
+  const LaidText& laidText(const SKIA_Text& text);
 
   BorrowedFonts fonts;
-  LruCache<Key, TextLayout> layouts;
+  GlyphImages images;
+  PlainShapes shapes;
+  Ink ink{0};
+  LruCache<Key, LaidText, IsBefore> texts;
 };
 
 }  // namespace brimol::pc

@@ -12,6 +12,7 @@
 #include <fstream>
 #include <limits>
 #include <memory>
+#include <random>
 
 #include "pc/support/painting.h"
 
@@ -110,6 +111,23 @@ TEST(Text, OfEveryScriptHasGlyphsAndDirection) {
   const int alef = drawn(textOf("א", 60, kWhite, 2)).inkIn(end);
   EXPECT_GT(alef, 50);
   EXPECT_EQ(drawn(textOf("אבבב", 60, kWhite, 2)).inkIn(end), alef);
+}
+
+// Plain texts are shaped by what others have taught; a new painter knows nothing yet.
+TEST(Text, LooksTheSameOnceItsLettersAreKnown) {
+  constexpr auto kStarts = std::to_array<const char*>({"", "office ", "AV To ", "12:"});
+  std::mt19937 random(7);
+  Painter taught(kScreen);
+  for (int round = 0; round < 400; ++round) {
+    std::string words = kStarts.at(random() % kStarts.size());
+    for (auto count = random() % 40; count > 0; --count) {
+      words += static_cast<char>(' ' + random() % 95);
+    }
+    const SKIA_Text text = textOf(words, 9 + round % 3 * 20, round % 2 == 0 ? kWhite : 0x80FF8020);
+    const Frame frame = {boxItem({0, 0, 300, 50, kBlue}), textItem(SKIA_LABEL, kWide, text)};
+    taught.paint(frame);
+    ASSERT_EQ(pictureOf(taught.picture()), painted(frame, kScreen)) << words;
+  }
 }
 
 // What `pc_text_sum` prints in an environment with that variable.

@@ -1,0 +1,198 @@
+#include "painter/laid_text.h"
+
+#include <pango/pangocairo.h>
+
+#include <algorithm>
+#include <optional>
+
+#include "painter/fonts.h"
+#include "painter/glyph_run.h"
+
+namespace brimol::pc {
+
+namespace {
+
+constexpr int kFarAway = 1'000'000;  // pixels; no text reaches from there to a screen
+
+int pixelsOf(int pangoUnits) { return PANGO_PIXELS(pangoUnits); }
+
+// Where something of `size` pixels lies in the room from `low` to `high`.
+int64_t centred(int64_t low, int64_t high, int size) { return low + (high - low - size) / 2; }
+
+int64_t aligned(const Edges& box, int align, int width) {
+  if (align == SKIA_ALIGN_RIGHT) return box.right - width;
+  if (align == SKIA_ALIGN_CENTRE) return centred(box.left, box.right, width);
+  return box.left;
+}
+
+bool isNear(int64_t position) { return position >= -kFarAway && position <= kFarAway; }
+
+Edges around(const Edges& one, const Edges& other) {
+  return {std::min(one.left, other.left), std::min(one.top, other.top),
+          std::max(one.right, other.right), std::max(one.bottom, other.bottom)};
+}
+
+std::span<const PangoGlyphInfo> glyphsOf(const PangoGlyphString* glyphs) {
+  return {glyphs->glyphs, static_cast<std::size_t>(glyphs->num_glyphs)};
+}
+
+// Pango draws a box with numbers for a character without a glyph: no glyphs, so no mask.
+bool hasAllGlyphs(const PangoGlyphString* glyphs) {
+  return std::ranges::none_of(glyphsOf(glyphs), [](const PangoGlyphInfo& info) {
+    return info.glyph != PANGO_GLYPH_EMPTY && (info.glyph & PANGO_GLYPH_UNKNOWN_FLAG) != 0;
+  });
+}
+
+// None where Pango must draw the run, which begins `start` Pango units from its line's left end.
+std::optional<LineMask> maskOf(const PangoGlyphItem& item, int start, GlyphImages& images) {
+  if (!hasAllGlyphs(item.glyphs)) return std::nullopt;
+  GlyphRun run(item.item->analysis.font, images);
+  start += item.start_x_offset;
+  for (const PangoGlyphInfo& info : glyphsOf(item.glyphs)) {
+    const PangoGlyphGeometry& geometry = info.geometry;
+    if (info.glyph != PANGO_GLYPH_EMPTY)
+      run.add(info.glyph, start + geometry.x_offset, geometry.y_offset - item.y_offset);
+    start += geometry.width;
+  }
+  return run.mask();
+}
+
+TextLayout layOut(PangoContext* context, std::string_view words, int size) {
+  TextLayout layout(pango_layout_new(context));
+  const FontDescription font = projectFonts(size);
+  pango_layout_set_font_description(layout.get(), font.get());
+  const std::unique_ptr<char, decltype(&g_free)> valid(
+      g_utf8_make_valid(words.data(), static_cast<gssize>(words.size())), g_free);
+  pango_layout_set_text(layout.get(), valid.get(), -1);
+  return layout;
+}
+
+}  // namespace
+
+LaidText::LaidText(const Sources& sources, std::string_view words, int size) {
+  const PlainShapes::Sheet* const sheet = sources.shapes.sheetFor(words, size);
+  if (sheet != nullptr && addPlainLine(*sheet, sources.images, words)) return;
+  layout = layOut(sources.context, words, size);
+  int units = 0;
+  pango_layout_get_size(layout.get(), nullptr, &units);
+  height = pixelsOf(units);
+  const LayoutIterator iter(pango_layout_get_iter(layout.get()));
+  do {
+    addLine(iter.get(), sources.images);
+  } while (pango_layout_iter_next_line(iter.get()) != FALSE);
+  const Line& first = lines.front();
+  sources.shapes.learn(words, size, layout.get(), {height, first.middle, first.baseline});
+  if (std::ranges::all_of(lines, &Line::isMasked)) layout.reset();
+}
+
+// False, and nothing is added, where the line has no mask.
+bool LaidText::addPlainLine(const PlainShapes::Sheet& sheet, GlyphImages& images,
+                            std::string_view words) {
+  GlyphRun run(sheet.font(), images);
+  int x = 0;
+  for (std::size_t i = 0; i < words.size(); ++i) {
+    run.add(sheet.glyph(words[i]), x, 0);
+    x += sheet.advance(words[i], i + 1 < words.size() ? words[i + 1] : '\0');
+  }
+  std::optional<LineMask> mask = run.mask();
+  if (!mask) return false;
+  const LineMetrics& metrics = sheet.metrics();
+  height = metrics.height;
+  lines.push_back({metrics.middle, metrics.baseline, pixelsOf(x), true, {}, {}});
+  lines.back().runs.push_back(std::move(*mask));
+  return true;
+}
+
+void LaidText::addLine(PangoLayoutIter* iter, GlyphImages& images) {
+  PangoRectangle extents = {};
+  pango_layout_iter_get_line_extents(iter, nullptr, &extents);
+  Line line = {pixelsOf(extents.y + extents.height / 2),
+               pixelsOf(pango_layout_iter_get_baseline(iter)),
+               pixelsOf(extents.width),
+               true,
+               {}};
+  int start = 0;
+  for (const GSList* each = pango_layout_iter_get_line_readonly(iter)->runs; each != nullptr;
+       each = each->next) {
+    const auto& run = *static_cast<const PangoGlyphItem*>(each->data);
+    std::optional<LineMask> mask = maskOf(run, start, images);
+    if (!mask) {
+      line.isMasked = false;
+      line.runs.clear();
+      break;
+    }
+    line.runs.push_back(std::move(*mask));
+    start += run.start_x_offset + pango_glyph_string_get_width(run.glyphs) + run.end_x_offset;
+  }
+  PangoRectangle letters = {};
+  pango_layout_line_get_pixel_extents(pango_layout_iter_get_line_readonly(iter), &letters, nullptr);
+  line.letters = {letters.x, letters.y, letters.width, letters.height};
+  lines.push_back(std::move(line));
+}
+
+// Visits the lines with the place of each one's left end on its baseline. Line by line, since each
+// is aligned to the box and not to the longest of them. In a box with room for fewer lines, those
+// whose middle lies outside are left out, and the others are whole. False: some are left out.
+template <typename Visit>
+bool LaidText::visit(const Edges& box, int align, Visit each) const {
+  const int64_t top = centred(box.top, box.bottom, height);
+  bool isWhole = true;
+  for (std::size_t i = 0; i < lines.size(); ++i) {
+    const int64_t middle = top + lines[i].middle;
+    const int64_t x = aligned(box, align, lines[i].width);
+    const int64_t y = top + lines[i].baseline;
+    const bool isInBox = middle >= box.top && middle <= box.bottom;
+    isWhole = isWhole && isInBox;
+    if (isInBox && isNear(x) && isNear(y)) {
+      each(i, Place{static_cast<int>(x), static_cast<int>(y)});
+    }
+  }
+  return isWhole;
+}
+
+void LaidText::draw(const Canvas& canvas, const Edges& box, int align, Ink& ink,
+                    const Pixels& clip) const {
+  visit(box, align, [&](std::size_t i, const Place& place) {
+    if (!lines[i].isMasked) drawByPango(canvas, i, place, ink.color(), clip);
+    for (const LineMask& run : lines[i].runs) run.draw(canvas, place, ink, clip);
+  });
+}
+
+TextInk LaidText::ink(const Edges& box, int align) const {
+  TextInk found;
+  found.isWhole = visit(box, align, [&](std::size_t i, const Place& place) {
+    Pixels letters = lines[i].letters;
+    if (letters.width == 0) return;
+    letters.x += place.x;
+    letters.y += place.y;
+    found.area = isEmpty(found.area) ? edgesOf(letters) : around(found.area, edgesOf(letters));
+  });
+  return found;
+}
+
+void LaidText::drawByPango(const Canvas& canvas, std::size_t line, const Place& place,
+                           uint32_t color, const Pixels& clip) const {
+  constexpr double kFull = 255;
+  const auto part = [color](int shift) { return (color >> shift & 0xFF) / kFull; };
+  cairo_t* const context = canvas.context();
+  cairo_save(context);
+  cairo_rectangle(context, clip.x, clip.y, clip.width, clip.height);
+  cairo_clip(context);
+  cairo_set_source_rgba(context, part(16), part(8), part(0), part(24));
+  cairo_move_to(context, place.x, place.y);
+  pango_cairo_show_layout_line(
+      context, pango_layout_get_line_readonly(layout.get(), static_cast<int>(line)));
+  cairo_restore(context);
+}
+
+std::size_t LaidText::bytes() const {
+  constexpr std::size_t kLayoutBytes = 8192;  // about what Pango keeps for a short text
+  std::size_t sum = sizeof *this + (layout ? kLayoutBytes : 0);
+  for (const Line& line : lines) {
+    sum += sizeof line;
+    for (const LineMask& run : line.runs) sum += sizeof run + run.bytes();
+  }
+  return sum;
+}
+
+}  // namespace brimol::pc

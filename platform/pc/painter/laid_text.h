@@ -1,0 +1,62 @@
+/// A text in one size, laid out and ready to be drawn in any colour at any place.
+#pragma once
+
+#include <string_view>
+#include <vector>
+
+#include "painter/glyph_images.h"
+#include "painter/line_mask.h"
+#include "painter/plain_shapes.h"
+#include "painter/text_handles.h"
+
+namespace brimol::pc {
+
+/// What the letters of a text touch.
+struct TextInk {
+  Edges area = {0, 0, 0, 0};  // screen pixels
+  bool isWhole = true;        // false: lines are left out for lack of height
+};
+
+/// Lines of text. One thread uses it.
+class LaidText {
+ public:
+  /// What a text is made from, and what is learnt for others meanwhile. Asked during the call.
+  struct Sources {
+    PangoContext* context;
+    GlyphImages& images;
+    PlainShapes& shapes;
+  };
+  LaidText(const Sources& sources, std::string_view words, int size);
+
+  /// Draws what text_painter.h describes.
+  void draw(const Canvas& canvas, const Edges& box, int align, Ink& ink, const Pixels& clip) const;
+
+  /// Where the letters' outlines lie. Only for a text that Pango has shaped.
+  TextInk ink(const Edges& box, int align) const;
+
+  std::size_t bytes() const;
+
+ private:
+  // In pixels; downwards from the text's top.
+  struct Line {
+    int middle;
+    int baseline;
+    int width;
+    bool isMasked;  // false: Pango draws it
+    std::vector<LineMask> runs;
+    Pixels letters = {};  // where the outlines lie, from the line's left end and baseline
+  };
+
+  template <typename Visit>
+  bool visit(const Edges& box, int align, Visit each) const;
+  bool addPlainLine(const PlainShapes::Sheet& sheet, GlyphImages& images, std::string_view words);
+  void addLine(PangoLayoutIter* iter, GlyphImages& images);
+  void drawByPango(const Canvas& canvas, std::size_t line, const Place& place, uint32_t color,
+                   const Pixels& clip) const;
+
+  TextLayout layout;  // null where no line needs it
+  int height = 0;
+  std::vector<Line> lines;
+};
+
+}  // namespace brimol::pc
