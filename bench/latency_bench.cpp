@@ -1,68 +1,189 @@
-// How long an event takes from its arrival at the platform to the application's callback, on the
-// real threads: the platform's queue, the input thread, the dispatch thread.
+// How long an event takes from its arrival at the platform to the application's callback and to the
+// painted frame, on the real threads of an application; how late it comes behind a flood; and what
+// an application costs in which nothing happens.
 #include <MW/button.h>
 #include <MW/event_service.h>
 #include <MW/window.h>
 #include <android/log.h>
 #include <benchmark/benchmark.h>
+#include <brimol/frame.h>
+#include <brimol/host.h>
+#include <sys/resource.h>
 
-#include <algorithm>
 #include <atomic>
 #include <chrono>
 #include <cstdlib>
+#include <optional>
+#include <random>
+#include <thread>
 #include <vector>
 
+#include "host/open_platform.h"
+#include "input/event_records.h"
 #include "input/input_service.h"
 #include "percentile.h"
 
 namespace {
 
+using brimol::pc::inputService;
+using brimol::pc::pointerRecord;
 using Clock = std::chrono::steady_clock;
 
-std::atomic<Clock::rep> called = 0;  // when the callback ran; 0: not yet
+constexpr unsigned int kLoopMs = 5;  // as the example application's
+constexpr double kAlmostAll = 0.99;
 
-double millisecondsTo(Clock::rep time, Clock::time_point start) {
-  const Clock::duration taken = Clock::duration(time) - start.time_since_epoch();
-  return std::chrono::duration<double, std::milli>(taken).count();
-}
-
-double waitForCallback(Clock::time_point start) {
-  called.wait(0);
-  return millisecondsTo(called.exchange(0), start);
-}
-
-void pressToCallback(benchmark::State& state) {
-  constexpr SKIA_Rect kArea = {0, 0, 100, 100, 0};
-  constexpr double kAlmostAll = 0.99;
-  MW::Window::init();
-  {
-    MW::Button button(&kArea, nullptr);
-    button.pressCallback = [](int) {
-      called = Clock::now().time_since_epoch().count();
-      called.notify_one();
-    };
-    button.setActive(1);
-    Event press = {};
-    press.pointer.type = BRIMOL_POINTER_DOWN;
-    std::vector<double> milliseconds;
-    for ([[maybe_unused]] auto round : state) {
-      const auto start = Clock::now();
-      brimol::pc::inputService().post(press);
-      milliseconds.push_back(waitForCallback(start));
+// When something happened for the first time since it was last asked for.
+class Mark {
+ public:
+  void set() {
+    Clock::rep none = 0;
+    if (time.compare_exchange_strong(none, Clock::now().time_since_epoch().count())) {
+      time.notify_one();
     }
-    state.counters["median_ms"] = median(milliseconds);
-    state.counters["p99_ms"] = percentile(milliseconds, kAlmostAll);
-    state.counters["worst_ms"] = percentile(milliseconds, 1);
   }
-  MW::Window::destroy();
+  Clock::time_point await() {
+    time.wait(0);
+    return Clock::time_point(Clock::duration(time.exchange(0)));
+  }
+
+ private:
+  std::atomic<Clock::rep> time = 0;
+};
+
+Mark gCalled;
+Mark gPainted;
+std::atomic<bool> gWantsFrame = false;
+
+// An application with one button and the usual loop, which draws and tells when it was painted.
+class Application {
+ public:
+  Application() {
+    brimol_host_open();
+    brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
+    MW::Window::init();
+    button.emplace(&kArea, nullptr);
+    button->pressCallback = [](int) { gCalled.set(); };
+    button->setActive(1);
+    loop = std::jthread([](const std::stop_token& stop) {
+      while (!stop.stop_requested()) round();
+    });
+  }
+  ~Application() {
+    loop = {};
+    button.reset();
+    MW::Window::destroy();
+  }
+  Application(const Application&) = delete;
+  Application& operator=(const Application&) = delete;
+
+  static constexpr SKIA_Rect kArea = {0, 0, 100, 100, 0};
+
+ private:
+  static void round() {
+    if (MW::isDisplayUpdate(0) == 1) {
+      skia_begin_frame_c();
+      MW::Window::show();
+      skia_end_frame_c();
+      if (gWantsFrame.exchange(false)) {
+        brimol::pc::openedPlatform()->copyPicture(std::chrono::seconds(1));
+        gPainted.set();
+      }
+    }
+    MW::Window::updateTimer(MW::kUnused);
+    Delay(kLoopMs);
+  }
+
+  std::optional<MW::Button> button;
+  std::jthread loop;
+};
+
+double millisecondsBetween(Clock::time_point start, Clock::time_point end) {
+  return std::chrono::duration<double, std::milli>(end - start).count();
 }
 
-BENCHMARK(pressToCallback)->Iterations(5000)->Unit(benchmark::kMillisecond)->UseRealTime();
+void report(benchmark::State& state, std::vector<double>& values) {
+  state.counters["median_ms"] = median(values);
+  state.counters["p99_ms"] = percentile(values, kAlmostAll);
+  state.counters["worst_ms"] = percentile(values, 1);
+}
+
+// Presses and releases that come at random moments, as a finger's do.
+void measurePresses(benchmark::State& state, Mark& seen) {
+  const Application application;
+  std::minstd_rand random;
+  std::uniform_int_distribution<int> pauses(10'000, 30'000);  // microseconds
+  std::vector<double> times;
+  for ([[maybe_unused]] auto round : state) {
+    std::this_thread::sleep_for(std::chrono::microseconds(pauses(random)));
+    gWantsFrame = &seen == &gPainted;
+    const auto start = Clock::now();
+    inputService().post(pointerRecord(BRIMOL_POINTER_DOWN, 0, {1, 1}));
+    times.push_back(millisecondsBetween(start, seen.await()));
+    if (&seen != &gCalled) gCalled.await();
+    inputService().post(pointerRecord(BRIMOL_POINTER_UP, 0, {1, 1}));
+  }
+  report(state, times);
+}
+
+void pressToCallback(benchmark::State& state) { measurePresses(state, gCalled); }
+void pressToFrame(benchmark::State& state) { measurePresses(state, gPainted); }
+
+// Ten fingers that move 120 times a second for five seconds; then a press.
+void pressBehindTenFingers(benchmark::State& state) {
+  const Application application;
+  std::vector<double> times;
+  for ([[maybe_unused]] auto round : state) {
+    auto next = Clock::now();
+    for (int step = 0; step < 600; ++step) {
+      for (int finger = 1; finger <= 10; ++finger) {
+        inputService().post(pointerRecord(BRIMOL_POINTER_MOTION, finger, {200 + step, 300}));
+      }
+      std::this_thread::sleep_until(next += std::chrono::microseconds(8333));
+    }
+    const auto start = Clock::now();
+    inputService().post(pointerRecord(BRIMOL_POINTER_DOWN, 0, {1, 1}));
+    times.push_back(millisecondsBetween(start, gCalled.await()));
+    inputService().post(pointerRecord(BRIMOL_POINTER_UP, 0, {1, 1}));
+  }
+  report(state, times);
+}
+
+void idle(benchmark::State& state) {
+  const Application application;
+  std::this_thread::sleep_for(std::chrono::seconds(2));
+  const auto usage = [] {
+    rusage used = {};
+    ::getrusage(RUSAGE_SELF, &used);
+    return used;
+  };
+  const auto seconds = [](const timeval& time) {
+    constexpr double kMicro = 1e-6;
+    return static_cast<double>(time.tv_sec) + kMicro * static_cast<double>(time.tv_usec);
+  };
+  constexpr int kSeconds = 5;
+  for ([[maybe_unused]] auto round : state) {
+    const rusage before = usage();
+    std::this_thread::sleep_for(std::chrono::seconds(kSeconds));
+    const rusage after = usage();
+    const double used = seconds(after.ru_utime) + seconds(after.ru_stime) -
+                        seconds(before.ru_utime) - seconds(before.ru_stime);
+    constexpr double kPercent = 100;
+    state.counters["core_percent"] = kPercent * used / kSeconds;
+    state.counters["wakeups_per_s"] =
+        static_cast<double>(after.ru_nvcsw - before.ru_nvcsw) / kSeconds;
+  }
+}
+
+BENCHMARK(pressToCallback)->Iterations(500)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(pressToFrame)->Iterations(500)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(pressBehindTenFingers)->Iterations(1)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(idle)->Iterations(1)->Unit(benchmark::kMillisecond)->UseRealTime();
 
 }  // namespace
 
 int main(int count, char** arguments) {
   setenv("BRIMOL_DISPLAY", "headless", 1);
+  setenv("BRIMOL_SCREEN", "480x800", 1);
   __android_log_set_minimum_priority(ANDROID_LOG_SILENT);
   benchmark::Initialize(&count, arguments);
   if (benchmark::ReportUnrecognizedArguments(count, arguments)) return EXIT_FAILURE;

@@ -1,5 +1,6 @@
 #include "main_loop.h"
 
+#include <MW/widget.h>
 #include <MW/window.h>
 #include <brimol/frame.h>
 #include <brimol/host.h>
@@ -33,7 +34,7 @@ void runMainLoop(const std::function<bool()>& isOver, const std::function<void()
   MW::isDisplayUpdate(1);
   while (!isOver() && !isEnded()) {
     if (MW::isDisplayUpdate(0) == 1) drawFrame(draw);
-    MW::Window::updateTimer(0);
+    MW::Window::updateTimer(MW::kUnused);
     Delay(kLoopMs);
   }
 }

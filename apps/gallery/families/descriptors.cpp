@@ -33,9 +33,9 @@ constexpr auto kDescriptors = std::to_array<Example>({
        MW::ref_t other = slide;
        other.kind = MW::kRcuiSlideFromRight;
        other.rect = place(15, 36, 70, 9);
-       const MW::WidgetRcui first(&button, &callbacks, 0);
-       const MW::WidgetRcui second(&slide, &callbacks, 0);
-       const MW::WidgetRcui third(&other, &callbacks, 0);
+       const MW::WidgetRcui first(&button, &callbacks, MW::kUnused);
+       const MW::WidgetRcui second(&slide, &callbacks, MW::kUnused);
+       const MW::WidgetRcui third(&other, &callbacks, MW::kUnused);
        loop();
      }},
     {"widget_rcui_items", "WidgetRcui, display items",
@@ -51,13 +51,13 @@ constexpr auto kDescriptors = std::to_array<Example>({
             {MW::kRcuiFirstInColumn, MW::kRcuiNextInColumn, MW::kRcuiNextInColumn}) {
          item.kind = kind;
          item.text = words("Below the last one", MW::kColorWhite);
-         const MW::WidgetRcui built(&item, nullptr, 0);
+         const MW::WidgetRcui built(&item, nullptr, MW::kUnused);
          MW::WidgetList::show(item.index);
        }
        item.kind = MW::kRcuiTextbox;
        item.rect = place(15, 36, 70, 8, 0xFFD07030);
        item.text = words("By itself");
-       const MW::WidgetRcui built(&item, nullptr, 0);
+       const MW::WidgetRcui built(&item, nullptr, MW::kUnused);
        MW::WidgetList::show(item.index);
        loop([] { MW::WidgetList::show(); });
        MW::WidgetList::destroy();
@@ -72,7 +72,7 @@ constexpr auto kDescriptors = std::to_array<Example>({
        dialog.visible = 1;
        dialog.text = words("A dialog", MW::kColorHighlight);
        dialog.desc = texts.data();
-       const MW::WidgetRcui built(&dialog, nullptr, 0);
+       const MW::WidgetRcui built(&dialog, nullptr, MW::kUnused);
        loop();
      },
      MW::kTopLayer},

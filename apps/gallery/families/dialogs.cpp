@@ -50,7 +50,7 @@ constexpr auto kDialogs = std::to_array<Example>({
      [](Loop& loop) {
        MW::DialogNew dialog("Sensor", SKIA_ALIGN_CENTRE, static_cast<int>(MW::kColorHighlight));
        dialog.setDesc("The sensor is calibrated", "Do not move the phone", nullptr);
-       dialog.setProgress(0);
+       dialog.setProgress(MW::kUnused);
        dialog.setActive(1);
        loop();
      },
@@ -74,7 +74,7 @@ constexpr auto kDialogs = std::to_array<Example>({
      "One of six.",
      {8, 92},
      [](Loop& loop) {
-       MW::DialogSelect dialog(0);
+       MW::DialogSelect dialog(MW::kUnused);
        dialog.setTitle("Which radio?");
        unsigned int choice = 0;
        for (const char* const name : {"2G", "3G", "4G", "5G", "BT", "NFC"}) {

@@ -43,7 +43,7 @@ constexpr auto kScreens = std::to_array<Example>({
      "a colour.",
      {25, 60},
      [](Loop& loop) {
-       MW::AutoCapScreen page(0);
+       MW::AutoCapScreen page(MW::kUnused);
        page.setBgColor(0xFF205080);
        page.setText(0, place(10, 30, 80, 10, 0xFF205080), words("Capacitance", MW::kColorWhite));
        page.setText(1, place(10, 42, 80, 10, MW::kColorWhite), words("0 of 64 lines"));

@@ -25,7 +25,7 @@ constexpr auto kTexts = std::to_array<Example>({
        const SKIA_Rect area = place(5, 2, 90, 30, 0xFFF4F4EC);
        const SKIA_Text looks = words("", MW::kColorBlack, SKIA_ALIGN_LEFT);
        MW::StaticText viewer(&area, &looks, true, true, true);
-       viewer.setRect(0, &area);
+       viewer.setRect(MW::kUnused, &area);
        viewer.setText(log.c_str());
        viewer.get_ime_result("failed");
        viewer.line_search(log.c_str());

@@ -33,7 +33,7 @@ constexpr auto kTimed = std::to_array<Example>({
      [](Loop& loop) {
        const SKIA_Rect area = place(15, 2, 70, 5, kDeep);
        const SKIA_Text caption = words("Copying", MW::kColorWhite);
-       MW::Progressbar bar(0, &area, &caption);
+       MW::Progressbar bar(MW::kUnused, &area, &caption);
        bar.onProgressbar(5000);
        loop();
      },

@@ -72,6 +72,7 @@ void submitFrame(Frame&& frame) {
   Session* const played = session();
   const auto platform = openedPlatform();
   if (!platform) return;
+  inputService().hearOfFrame();
   played != nullptr ? played->frame(*platform, std::move(frame))
                     : platform->submit(std::move(frame));
 }

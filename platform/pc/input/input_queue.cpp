@@ -43,9 +43,12 @@ int16_t boundedSum(int16_t a, int16_t b) {
   return static_cast<int16_t>(std::clamp<int>(a + b, Limits::min(), Limits::max()));
 }
 
+bool hasExactSum(int16_t a, int16_t b) { return boundedSum(a, b) == a + b; }
+
 }  // namespace
 
 void InputQueue::push(const Event& record) {
+  if (isMotion(record) && mergeWithWaiting(record)) return;
   records.push_back(record);
   if (records.size() > capacity) makeRoom();
 }
@@ -55,6 +58,22 @@ bool InputQueue::take(Event& record) {
   record = records.front();
   records.pop_front();
   return true;
+}
+
+// Only other fingers' motions may lie between: everything else keeps its place in the order.
+bool InputQueue::mergeWithWaiting(const Event& motion) {
+  for (auto one = records.rbegin(); one != records.rend() && isMotion(*one); ++one) {
+    BrimolPointerEvent& waiting = one->pointer;
+    if (waiting.finger != motion.pointer.finger) continue;
+    if (!hasExactSum(waiting.xrel, motion.pointer.xrel)) return false;
+    if (!hasExactSum(waiting.yrel, motion.pointer.yrel)) return false;
+    const BrimolPointerEvent before = waiting;
+    waiting = motion.pointer;
+    waiting.xrel = boundedSum(before.xrel, waiting.xrel);
+    waiting.yrel = boundedSum(before.yrel, waiting.yrel);
+    return true;
+  }
+  return false;
 }
 
 void InputQueue::makeRoom() {

@@ -10,6 +10,10 @@ namespace brimol::pc {
 
 /// Records in the order of their arrival, at most `capacity` of them. Not guarded: InputService is.
 ///
+/// A motion of a finger whose motion waits already becomes one with that, their relative motions
+/// added, unless anything but motions came between. So a reader that is late is never further
+/// behind.
+///
 /// A full queue takes a record all the same and drops another one: the oldest motion of the same
 /// finger; else the oldest motion; else the oldest record that is neither a down nor an up; else
 /// the oldest press together with its release. So the release of a press that was seen always
@@ -30,6 +34,7 @@ class InputQueue {
 
  private:
   using Place = std::deque<Event>::iterator;
+  bool mergeWithWaiting(const Event& motion);
   void makeRoom();
   void dropMotion(Place motion);
   void dropOldestPress();

@@ -1,11 +1,14 @@
 #include "input/input_service.h"
 
-#include <chrono>
+#include <algorithm>
 #include <utility>
 
 namespace brimol::pc {
 
 namespace {
+
+using std::chrono::milliseconds;
+using std::chrono::steady_clock;
 
 InputService& gService = *new InputService;
 
@@ -16,6 +19,8 @@ InputService& inputService() { return gService; }
 void InputService::open() {
   const std::lock_guard lock(mutex);
   isOpen = true;
+  lastActivity = steady_clock::now();
+  earlyEnds.reset();
 }
 
 void InputService::close() {
@@ -34,7 +39,8 @@ void InputService::deliver(const Event& record) {
     const std::lock_guard lock(mutex);
     if (!isOpen) return;
     queue.push(record);
-    if (!firstArrival) firstArrival = std::chrono::steady_clock::now();
+    lastActivity = steady_clock::now();
+    if (!firstArrival) firstArrival = lastActivity;
   }
   wake.notify_all();
 }
@@ -42,7 +48,9 @@ void InputService::deliver(const Event& record) {
 bool InputService::poll(Event& record) {
   const std::lock_guard lock(mutex);
   poller = std::this_thread::get_id();
-  return queue.take(record);
+  const bool isGiven = queue.take(record);
+  earlyEnds.hearOfPoll(isGiven);
+  return isGiven;
 }
 
 std::optional<std::chrono::steady_clock::time_point> InputService::takeFirstArrival() {
@@ -56,22 +64,52 @@ uint32_t InputService::now() const {
   return clock.now();
 }
 
+void InputService::hearOfFrame() {
+  const std::lock_guard lock(mutex);
+  lastActivity = steady_clock::now();
+}
+
 void InputService::delay(uint32_t ms) {
-  const auto end = std::chrono::steady_clock::now() + std::chrono::milliseconds(ms);
-  std::unique_lock lock(mutex);
-  const uint32_t started = clock.now();
-  const uint32_t handAtStart = handChanges;
-  const bool isPoller = poller == std::this_thread::get_id();
-  const auto isOver = [&] {
-    if (handChanges != handAtStart) return true;
-    if (isPoller && !queue.isEmpty()) return true;
-    return clock.isByHand() && clock.now() - started >= ms;
-  };
+  Lock lock(mutex);
   if (clock.isByHand()) {
-    wake.wait(lock, isOver);
+    pauseByHand(lock, ms);
+  } else if (poller == std::this_thread::get_id()) {
+    pausePoller(lock, endOf(ms));
   } else {
-    wake.wait_until(lock, end, isOver);
+    pauseOther(lock, ms, endOf(ms));
   }
+}
+
+InputService::Time InputService::endOf(uint32_t ms) const {
+  const Time now = steady_clock::now();
+  const bool isIdle = now - lastActivity >= kIdleAfter;
+  return now + milliseconds(isIdle && ms == 1 ? kIdlePauseMs : ms);
+}
+
+void InputService::pauseByHand(Lock& lock, uint32_t ms) {
+  const uint32_t started = clock.now();
+  const bool isPoller = poller == std::this_thread::get_id();
+  wake.wait(lock, [&, handAtStart = handChanges] {
+    return handChanges != handAtStart || clock.now() - started >= ms ||
+           (isPoller && !queue.isEmpty());
+  });
+}
+
+void InputService::pausePoller(Lock& lock, Time end) {
+  wake.wait_until(lock, end, [&, handAtStart = handChanges] {
+    return handChanges != handAtStart || !queue.isEmpty();
+  });
+}
+
+void InputService::pauseOther(Lock& lock, uint32_t ms, Time end) {
+  EarlyEnds::Pause pause(earlyEnds, ms);
+  const auto handMoved = [&, handAtStart = handChanges] { return handChanges != handAtStart; };
+  if (pause.isBounded()) {
+    const Time soonest = std::min(end, steady_clock::now() + milliseconds(1));
+    if (wake.wait_until(lock, soonest, handMoved)) return;
+  }
+  pause.wake().wait_until(lock, end, [&] { return handMoved() || pause.isOver(); });
+  if (pause.isOver()) pause.endEarly();
 }
 
 void InputService::takeHand(uint32_t start) {
@@ -107,6 +145,7 @@ void InputService::setTimeWatcher(std::function<void()> watcher) {
 
 void InputService::tellTime() {
   wake.notify_all();
+  earlyEnds.wakeAll();
   const std::lock_guard lock(watcherMutex);
   if (timeWatcher) timeWatcher();
 }

@@ -11,6 +11,7 @@
 
 #include "clock/clock.h"
 #include "clock/turn_clock.h"
+#include "input/early_ends.h"
 #include "input/input_queue.h"
 
 namespace brimol::pc {
@@ -48,8 +49,15 @@ class InputService {
   /// Milliseconds; wraps.
   uint32_t now() const;
   /// Pauses the calling thread for `ms` milliseconds of the clock. Ends early on the polling thread
-  /// while a record waits, and on every thread when the clock is taken by hand or let go.
+  /// while a record waits, and on every thread when the clock is taken by hand or let go. While
+  /// time is real, input ends pauses of other threads, too (see EarlyEnds), and those of a
+  /// millisecond last kIdlePauseMs when nothing has come in or was drawn for kIdleAfter.
   void delay(uint32_t ms);
+  /// Something was drawn.
+  void hearOfFrame();
+
+  static constexpr uint32_t kIdlePauseMs = 4;
+  static constexpr std::chrono::seconds kIdleAfter{1};
 
   /// See Clock. What waited for the time that is reached goes on.
   void takeHand(uint32_t start);
@@ -61,16 +69,25 @@ class InputService {
   void setTimeWatcher(std::function<void()> watcher);
 
  private:
+  using Lock = std::unique_lock<std::mutex>;
+  using Time = std::chrono::steady_clock::time_point;
+
   void tellTime();
+  void pauseByHand(Lock& lock, uint32_t ms);
+  void pausePoller(Lock& lock, Time end);
+  void pauseOther(Lock& lock, uint32_t ms, Time end);
+  Time endOf(uint32_t ms) const;
 
   mutable std::mutex mutex;      // guards all up to watcherMutex
-  std::condition_variable wake;  // a record arrived, or the hand moved
+  std::condition_variable wake;  // a record arrived for the polling thread, or the hand moved
+  EarlyEnds earlyEnds;
   Clock clock;
   InputQueue queue;
   bool isOpen = false;
   std::optional<std::chrono::steady_clock::time_point> firstArrival;
   uint32_t handChanges = 0;  // how often the hand was put on or taken off
   std::thread::id poller;
+  Time lastActivity;  // a record arrived, or something was drawn
 
   // Set before other threads come.
   std::function<void(const Event&)> diversion;

@@ -31,9 +31,15 @@ struct QueueCase {
 };
 
 const auto kQueueCases = std::to_array<QueueCase>({
-    {"the oldest motion of the finger merges",
-     {motion(1, 5, 5), motion(0, 2, 2), motion(0, 5, 3), motion(0, 6, 1)},
-     {"motion 1 at 5,0 by 5,0", "motion 0 at 5,0 by 5,0", "motion 0 at 6,0 by 1,0"}},
+    {"motions of a finger merge, though others move between",
+     {motion(0, 2, 2), motion(1, 5, 5), motion(0, 5, 3), motion(0, 6, 1)},
+     {"motion 0 at 6,0 by 6,0", "motion 1 at 5,0 by 5,0"}},
+    {"motions stay on their side of what happened between",
+     {motion(0, 2, 2), down(1), motion(0, 5, 3)},
+     {"motion 0 at 2,0 by 2,0", "down 1 at 0,0", "motion 0 at 5,0 by 3,0"}},
+    {"the oldest motion of the finger makes room",
+     {motion(0, 2, 2), down(1), motion(0, 5, 3), up(1), motion(0, 6, 1)},
+     {"down 1 at 0,0", "up 1 at 0,0", "motion 0 at 6,0 by 6,0"}},
     {"motion is not added beyond a release",
      {motion(0, 5, 5), up(0), down(0), motion(0, 1, 1)},
      {"up 0 at 0,0", "down 0 at 0,0", "motion 0 at 1,0 by 1,0"}},

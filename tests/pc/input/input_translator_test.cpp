@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <array>
+#include <iterator>
 #include <limits>
 
 #include "display/sdl_input.h"
@@ -117,8 +118,12 @@ TEST_F(TranslatorTest, DragsByWheelAndGoesOnFromTheEdge) {
   SdlInput sdl(kScreen, input);
   uint32_t now = 0xFFFFFFF0;
   const auto play = [&] {
-    for (auto ms = sdl.msToTick(now); ms; ms = sdl.msToTick(now)) sdl.tick(now += *ms);
-    return takeTexts(service);
+    auto texts = takeTexts(service);
+    for (auto ms = sdl.msToTick(now); ms; ms = sdl.msToTick(now)) {
+      sdl.tick(now += *ms);
+      std::ranges::move(takeTexts(service), std::back_inserter(texts));
+    }
+    return texts;
   };
   sdl.take(mouse(kMove, 0, 70), view, now);
   sdl.take(wheel(0, -0.2F), view, now);
