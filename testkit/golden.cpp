@@ -83,10 +83,9 @@ std::string firstDifference(const std::string& expected, const std::string& actu
 // Red where two pixels differ, and faint where they do not.
 Picture differenceOf(const Picture& expected, const Picture& actual) {
   Picture marks = expected;
-  std::ranges::transform(expected.pixels, actual.pixels, marks.pixels.begin(),
-                         [](uint32_t one, uint32_t other) {
-                           return one == other ? one >> 2 & 0x3F3F3F : kDiffers;
-                         });
+  std::ranges::transform(
+      expected.pixels, actual.pixels, marks.pixels.begin(),
+      [](uint32_t one, uint32_t other) { return one == other ? one >> 2 & 0x3F3F3F : kDiffers; });
   return marks;
 }
 
@@ -140,8 +139,7 @@ void Goldens::renewPicture(const std::string& name, const Picture& picture, cons
   write(folder / (name + ".png"), picture, here);
 }
 
-Compared Goldens::expectPicture(const std::string& name, const Picture& actual,
-                                const Here& here) {
+Compared Goldens::expectPicture(const std::string& name, const Picture& actual, const Here& here) {
   const fs::path file = folder / (name + ".png");
   if (isRenewing()) {
     renewPicture(name, actual, here);

@@ -36,7 +36,8 @@ std::vector<std::string> splitAtCommas(const std::string& names) {
   return parts;
 }
 
-// The next text between double quotes, its escapes kept as patterns want them. False: there is none.
+// The next text between double quotes, its escapes kept as patterns want them. False: there is
+// none.
 bool readQuoted(std::istringstream& in, std::string& text) {
   in >> std::ws;
   if (in.get() != '"') return false;
@@ -96,8 +97,7 @@ void AcceptedFindings::addLine(const std::string& line, const std::string& place
   Entry entry{place, row->check, {}, {}, {}};
   if (profiles != "*") entry.profiles = splitAtCommas(profiles);
   std::string reason;
-  const bool isWhole =
-      readQuoted(in, entry.item) && readQuoted(in, entry.page) && in >> reason;
+  const bool isWhole = readQuoted(in, entry.item) && readQuoted(in, entry.page) && in >> reason;
   if (!isWhole) {
     throw std::runtime_error(place + ": wanted CHECK PROFILES \"ITEM\" \"PAGE\" REASON");
   }
@@ -117,9 +117,8 @@ std::vector<std::string> AcceptedFindings::judge(const std::vector<Finding>& fin
                                                  const Profile& profile) const {
   std::vector<std::string> wrong;
   for (const Finding& finding : findings) {
-    const bool isAccepted = std::ranges::any_of(entries, [&](const Entry& entry) {
-      return entry.isFor(profile) && entry.fits(finding);
-    });
+    const bool isAccepted = std::ranges::any_of(
+        entries, [&](const Entry& entry) { return entry.isFor(profile) && entry.fits(finding); });
     if (!isAccepted) wrong.push_back(textOf(finding, profile));
   }
   for (const Entry& entry : entries) {

@@ -64,8 +64,9 @@ class KeyReach {
 
   bool reaches(const Target& target) const {
     const auto [first, last] = tapWays.equal_range(target);
-    return marked.contains(target) ||
-           std::any_of(first, last, [this](const auto& way) { return keyWays.contains(way.second); });
+    return marked.contains(target) || std::any_of(first, last, [this](const auto& way) {
+             return keyWays.contains(way.second);
+           });
   }
 
  private:
@@ -108,9 +109,9 @@ void lintTargets(const View& view, const Scale& scale, Findings& findings) {
     const SKIA_Rect& rect = view.item(target).rect;
     const int side = std::min(rect.w, rect.h);
     if (scale.mm(side) < kSmallestTargetMm - kRoundingMm) {
-      findings.add(Check::SmallTarget, view, target,
-                   scale.text(side) + (rect.h <= rect.w ? " high" : " wide") +
-                       ", at least 7 mm wanted");
+      findings.add(
+          Check::SmallTarget, view, target,
+          scale.text(side) + (rect.h <= rect.w ? " high" : " wide") + ", at least 7 mm wanted");
     }
     const Edges area = pc::edgesOf(rect);
     const bool isInside = area.left >= screen.left && area.right <= screen.right &&

@@ -36,7 +36,8 @@ Color over(uint32_t word, const Color& below) {
   constexpr double kMost = 255;
   const double share = pc::alphaOf(word) / kMost;
   Color mixed = colorOf(word);
-  for (std::size_t i = 0; i < mixed.size(); ++i) mixed[i] = mixed[i] * share + below[i] * (1 - share);
+  for (std::size_t i = 0; i < mixed.size(); ++i)
+    mixed[i] = mixed[i] * share + below[i] * (1 - share);
   return mixed;
 }
 
@@ -81,7 +82,8 @@ void lintContrast(const View& view, const SeenText& seen, Findings& findings) {
 void lintSize(const View& view, const SeenText& seen, const Scale& scale, Findings& findings) {
   const int size = pc::textSizeOf(view.item(seen.item).text);
   if (scale.mm(size) >= kSmallestTextMm) return;
-  findings.add(Check::SmallText, view, seen.item, scale.text(size) + " high, at least 1.5 mm wanted");
+  findings.add(Check::SmallText, view, seen.item,
+               scale.text(size) + " high, at least 1.5 mm wanted");
 }
 
 void lintCut(const View& view, const SeenText& seen, Findings& findings) {
@@ -129,7 +131,8 @@ std::string whatOverlaps(const View& view, const SeenText& seen, const Scale& sc
   for (std::size_t i = seen.item + 1; i < view.frame().size(); ++i) {
     const SKIA_Item& item = view.item(i);
     const bool isBox = pc::groundOf(item) != pc::Ground::None && pc::alphaOf(item.rect.color) != 0;
-    if (isBox && touches(pc::edgesOf(item.rect))) return "partly hidden by " + quoted(view.nameOf(i));
+    if (isBox && touches(pc::edgesOf(item.rect)))
+      return "partly hidden by " + quoted(view.nameOf(i));
   }
   return {};
 }

@@ -16,9 +16,10 @@ constexpr uint32_t kRgb = 0x00FFFFFF;
 // Between rows of 32-bit pixels there is no gap.
 Picture pictureOf(cairo_surface_t* surface) {
   cairo_surface_flush(surface);
-  Picture picture{{cairo_image_surface_get_width(surface), cairo_image_surface_get_height(surface)}};
-  const auto count = static_cast<std::size_t>(picture.size.width) *
-                     static_cast<std::size_t>(picture.size.height);
+  Picture picture{
+      {cairo_image_surface_get_width(surface), cairo_image_surface_get_height(surface)}};
+  const auto count =
+      static_cast<std::size_t>(picture.size.width) * static_cast<std::size_t>(picture.size.height);
   const auto* const pixels =
       reinterpret_cast<const uint32_t*>(cairo_image_surface_get_data(surface));
   std::transform(pixels, pixels + count, std::back_inserter(picture.pixels),

@@ -8,9 +8,9 @@ namespace brimol::test {
 namespace {
 
 // By the call's number; an item's record names its kind itself.
-constexpr auto kKinds = std::to_array<int32_t>(
-    {SKIA_BOX, SKIA_ROUNDBOX, SKIA_LINE, SKIA_LABEL, SKIA_TEXTBOX, SKIA_ROUNDTEXTBOX,
-     SKIA_BUTTONBOX, SKIA_ROUNDBUTTONBOX, SKIA_STATICBOX, SKIA_ARROW});
+constexpr auto kKinds = std::to_array<int32_t>({SKIA_BOX, SKIA_ROUNDBOX, SKIA_LINE, SKIA_LABEL,
+                                                SKIA_TEXTBOX, SKIA_ROUNDTEXTBOX, SKIA_BUTTONBOX,
+                                                SKIA_ROUNDBUTTONBOX, SKIA_STATICBOX, SKIA_ARROW});
 static_assert(kKinds.size() == static_cast<std::size_t>(Call::Item));
 
 constexpr auto kNames =

@@ -176,9 +176,7 @@ std::string Screen::listOfTexts() const {
   return list;
 }
 
-bool Screen::shows(const std::string& text) const {
-  return !fitting(newest, screen, text).empty();
-}
+bool Screen::shows(const std::string& text) const { return !fitting(newest, screen, text).empty(); }
 
 const SKIA_Item& Screen::itemOf(const std::string& text, const Here& here) const {
   const auto found = fitting(newest, screen, text);
@@ -217,8 +215,8 @@ void Screen::expectLog(const std::string& text, const Here& here) {
   if (found == lines.end()) {
     std::ostringstream said;
     for (const LogLine& line : lines) said << "\n  " << line;
-    throw Failure(here, "no line of the log has " + quoted(text) + " in it; since then it says" +
-                            said.str());
+    throw Failure(
+        here, "no line of the log has " + quoted(text) + " in it; since then it says" + said.str());
   }
   lines.erase(lines.begin(), found + 1);
 }

@@ -71,10 +71,12 @@ Judgement judgeLayout(const Judgement& judgement, const Session& session,
   if (judgement.verdict != Verdict::Passed) return judgement;
   const std::vector<Moment> moments = momentsOf(session);
   const test::Profile profile = profileOf(session);
-  const bool isListed = std::ranges::any_of(moments, [](const Moment& one) { return !one.frame.empty(); });
+  const bool isListed =
+      std::ranges::any_of(moments, [](const Moment& one) { return !one.frame.empty(); });
   if (!isListed || !(profile.dpi > 0)) {
-    return {Verdict::Unusable, "The layout cannot be looked at.",
-            "The session lists no items or no density: is the application's platform an older one?"};
+    return {
+        Verdict::Unusable, "The layout cannot be looked at.",
+        "The session lists no items or no density: is the application's platform an older one?"};
   }
   const auto wrong = accepted.judge(test::lint(moments, profile), profile);
   if (wrong.empty()) return judgement;

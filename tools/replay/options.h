@@ -23,9 +23,9 @@ struct Options {
   std::filesystem::path junit = {};
   std::filesystem::path bundle = {};
   std::filesystem::path against = {};
-  std::string screen = {};                // WIDTHxHEIGHT
-  std::string device = {};                // a name
-  std::filesystem::path accepted = {};    // findings of the lint
+  std::string screen = {};              // WIDTHxHEIGHT
+  std::string device = {};              // a name
+  std::filesystem::path accepted = {};  // findings of the lint
   bool lints = false;
   std::chrono::seconds timeout{60};       // 0: none
   std::vector<std::string> command = {};  // the application and its arguments

@@ -36,7 +36,7 @@ struct Frame {
   int items = 0;
   std::vector<std::string> texts = {};
   std::vector<SKIA_Item> drawn = {};  // empty if the session does not list them
-  std::string picture = {};  // a file in the session's folder
+  std::string picture = {};           // a file in the session's folder
   double paintMs = 0;
 };
 

@@ -92,7 +92,7 @@ class Session {
 
   const SessionSettings settings;
   Size screenSize = {};
-  float density = 0;  // dots per inch
+  float density = 0;    // dots per inch
   std::string problem;  // of the environment, for who opens the screen
   ParsedTrace parsed;
   std::optional<TurnClock> turns;

@@ -85,9 +85,8 @@ SessionSettings readSessionSettings(const VariableLookup& lookup) {
   settings.recording = valueOf(lookup, "BRIMOL_RECORD");
   settings.reportFolder = valueOf(lookup, "BRIMOL_REPORT_DIR");
   const std::string clockError = readClock(lookup, settings);
-  for (const std::string& error :
-       {clockError, readStart(lookup, settings), readPictures(lookup, settings),
-        readItems(lookup, settings)}) {
+  for (const std::string& error : {clockError, readStart(lookup, settings),
+                                   readPictures(lookup, settings), readItems(lookup, settings)}) {
     if (settings.error.empty()) settings.error = error;
   }
   if (!settings.trace.empty() && !settings.recording.empty()) {

@@ -88,8 +88,7 @@ void testGoldens(Screen& screen, const std::string& folder) {
   expect(goldens.expect("counter", screen) == brimol::test::Compared::Same, "another renderer");
 
   screen.tap("Taps: *");
-  const std::string items =
-      failureOf([&] { goldens.expectItems("counter", screen.frame()); });
+  const std::string items = failureOf([&] { goldens.expectItems("counter", screen.frame()); });
   expect(has(items, "item 1 of ") && has(items, "Taps: 1") && has(items, "Taps: 2"), items);
   const std::string picture =
       failureOf([&] { goldens.expectPicture("counter", screen.picture()); });
