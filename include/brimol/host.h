@@ -15,10 +15,10 @@ extern "C" {
 
 /* Opens the screen as the environment asks: BRIMOL_DISPLAY=window|browser|headless (a window when
  * there is a display, headless otherwise; browser prints the address that browsers open),
- * BRIMOL_DEVICE=NAME of brimol/device.h (1440x2560 pixels at 489.5 dots per inch) and BRIMOL_SCREEN=WIDTHxHEIGHT, which changes that size and leaves the density.
- * EventInit does it for an application that did not; EventQuit closes it. Opening an open screen is
- * a success. Returns 1, or 0 when it cannot be opened, and says why on stderr and in
- * brimol_host_error(). */
+ * BRIMOL_DEVICE=NAME of brimol/device.h (1440x2560 pixels at 489.5 dots per inch) and
+ * BRIMOL_SCREEN=WIDTHxHEIGHT, which changes that size and leaves the density. EventInit does it for
+ * an application that did not; EventQuit closes it. Opening an open screen is a success. Returns 1,
+ * or 0 when it cannot be opened, and says why on stderr and in brimol_host_error(). */
 int brimol_host_open(void);
 
 /* One line without a line end about the call that failed last; empty when none did. The text stays

@@ -117,9 +117,9 @@ int PollEvent(Event* event);
 unsigned int GetTicks(void);
 
 /* Pauses the calling thread for about `ms` milliseconds. Input may end a pause early, so that it is
- * seen at once: on the polling thread when it arrives; on other threads, once the polling thread has
- * asked for the next record, pauses of up to 20 ms. While there is neither input nor drawing, a pause
- * of 1 ms may last up to 4. Any thread. */
+ * seen at once: on the polling thread when it arrives; on other threads, once the polling thread
+ * has asked for the next record, pauses of up to 20 ms. While there is neither input nor drawing, a
+ * pause of 1 ms may last up to 4. Any thread. */
 void Delay(unsigned int ms);
 
 #pragma GCC visibility pop

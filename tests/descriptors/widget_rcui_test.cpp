@@ -4,8 +4,8 @@
 
 #include <bit>
 
-#include "support/widget_test.h"
 #include <brimol3_widget_test/drawings.h>
+#include "support/widget_test.h"
 
 namespace {
 

@@ -3,8 +3,8 @@
 
 #include <MW/dialog_list.h>
 
-#include "support/play_test.h"
 #include <brimol3_widget_test/drawings.h>
+#include "support/play_test.h"
 
 namespace brimol::test {
 

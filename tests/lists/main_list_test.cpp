@@ -4,8 +4,8 @@
 #include <array>
 #include <thread>
 
-#include "support/play_test.h"
 #include <brimol3_widget_test/drawings.h>
+#include "support/play_test.h"
 
 namespace {
 

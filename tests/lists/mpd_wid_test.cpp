@@ -1,7 +1,7 @@
 #include <MW/mpd_wid.h>
 
-#include "support/play_test.h"
 #include <brimol3_widget_test/drawings.h>
+#include "support/play_test.h"
 
 namespace {
 

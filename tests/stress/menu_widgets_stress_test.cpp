@@ -9,8 +9,8 @@
 #include <random>
 #include <thread>
 
-#include "support/widget_test.h"
 #include <brimol3_widget_test/drawings.h>
+#include "support/widget_test.h"
 
 namespace {
 

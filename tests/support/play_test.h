@@ -4,8 +4,8 @@
 #include <filesystem>
 #include <initializer_list>
 
-#include "support/widget_test.h"
 #include <brimol3_widget_test/play.h>
+#include "support/widget_test.h"
 
 namespace brimol::test {
 

@@ -2,8 +2,8 @@
 
 #include <array>
 
-#include "support/play_test.h"
 #include <brimol3_widget_test/drawings.h>
+#include "support/play_test.h"
 
 namespace {
 

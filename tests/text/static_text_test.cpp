@@ -3,8 +3,8 @@
 #include <algorithm>
 #include <array>
 
-#include "support/play_test.h"
 #include <brimol3_widget_test/drawings.h>
+#include "support/play_test.h"
 
 namespace {
 

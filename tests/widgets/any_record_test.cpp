@@ -6,8 +6,8 @@
 #include <algorithm>
 #include <climits>
 
-#include "support/play_test.h"
 #include <brimol3_widget_test/drawings.h>
+#include "support/play_test.h"
 
 namespace {
 

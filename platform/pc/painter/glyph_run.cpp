@@ -30,7 +30,7 @@ struct Sheet {
     for (int y = 0; y < at.height; ++y) {
       const int first = (at.y - area.y + y) * area.width + at.x - area.x;
       for (const CoveredGroup& group : image.row(static_cast<std::size_t>(y))) {
-        putGroup(static_cast<std::size_t>(first + group.x), group);
+        putGroup(static_cast<std::size_t>(first) + group.x, group);
       }
     }
   }

@@ -76,7 +76,7 @@ class WebServer {
   bool connectToServer(const LinePointer& line);
   int send(lws* wsi);
   int sendToViewer(Line& line);
-  int sendToServer(Line& line);
+  static int sendToServer(Line& line);
   static void watch(const Line& line);
   void end(lws* wsi);
 
