@@ -148,10 +148,13 @@ TEST_F(Window, PlaysTheWheelAndASecondFinger) {
   expectNext("up 1 at 542,854");
   run(at(0, 0) + "click 5 click 4");  // up there is no room, and no tap either
   expectNext("down 0 at 0,0");
-  for (int moved = 1; moved <= 8; ++moved) {
-    const int y = std::min(26 * moved, 204);
-    expectNext("motion 0 at 0," + std::to_string(y) + " by 0," +
-               std::to_string(moved < 8 ? 26 : 22));
+  int moved = 0;  // in as many records as the test is quick to take
+  while (moved < 204) {
+    Event record = {};
+    while (PollEvent(&record) == 0) Delay(60'000);
+    ASSERT_EQ(record.type, BRIMOL_POINTER_MOTION);
+    moved += record.pointer.yrel;
+    EXPECT_EQ(record.pointer.y, moved);
   }
   expectNext("up 0 at 0,204");
 }
