@@ -18,8 +18,10 @@ function(brimol_install_library target component)
   if(NOT BRIMOL_INSTALL)
     return()
   endif()
-  set(where runtime ${ARGN})
-  list(POP_BACK where where)
+  set(where runtime)
+  if(ARGN)
+    set(where ${ARGN})
+  endif()
   install(
     TARGETS ${target}
     EXPORT brimol3_widget-${component}
