@@ -122,7 +122,7 @@ void Goldens::expectItems(const std::string& name, const Frame& frame, const Her
   const fs::path written = results / (name + ".actual.items.txt");
   write(written, actual, here);
   throw Failure(here, name + ": " + firstDifference(expected, actual) + "\n  golden " +
-                          file.native() + "\n  actual " + written.native());
+                          file.native() + "\n  actual " + fs::absolute(written).native());
 }
 
 bool Goldens::isReferenceRenderer(const Here& here) {

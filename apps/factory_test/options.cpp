@@ -118,10 +118,12 @@ std::string usage() {
   text +=
       "\nEnvironment:\n"
       "  BRIMOL_DISPLAY=window|browser|headless\n"
-      "                                   where to draw; a window when there is a display\n"
+      "                                   where to draw; a window when there is a display, else "
+      "memory\n"
       "  BRIMOL_LISTEN=ADDRESS:PORT       where browsers connect\n"
       "  BRIMOL_DEVICE=NAME               as --device; 1440x2560 pixels when not set\n"
       "  BRIMOL_SCREEN=WIDTHxHEIGHT       screen size in pixels, instead of the device's\n"
+      "  BRIMOL_TRACE, BRIMOL_RECORD      a file with a session to play, or to record\n"
       "\nDevices:\n";
   for (const BrimolDevice& device : devices()) {
     text += helpLine(device.name, kDeviceColumns,

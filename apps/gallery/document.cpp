@@ -16,7 +16,8 @@ constexpr std::size_t kColumns = 4;
 constexpr const char* kOpening = R"(# Gallery
 
 Every widget and every dialog with the code that makes it. Code and pictures come from the examples in
-`apps/gallery/families/`, which `brimol_gallery` shows in a window, where they can be touched.
+`apps/gallery/families/`, which `brimol_gallery` shows live: `build/release/apps/gallery/brimol_gallery` in the
+build, with `BRIMOL_DISPLAY=browser` in a web browser.
 `scripts/renew_goldens.sh` writes this page.
 
 An example makes its widgets and runs the application's main loop, `loop()`. In each frame the loop calls
