@@ -24,3 +24,13 @@ done
 
 desktop-file-validate "$staged/share/applications/factory_test.desktop"
 "$staged/bin/factory_test" --headless --shot "$WORK/menu.png"
+
+# The devices stand in one table of the platform; the manual page and the layout lint name all of them.
+page=$(gzip -dc "$staged/share/man/man7/brimol3_widget.7.gz" | sed 's/\\-/-/g')
+devices=$("$staged/bin/factory_test" --help | sed -n '/^Devices:/,$p' | grep -oE '^  [a-z]+-[0-9.]+' | tr -d ' ')
+[[ -n $devices ]] || fail "factory_test --help lists no devices."
+linted=$(sed -nE 's/^set\(devices (.*)\)$/\1/p' "$SOURCE/tests/lint/CMakeLists.txt" | tr ' ' '\n')
+diff <(echo "$devices") <(echo "$linted") || fail "The layout lint knows other devices."
+for device in $devices; do
+  grep -qE "^\.BR? $device( |\$)" <<<"$page" || fail "brimol3_widget(7) does not name $device."
+done
