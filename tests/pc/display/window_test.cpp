@@ -141,6 +141,7 @@ TEST_F(Window, PlaysTheWheelAndASecondFinger) {
   const auto run = [](const std::string& actions) {
     ASSERT_EQ(std::system(("xdotool " + actions).c_str()), 0);
   };
+  play(at(190, 300));  // the window has heard where the mouse is before it hears of keys
   run(at(200, 300) + "keydown ctrl " + at(210, 300) + "mousedown 1 mouseup 1 keyup ctrl");
   expectNext("down 0 at 598,854");
   expectNext("down 1 at 542,854");
