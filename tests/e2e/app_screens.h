@@ -1,4 +1,5 @@
-/// Where the application's screens have what the end-to-end tests use, on the screen of the device hd-4.7.
+/// Where the application's screens have what the end-to-end tests use, on the screen of the device
+/// hd-4.7.
 #pragma once
 
 #include <array>

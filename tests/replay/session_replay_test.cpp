@@ -77,7 +77,8 @@ TEST_F(SessionReplay, IsTheSameTenMinutesEveryTime) {
 
 TEST_F(SessionReplay, PaintsTheSamePictures) {
   const fs::path other = folder / "other";
-  const std::string trace = writeTrace("screen 720x1280\ninclude " TRACES "minute.trace\n");
+  const std::string trace =
+      writeTrace("screen 720x1280\ndensity 312.5\ninclude " TRACES "minute.trace\n");
   ASSERT_EQ(play(trace, {{"BRIMOL_REPORT_DIR", report}}), 0) << readAll(folder / "stderr");
   const BusyCore busy;
   ASSERT_EQ(play(trace, {{"BRIMOL_REPORT_DIR", other}}), 0);
