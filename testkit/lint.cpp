@@ -99,7 +99,7 @@ void AcceptedFindings::addLine(const std::string& line, const std::string& place
   std::string reason;
   const bool isWhole = readQuoted(in, entry.item) && readQuoted(in, entry.page) && in >> reason;
   if (!isWhole) {
-    throw std::runtime_error(place + ": wanted CHECK PROFILES \"ITEM\" \"PAGE\" REASON");
+    throw std::runtime_error(place + R"(: wanted CHECK PROFILES "ITEM" "PAGE" REASON)");
   }
   entries.push_back(std::move(entry));
 }

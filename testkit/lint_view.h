@@ -7,6 +7,7 @@
 #include <map>
 #include <set>
 #include <string>
+#include <tuple>
 #include <utility>
 #include <vector>
 
@@ -69,7 +70,9 @@ class Findings {
     Check check;
     std::string name;
     int32_t w, h;
-    auto operator<=>(const Kind&) const = default;
+    friend bool operator<(const Kind& a, const Kind& b) {
+      return std::tie(a.check, a.name, a.w, a.h) < std::tie(b.check, b.name, b.w, b.h);
+    }
   };
   struct Found {
     Finding finding;

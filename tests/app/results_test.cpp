@@ -196,28 +196,34 @@ TestResult resultOf(int number) {
   return {"test " + std::to_string(number % kTests), Verdict::Pass, started, {}, {}};
 }
 
+// Records in a process of its own, which its alarm ends in any moment after the first record.
+// `safe` is the number of the last one that was written.
+void killWhileWriting(const fs::path& file, std::atomic<int>& safe, const itimerval& life) {
+  const int before = safe;
+  const pid_t writer = ::fork();
+  if (writer == 0) {
+    std::string error;
+    auto book = ResultBook::open(file, error);
+    while (book && book->record(resultOf(safe + 1), error)) {
+      if (++safe == before + 1) ::setitimer(ITIMER_REAL, &life, nullptr);
+    }
+    ::_exit(1);
+  }
+  int end = 0;
+  ::waitpid(writer, &end, 0);
+  ASSERT_TRUE(WIFSIGNALED(end) && WTERMSIG(end) == SIGALRM) << "it ended by itself";
+}
+
 TEST_F(Results, LoseAtMostTheRunningTestOfAKilledWriter) {
   auto* const shared = ::mmap(nullptr, sizeof(std::atomic<int>), PROT_READ | PROT_WRITE,
                               MAP_SHARED | MAP_ANONYMOUS, -1, 0);
-  // The number of the last record that was written.
   auto* const safe = static_cast<std::atomic<int>*>(shared);
   std::mt19937 random(20261121);
   std::uniform_int_distribution<suseconds_t> lives(1, 20'000);
   for (int kill = 0; kill < 50; ++kill) {
     SCOPED_TRACE(kill);
-    const int before = *safe;
-    const itimerval life = {{}, {0, lives(random)}};  // its alarm ends the writer in any moment
-    const pid_t writer = ::fork();
-    if (writer == 0) {
-      auto book = ResultBook::open(file, error);
-      while (book && book->record(resultOf(*safe + 1), error)) {
-        if (++*safe == before + 1) ::setitimer(ITIMER_REAL, &life, nullptr);
-      }
-      ::_exit(1);
-    }
-    int end = 0;
-    ::waitpid(writer, &end, 0);
-    ASSERT_TRUE(WIFSIGNALED(end) && WTERMSIG(end) == SIGALRM) << "it ended by itself";
+    const itimerval life = {{}, {0, lives(random)}};
+    ASSERT_NO_FATAL_FAILURE(killWhileWriting(file, *safe, life));
     const auto book = ResultBook::open(file, error);
     ASSERT_TRUE(book) << error;
     for (int number = std::max(1, *safe - kTests + 2); number <= *safe; ++number) {

@@ -89,7 +89,7 @@ TEST_F(MainListTest, LogsWhatItIsByThen) {
   const Step hear = call([](MW::Widget&) {
     __android_log_set_logger([](const __android_logger_data*, const char* line) {
       if (stage.widget == nullptr) return;
-      const std::string active = stage.widget->isActive() == 1 ? " active" : "";
+      const std::string active = stage.widget->isActive() ? " active" : "";
       stage.journal += line + active + std::to_string(stage.widget->isSelect()) + ' ';
     });
   });

@@ -28,7 +28,7 @@ constexpr int kWidth = 480;
 constexpr int kHeight = 800;
 
 /// The session's file, a line at once.
-void say(json line) {
+void say(const json& line) {
   static std::ofstream file(kFolder / "session.jsonl");
   file << line.dump() << std::endl;
 }
@@ -81,7 +81,7 @@ const std::string kTrace = std::filesystem::path(setting("BRIMOL_TRACE")).filena
 void tap(int time, int line, int y, const std::string& text) {
   const auto at = [&](json more) {
     more.update({{"time", time}, {"file", kTrace}, {"line", line}});
-    say(std::move(more));
+    say(more);
   };
   at({{"kind", "step"}, {"text", text}});
   at({{"kind", "event"}, {"input", "down"}, {"finger", 0}, {"x", kWidth / 2}, {"y", y}});
@@ -175,9 +175,7 @@ int animate(int frames) {
   return 0;
 }
 
-}  // namespace
-
-int main(int count, char** arguments) {
+int run(int count, char** arguments) {
   const std::string what = count > 1 ? arguments[1] : "";
   if (what == "pass") return pass(400);
   if (what == "pass-otherwise") return pass(420);
@@ -190,5 +188,14 @@ int main(int count, char** arguments) {
   if (what == "animate") return animate(std::stoi(arguments[2]));
   if (what == "exit") return pass(400) + std::stoi(arguments[2]);
   std::cerr << "fake_application: does not know '" << what << "'\n";
+  return 2;
+}
+
+}  // namespace
+
+int main(int count, char** arguments) try {
+  return run(count, arguments);
+} catch (const std::exception& error) {
+  std::cerr << "fake_application: " << error.what() << '\n';
   return 2;
 }

@@ -34,6 +34,22 @@ std::string_view trimmed(std::string_view line) {
 
 bool isDigit(char letter) { return letter >= '0' && letter <= '9'; }
 
+// "720x1280".
+Size readScreen(TraceWords& words) {
+  std::string size = words.word("a size as 720x1280");
+  std::ranges::replace(size, 'x', ' ');
+  TraceWords sides(size);
+  const auto side = [&] {
+    const uint64_t pixels = sides.number("a side in pixels", kMostSide);
+    if (pixels == 0) throw BadLine{"a screen without pixels"};
+    return static_cast<int>(pixels);
+  };
+  const int width = side();
+  const int height = side();
+  sides.expectEnd();
+  return {width, height};
+}
+
 float readDensity(std::string_view word) {
   constexpr float kMost = 10000;
   float density = 0;
@@ -200,17 +216,7 @@ bool TraceParser::readSetting(const TraceLine& line, TraceWords& words) {
   };
   if (words.takes("screen")) {
     mustComeFirst();
-    std::string size = words.word("a size as 720x1280");
-    std::ranges::replace(size, 'x', ' ');
-    TraceWords sides(size);
-    const auto side = [&] {
-      const uint64_t pixels = sides.number("a side in pixels", kMostSide);
-      if (pixels == 0) throw BadLine{"a screen without pixels"};
-      return static_cast<int>(pixels);
-    };
-    const int width = side();
-    trace.screen = Size{width, side()};
-    sides.expectEnd();
+    trace.screen = readScreen(words);
   } else if (words.takes("density")) {
     mustComeFirst();
     trace.density = readDensity(words.word("dots per inch"));

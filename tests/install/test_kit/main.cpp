@@ -45,7 +45,7 @@ struct Counter {
   }
   static bool isRested() { return tapped != 0 && GetTicks() - tapped >= 1000; }
 
-  void draw() {
+  static void draw() {
     skia_begin_frame_c();
     MW::Window::show();
     if (isRested()) skia_add_label_c({0, 200, 400, 50, 0}, textOf("Rested"));
@@ -101,7 +101,7 @@ void testGoldens(Screen& screen, const std::string& folder) {
 
 void testCounter(const std::string& folder) {
   std::optional<Counter> counter;
-  Screen screen({400, 300}, {[&] { counter->update(); }, [&] { counter->draw(); }});
+  Screen screen({400, 300}, {[&] { counter->update(); }, [] { Counter::draw(); }});
   counter.emplace();
   screen.expectLog("startEvent->EventInit");
 

@@ -68,8 +68,8 @@ TEST_F(OverlayTest, ShowsBothFingersWhereTheyAre) {
   EXPECT_TRUE(overlay.setFingers(fingers));
   EXPECT_FALSE(overlay.setFingers(fingers)) << "nothing new";
   const Area shown = changedIn(drawn());
-  EXPECT_NEAR(shown.x + shown.width / 2, 150, 1) << "between 100 and 200";
-  EXPECT_NEAR(shown.y + shown.height / 2, 200, 1) << "between 150 and 250";
+  EXPECT_NEAR(2 * shown.x + shown.width, 2 * 150, 2) << "between 100 and 200";
+  EXPECT_NEAR(2 * shown.y + shown.height, 2 * 200, 2) << "between 150 and 250";
 }
 
 }  // namespace

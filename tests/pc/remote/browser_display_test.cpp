@@ -5,6 +5,7 @@
 #include <malloc.h>
 
 #include <algorithm>
+#include <array>
 #include <cstring>
 #include <iostream>
 #include <list>
@@ -67,7 +68,7 @@ class ServedScreen : public testing::Test {
     for (int y = part.y; y < part.y + part.height; ++y) {
       unsigned char* const row = cairo_image_surface_get_data(picture.get()) +
                                  std::ptrdiff_t{y} * cairo_image_surface_get_stride(picture.get());
-      std::generate_n(row + part.x * 4, part.width * 4,
+      std::generate_n(row + std::ptrdiff_t{4} * part.x, 4 * part.width,
                       [&random] { return static_cast<unsigned char>(random()); });
     }
     cairo_surface_mark_dirty(picture.get());
@@ -179,9 +180,9 @@ TEST_F(ServedScreen, BearsBrokenViewers) {
   std::list<Socket> broken;
   for (int count = 0; count < 200; ++count) {
     const int port = count % 2 == 0 ? webPort : vncPort;
-    constexpr const char* kBeginnings[] = {"", "\x80\xFF garbage \n\n", "RFB 003.008\n\2half",
-                                           "GET / HTTP/1.1\r\nHost: local"};
-    broken.push_back(rawConnection(port, kBeginnings[count / 2 % 4]));
+    static constexpr auto kBeginnings = std::to_array(
+        {"", "\x80\xFF garbage \n\n", "RFB 003.008\n\2half", "GET / HTTP/1.1\r\nHost: local"});
+    broken.push_back(rawConnection(port, kBeginnings.at(static_cast<std::size_t>(count / 2 % 4))));
   }
   for (int count = 0; count < 50; ++count) {
     const uint32_t colour = count % 2 == 0 ? kOrange : kBlue;

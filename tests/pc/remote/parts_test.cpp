@@ -1,6 +1,7 @@
 // What the server takes from viewers and browsers, and what it makes of it.
 #include <gtest/gtest.h>
 
+#include <array>
 #include <string>
 #include <vector>
 
@@ -32,29 +33,34 @@ struct Stream {
   bool isViewer = true;
 };
 
+const std::string kOld = "RFB 003.003\n" + std::string(16, 'p') + "\1";
+const auto kStreams = std::to_array<Stream>(
+    {{"all messages, and no clipboard",
+      kHandshake + kEncodings + kClipboard + kLongClipboard + kFinger + kKey,
+      kHandshake + kEncodings + kFinger + kKey},
+     {"an old viewer", kOld + kKey, kOld + kKey},
+     {"half a message", kHandshake + kKey.substr(0, 7), kHandshake},
+     {"a browser", "GET / HTTP/1.1\r\n", "", false},
+     {"no password wanted", "RFB 003.008\n\1", "RFB 003.008\n", false},
+     {"an unknown message", kHandshake + "\7" + kKey, kHandshake, false},
+     {"too many encodings", kHandshake + "\2\0\xFF\xFF"s, kHandshake, false}});
+
+void expectPassed(const Stream& stream, std::size_t step) {
+  MessageGate gate;
+  std::string passed;
+  bool isViewer = true;
+  for (std::size_t at = 0; at < stream.bytes.size() && isViewer; at += step) {
+    isViewer = gate.take(stream.bytes.substr(at, step), passed);
+  }
+  EXPECT_EQ(passed, stream.passed);
+  EXPECT_EQ(isViewer, stream.isViewer);
+}
+
 TEST(MessageGate, PassesWholeMessagesOfViewersAlone) {
-  const std::string old = "RFB 003.003\n" + std::string(16, 'p') + "\1";
-  const Stream streams[] = {
-      {"all messages, and no clipboard",
-       kHandshake + kEncodings + kClipboard + kLongClipboard + kFinger + kKey,
-       kHandshake + kEncodings + kFinger + kKey},
-      {"an old viewer", old + kKey, old + kKey},
-      {"half a message", kHandshake + kKey.substr(0, 7), kHandshake},
-      {"a browser", "GET / HTTP/1.1\r\n", "", false},
-      {"no password wanted", "RFB 003.008\n\1", "RFB 003.008\n", false},
-      {"an unknown message", kHandshake + "\7" + kKey, kHandshake, false},
-      {"too many encodings", kHandshake + "\2\0\xFF\xFF"s, kHandshake, false}};
-  for (const Stream& stream : streams) {
+  for (const Stream& stream : kStreams) {
     for (const std::size_t step : {std::size_t{1}, std::size_t{5}, stream.bytes.size()}) {
       SCOPED_TRACE(stream.name + std::to_string(step));
-      MessageGate gate;
-      std::string passed;
-      bool isViewer = true;
-      for (std::size_t at = 0; at < stream.bytes.size() && isViewer; at += step) {
-        isViewer = gate.take(stream.bytes.substr(at, step), passed);
-      }
-      EXPECT_EQ(passed, stream.passed);
-      EXPECT_EQ(isViewer, stream.isViewer);
+      expectPassed(stream, step);
     }
   }
 }

@@ -2,6 +2,7 @@
 
 #include <arpa/inet.h>
 #include <sys/socket.h>
+#include <stdexcept>
 
 #include <cstdlib>
 #include <cstring>
@@ -62,7 +63,9 @@ pc::Socket rawConnection(int port, std::string_view bytes) {
   server.sin_family = AF_INET;
   server.sin_port = htons(static_cast<uint16_t>(port));
   server.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
-  connect(connection.get(), reinterpret_cast<sockaddr*>(&server), sizeof server);
+  if (connect(connection.get(), reinterpret_cast<sockaddr*>(&server), sizeof server) != 0) {
+    throw std::runtime_error("nobody listens there");
+  }
   send(connection.get(), bytes.data(), bytes.size(), MSG_NOSIGNAL);
   return connection;
 }
