@@ -43,6 +43,12 @@ int Program::waitForEnd() {
   return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
 }
 
+bool Program::isRunning() const {
+  siginfo_t end = {};
+  const auto number = static_cast<id_t>(process);
+  return ::waitid(P_PID, number, &end, WEXITED | WNOHANG | WNOWAIT) == 0 && end.si_pid == 0;
+}
+
 void Program::kill() const { ::kill(process, SIGKILL); }
 
 std::string readAll(const std::filesystem::path& file) {

@@ -23,6 +23,7 @@ class Program {
 
   /// Its exit code, or -1 for another end.
   int waitForEnd();
+  bool isRunning() const;
   void kill() const;
 
  private:
