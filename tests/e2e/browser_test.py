@@ -2,8 +2,10 @@
 
 import os
 import pathlib
+import random
 import re
 import signal
+import socket
 import subprocess
 import sys
 import tempfile
@@ -28,6 +30,19 @@ return {x: place.left + %d * place.width / canvas.width, y: place.top + %d * pla
 """
 
 
+def free_address():
+    """A loopback address whose port and the next are free, and stay so: the system gives them to nobody by itself."""
+    while True:
+        port = random.randrange(10000, 30000)
+        try:
+            for wanted in port, port + 1:
+                with socket.create_server(("127.0.0.1", wanted)):
+                    pass
+            return f"127.0.0.1:{port}"
+        except OSError:
+            continue
+
+
 class Application:
     """A program that shows its screen in browsers, from its start to its end."""
 
@@ -36,7 +51,10 @@ class Application:
         self.folder = tempfile.TemporaryDirectory()
         self.process = subprocess.Popen([program], stderr=subprocess.PIPE, text=True, env=settings,
                                         cwd=self.folder.name)
-        self.address = re.search(r"http://\S+", self.process.stderr.readline()).group()
+        said = self.process.stderr.readline()
+        address = re.search(r"http://\S+", said)
+        assert address, f"no address, but: {said}"
+        self.address = address.group()
 
     def __enter__(self):
         return self
@@ -81,7 +99,8 @@ class BrowserTest(unittest.TestCase):
 
     def test_a_click_ends_the_application_and_another_one_is_found_again(self):
         for width, height in (1200, 900), (390, 844):
-            with Application(FIRST_SCREEN) as first:
+            listen = free_address()
+            with Application(FIRST_SCREEN, listen) as first:
                 self.browser.resize(width, height)
                 self.browser.open(first.address)
                 button = self.see(*BUTTON_AT, BUTTON)
@@ -91,7 +110,6 @@ class BrowserTest(unittest.TestCase):
                 self.mouse("mouseReleased", button, 0)
                 self.assertEqual(first.process.wait(60), 0)
                 self.eventually(lambda: "Trying again" in self.status())
-                listen = re.search(r"//([^/]+)/", first.address).group(1)
                 with Application(FIRST_SCREEN, listen) as second:
                     self.eventually(lambda: "open the address" in self.status())
                     self.browser.open(second.address)
