@@ -128,7 +128,10 @@ TEST_F(Results, SurviveAFullDiskBehindALink) {
   EXPECT_EQ(error, file.native() + ": cannot be written: File too large");
   EXPECT_EQ(textOf(file), kDocumented);
   EXPECT_FALSE(fs::exists(folder / "far.tmp"));
-  EXPECT_TRUE(book->record(kColours, error)) << error;
+  EXPECT_FALSE(book->isSaved(kKeys.test));
+  EXPECT_TRUE(book->isSaved(kColours.test));
+  EXPECT_TRUE(book->saveAgain(error)) << error;
+  EXPECT_TRUE(book->isSaved(kKeys.test));
   EXPECT_EQ(ResultBook::open(folder / "far", error)->results(), (std::vector{kColours, kKeys}));
 }
 

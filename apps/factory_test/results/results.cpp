@@ -32,14 +32,23 @@ bool ResultBook::resume(std::string& error) {
   return true;
 }
 
-bool ResultBook::save(std::string& error) const {
-  return file.empty() || replaceFile(file, resultsJson(kept), error);
+bool ResultBook::save(std::string& error) {
+  if (!file.empty() && !replaceFile(file, resultsJson(kept), error)) return false;
+  unsaved.clear();
+  return true;
 }
 
 bool ResultBook::record(TestResult result, std::string& error) {
+  unsaved.insert(result.test);
   put(clamped(std::move(result)));
   return save(error);
 }
+
+bool ResultBook::isSaved(std::string_view test) const {
+  return find(test) != nullptr && !unsaved.contains(test);
+}
+
+bool ResultBook::saveAgain(std::string& error) { return unsaved.empty() || save(error); }
 
 void ResultBook::put(TestResult result) {
   const auto earlier = std::ranges::find(kept, result.test, &TestResult::test);

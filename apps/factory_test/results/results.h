@@ -2,7 +2,9 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
 #include <optional>
+#include <set>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -28,6 +30,12 @@ class ResultBook {
   /// milliseconds.
   bool record(TestResult result, std::string& error);
 
+  /// Whether the test has a result, and all that it is kept in holds it.
+  bool isSaved(std::string_view test) const;
+
+  /// Tries again to write what record() could not. True: nothing is left unsaved, or was.
+  bool saveAgain(std::string& error);
+
   /// The test's result, or null. Valid until the next record().
   const TestResult* find(std::string_view test) const;
 
@@ -38,11 +46,12 @@ class ResultBook {
   ResultBook() = default;
 
   bool resume(std::string& error);
-  bool save(std::string& error) const;
+  bool save(std::string& error);
   void put(TestResult result);
 
   std::filesystem::path file = {};  // empty: in memory only
   std::vector<TestResult> kept = {};
+  std::set<std::string, std::less<>> unsaved = {};  // tests whose result the file does not hold
 };
 
 }  // namespace factory_test

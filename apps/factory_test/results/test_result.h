@@ -2,7 +2,9 @@
 #pragma once
 
 #include <chrono>
+#include <optional>
 #include <string>
+#include <vector>
 
 namespace factory_test {
 
@@ -18,12 +20,26 @@ struct ScreenSize {
   bool operator==(const ScreenSize&) const = default;
 };
 
+/// A value that a test delivered.
+struct Measure {
+  std::string name = {};             // "cells missed"; [a-z0-9 ], the key of limits and history
+  std::string unit = {};             // "mm", "ms", "1/s"; empty for a count
+  double value = 0;                  // finite
+  std::optional<double> least = {};  // the limits that it was judged by; none: no limit
+  std::optional<double> most = {};
+
+  bool isWithin() const { return (!least || value >= *least) && (!most || value <= *most); }
+  bool operator==(const Measure&) const = default;
+};
+
 struct TestResult {
   std::string test = {};  // its name, the key; UTF-8
   Verdict verdict = Verdict::None;
   std::chrono::sys_seconds started = {};    // UTC, years 1970 to 9999
   std::chrono::milliseconds duration = {};  // 0 to INT_MAX, that is 24 days
   ScreenSize screen = {};
+  std::vector<Measure> values = {};
+  int attempt = 1;  // 1 or more
 
   bool operator==(const TestResult&) const = default;
 };
