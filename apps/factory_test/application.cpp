@@ -60,8 +60,9 @@ std::optional<std::string> readText(const std::string& path, std::string& error)
   return {};
 }
 
-int showScreens(const Options& options, ResultBook& book, const Surroundings& surroundings) {
-  FactoryTest test(book, surroundings, options.junit);
+int showScreens(const Options& options, ResultBook& book, const Context& context) {
+  FactoryTest test(book, context, options.junit);
+  if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
     loop(test);
@@ -80,17 +81,17 @@ int runApplication(const Options& options) {
   std::string error;
   auto book = ResultBook::open(options.results, error);
   if (!book) return fail(error);
-  Surroundings surroundings = {*book, log, {}, options.shell};
+  Context context = {*book, log, {}, options.shell};
   if (!options.log.empty()) {
-    surroundings.logText = readText(options.log, error);
-    if (!surroundings.logText) return fail(error);
+    context.logText = readText(options.log, error);
+    if (!context.logText) return fail(error);
   }
   if (brimol_host_open() == 0) return EXIT_FAILURE;
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;
-  const int result = started ? showScreens(options, *book, surroundings)
-                             : fail("no memory for the dispatch thread");
+  const int result =
+      started ? showScreens(options, *book, context) : fail("no memory for the dispatch thread");
   MW::Window::destroy();
   return result;
 }

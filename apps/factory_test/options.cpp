@@ -8,6 +8,8 @@
 #include <string_view>
 #include <utility>
 
+#include "pages/table.h"
+
 namespace factory_test {
 
 namespace {
@@ -34,7 +36,9 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char* value) { options.log = value; }},
     {"--shell", "CMD", "run CMD in the shell, instead of uname -a",
      [](Options& options, const char* value) { options.shell = value; }},
-    {"--shot", "FILE.png", "draw the menu, write it to FILE.png and end",
+    {"--test", "ID", "show that test first, in the place of the menu",
+     [](Options& options, const char* value) { options.test = value; }},
+    {"--shot", "FILE.png", "draw the first screen, write it to FILE.png and end",
      [](Options& options, const char* value) { options.shot = value; }},
     {"--verbose", nullptr, "write the toolkit's log to stderr",
      [](Options& options, const char*) { options.verbose = true; }},
@@ -75,6 +79,12 @@ std::string wrongDevice(const std::string& name) {
   return error;
 }
 
+std::string wrongTest(const std::string& id) {
+  std::string error = "unknown test '" + id + "', known are:";
+  for (const TestEntry& entry : testEntries()) error.append(" ").append(entry.id);
+  return error;
+}
+
 std::string helpLine(std::string name, std::size_t columns, const std::string& meaning) {
   name.resize(std::max(columns, name.size() + 1), ' ');
   return "  " + name + meaning + "\n";
@@ -100,6 +110,10 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
   }
   if (!options.device.empty() && brimol_device_named(options.device.c_str()) == nullptr) {
     error = wrongDevice(options.device);
+    return {};
+  }
+  if (!options.test.empty() && placeOf(options.test) == testEntries().size()) {
+    error = wrongTest(options.test);
     return {};
   }
   return options;

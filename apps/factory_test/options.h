@@ -14,6 +14,7 @@ struct Options {
   bool headless = false;     // draw to memory, without a window
   std::string device = {};   // the phone's screen that is played; empty: what BRIMOL_DEVICE says
   bool verbose = false;      // write the toolkit's log to stderr
+  std::string test = {};     // the page of this id comes first; empty: the menu
   std::string shot = {};     // draw once, write this PNG file and end; empty: no
   std::string results = {};  // the JSON file that keeps the verdicts; empty: none
   std::string junit = {};    // the same as a report for a CI system; empty: none

@@ -16,8 +16,8 @@
 #include <limits>
 #include <random>
 
+#include "machine_figures.h"
 #include "results/junit.h"
-#include "results/machine_figures.h"
 #include "results/results.h"
 
 namespace factory_test {

@@ -6,19 +6,14 @@
 #include <string>
 #include <vector>
 
+#include "screen_size.h"
+
 namespace factory_test {
 
 enum class Verdict { None, Pass, Fail };
 
 /// The word of the files for it: "PASS", "FAIL" or "none".
 const char* verdictName(Verdict verdict);
-
-struct ScreenSize {
-  int width = 0;  // pixels, 0 or more
-  int height = 0;
-
-  bool operator==(const ScreenSize&) const = default;
-};
 
 /// A value that a test delivered.
 struct Measure {

@@ -3,6 +3,7 @@
 
 #include <array>
 #include <atomic>
+#include <memory>
 #include <optional>
 #include <string>
 
@@ -10,6 +11,7 @@
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -82,9 +84,8 @@ const std::array<ButtonRow::Face, KeyboardTest::kLayoutCount> KeyboardTest::kFac
     {"123", [](int) { self().change(MW::Ime::kOnlyDigits); }},
 }};
 
-const TestRegistration kKeyboardRegistration({Group::Input, 3, "keyboard", "Keyboard",
-                                              makeTest<KeyboardTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeKeyboard(const Context&) { return std::make_unique<KeyboardTest>(); }
 
 }  // namespace factory_test

@@ -8,6 +8,7 @@
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -58,9 +59,8 @@ class WarningTest : public StepTest {
   std::unique_ptr<MW::Widget> warning;
 };
 
-const TestRegistration kWarningsRegistration({Group::Dialogs, 5, "warnings", "Warning pages",
-                                              makeTest<WarningTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeWarnings(const Context&) { return std::make_unique<WarningTest>(); }
 
 }  // namespace factory_test

@@ -5,11 +5,13 @@
 #include <array>
 #include <atomic>
 #include <cstdio>
+#include <memory>
 #include <optional>
 
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -77,9 +79,8 @@ class TouchTest : public LookTest {
   std::optional<MW::Key> key;
 };
 
-const TestRegistration kTouchRegistration({Group::Input, 0, "touch", "Touch panel",
-                                           makeTest<TouchTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeTouch(const Context&) { return std::make_unique<TouchTest>(); }
 
 }  // namespace factory_test

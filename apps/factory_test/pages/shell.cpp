@@ -3,12 +3,14 @@
 #include <MW/window.h>
 
 #include <algorithm>
+#include <memory>
 #include <optional>
 #include <string>
 
 #include "command.h"
 #include "current.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -20,7 +22,7 @@ constexpr std::size_t kCharacterRest = 3;  // bytes of a character behind its fi
 /// Runs the command of --shell. OK and the keys select and back end the look, and the command.
 class ShellTest : public LookTest {
  public:
-  explicit ShellTest(const Surroundings& program)
+  explicit ShellTest(const Context& program)
       : LookTest("Shell", "A command and what it writes."), line(program.shellCommand) {}
 
  protected:
@@ -92,9 +94,10 @@ class ShellTest : public LookTest {
   std::optional<Command> command;
 };
 
-const TestRegistration kShellRegistration({Group::Dialogs, 4, "shell", "Shell",
-                                           makeTest<ShellTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeShell(const Context& context) {
+  return std::make_unique<ShellTest>(context);
+}
 
 }  // namespace factory_test

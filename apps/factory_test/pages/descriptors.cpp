@@ -13,6 +13,7 @@
 
 #include "current.h"
 #include "layout.h"
+#include "pages/table.h"
 #include "test.h"
 #include "verdict_bar.h"
 
@@ -180,9 +181,8 @@ const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
     {kRcuiFullScreen, false, {}, ""},
 };
 
-const TestRegistration kDescriptorsRegistration({Group::Widgets, 5, "descriptors", "Descriptors",
-                                                 makeTest<DescriptorTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeDescriptors(const Context&) { return std::make_unique<DescriptorTest>(); }
 
 }  // namespace factory_test

@@ -1,11 +1,13 @@
 // Every built-in dialog, one after another.
 #include <MW/dialog.h>
 
+#include <memory>
 #include <optional>
 #include <string>
 
 #include "current.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -40,9 +42,8 @@ class PromptTest : public StepTest {
   std::optional<MW::Dialog> dialog;
 };
 
-const TestRegistration kPromptsRegistration({Group::Dialogs, 0, "prompts", "Built-in dialogs",
-                                             makeTest<PromptTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makePrompts(const Context&) { return std::make_unique<PromptTest>(); }
 
 }  // namespace factory_test

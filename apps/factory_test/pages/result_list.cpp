@@ -3,6 +3,7 @@
 #include <MW/mpd_wid.h>
 
 #include <array>
+#include <memory>
 #include <optional>
 #include <string>
 
@@ -10,6 +11,7 @@
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 #include "results/utc_time.h"
 
 namespace factory_test {
@@ -56,8 +58,7 @@ std::string wordsOf(Group group, const ResultBook& book) {
 // The list never hides its last line, nor does that one open: it closes the list.
 std::string wordsOf(const ResultBook& book) {
   std::string words;
-  for (const Group group :
-       {Group::Display, Group::Input, Group::Widgets, Group::Dialogs, Group::Reports}) {
+  for (const Group group : {Group::Display, Group::Input, Group::Reports, Group::Toolkit}) {
     words += wordsOf(group, book);
   }
   return words + lineOf(kGroup, "All", std::to_string(book.results().size()), "results");
@@ -67,7 +68,7 @@ std::string wordsOf(const ResultBook& book) {
 /// header, and the keys select and back, end the look.
 class ResultListTest : public LookTest {
  public:
-  explicit ResultListTest(const Surroundings& program)
+  explicit ResultListTest(const Context& program)
       : LookTest("Results", ""), words(wordsOf(program.results)) {}
 
  protected:
@@ -107,9 +108,10 @@ const std::array<ButtonRow::Face, 1> ResultListTest::kFaces = {{
     {"Done", [](int) { self().finishLook(); }},
 }};
 
-const TestRegistration kResultListRegistration({Group::Reports, 1, "result_list", "Results",
-                                                makeTest<ResultListTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeResultList(const Context& context) {
+  return std::make_unique<ResultListTest>(context);
+}
 
 }  // namespace factory_test

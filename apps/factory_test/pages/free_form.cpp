@@ -8,6 +8,7 @@
 
 #include "current.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -84,9 +85,8 @@ class FreeFormTest : public StepTest {
   std::unique_ptr<MW::Widget> dialog;
 };
 
-const TestRegistration kFreeFormRegistration({Group::Dialogs, 3, "free_form", "Free-form dialogs",
-                                              makeTest<FreeFormTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeFreeForm(const Context&) { return std::make_unique<FreeFormTest>(); }
 
 }  // namespace factory_test

@@ -3,11 +3,13 @@
 
 #include <array>
 #include <atomic>
+#include <memory>
 #include <optional>
 #include <string>
 
 #include "current.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -52,9 +54,8 @@ class SixChoiceTest : public LookTest {
   std::optional<MW::DialogSelect> dialog;
 };
 
-const TestRegistration kSixChoiceRegistration({Group::Dialogs, 2, "six_choice", "Six-way choice",
-                                               makeTest<SixChoiceTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeSixChoice(const Context&) { return std::make_unique<SixChoiceTest>(); }
 
 }  // namespace factory_test

@@ -5,6 +5,7 @@
 #include <array>
 #include <atomic>
 #include <bitset>
+#include <memory>
 #include <optional>
 #include <string>
 
@@ -12,6 +13,7 @@
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -83,9 +85,8 @@ const std::array<ButtonRow::Face, 1> PadTest::kFaces = {{
     {"Next layout", [](int) { self().nextLayout(); }},
 }};
 
-const TestRegistration kPadRegistration({Group::Input, 2, "pad", "Multi-touch pad",
-                                         makeTest<PadTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makePad(const Context&) { return std::make_unique<PadTest>(); }
 
 }  // namespace factory_test

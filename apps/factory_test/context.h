@@ -1,4 +1,4 @@
-/// What tests need of the program around them.
+/// What pages need of the program around them.
 #pragma once
 
 #include <optional>
@@ -10,7 +10,7 @@
 namespace factory_test {
 
 /// Everything lives as long as the program; used on the main thread, the log on any.
-struct Surroundings {
+struct Context {
   const ResultBook& results;
   SessionLog& log;
   std::optional<std::string> logText;  // what the log viewer shows; none: the program's own log

@@ -5,11 +5,13 @@
 
 #include <array>
 #include <cstdio>
+#include <memory>
 #include <optional>
 
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 #include "pictures.h"
 
 namespace factory_test {
@@ -122,9 +124,8 @@ const std::array<ButtonTest::ButtonRow, ButtonTest::kButtonCount> ButtonTest::kB
     {"Hide me", &Widget::clickCallback, [](int) { self().hideLate(); }},
 }};
 
-const TestRegistration kButtonsRegistration({Group::Widgets, 0, "buttons", "Buttons",
-                                             makeTest<ButtonTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeButtons(const Context&) { return std::make_unique<ButtonTest>(); }
 
 }  // namespace factory_test

@@ -3,11 +3,13 @@
 
 #include <array>
 #include <atomic>
+#include <memory>
 #include <optional>
 #include <string>
 
 #include "current.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -55,9 +57,8 @@ class ListTest : public LookTest {
   std::optional<MW::DialogList> list;
 };
 
-const TestRegistration kListChoiceRegistration({Group::Dialogs, 1, "list_choice", "List choice",
-                                                makeTest<ListTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeListChoice(const Context&) { return std::make_unique<ListTest>(); }
 
 }  // namespace factory_test

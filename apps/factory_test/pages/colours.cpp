@@ -3,11 +3,13 @@
 #include <MW/screen.h>
 #include <MW/window.h>
 
+#include <memory>
 #include <optional>
 
 #include "current.h"
 #include "on_top.h"
 #include "page_test.h"
+#include "pages/table.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -59,9 +61,8 @@ class ColourTest : public LookTest {
   std::optional<OnTop<MW::Key>> key;
 };
 
-const TestRegistration kColoursRegistration({Group::Display, 0, "colours", "Display colours",
-                                             makeTest<ColourTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeColours(const Context&) { return std::make_unique<ColourTest>(); }
 
 }  // namespace factory_test

@@ -4,12 +4,14 @@
 
 #include <algorithm>
 #include <atomic>
+#include <memory>
 #include <optional>
 #include <string>
 
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -62,9 +64,8 @@ class BrightnessTest : public PageTest {
   std::optional<MW::SlideMove> slider;
 };
 
-const TestRegistration kBrightnessRegistration({Group::Display, 1, "brightness", "Brightness",
-                                                makeTest<BrightnessTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeBrightness(const Context&) { return std::make_unique<BrightnessTest>(); }
 
 }  // namespace factory_test

@@ -1,11 +1,13 @@
 // Slides that end something once their knob has come to the other end.
 #include <MW/slide_e.h>
 
+#include <memory>
 #include <optional>
 
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -54,9 +56,8 @@ class ExitSlideTest : public PageTest {
   std::optional<MW::SlideE> leaving;
 };
 
-const TestRegistration kExitSlidesRegistration({Group::Widgets, 4, "exit_slides", "Exit slides",
-                                                makeTest<ExitSlideTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeExitSlides(const Context&) { return std::make_unique<ExitSlideTest>(); }
 
 }  // namespace factory_test

@@ -1,4 +1,4 @@
-#include "results/machine_figures.h"
+#include "machine_figures.h"
 
 #include <ifaddrs.h>
 #include <net/if.h>

@@ -3,11 +3,13 @@
 #include <MW/timed.h>
 
 #include <array>
+#include <memory>
 #include <optional>
 
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -84,9 +86,8 @@ class TimedTest : public PageTest {
   std::optional<MW::Progressbar> progress;
 };
 
-const TestRegistration kTimedRegistration({Group::Widgets, 3, "timed", "Toast and progress",
-                                           makeTest<TimedTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeTimed(const Context&) { return std::make_unique<TimedTest>(); }
 
 }  // namespace factory_test

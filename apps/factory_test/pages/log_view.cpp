@@ -4,6 +4,7 @@
 #include <MW/window.h>
 
 #include <array>
+#include <memory>
 #include <mutex>
 #include <optional>
 #include <string>
@@ -12,6 +13,7 @@
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -40,7 +42,7 @@ class Viewer : public MW::StaticText {
 /// match, as the keys up and down do; the fold key closes the keyboard.
 class LogTest : public PageTest {
  public:
-  explicit LogTest(const Surroundings& program)
+  explicit LogTest(const Context& program)
       : PageTest("Log",
                  "Drag to scroll. Search, then Previous\nand Next, or the keys up and down."),
         text(program.logText ? *program.logText : program.log.text()) {}
@@ -134,8 +136,10 @@ const std::array<ButtonRow::Face, 3> LogTest::kFaces = {{
     {"Next", [](int) { self().jump(Viewer::kNext); }},
 }};
 
-const TestRegistration kLogViewRegistration({Group::Reports, 0, "log", "Log", makeTest<LogTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeLogView(const Context& context) {
+  return std::make_unique<LogTest>(context);
+}
 
 }  // namespace factory_test

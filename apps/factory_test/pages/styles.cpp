@@ -11,6 +11,7 @@
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -99,9 +100,8 @@ class StyleTest : public PageTest {
   std::array<std::unique_ptr<MW::Widget>, kStyles.size()> buttons;
 };
 
-const TestRegistration kStylesRegistration({Group::Widgets, 1, "styles", "Button styles",
-                                            makeTest<StyleTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeStyles(const Context&) { return std::make_unique<StyleTest>(); }
 
 }  // namespace factory_test

@@ -6,11 +6,13 @@
 #include <algorithm>
 #include <array>
 #include <atomic>
+#include <memory>
 #include <optional>
 
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -95,8 +97,8 @@ class KeyTest : public PageTest {
   std::optional<MW::Key> key;
 };
 
-const TestRegistration kKeysRegistration({Group::Input, 1, "keys", "Keys", makeTest<KeyTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeKeys(const Context&) { return std::make_unique<KeyTest>(); }
 
 }  // namespace factory_test

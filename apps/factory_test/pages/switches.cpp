@@ -2,11 +2,13 @@
 #include <MW/slide.h>
 
 #include <atomic>
+#include <memory>
 #include <optional>
 
 #include "current.h"
 #include "layout.h"
 #include "page_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -72,9 +74,8 @@ class SwitchTest : public PageTest {
   std::optional<MW::Slide> locked;
 };
 
-const TestRegistration kSwitchesRegistration({Group::Widgets, 2, "switches", "Slide switches",
-                                              makeTest<SwitchTest>});
-
 }  // namespace
+
+std::unique_ptr<Test> makeSwitches(const Context&) { return std::make_unique<SwitchTest>(); }
 
 }  // namespace factory_test
