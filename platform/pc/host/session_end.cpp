@@ -46,8 +46,8 @@ void Session::endIfFailed() {
 
 void Session::endMonkey(const std::string& why) {
   isOver = true;
-  std::cerr << "brimol: monkey " << settings.monkey->seed << ": " << why << "\nTexts on the screen, at "
-            << now() << " ms:\n"
+  std::cerr << "brimol: monkey " << settings.monkey->seed << ": " << why
+            << "\nTexts on the screen, at " << now() << " ms:\n"
             << textsOf(lastFrame, screenSize);
   if (report) report->end(now(), kFailed, "failed");
   endProcess(kFailed);

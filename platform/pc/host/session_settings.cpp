@@ -45,8 +45,7 @@ std::string readClock(const VariableLookup& lookup, SessionSettings& settings) {
     return std::string(kClockVariable) + "=" + value + ": wanted real, simulated or paced";
   }
   settings.clock = row->clock;
-  const bool isSession =
-      !settings.trace.empty() || !settings.recording.empty() || settings.monkey;
+  const bool isSession = !settings.trace.empty() || !settings.recording.empty() || settings.monkey;
   if (isSession && settings.clock == ClockChoice::Real) {
     return "BRIMOL_CLOCK=real: a real clock plays no trace and records none";
   }

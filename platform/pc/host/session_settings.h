@@ -20,13 +20,13 @@ struct MonkeyWish {
 struct SessionSettings {
   ClockChoice clock = ClockChoice::Real;
   std::optional<uint32_t> clockStart;
-  std::string trace;          // what is played; empty: nothing
-  std::string recording;      // what is recorded into; empty: nothing
+  std::string trace;                 // what is played; empty: nothing
+  std::string recording;             // what is recorded into; empty: nothing
   std::optional<MonkeyWish> monkey;  // who plays instead of a trace or a user
-  std::string reportFolder;   // empty: none
-  bool keepsPictures = true;  // of the frames, in that folder
-  bool listsItems = false;    // of the frames, in the session's file
-  std::string error;          // one line about the first wrong value; empty: none is wrong
+  std::string reportFolder;          // empty: none
+  bool keepsPictures = true;         // of the frames, in that folder
+  bool listsItems = false;           // of the frames, in the session's file
+  std::string error;                 // one line about the first wrong value; empty: none is wrong
 };
 
 /// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_TRACE, BRIMOL_RECORD, BRIMOL_MONKEY,

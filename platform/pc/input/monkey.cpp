@@ -13,7 +13,7 @@ namespace brimol::pc {
 namespace {
 
 constexpr uint64_t kFirstMs = 100;  // after the first frame
-constexpr uint32_t kMostPauseMs = 200;
+constexpr uint32_t kMostPauseMs = 40;
 constexpr uint32_t kMostRestMs = 3000;
 constexpr uint32_t kMoveMs = 10;
 constexpr uint32_t kLongMs = 700;  // more than a long press
@@ -35,14 +35,14 @@ struct Monkey::Habit {
 };
 
 const Monkey::Habit& Monkey::habitFor(uint32_t share) {
-  static constexpr auto kHabits = std::to_array<Habit>({{45, &Monkey::tap},
+  static constexpr auto kHabits = std::to_array<Habit>({{51, &Monkey::tap},
                                                         {8, &Monkey::tapTwice},
-                                                        {8, &Monkey::hold},
+                                                        {3, &Monkey::hold},
                                                         {12, &Monkey::drag},
-                                                        {4, &Monkey::useManyFingers},
+                                                        {6, &Monkey::useManyFingers},
                                                         {16, &Monkey::pressKey},
                                                         {3, &Monkey::plug},
-                                                        {4, &Monkey::rest}});
+                                                        {1, &Monkey::rest}});
   const Habit* habit = kHabits.data();
   while (share >= habit->share) share -= (habit++)->share;
   return *habit;
@@ -128,7 +128,7 @@ void Monkey::planMoves(int finger, int steps) {
   }
 }
 
-void Monkey::tap(const Frame& shown) { planPress(0, somewhere(shown), 20 + below(100)); }
+void Monkey::tap(const Frame& shown) { planPress(0, somewhere(shown), 5 + below(60)); }
 
 void Monkey::tapTwice(const Frame& shown) {
   const ScreenPoint place = somewhere(shown);
@@ -137,9 +137,7 @@ void Monkey::tapTwice(const Frame& shown) {
   planPress(0, place, 20 + below(60));
 }
 
-void Monkey::hold(const Frame& shown) {
-  planPress(0, somewhere(shown), kLongMs + below(kLongMs));
-}
+void Monkey::hold(const Frame& shown) { planPress(0, somewhere(shown), kLongMs + below(kLongMs)); }
 
 void Monkey::drag(const Frame& shown) {
   const ScreenPoint from = somewhere(shown);
@@ -162,7 +160,7 @@ void Monkey::useManyFingers(const Frame& shown) {
 
 void Monkey::planKey(uint32_t code) {
   plan(0, [this, code](uint64_t) { post(keyRecord(BRIMOL_KEY_DOWN, code)); });
-  plan(20 + below(80), [this, code](uint64_t) { post(keyRecord(BRIMOL_KEY_UP, code)); });
+  plan(5 + below(40), [this, code](uint64_t) { post(keyRecord(BRIMOL_KEY_UP, code)); });
 }
 
 void Monkey::pressKey(const Frame&) {
@@ -176,6 +174,8 @@ void Monkey::plug(const Frame&) {
   plan(below(kMostPauseMs), [](uint64_t) {});
 }
 
-void Monkey::rest(const Frame&) { plan(below(kMostRestMs), [](uint64_t) {}); }
+void Monkey::rest(const Frame&) {
+  plan(below(kMostRestMs), [](uint64_t) {});
+}
 
 }  // namespace brimol::pc

@@ -12,9 +12,10 @@
 
 namespace brimol::pc {
 
-/// Makes up taps, drags, long presses, up to ten fingers, keys and plugs, at random places and on what the
-/// screen shows. The same seed on the same screen does the same. It reads no clock and knows no thread: one
-/// call at a time. Times are milliseconds since the session's start and do not run back.
+/// Makes up taps, drags, long presses, up to ten fingers, keys and plugs, at random places and on
+/// what the screen shows. The same seed on the same screen does the same. It reads no clock and
+/// knows no thread: one call at a time. Times are milliseconds since the session's start and do not
+/// run back.
 class Monkey {
  public:
   using Post = ScriptFingers::Post;
@@ -69,9 +70,9 @@ class Monkey {
   uint64_t wanted;
   uint64_t count = 0;
   uint64_t countAtChange = 0;
-  std::deque<Planned> planned;       // in the order of their times
+  std::deque<Planned> planned;        // in the order of their times
   std::optional<uint64_t> nextHabit;  // none: no frame was seen yet
-  uint64_t planTime = 0;             // when what is planned last happens
+  uint64_t planTime = 0;              // when what is planned last happens
   bool over = false;
 };
 
