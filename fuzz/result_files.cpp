@@ -8,9 +8,9 @@
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, std::size_t count) {
   using namespace factory_test;  // NOLINT(google-build-using-namespace): its own words
   std::string reason;
-  const auto results = parseResults({reinterpret_cast<const char*>(bytes), count}, reason);
-  if (!results) return reason.empty() ? (std::abort(), 1) : 0;
-  const auto again = parseResults(resultsJson(*results), reason);
-  if (again != results) std::abort();
+  const auto read = parseResults({reinterpret_cast<const char*>(bytes), count}, reason);
+  if (!read) return reason.empty() ? (std::abort(), 1) : 0;
+  const auto again = parseResults(resultsJson(read->unit, read->results), reason);
+  if (!again || again->unit != read->unit || again->results != read->results) std::abort();
   return 0;
 }
