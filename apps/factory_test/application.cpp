@@ -18,6 +18,7 @@
 
 #include "complain.h"
 #include "factory_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -60,8 +61,9 @@ std::optional<std::string> readText(const std::string& path, std::string& error)
   return {};
 }
 
-int showScreens(const Options& options, ResultBook& book, const Surroundings& surroundings) {
-  FactoryTest test(book, surroundings, options.junit);
+int showScreens(const Options& options, ResultBook& book, const Context& context) {
+  FactoryTest test(book, context);
+  if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
     loop(test);
@@ -78,19 +80,23 @@ int runApplication(const Options& options) {
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   std::string error;
-  auto book = ResultBook::open(options.results, error);
+  RunStart run;
+  for (const TestEntry& each : testEntries()) {
+    if (each.plan == DefaultPlan::In) run.tests.emplace_back(each.id);
+  }
+  auto book = ResultBook::open({.json = options.results, .junit = options.junit}, run, error);
   if (!book) return fail(error);
-  Surroundings surroundings = {*book, log, {}, options.shell};
+  Context context = {*book, log, {}, options.shell};
   if (!options.log.empty()) {
-    surroundings.logText = readText(options.log, error);
-    if (!surroundings.logText) return fail(error);
+    context.logText = readText(options.log, error);
+    if (!context.logText) return fail(error);
   }
   if (brimol_host_open() == 0) return EXIT_FAILURE;
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;
-  const int result = started ? showScreens(options, *book, surroundings)
-                             : fail("no memory for the dispatch thread");
+  const int result =
+      started ? showScreens(options, *book, context) : fail("no memory for the dispatch thread");
   MW::Window::destroy();
   return result;
 }

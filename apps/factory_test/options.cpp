@@ -8,6 +8,8 @@
 #include <string_view>
 #include <utility>
 
+#include "pages/table.h"
+
 namespace factory_test {
 
 namespace {
@@ -30,11 +32,17 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char* value) { options.results = value; }},
     {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
      [](Options& options, const char* value) { options.junit = value; }},
+    {"--plan", "FILE.json", "test what this plan says, see docs/plans.md",
+     [](Options& options, const char* value) { options.plan = value; }},
+    {"--print-plan", nullptr, "print the plan with every field, and end",
+     [](Options& options, const char*) { options.action = Options::Action::PrintPlan; }},
     {"--log", "FILE", "show FILE in the log viewer, instead of the program's own log",
      [](Options& options, const char* value) { options.log = value; }},
     {"--shell", "CMD", "run CMD in the shell, instead of uname -a",
      [](Options& options, const char* value) { options.shell = value; }},
-    {"--shot", "FILE.png", "draw the menu, write it to FILE.png and end",
+    {"--test", "ID", "show that test first, in the place of the menu",
+     [](Options& options, const char* value) { options.test = value; }},
+    {"--shot", "FILE.png", "draw the first screen, write it to FILE.png and end",
      [](Options& options, const char* value) { options.shot = value; }},
     {"--verbose", nullptr, "write the toolkit's log to stderr",
      [](Options& options, const char*) { options.verbose = true; }},
@@ -75,6 +83,12 @@ std::string wrongDevice(const std::string& name) {
   return error;
 }
 
+std::string wrongTest(const std::string& id) {
+  std::string error = "unknown test '" + id + "', known are:";
+  for (const TestEntry& entry : testEntries()) error.append(" ").append(entry.id);
+  return error;
+}
+
 std::string helpLine(std::string name, std::size_t columns, const std::string& meaning) {
   name.resize(std::max(columns, name.size() + 1), ' ');
   return "  " + name + meaning + "\n";
@@ -100,6 +114,10 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
   }
   if (!options.device.empty() && brimol_device_named(options.device.c_str()) == nullptr) {
     error = wrongDevice(options.device);
+    return {};
+  }
+  if (!options.test.empty() && placeOf(options.test) == testEntries().size()) {
+    error = wrongTest(options.test);
     return {};
   }
   return options;
