@@ -11,6 +11,7 @@
 #include <utility>
 
 #include "pages/table.h"
+#include "records/commands.h"
 
 namespace factory_test {
 
@@ -165,6 +166,7 @@ std::string usage() {
     if (row.value != nullptr) name.append(" ").append(row.value);
     text += helpLine(std::move(name), kNameColumns, row.meaning);
   }
+  text += recordsUsage();
   text +=
       "\nEnvironment:\n"
       "  BRIMOL_DISPLAY=window|browser|headless\n"
