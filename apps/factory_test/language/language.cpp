@@ -44,7 +44,8 @@ std::filesystem::path catalogues() {
 std::span<const std::string_view> languages() { return kLanguages; }
 
 void chooseLanguage(const std::string& code) {
-  // Catalogues are read under any locale but "C", and this one is always there. LANGUAGE says whose.
+  // Catalogues are read under any locale but "C", and this one is always there. LANGUAGE says
+  // whose.
   std::setlocale(LC_MESSAGES, "C.UTF-8");
   setenv("LANGUAGE", (code.empty() ? environmentsLanguage() : code).c_str(), 1);
   bindtextdomain(kDomain, catalogues().c_str());
