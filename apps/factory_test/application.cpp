@@ -18,6 +18,7 @@
 
 #include "complain.h"
 #include "factory_test.h"
+#include "language/language.h"
 #include "pages/table.h"
 
 namespace factory_test {
@@ -86,6 +87,7 @@ int showScreens(const Options& options, ResultBook& book, const Context& context
 
 int runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
+  chooseLanguage(options.language);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   if (!options.monkey.empty()) letMonkeyPlay(options);

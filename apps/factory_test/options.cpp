@@ -10,6 +10,7 @@
 #include <system_error>
 #include <utility>
 
+#include "language/language.h"
 #include "pages/table.h"
 #include "records/commands.h"
 
@@ -31,6 +32,8 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char*) { options.headless = true; }},
     {"--device", "NAME", "play on that phone's screen, see below",
      [](Options& options, const char* value) { options.device = value; }},
+    {"--language", "CODE", "show texts in en, de, ko or ar, instead of the environment's language",
+     [](Options& options, const char* value) { options.language = value; }},
     {"--results", "FILE.json", "keep the verdicts in FILE.json, and go on from what it holds",
      [](Options& options, const char* value) { options.results = value; }},
     {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
@@ -109,6 +112,12 @@ std::string wrongMonkey(const Options& options) {
   return "--monkey and --events need numbers";
 }
 
+std::string wrongLanguage(const std::string& code) {
+  std::string error = "unknown language '" + code + "', known are:";
+  for (const std::string_view each : languages()) error.append(" ").append(each);
+  return error;
+}
+
 std::string wrongTest(const std::string& id) {
   std::string error = "unknown test '" + id + "', known are:";
   for (const TestEntry& entry : testEntries()) error.append(" ").append(entry.id);
@@ -147,6 +156,10 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
           ? isMonkeys
           : !isNumber(options.monkey) || (!options.events.empty() && !isNumber(options.events))) {
     error = wrongMonkey(options);
+    return {};
+  }
+  if (!options.language.empty() && std::ranges::count(languages(), options.language) == 0) {
+    error = wrongLanguage(options.language);
     return {};
   }
   if (!options.test.empty() && placeOf(options.test) == testEntries().size()) {

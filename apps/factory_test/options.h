@@ -13,6 +13,7 @@ struct Options {
   Action action = Action::Run;
   bool headless = false;      // draw to memory, without a window
   std::string device = {};    // the phone's screen that is played; empty: what BRIMOL_DEVICE says
+  std::string language = {};  // as chooseLanguage() takes it; empty: the environment's
   bool verbose = false;       // write the toolkit's log to stderr
   std::string test = {};      // the page of this id comes first; empty: the menu
   std::string shot = {};      // draw once, write this PNG file and end; empty: no
