@@ -7,14 +7,19 @@
 
 #include "complain.h"
 #include "layout.h"
-#include "results/junit.h"
 #include "world.h"
 
 namespace factory_test {
 
-FactoryTest::FactoryTest(ResultBook& results, const Surroundings& program, std::string reportPath)
-    : book(results), surroundings(program), junitPath(std::move(reportPath)), menu(book) {
+FactoryTest::FactoryTest(ResultBook& results, const Context& program)
+    : book(results), context(program), menu(book) {
   menu.show();
+}
+
+void FactoryTest::open(std::size_t entry, uint32_t now) {
+  menu.markEntry(entry);
+  menu.hide();
+  start(entry, now);
 }
 
 void FactoryTest::update(uint32_t now) {
@@ -52,8 +57,9 @@ void FactoryTest::updatePrompt() {
 }
 
 void FactoryTest::start(std::size_t entry, uint32_t now) {
-  surroundings.log.add(std::string("Test ") + testEntries().at(entry).id);
-  running = Running{entry, testEntries().at(entry).make(surroundings), presentTime(), now};
+  const TestEntry& chosen = testEntries()[entry];
+  context.log.add(std::string("Test ") + chosen.id);
+  running = Running{entry, chosen.make(context), presentTime(), now};
   running->test->enter();
   MW::isDisplayUpdate(1);
 }
@@ -69,7 +75,7 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
   if (outcome == Outcome::Pass) keep(*running, Verdict::Pass, now);
   if (outcome == Outcome::Fail) keep(*running, Verdict::Fail, now);
   // Looking at a test without a verdict keeps the one that it had.
-  if (outcome == Outcome::Left && book.find(testEntries().at(entry).id) == nullptr) {
+  if (outcome == Outcome::Left && book.find(testEntries()[entry].id) == nullptr) {
     keep(*running, Verdict::None, now);
   }
   running.reset();
@@ -77,17 +83,17 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
 }
 
 void FactoryTest::keep(const Running& done, Verdict verdict, uint32_t now) {
-  surroundings.log.add(std::string("Verdict ") + verdictName(verdict));
+  context.log.add(std::string("Verdict ") + verdictName(verdict));
   std::string error;
-  if (!book.record({.test = testEntries().at(done.entry).id,
+  if (!book.record({.test = testEntries()[done.entry].id,
                     .verdict = verdict,
                     .started = done.started,
                     .duration = std::chrono::milliseconds(now - done.startTicks),
-                    .screen = screenSize()},
+                    .screen = screenSize(),
+                    .values = done.test->values()},
                    error)) {
     complain(error);
   }
-  if (!junitPath.empty() && !writeJunit(junitPath, book.results(), error)) complain(error);
   menu.showVerdict(done.entry, verdict);
 }
 

@@ -9,18 +9,19 @@
 
 #include "leave_prompt.h"
 #include "menu.h"
+#include "pages/table.h"
 #include "results/results.h"
-#include "test.h"
 
 namespace factory_test {
 
 /// Used on the main thread.
 class FactoryTest {
  public:
-  /// Keeps verdicts in `results`, which outlives it, as do the surroundings. `reportPath`: the
-  /// report for a CI system; empty: none.
-  FactoryTest(ResultBook& results, const Surroundings& program, std::string reportPath);
+  /// Keeps verdicts in `results`, which outlives it, as does the context.
+  FactoryTest(ResultBook& results, const Context& program);
 
+  /// Shows a page of testEntries() in the place of the menu.
+  void open(std::size_t entry, uint32_t now);
   /// One round of the main loop, at GetTicks() milliseconds.
   void update(uint32_t now);
   /// Draws one frame.
@@ -43,8 +44,7 @@ class FactoryTest {
   void keep(const Running& done, Verdict verdict, uint32_t now);
 
   ResultBook& book;
-  const Surroundings& surroundings;
-  std::string junitPath;
+  const Context& context;
   bool ended = false;
   Menu menu;
   std::optional<Running> running;

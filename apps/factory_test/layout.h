@@ -4,7 +4,7 @@
 #include <MW/records.h>
 #include <brimol/scene.h>
 
-#include "results/test_result.h"
+#include "screen_size.h"
 
 namespace factory_test {
 

@@ -9,6 +9,9 @@
 #include "application.h"
 #include "complain.h"
 #include "options.h"
+#include "plan/plan_json.h"
+#include "records/commands.h"
+#include "task.h"
 
 namespace {
 
@@ -23,13 +26,24 @@ void printHelp() {
 int main(int count, char** arguments) {
   std::string error;
   const std::span<const char* const> all(arguments, static_cast<std::size_t>(count));
-  const auto options = factory_test::parseOptions(all.subspan(all.empty() ? 0 : 1), error);
+  const auto words = all.subspan(all.empty() ? 0 : 1);
+  if (const auto done = factory_test::runRecordsCommand(words)) return *done;
+  const auto options = factory_test::parseOptions(words, error);
   if (!options) {
     factory_test::complain(error);
     return kUsageError;
   }
   if (options->action == factory_test::Options::Action::Help) {
     printHelp();
+    return EXIT_SUCCESS;
+  }
+  const auto task = factory_test::chooseTask(*options, error);
+  if (!task) {
+    factory_test::complain(error);
+    return kUsageError;
+  }
+  if (options->action == factory_test::Options::Action::PrintPlan) {
+    std::fputs(factory_test::planJson(task->plan).c_str(), stdout);
     return EXIT_SUCCESS;
   }
   return factory_test::runApplication(*options);

@@ -8,7 +8,7 @@
 #include <string>
 
 #include "layout.h"
-#include "test.h"
+#include "pages/table.h"
 #include "verdict_bar.h"
 #include "world.h"
 
@@ -173,9 +173,13 @@ void Menu::showVerdict(std::size_t entry, Verdict verdict) {
   const auto* const look = std::ranges::find(kLooks, verdict, &VerdictLook::verdict);
   if (verdict != Verdict::None) verdicts.insert(entry);
   list.setBGColor(rowOfEntry.at(entry), look->color);
-  std::string words = rowWords(testEntries().at(entry).name);
+  std::string words = rowWords(testEntries()[entry].name);
   if (verdict != Verdict::None) words.append(": ").append(verdictName(verdict));
   list.setText(rowOfEntry.at(entry), words.c_str(), static_cast<unsigned int>(words.size()));
+}
+
+void Menu::markEntry(std::size_t entry) {
+  while (markedRow != rowOfEntry.at(entry)) followKey(MW::kKeyDown);
 }
 
 std::optional<std::size_t> Menu::takeChosen() {

@@ -28,6 +28,8 @@ class Menu {
   /// Reads the machine's figures anew when a second has passed.
   void update(uint32_t now);
   void showVerdict(std::size_t entry, Verdict verdict);
+  /// Marks an entry as keys do, before the menu is shown first.
+  void markEntry(std::size_t entry);
 
   /// The number in testEntries() of what was chosen since the last call, if anything was.
   std::optional<std::size_t> takeChosen();

@@ -4,9 +4,15 @@
 
 #include <algorithm>
 #include <array>
+#include <charconv>
 #include <cmath>
 #include <string_view>
+#include <system_error>
 #include <utility>
+
+#include "language/language.h"
+#include "pages/table.h"
+#include "records/commands.h"
 
 namespace factory_test {
 
@@ -26,16 +32,35 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char*) { options.headless = true; }},
     {"--device", "NAME", "play on that phone's screen, see below",
      [](Options& options, const char* value) { options.device = value; }},
+    {"--language", "CODE", "show texts in en, de, ko or ar, instead of the environment's language",
+     [](Options& options, const char* value) { options.language = value; }},
     {"--results", "FILE.json", "keep the verdicts in FILE.json, and go on from what it holds",
      [](Options& options, const char* value) { options.results = value; }},
     {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
      [](Options& options, const char* value) { options.junit = value; }},
+    {"--plan", "FILE.json", "test what this plan says, see docs/plans.md",
+     [](Options& options, const char* value) { options.plan = value; }},
+    {"--print-plan", nullptr, "print the plan with every field, and end",
+     [](Options& options, const char*) { options.action = Options::Action::PrintPlan; }},
     {"--log", "FILE", "show FILE in the log viewer, instead of the program's own log",
      [](Options& options, const char* value) { options.log = value; }},
     {"--shell", "CMD", "run CMD in the shell, instead of uname -a",
      [](Options& options, const char* value) { options.shell = value; }},
-    {"--shot", "FILE.png", "draw the menu, write it to FILE.png and end",
+    {"--test", "ID", "show that test first, in the place of the menu",
+     [](Options& options, const char* value) { options.test = value; }},
+    {"--shot", "FILE.png", "draw the first screen, write it to FILE.png and end",
      [](Options& options, const char* value) { options.shot = value; }},
+    {"--monkey", "SEED", "let random input use the program, in simulated time and without a window",
+     [](Options& options, const char* value) {
+       options.monkey = value;
+       options.stays = true;
+     }},
+    {"--events", "N", "so many events of it; 10000 when not given",
+     [](Options& options, const char* value) { options.events = value; }},
+    {"--monkey-trace", "FILE", "write that input as a trace; monkey-SEED.trace when not given",
+     [](Options& options, const char* value) { options.monkeyTrace = value; }},
+    {"--stay", nullptr, "show the menu again where the user leaves the program, as with --monkey",
+     [](Options& options, const char*) { options.stays = true; }},
     {"--verbose", nullptr, "write the toolkit's log to stderr",
      [](Options& options, const char*) { options.verbose = true; }},
 });
@@ -75,6 +100,30 @@ std::string wrongDevice(const std::string& name) {
   return error;
 }
 
+bool isNumber(const std::string& text) {
+  uint64_t number = 0;
+  const char* const end = text.data() + text.size();
+  const auto [stop, failure] = std::from_chars(text.data(), end, number);
+  return failure == std::errc() && stop == end;
+}
+
+std::string wrongMonkey(const Options& options) {
+  if (options.monkey.empty()) return "--events and --monkey-trace belong to --monkey";
+  return "--monkey and --events need numbers";
+}
+
+std::string wrongLanguage(const std::string& code) {
+  std::string error = "unknown language '" + code + "', known are:";
+  for (const std::string_view each : languages()) error.append(" ").append(each);
+  return error;
+}
+
+std::string wrongTest(const std::string& id) {
+  std::string error = "unknown test '" + id + "', known are:";
+  for (const TestEntry& entry : testEntries()) error.append(" ").append(entry.id);
+  return error;
+}
+
 std::string helpLine(std::string name, std::size_t columns, const std::string& meaning) {
   name.resize(std::max(columns, name.size() + 1), ' ');
   return "  " + name + meaning + "\n";
@@ -102,6 +151,21 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
     error = wrongDevice(options.device);
     return {};
   }
+  const bool isMonkeys = !options.events.empty() || !options.monkeyTrace.empty();
+  if (options.monkey.empty()
+          ? isMonkeys
+          : !isNumber(options.monkey) || (!options.events.empty() && !isNumber(options.events))) {
+    error = wrongMonkey(options);
+    return {};
+  }
+  if (!options.language.empty() && std::ranges::count(languages(), options.language) == 0) {
+    error = wrongLanguage(options.language);
+    return {};
+  }
+  if (!options.test.empty() && placeOf(options.test) == testEntries().size()) {
+    error = wrongTest(options.test);
+    return {};
+  }
   return options;
 }
 
@@ -115,6 +179,7 @@ std::string usage() {
     if (row.value != nullptr) name.append(" ").append(row.value);
     text += helpLine(std::move(name), kNameColumns, row.meaning);
   }
+  text += recordsUsage();
   text +=
       "\nEnvironment:\n"
       "  BRIMOL_DISPLAY=window|browser|headless\n"

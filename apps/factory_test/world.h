@@ -4,7 +4,7 @@
 
 #include <chrono>
 
-#include "results/machine_figures.h"
+#include "machine_figures.h"
 
 namespace factory_test {
 

@@ -20,7 +20,6 @@ struct MenuRow {
 inline constexpr MenuRow kColours = {1, 0};
 inline constexpr MenuRow kTouch = {2, 2};
 inline constexpr MenuRow kKeys = {2, 3};
-inline constexpr MenuRow kButtons = {3, 6};
 
 constexpr SKIA_Rect areaOf(const MenuRow& row) {
   constexpr int kListTop = 510;  // of MW::MainList with its extended header

@@ -42,6 +42,7 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
                               {{"--shot"}, "--shot needs"},
                               {{"--results", ""}, "--results needs"},
                               {{"--device", "wvga"}, "wvga-4.0"},
+                              {{"--test", "colour"}, "colours"},
                               {{"file"}, "'file'"},
                               {{"--results", "a", "--junit", "a"}, "same file"}}) {
     std::string error;

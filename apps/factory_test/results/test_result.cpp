@@ -1,6 +1,7 @@
 #include "results/test_result.h"
 
 #include <algorithm>
+#include <cmath>
 #include <limits>
 
 namespace factory_test {
@@ -29,6 +30,8 @@ TestResult clamped(TestResult result) {
   result.started = std::clamp(result.started, sys_seconds(), kLastSecond);
   result.duration = std::clamp(result.duration, milliseconds(0), kLongestDuration);
   result.screen = {std::max(result.screen.width, 0), std::max(result.screen.height, 0)};
+  std::erase_if(result.values, [](const Measure& each) { return !std::isfinite(each.value); });
+  result.attempt = std::max(result.attempt, 1);
   return result;
 }
 

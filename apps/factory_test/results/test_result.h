@@ -2,7 +2,11 @@
 #pragma once
 
 #include <chrono>
+#include <optional>
 #include <string>
+#include <vector>
+
+#include "screen_size.h"
 
 namespace factory_test {
 
@@ -11,11 +15,16 @@ enum class Verdict { None, Pass, Fail };
 /// The word of the files for it: "PASS", "FAIL" or "none".
 const char* verdictName(Verdict verdict);
 
-struct ScreenSize {
-  int width = 0;  // pixels, 0 or more
-  int height = 0;
+/// A value that a test delivered.
+struct Measure {
+  std::string name = {};             // "cells missed"; [a-z0-9 ], the key of limits and history
+  std::string unit = {};             // "mm", "ms", "1/s"; empty for a count
+  double value = 0;                  // finite
+  std::optional<double> least = {};  // the limits that it was judged by; none: no limit
+  std::optional<double> most = {};
 
-  bool operator==(const ScreenSize&) const = default;
+  bool isWithin() const { return (!least || value >= *least) && (!most || value <= *most); }
+  bool operator==(const Measure&) const = default;
 };
 
 struct TestResult {
@@ -24,6 +33,8 @@ struct TestResult {
   std::chrono::sys_seconds started = {};    // UTC, years 1970 to 9999
   std::chrono::milliseconds duration = {};  // 0 to INT_MAX, that is 24 days
   ScreenSize screen = {};
+  std::vector<Measure> values = {};
+  int attempt = 1;  // 1 or more
 
   bool operator==(const TestResult&) const = default;
 };

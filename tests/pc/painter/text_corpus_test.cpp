@@ -59,8 +59,8 @@ std::string anyText(Random& random) {
 Picture drawnByPango(const SKIA_Text& text, uint32_t ground) {
   const Canvas canvas(kScreen);
   canvas.fill({0, 0, kScreen.w, kScreen.h}, ground);
-  const BorrowedFonts fonts = borrowFonts();
-  const TextLayout layout(pango_layout_new(fonts->context()));
+  const BorrowedFonts fonts = borrowFonts();  // all of them, whatever the text needs
+  const TextLayout layout(pango_layout_new(fonts->contextFor("中")));
   pango_layout_set_font_description(layout.get(), projectFonts(text.size).get());
   const std::unique_ptr<char, decltype(&g_free)> valid(g_utf8_make_valid(text.text, -1), g_free);
   pango_layout_set_text(layout.get(), valid.get(), -1);

@@ -1,0 +1,68 @@
+// The display in one colour after another, to look for dead pixels and stains.
+#include <MW/key.h>
+#include <MW/screen.h>
+#include <MW/window.h>
+
+#include <memory>
+#include <optional>
+
+#include "current.h"
+#include "on_top.h"
+#include "page_test.h"
+#include "pages/table.h"
+#include "verdict_bar.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr int kColours = MW::FullScreen::kGrey + 1;
+
+/// A tap, or the right key, shows the next colour. A double tap, or the select key, ends the look,
+/// and the verdict is asked for.
+class ColourTest : public LookTest {
+ public:
+  ColourTest() : LookTest("Colours", "Look for pixels and places that differ.") {}
+
+ protected:
+  void beginLook() override {
+    colour.emplace(MW::FullScreen::kWhite).setActive(1);
+    touch.emplace();
+    touch->clickCallback = [](MW::mouse_event*) { Current<ColourTest>::get().next(); };
+    touch->doubleClickCallback = [](int) { Current<ColourTest>::get().finishLook(); };
+    touch->setActive(1);
+    key.emplace();
+    key->keyPressCallback = [](MW::kbd_event* event) {
+      Current<ColourTest>::get().followKey(event->code);
+    };
+  }
+
+  std::string question() const override { return "Was every colour even?"; }
+
+  void endLook() override {
+    key.reset();
+    touch.reset();
+    colour.reset();
+  }
+
+ private:
+  void next() { colour->setRect(++shown % kColours); }
+
+  void followKey(unsigned int code) {
+    if (code == MW::kKeyRight) next();
+    finishLookOn(code);
+    MW::isDisplayUpdate(1);
+  }
+
+  Current<ColourTest> current{this};
+  int shown = 0;  // dispatch thread
+  std::optional<MW::FullScreen> colour;
+  std::optional<OnTop<MW::Screen>> touch;
+  std::optional<OnTop<MW::Key>> key;
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makeColours(const Context&) { return std::make_unique<ColourTest>(); }
+
+}  // namespace factory_test

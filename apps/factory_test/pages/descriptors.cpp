@@ -1,0 +1,188 @@
+// A page that is nothing but data: every item and widget on it is built from a descriptor.
+#include <MW/dialog.h>
+#include <MW/widget_list.h>
+#include <MW/widget_rcui.h>
+#include <MW/window.h>
+#include <brimol/input.h>
+
+#include <algorithm>
+#include <array>
+#include <atomic>
+#include <memory>
+#include <vector>
+
+#include "current.h"
+#include "layout.h"
+#include "pages/table.h"
+#include "test.h"
+#include "verdict_bar.h"
+
+namespace factory_test {
+
+namespace {
+
+using enum MW::RcuiKind;
+
+constexpr int kShowMs = 2000;
+constexpr int kWhiteMs = 700;
+constexpr int kLineWidth = 4;  // pixels
+constexpr uint32_t kBarColor = 0xFFC8D2E0;
+constexpr std::size_t kTexts = 5;
+constexpr SKIA_Rect kNoPlace = {0, 0, 0, 0, kBarColor};  // of what places itself
+
+/// PASS, RETRY and FAIL are squares of the page itself; the select key passes, the back key leaves.
+class DescriptorTest : public Test {
+ public:
+  void enter() override {
+    MW::WidgetList::init();
+    for (const Entry& entry : kEntries) build(entry);
+  }
+
+  void leave() override {
+    built.clear();
+    MW::WidgetList::destroy();
+  }
+
+  Outcome verdict() const override { return chosen; }
+
+  void draw() override { MW::WidgetList::show(); }
+
+  void update(uint32_t now) override {
+    if (!find(kRcuiFullScreen).isActive() || now - whiteSince < kWhiteMs) return;
+    find(kRcuiFullScreen).hide();
+    MW::isDisplayUpdate(1);
+  }
+
+ private:
+  struct Entry {
+    MW::RcuiKind kind;
+    bool isShown;
+    SKIA_Rect place;  // x and w in columns of ten, y and h in per cent of the screen's height
+    const char* words;
+    MW::ref_cb_t callbacks = {};
+    std::array<const char*, kTexts> texts = {};
+  };
+
+  using Self = Current<DescriptorTest>;
+  static const std::vector<Entry> kEntries;
+
+  /// The only widget of its kind.
+  static MW::Widget& find(MW::RcuiKind kind) {
+    const auto entry = std::ranges::find(kEntries, kind, &Entry::kind);
+    return *Self::get().built.at(static_cast<std::size_t>(entry - kEntries.begin()))->getPointer();
+  }
+
+  template <Outcome outcome>
+  static void choose(int) {
+    Self::get().chosen = outcome;
+  }
+
+  static void open(MW::RcuiKind kind) {
+    find(kind).setActive(1);
+    MW::isDisplayUpdate(1);
+  }
+
+  static void whiten(int) {
+    Self::get().whiteSince = GetTicks();
+    open(kRcuiFullScreen);
+  }
+
+  static void showTimed(int) {
+    find(kRcuiToastbox).onHideTimer(kShowMs);
+    find(kRcuiProgressbar).onProgressbar(kShowMs);
+  }
+
+  // Button 1 leaves a dialog where it is.
+  static void closeDialogs(int) {
+    find(kRcuiDialog).hide();
+    find(kRcuiDialogNew).hide();
+    MW::isDisplayUpdate(1);
+  }
+
+  static void followKey(MW::kbd_event* event) {
+    if (event->code == MW::kKeyUp) showTimed(0);
+    if (event->code == MW::kKeySelect) Self::get().chosen = Outcome::Pass;
+    if (event->code == kKeyBack) Self::get().chosen = Outcome::Left;
+  }
+
+  void build(const Entry& entry) {
+    const ScreenSize screen = screenSize();
+    const auto& [left, top, columns, height, color] = entry.place;
+    constexpr int kColumnPercent = 10;
+    std::array<SKIA_Text, kTexts> texts;
+    std::ranges::transform(entry.texts, texts.begin(), [](const char* words) {
+      return captionOf(words != nullptr ? words : "", MW::kColorWhite);
+    });
+    MW::ref_t ref;
+    ref.kind = entry.kind;
+    ref.dialogKind = MW::Dialog::kRetryTest;
+    ref.visible = entry.isShown ? 1 : 0;
+    ref.cbIndex = 1;
+    ref.rect = {percentOf(screen.width, left * kColumnPercent), percentOf(screen.height, top),
+                percentOf(screen.width, columns * kColumnPercent), percentOf(screen.height, height),
+                color};
+    ref.lineWidth = kLineWidth;
+    ref.text = captionOf(entry.words, color == kBarColor ? MW::kColorBlack : MW::kColorWhite);
+    ref.desc = entry.texts.front() != nullptr ? texts.data() : nullptr;
+    built.push_back(std::make_unique<MW::WidgetRcui>(&ref, &entry.callbacks, MW::kUnused));
+    if (ref.index > 0) MW::WidgetList::show(ref.index);
+  }
+
+  Current<DescriptorTest> current{this};
+  std::atomic<Outcome> chosen = Outcome::Running;
+  std::atomic<uint32_t> whiteSince = 0;  // GetTicks() milliseconds
+  std::vector<std::unique_ptr<MW::WidgetRcui>> built;
+};
+
+// Widgets come after the pictures, dialogs last.
+const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
+    {kRcuiTextbox, true, {0, 0, 10, 100, kGroundColor}, ""},
+    {kRcuiBox, true, {0, 2, 10, 7, kTitleColor}, ""},
+    {kRcuiLabel, true, {0, 2, 10, 7, 0}, "Built from descriptors"},
+    {kRcuiLine, true, {1, 10, 9, 10, kBarColor}, ""},
+    {kRcuiFirstInColumn, true, {1, 11, 8, 4, kBarColor}, "A column of text boxes:"},
+    {kRcuiNextInColumn, true, kNoPlace, "each stands below the one before,"},
+    {kRcuiNextInColumn, true, kNoPlace, "wherever its own rectangle is."},
+    {kRcuiButton, true, {1, 25, 3, 9, kBarColor}, "Toast", {.cbClick = showTimed}},
+    {kRcuiButton, true, {6, 25, 3, 9, kBarColor}, "White", {.cbClick = whiten}},
+    {kRcuiButton,
+     true,
+     {1, 35, 3, 9, kBarColor},
+     "Dialog",
+     {.cbClick = [](int) { open(kRcuiDialog); }}},
+    {kRcuiButton,
+     true,
+     {6, 35, 3, 9, kBarColor},
+     "Words",
+     {.cbClick = [](int) { open(kRcuiDialogNew); }}},
+    {kRcuiSlideFromLeft,
+     true,
+     {1, 46, 8, 6, kBarColor},
+     "Slide to pass",
+     {.cbTouchRelease = choose<Outcome::Pass>}},
+    {kRcuiSlideFromRight,
+     true,
+     {1, 53, 8, 6, kBarColor},
+     "Slide to leave",
+     {.cbTouchRelease = choose<Outcome::Left>}},
+    {kRcuiButton3Left, true, kNoPlace, "PASS", {.cbClick = choose<Outcome::Pass>}},
+    {kRcuiButton3Centre, true, kNoPlace, "RETRY", {.cbClick = choose<Outcome::Retry>}},
+    {kRcuiButton3Right, true, kNoPlace, "FAIL", {.cbClick = choose<Outcome::Fail>}},
+    {kRcuiToastbox, false, {1, 60, 8, 8, kTitleColor}, "A toast", {}, {"with a second line"}},
+    {kRcuiProgressbar, false, {1, 70, 8, 5, kTitleColor}, "Two seconds"},
+    {kRcuiKey, true, {}, "", {.cbKeyPress = followKey}},
+    {kRcuiDialog, false, {}, "", {.cbTouchRelease = closeDialogs}},
+    {kRcuiDialogNew,
+     false,
+     {},
+     "Words of its own",
+     {.cbTouchRelease = closeDialogs},
+     {"from a descriptor", "in two lines", "", "OK", ""}},
+    {kRcuiFullScreen, false, {}, ""},
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makeDescriptors(const Context&) { return std::make_unique<DescriptorTest>(); }
+
+}  // namespace factory_test

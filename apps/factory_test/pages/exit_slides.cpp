@@ -1,0 +1,63 @@
+// Slides that end something once their knob has come to the other end.
+#include <MW/slide_e.h>
+
+#include <memory>
+#include <optional>
+
+#include "current.h"
+#include "layout.h"
+#include "page_test.h"
+#include "pages/table.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr uint32_t kBarColor = 0xFFC8D2E0;
+
+/// One slide passes the test, the other leaves it.
+class ExitSlideTest : public PageTest {
+ public:
+  ExitSlideTest()
+      : PageTest("Exit slides",
+                 "Drag a knob to the other end:\nthe upper one passes, the lower leaves.") {}
+
+  void enter() override {
+    page.ask();
+    place(passing, 38, MW::SlideE::kFromLeft, "Slide to pass");
+    place(leaving, 56, MW::SlideE::kFromRight, "Slide to leave");
+    passing->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Pass; };
+    leaving->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Left; };
+  }
+
+  void leave() override {
+    leaving.reset();
+    passing.reset();
+    page.endAsking();
+  }
+
+  Outcome verdict() const override {
+    const Outcome slid = ended;
+    return slid != Outcome::Running ? slid : PageTest::verdict();
+  }
+
+ private:
+  static void place(std::optional<MW::SlideE>& slide, int top, MW::SlideE::State state,
+                    const char* words) {
+    const SKIA_Rect area = rowOf(screenSize(), top, 10, kBarColor);
+    const SKIA_Text caption = captionOf(words);
+    slide.emplace(state, &area, &caption, "");
+    slide->setActive(1);
+  }
+
+  Current<ExitSlideTest> current{this};
+  std::atomic<Outcome> ended = Outcome::Running;
+  std::optional<MW::SlideE> passing;
+  std::optional<MW::SlideE> leaving;
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makeExitSlides(const Context&) { return std::make_unique<ExitSlideTest>(); }
+
+}  // namespace factory_test

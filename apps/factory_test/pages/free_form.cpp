@@ -1,0 +1,92 @@
+// Dialogs whose words the application gives.
+#include <MW/dialog_new.h>
+#include <MW/dialog_slide.h>
+
+#include <array>
+#include <memory>
+#include <string>
+
+#include "current.h"
+#include "page_test.h"
+#include "pages/table.h"
+
+namespace factory_test {
+
+namespace {
+
+/// A touch, too, shows the next dialog.
+class FreeFormTest : public StepTest {
+ public:
+  FreeFormTest() : StepTest("Free-form dialogs", "Touch for the next dialog.") {}
+
+ protected:
+  std::string question() const override { return "Did all dialogs look right?"; }
+  int lastStep() const override { return static_cast<int>(kSteps.size()) - 1; }
+
+  void showStep(int step) override {
+    dialog.reset();
+    (this->*kSteps.at(static_cast<std::size_t>(step)))();
+    dialog->setActive(1);
+    page.say(("Dialog " + std::to_string(step + 1)).c_str());
+  }
+
+  void endLook() override { dialog.reset(); }
+
+ private:
+  static FreeFormTest& self() { return Current<FreeFormTest>::get(); }
+  static void next(MW::mouse_event*) { self().move(1); }
+  static void follow(MW::kbd_event* event) { self().followKey(event->code); }
+
+  MW::DialogNew& put(const char* title) {
+    auto made = std::make_unique<MW::DialogNew>(title, SKIA_ALIGN_CENTRE,
+                                                static_cast<int>(MW::kColorHighlight));
+    made->clickCallback = next;
+    made->keyPressCallback = follow;
+    MW::DialogNew& kept = *made;
+    dialog = std::move(made);
+    return kept;
+  }
+
+  void putWords() { put("Words alone").setDesc("One line", nullptr, nullptr); }
+
+  void putOneButton() {
+    MW::DialogNew& made = put("One button");
+    made.setDesc("Two lines,", "one above the other", nullptr);
+    made.setbutton("OK", nullptr);
+  }
+
+  void putTwoButtons() {
+    MW::DialogNew& made = put("Two buttons");
+    made.setDesc("Three lines", "in the middle", "of the dialog", SKIA_ALIGN_CENTRE);
+    made.setbutton("YES", "NO");
+  }
+
+  void putProgress() {
+    MW::DialogNew& made = put("Progress");
+    made.setDesc("Something goes on", nullptr, nullptr);
+    made.setProgress(MW::kUnused);
+  }
+
+  void putSlide() {
+    auto made = std::make_unique<MW::DialogSlide>(MW::DialogSlide::kRepeatPassedTest);
+    made->leftCallback = [](int) { self().move(1); };
+    made->rightCallback = [](int) { self().move(1); };
+    made->keyPressCallback = follow;
+    dialog = std::move(made);
+  }
+
+  using Put = void (FreeFormTest::*)();
+  static constexpr std::array<Put, 5> kSteps = {
+      &FreeFormTest::putWords,    &FreeFormTest::putOneButton, &FreeFormTest::putTwoButtons,
+      &FreeFormTest::putProgress, &FreeFormTest::putSlide,
+  };
+
+  Current<FreeFormTest> current{this};
+  std::unique_ptr<MW::Widget> dialog;
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makeFreeForm(const Context&) { return std::make_unique<FreeFormTest>(); }
+
+}  // namespace factory_test

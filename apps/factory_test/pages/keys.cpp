@@ -1,0 +1,104 @@
+// Every key once, and one of them twice and three times in a row.
+#include <MW/key.h>
+#include <MW/primitives.h>
+#include <brimol/input.h>
+
+#include <algorithm>
+#include <array>
+#include <atomic>
+#include <memory>
+#include <optional>
+
+#include "current.h"
+#include "layout.h"
+#include "page_test.h"
+#include "pages/table.h"
+#include "verdict_bar.h"
+
+namespace factory_test {
+
+namespace {
+
+struct KeyName {
+  unsigned int code;
+  const char* name;
+};
+
+// What is asked for; the last two are no keys.
+constexpr unsigned int kTwice = 1;
+constexpr unsigned int kThreeTimes = 2;
+constexpr auto kAsked = std::to_array<KeyName>({
+    {MW::kKeyUp, "Up"},
+    {MW::kKeyDown, "Down"},
+    {MW::kKeyLeft, "Left"},
+    {MW::kKeyRight, "Right"},
+    {MW::kKeySelect, "Select"},
+    {MW::kKeyHook, "Hook"},
+    {BRIMOL_CODE_VOLUME_UP, "Volume up"},
+    {BRIMOL_CODE_VOLUME_DOWN, "Volume down"},
+    {BRIMOL_CODE_POWER, "Power"},
+    {BRIMOL_CODE_HOME, "Home"},
+    {kTwice, "Twice"},
+    {kThreeTimes, "Three times"},
+});
+
+/// All that was asked for passes by itself. The back key three times in a row fails.
+class KeyTest : public PageTest {
+ public:
+  KeyTest()
+      : PageTest("Keys",
+                 "Press every key once, one key twice\nand one three times in a row.\n"
+                 "Back three times: FAIL.") {}
+
+  void enter() override {
+    page.ask(VerdictBar::Keys::Free);
+    key.emplace();
+    key->keyPressCallback = [](MW::kbd_event* event) { Current<KeyTest>::get().mark(event->code); };
+    key->doubleKeyCallback = [](MW::kbd_event*) { Current<KeyTest>::get().mark(kTwice); };
+    key->tripleKeyCallback = [](MW::kbd_event* event) {
+      if (event->code == kKeyBack) Current<KeyTest>::get().failed = true;
+      Current<KeyTest>::get().mark(kThreeTimes);
+    };
+  }
+
+  void leave() override {
+    key.reset();
+    page.endAsking();
+  }
+
+  Outcome verdict() const override {
+    const bool isDone = std::ranges::all_of(pressed, [](const auto& each) { return each.load(); });
+    if (isDone) return Outcome::Pass;
+    return failed ? Outcome::Fail : page.outcome();
+  }
+
+  void draw() override {
+    page.draw();
+    for (std::size_t i = 0; i < kAsked.size(); ++i) drawKey(static_cast<int>(i), pressed.at(i));
+  }
+
+ private:
+  void mark(unsigned int code) {
+    const auto* const row = std::ranges::find(kAsked, code, &KeyName::code);
+    if (row == kAsked.end()) return;
+    pressed.at(static_cast<std::size_t>(row - kAsked.begin())) = true;
+    page.say(row->name);
+  }
+
+  static void drawKey(int index, bool isPressed) {
+    const ScreenSize screen = screenSize();
+    skia_add_textbox_c(cellOf(screen, kKeyGrid, index, isPressed ? kPassColor : kButtonColor),
+                       captionOf(kAsked.at(static_cast<std::size_t>(index)).name));
+  }
+
+  Current<KeyTest> current{this};
+  std::atomic<bool> failed = false;
+  std::array<std::atomic<bool>, kAsked.size()> pressed = {};
+  std::optional<MW::Key> key;
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makeKeys(const Context&) { return std::make_unique<KeyTest>(); }
+
+}  // namespace factory_test

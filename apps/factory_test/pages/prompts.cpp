@@ -1,0 +1,49 @@
+// Every built-in dialog, one after another.
+#include <MW/dialog.h>
+
+#include <memory>
+#include <optional>
+#include <string>
+
+#include "current.h"
+#include "page_test.h"
+#include "pages/table.h"
+
+namespace factory_test {
+
+namespace {
+
+/// A touch, too, shows the next kind, and the right button ends the look.
+class PromptTest : public StepTest {
+ public:
+  PromptTest() : StepTest("Prompts", "Touch for the next dialog;\nthe right button ends.") {}
+
+ protected:
+  std::string question() const override { return "Did all dialogs look right?"; }
+  int lastStep() const override { return MW::Dialog::kLeaveLightSensor; }
+
+  void showStep(int kind) override {
+    dialog.reset();
+    MW::Dialog& made = dialog.emplace(kind);
+    made.clickCallback = [](MW::mouse_event*) { Current<PromptTest>::get().move(1); };
+    made.button2Callback = [](int) { Current<PromptTest>::get().finishLook(); };
+    made.hookKeyCallback = [](int) { Current<PromptTest>::get().move(1); };
+    made.keyPressCallback = [](MW::kbd_event* event) {
+      Current<PromptTest>::get().followKey(event->code);
+    };
+    made.setActive(1);
+    page.say(("Dialog of kind " + std::to_string(kind)).c_str());
+  }
+
+  void endLook() override { dialog.reset(); }
+
+ private:
+  Current<PromptTest> current{this};
+  std::optional<MW::Dialog> dialog;
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makePrompts(const Context&) { return std::make_unique<PromptTest>(); }
+
+}  // namespace factory_test

@@ -1,0 +1,103 @@
+// A console that shows what a command writes, as it writes it.
+#include <MW/dialog_shell.h>
+#include <MW/window.h>
+
+#include <algorithm>
+#include <memory>
+#include <optional>
+#include <string>
+
+#include "command.h"
+#include "current.h"
+#include "page_test.h"
+#include "pages/table.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr std::size_t kLongestLine = 60;   // bytes: what fits the dialog
+constexpr std::size_t kCharacterRest = 3;  // bytes of a character behind its first
+
+/// Runs the command of --shell. OK and the keys select and back end the look, and the command.
+class ShellTest : public LookTest {
+ public:
+  explicit ShellTest(const Context& program)
+      : LookTest("Shell", "A command and what it writes."), line(program.shellCommand) {}
+
+ protected:
+  void beginLook() override {
+    shell.emplace(line.c_str());
+    shell->button1Callback = [](int) { Current<ShellTest>::get().finishLook(); };
+    shell->keyPressCallback = [](MW::kbd_event* event) {
+      Current<ShellTest>::get().finishLookOn(event->code);
+    };
+    shell->setActive(1);
+    command.emplace(line);
+  }
+
+  void endLook() override {
+    command.reset();
+    shell.reset();
+  }
+
+  void updateLook() override {
+    if (!command) return;
+    const std::string bytes = command->read();
+    std::ranges::for_each(bytes, [this](char byte) { take(byte); });
+    if (const auto outcome = command->outcome()) {
+      endLine();
+      pending = "[" + *outcome + "]";
+      endLine();
+      command.reset();
+    }
+    if (!bytes.empty() || !command) MW::isDisplayUpdate(1);
+  }
+
+  std::string question() const override { return "Did the command do its work?"; }
+
+ private:
+  void take(char byte) {
+    constexpr char kTab = '\t';
+    if (byte == '\n') {
+      shell->addShell(pending.c_str());
+      pending.clear();
+      return;
+    }
+    if (pending.size() >= kLongestLine + (isInsideCharacter(byte) ? kCharacterRest : 0)) endLine();
+    if (byte == kTab) byte = ' ';
+    if (!isControl(byte)) pending += byte;
+  }
+
+  void endLine() {
+    if (pending.empty()) return;
+    shell->addShell(pending.c_str());
+    pending.clear();
+  }
+
+  // Of UTF-8: all bytes of a character but the first.
+  static bool isInsideCharacter(char byte) {
+    constexpr unsigned int kMask = 0xC0;
+    constexpr unsigned int kFollowing = 0x80;
+    return (static_cast<unsigned char>(byte) & kMask) == kFollowing;
+  }
+
+  static bool isControl(char byte) {
+    constexpr char kDelete = 0x7F;
+    return (byte >= 0 && byte < ' ') || byte == kDelete;
+  }
+
+  Current<ShellTest> current{this};
+  std::string line;     // for /bin/sh
+  std::string pending;  // what the command has written of its last line
+  std::optional<MW::DialogShell> shell;
+  std::optional<Command> command;
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makeShell(const Context& context) {
+  return std::make_unique<ShellTest>(context);
+}
+
+}  // namespace factory_test

@@ -1,0 +1,86 @@
+// The touch panel: where it is touched, and how.
+#include <MW/key.h>
+#include <MW/screen.h>
+
+#include <array>
+#include <atomic>
+#include <cstdio>
+#include <memory>
+#include <optional>
+
+#include "current.h"
+#include "layout.h"
+#include "page_test.h"
+#include "pages/table.h"
+#include "verdict_bar.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr uint32_t kCross = 0xFFE8C040;
+constexpr int kCrossWidth = 3;  // pixels
+
+/// Shows the coordinates of every touch, with a cross through the last one. A double tap, or the
+/// select key, ends the look, and the verdict is asked for.
+class TouchTest : public LookTest {
+ public:
+  TouchTest() : LookTest("Touch", "Touch and drag everywhere.\nTap twice in one place to end.") {}
+
+  void draw() override {
+    page.drawGround();
+    if (x >= 0) drawCross();
+    page.drawFront();
+  }
+
+ protected:
+  void beginLook() override {
+    touch.emplace();
+    touch->pressCallback = [](MW::mouse_event* mouse) { self().tell("Press", *mouse); };
+    touch->hoverCallback = [](MW::mouse_event* mouse) { self().tell("Move", *mouse); };
+    touch->clickCallback = [](MW::mouse_event* mouse) { self().tell("Lift", *mouse); };
+    touch->longPressCallback = [](MW::mouse_event* mouse) { self().tell("Long press", *mouse); };
+    touch->doubleClickCallback = [](int) { self().finishLook(); };
+    touch->setActive(1);
+    key.emplace().keyPressCallback = [](MW::kbd_event* event) { self().finishLookOn(event->code); };
+  }
+
+  std::string question() const override { return "Double tap. Was every touch met?"; }
+
+  void endLook() override {
+    key.reset();
+    touch.reset();
+  }
+
+ private:
+  static TouchTest& self() { return Current<TouchTest>::get(); }
+
+  void drawCross() const {
+    const ScreenSize screen = screenSize();
+    const int atX = x;
+    const int atY = y;
+    skia_add_line_c({atX, 0, atX, screen.height, kCross, kCrossWidth});
+    skia_add_line_c({0, atY, screen.width, atY, kCross, kCrossWidth});
+  }
+
+  void tell(const char* what, const MW::mouse_event& mouse) {
+    x = mouse.x;
+    y = mouse.y;
+    std::array<char, SKIA_TEXT_BYTES> words{};
+    std::snprintf(words.data(), words.size(), "%s: finger %u at %d, %d", what, mouse.finger,
+                  mouse.x, mouse.y);
+    page.say(words.data());
+  }
+
+  Current<TouchTest> current{this};
+  std::atomic<int> x = -1;  // pixels; -1: not touched yet
+  std::atomic<int> y = -1;
+  std::optional<MW::Screen> touch;
+  std::optional<MW::Key> key;
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makeTouch(const Context&) { return std::make_unique<TouchTest>(); }
+
+}  // namespace factory_test
