@@ -20,6 +20,8 @@
 #include "factory_test.h"
 #include "language/language.h"
 #include "pages/table.h"
+#include "run_start.h"
+#include "task.h"
 
 namespace factory_test {
 
@@ -92,11 +94,9 @@ int runApplication(const Options& options) {
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   if (!options.monkey.empty()) letMonkeyPlay(options);
   std::string error;
-  RunStart run;
-  for (const TestEntry& each : testEntries()) {
-    if (each.plan == DefaultPlan::In) run.tests.emplace_back(each.id);
-  }
-  auto book = ResultBook::open({.json = options.results, .junit = options.junit}, run, error);
+  const auto task = chooseTask(options, error);
+  if (!task) return fail(error);
+  auto book = ResultBook::open(keepingOf(options), runStartOf(options, task->plan), error);
   if (!book) return fail(error);
   Context context = {*book, log, {}, options.shell};
   if (!options.log.empty()) {
@@ -110,6 +110,10 @@ int runApplication(const Options& options) {
   const int result =
       started ? showScreens(options, *book, context) : fail("no memory for the dispatch thread");
   MW::Window::destroy();
+  const auto line = book->lineStatus();
+  if (line && !line->error.empty()) {
+    complain(std::to_string(line->waiting) + " verdicts wait for the line: " + line->error);
+  }
   return result;
 }
 

@@ -13,6 +13,7 @@
 #include "language/language.h"
 #include "pages/table.h"
 #include "records/commands.h"
+#include "run_start.h"
 
 namespace factory_test {
 
@@ -38,6 +39,16 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char* value) { options.results = value; }},
     {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
      [](Options& options, const char* value) { options.junit = value; }},
+    {"--database", "FILE", "keep all runs in FILE, and go on with the unit's aborted one",
+     [](Options& options, const char* value) { options.database = value; }},
+    {"--new-run", nullptr, "begin a new run even so",
+     [](Options& options, const char*) { options.newRun = true; }},
+    {"--line", "postgresql://...", "send the database's runs there, too",
+     [](Options& options, const char* value) { options.line = value; }},
+    {"--serial", "SERIAL", "the unit's serial number, instead of the property ro.serialno",
+     [](Options& options, const char* value) { options.serial = value; }},
+    {"--operator", "NAME", "who tests",
+     [](Options& options, const char* value) { options.operatorName = value; }},
     {"--plan", "FILE.json", "test what this plan says, see docs/plans.md",
      [](Options& options, const char* value) { options.plan = value; }},
     {"--print-plan", nullptr, "print the plan with every field, and end",
@@ -147,6 +158,8 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
     error = "--results and --junit name the same file";
     return {};
   }
+  error = wrongRecords(options);
+  if (!error.empty()) return {};
   if (!options.device.empty() && brimol_device_named(options.device.c_str()) == nullptr) {
     error = wrongDevice(options.device);
     return {};
