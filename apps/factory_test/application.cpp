@@ -18,6 +18,7 @@
 
 #include "complain.h"
 #include "factory_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -61,7 +62,7 @@ std::optional<std::string> readText(const std::string& path, std::string& error)
 }
 
 int showScreens(const Options& options, ResultBook& book, const Context& context) {
-  FactoryTest test(book, context, options.junit);
+  FactoryTest test(book, context);
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
@@ -79,7 +80,11 @@ int runApplication(const Options& options) {
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   std::string error;
-  auto book = ResultBook::open(options.results, error);
+  RunStart run;
+  for (const TestEntry& each : testEntries()) {
+    if (each.plan == DefaultPlan::In) run.tests.emplace_back(each.id);
+  }
+  auto book = ResultBook::open({.json = options.results, .junit = options.junit}, run, error);
   if (!book) return fail(error);
   Context context = {*book, log, {}, options.shell};
   if (!options.log.empty()) {

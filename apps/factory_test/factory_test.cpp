@@ -7,13 +7,12 @@
 
 #include "complain.h"
 #include "layout.h"
-#include "results/junit.h"
 #include "world.h"
 
 namespace factory_test {
 
-FactoryTest::FactoryTest(ResultBook& results, const Context& program, std::string reportPath)
-    : book(results), context(program), junitPath(std::move(reportPath)), menu(book) {
+FactoryTest::FactoryTest(ResultBook& results, const Context& program)
+    : book(results), context(program), menu(book) {
   menu.show();
 }
 
@@ -95,7 +94,6 @@ void FactoryTest::keep(const Running& done, Verdict verdict, uint32_t now) {
                    error)) {
     complain(error);
   }
-  if (!junitPath.empty() && !writeJunit(junitPath, book.results(), error)) complain(error);
   menu.showVerdict(done.entry, verdict);
 }
 

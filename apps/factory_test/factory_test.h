@@ -17,9 +17,8 @@ namespace factory_test {
 /// Used on the main thread.
 class FactoryTest {
  public:
-  /// Keeps verdicts in `results`, which outlives it, as does the context. `reportPath`: the
-  /// report for a CI system; empty: none.
-  FactoryTest(ResultBook& results, const Context& program, std::string reportPath);
+  /// Keeps verdicts in `results`, which outlives it, as does the context.
+  FactoryTest(ResultBook& results, const Context& program);
 
   /// Shows a page of testEntries() in the place of the menu.
   void open(std::size_t entry, uint32_t now);
@@ -46,7 +45,6 @@ class FactoryTest {
 
   ResultBook& book;
   const Context& context;
-  std::string junitPath;
   bool ended = false;
   Menu menu;
   std::optional<Running> running;

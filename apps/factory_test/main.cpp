@@ -9,6 +9,8 @@
 #include "application.h"
 #include "complain.h"
 #include "options.h"
+#include "plan/plan_json.h"
+#include "task.h"
 
 namespace {
 
@@ -30,6 +32,15 @@ int main(int count, char** arguments) {
   }
   if (options->action == factory_test::Options::Action::Help) {
     printHelp();
+    return EXIT_SUCCESS;
+  }
+  const auto task = factory_test::chooseTask(*options, error);
+  if (!task) {
+    factory_test::complain(error);
+    return kUsageError;
+  }
+  if (options->action == factory_test::Options::Action::PrintPlan) {
+    std::fputs(factory_test::planJson(task->plan).c_str(), stdout);
     return EXIT_SUCCESS;
   }
   return factory_test::runApplication(*options);
