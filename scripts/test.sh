@@ -7,7 +7,7 @@ usage() {
   cat <<'END'
 Usage: scripts/test.sh [--quick | --all | SUITE...] [--repeat N]
 
-Without an argument: phone, tidy, asan, tsan, i386 and release.
+Without an argument: phone, tidy, asan, tsan, fuzz, i386 and release.
 
   --quick     the unit tests in release, and tidy for what changed since main
   --all       every suite
@@ -19,6 +19,7 @@ Suites:
   asan        the same under the address, leak and undefined behaviour sanitizers, by GCC
   asan-clang  the same, by Clang
   tsan        the same under the thread sanitizer
+  fuzz        the fuzzers, a few seconds each
   race        whether the thread sanitizer finds a lock that is taken out
   phone       the library alone, without the PC platform
   i386        the library and its unit tests for 32-bit x86
@@ -62,7 +63,7 @@ run_suite() {
       build release --target unit_tests
       run_tests release --label-regex unit
       ;;
-    release | asan | asan-clang | tsan)
+    release | asan | asan-clang | tsan | fuzz)
       build "$1"
       run_tests "$1"
       ;;
@@ -84,18 +85,18 @@ while (($# > 0)); do
   case $1 in
     --help) usage; exit ;;
     --quick) suites+=(unit tidy-changed) ;;
-    --all) suites+=(phone tidy asan asan-clang tsan race i386 arm64 armhf release) ;;
+    --all) suites+=(phone tidy asan asan-clang tsan fuzz race i386 arm64 armhf release) ;;
     --repeat)
       [[ ${2:-} =~ ^[1-9][0-9]{0,5}$ ]] || fail_usage "--repeat needs a number of times"
       repeat=$2
       shift
       ;;
-    release | asan | asan-clang | tsan | race | phone | i386 | arm64 | armhf | tidy) suites+=("$1") ;;
+    release | asan | asan-clang | tsan | fuzz | race | phone | i386 | arm64 | armhf | tidy) suites+=("$1") ;;
     *) fail_usage "unknown suite or option '$1'" ;;
   esac
   shift
 done
-((${#suites[@]} > 0)) || suites=(phone tidy asan tsan i386 release)
+((${#suites[@]} > 0)) || suites=(phone tidy asan tsan fuzz i386 release)
 
 scripts/install_packages.sh
 for suite in "${suites[@]}"; do

@@ -1,6 +1,6 @@
 # Another architecture's build, by Clang, with the packages that scripts/foreign_root.sh unpacked.
-# Included by <architecture>.cmake, which sets BRIMOL_TRIPLE, BRIMOL_LOADER and, unless this machine runs
-# its programs itself, BRIMOL_EMULATOR.
+# Included by <architecture>.cmake, which sets BRIMOL_ARCHITECTURE, BRIMOL_TRIPLE, and either BRIMOL_EMULATOR or,
+# where this machine runs the programs itself, BRIMOL_LOADER.
 
 cmake_path(SET root NORMALIZE "${CMAKE_CURRENT_LIST_DIR}/../../build/roots/${BRIMOL_ARCHITECTURE}")
 set(CMAKE_SYSTEM_NAME Linux)
@@ -20,9 +20,8 @@ set(CMAKE_SHARED_LINKER_FLAGS_INIT "-fuse-ld=lld")
 if(BRIMOL_EMULATOR)
   set(CMAKE_CROSSCOMPILING_EMULATOR ${BRIMOL_EMULATOR} -L "${root}")
 else()
-  # The loader and the libraries of the folder, not those of this machine.
-  string(CONCAT folders "${root}/lib/${BRIMOL_TRIPLE}:${root}/usr/lib/${BRIMOL_TRIPLE}:"
-                        "${root}/usr/lib/${BRIMOL_TRIPLE}/android")
-  string(APPEND CMAKE_EXE_LINKER_FLAGS_INIT
-         " -Wl,--disable-new-dtags -Wl,--dynamic-linker=${root}${BRIMOL_LOADER} -Wl,-rpath,${folders}")
+  # The libraries of the folder, not those of this machine.
+  string(CONCAT libraries "${root}/lib/${BRIMOL_TRIPLE}:${root}/usr/lib/${BRIMOL_TRIPLE}:"
+                          "${root}/usr/lib/${BRIMOL_TRIPLE}/android")
+  set(CMAKE_CROSSCOMPILING_EMULATOR "${root}${BRIMOL_LOADER}" --library-path "${libraries}")
 endif()
