@@ -22,6 +22,6 @@ if(BRIMOL_EMULATOR)
 else()
   # The libraries of the folder, not those of this machine.
   string(CONCAT libraries "${root}/lib/${BRIMOL_TRIPLE}:${root}/usr/lib/${BRIMOL_TRIPLE}:"
-                          "${root}/usr/lib/${BRIMOL_TRIPLE}/android")
+                          "${root}/usr/lib/${BRIMOL_TRIPLE}/android:${root}/usr/lib/p7zip")
   set(CMAKE_CROSSCOMPILING_EMULATOR "${root}${BRIMOL_LOADER}" --library-path "${libraries}")
 endif()
