@@ -8,6 +8,8 @@
 
 namespace factory_test {
 
+struct RunProgress;
+
 /// What became of a test so far.
 enum class Outcome { Running, Pass, Fail, Retry, Left };
 
@@ -17,12 +19,16 @@ class Test {
  public:
   virtual ~Test() = default;
 
+  /// How far the run had come before; asked for by a page that shows it.
+  virtual void showProgress(const RunProgress&) {}
   /// Puts the test's widgets on the screen.
   virtual void enter() = 0;
   /// Takes them off again. No callback runs any more when it returns.
   virtual void leave() = 0;
-  /// Anything but Running ends the test.
+  /// Anything but Running ends the test, unless it is taken back.
   virtual Outcome verdict() const = 0;
+  /// A PASS was not taken: the test goes on.
+  virtual void takeBack() {}
 
   /// What it measured so far; asked for at the verdict, after leave().
   virtual std::vector<Measure> values() const { return {}; }
@@ -31,6 +37,8 @@ class Test {
 
   /// Draws what stands under the window's widgets.
   virtual void draw() = 0;
+  /// Draws what stands over them.
+  virtual void drawOver() {}
   /// Comes in every round of the main loop, at GetTicks() milliseconds.
   virtual void update(uint32_t now) { static_cast<void>(now); }
 };
