@@ -52,9 +52,12 @@ int32_t Arguments::number() {
 char* Arguments::text() {
   const std::string given = bytes();
   if (given.empty() && byte() % kNullEvery == 1) return nullptr;
-  const std::shared_ptr<char[]> block(new char[given.size() + 1]);  // NOLINT(*-avoid-c-arrays)
-  *std::ranges::copy(given, block.get()).out = '\0';
-  return keep(std::shared_ptr<char>(block, block.get()));
+  const std::size_t size = given.size() + 1;
+  auto* const block = static_cast<char*>(memory.allocate(size, 1));
+  *std::ranges::copy(given, block).out = '\0';
+  const auto release = [from = &memory, size](char* bytes) { from->deallocate(bytes, size, 1); };
+  return keep(
+      std::shared_ptr<char>(block, release, std::pmr::polymorphic_allocator<char>(&memory)));
 }
 
 SKIA_Rect Arguments::record(const SKIA_Rect*) {

@@ -146,6 +146,7 @@ void getDpi(float* xdpi, float* ydpi) {
 // NOLINTNEXTLINE(readability-identifier-naming): the parameters are named as in the contract
 int property_get(const char* key, char* value, const char* default_value) {
   const std::lock_guard guard(platform().lock);
+  if (!platform().hasProperties) return -1;
   const auto found = platform().properties.find(key);
   const std::string text = found != platform().properties.end() ? found->second : default_value;
   const std::size_t length = text.copy(value, BRIMOL_PROPERTY_BYTES - 1);
@@ -155,6 +156,7 @@ int property_get(const char* key, char* value, const char* default_value) {
 
 int property_set(const char* key, const char* value) {
   const std::lock_guard guard(platform().lock);
+  if (!platform().hasProperties) return -1;
   platform().properties.insert_or_assign(key, value);
   return 0;
 }

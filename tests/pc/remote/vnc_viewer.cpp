@@ -1,6 +1,7 @@
 #include "pc/remote/vnc_viewer.h"
 
 #include <arpa/inet.h>
+#include <poll.h>
 #include <sys/socket.h>
 #include <stdexcept>
 
@@ -12,7 +13,13 @@ namespace brimol::test {
 namespace {
 
 constexpr unsigned kPatienceUs = 30'000'000;
+constexpr int kEndPatienceMs = 60'000;
 char tag = 0;  // its address finds the viewer in LibVNCClient's record
+
+bool seesEnd(int connection) {
+  pollfd end = {connection, POLLRDHUP, 0};
+  return poll(&end, 1, kEndPatienceMs) == 1;
+}
 
 }  // namespace
 
@@ -57,6 +64,8 @@ void VncViewer::sendRaw(std::string_view bytes) {
   WriteToRFBServer(client, bytes.data(), static_cast<unsigned>(bytes.size()));
 }
 
+bool VncViewer::waitForEnd() const { return seesEnd(client->sock); }
+
 pc::Socket rawConnection(int port, std::string_view bytes) {
   pc::Socket connection(socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0));
   sockaddr_in server = {};
@@ -77,5 +86,7 @@ std::string readLine(const pc::Socket& connection) {
     line += next;
   return line;
 }
+
+bool waitForEnd(const pc::Socket& connection) { return seesEnd(connection.get()); }
 
 }  // namespace brimol::test

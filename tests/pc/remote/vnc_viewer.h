@@ -32,6 +32,8 @@ class VncViewer {
   void mouse(int buttons, int x, int y) { SendPointerEvent(client, x, y, buttons); }
   void key(uint32_t symbol, bool isDown) { SendKeyEvent(client, symbol, isDown ? TRUE : FALSE); }
   void sendRaw(std::string_view bytes);
+  /// See below.
+  bool waitForEnd() const;
 
  private:
   rfbClient* client;
@@ -43,5 +45,7 @@ class VncViewer {
 pc::Socket rawConnection(int port, std::string_view bytes);
 /// Waits for the other side's bytes up to a line's end, or to its end.
 std::string readLine(const pc::Socket& connection);
+/// Waits until the other side ends the connection, and reads nothing. False: it does not.
+bool waitForEnd(const pc::Socket& connection);
 
 }  // namespace brimol::test
