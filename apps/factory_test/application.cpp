@@ -18,6 +18,7 @@
 
 #include "complain.h"
 #include "factory_test.h"
+#include "language/language.h"
 #include "pages/table.h"
 
 namespace factory_test {
@@ -37,8 +38,8 @@ int fail(const std::string& why) {
   return EXIT_FAILURE;
 }
 
-void loop(FactoryTest& test) {
-  while (!test.isEnded() && brimol_host_close_requested() == 0 && interrupted == 0) {
+void loop(FactoryTest& test, bool stays) {
+  while ((stays || !test.isEnded()) && brimol_host_close_requested() == 0 && interrupted == 0) {
     test.update(GetTicks());
     if (MW::isDisplayUpdate(0) == 1) test.draw();
     MW::Window::updateTimer(MW::kUnused);
@@ -61,12 +62,21 @@ std::optional<std::string> readText(const std::string& path, std::string& error)
   return {};
 }
 
+void letMonkeyPlay(const Options& options) {
+  const std::string events = options.events.empty() ? "" : ":" + options.events;
+  const std::string trace =
+      options.monkeyTrace.empty() ? "monkey-" + options.monkey + ".trace" : options.monkeyTrace;
+  setenv("BRIMOL_MONKEY", (options.monkey + events).c_str(), 1);
+  setenv("BRIMOL_RECORD", trace.c_str(), 1);
+  setenv("BRIMOL_DISPLAY", "headless", 1);
+}
+
 int showScreens(const Options& options, ResultBook& book, const Context& context) {
   FactoryTest test(book, context);
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
-    loop(test);
+    loop(test, options.stays);
     return EXIT_SUCCESS;
   }
   if (brimol_host_screenshot(options.shot.c_str()) == 0) return fail(brimol_host_error());
@@ -77,8 +87,10 @@ int showScreens(const Options& options, ResultBook& book, const Context& context
 
 int runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
+  chooseLanguage(options.language);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
+  if (!options.monkey.empty()) letMonkeyPlay(options);
   std::string error;
   RunStart run;
   for (const TestEntry& each : testEntries()) {

@@ -4,11 +4,15 @@
 
 #include <algorithm>
 #include <array>
+#include <charconv>
 #include <cmath>
 #include <string_view>
+#include <system_error>
 #include <utility>
 
+#include "language/language.h"
 #include "pages/table.h"
+#include "records/commands.h"
 
 namespace factory_test {
 
@@ -28,6 +32,8 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char*) { options.headless = true; }},
     {"--device", "NAME", "play on that phone's screen, see below",
      [](Options& options, const char* value) { options.device = value; }},
+    {"--language", "CODE", "show texts in en, de, ko or ar, instead of the environment's language",
+     [](Options& options, const char* value) { options.language = value; }},
     {"--results", "FILE.json", "keep the verdicts in FILE.json, and go on from what it holds",
      [](Options& options, const char* value) { options.results = value; }},
     {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
@@ -44,6 +50,17 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char* value) { options.test = value; }},
     {"--shot", "FILE.png", "draw the first screen, write it to FILE.png and end",
      [](Options& options, const char* value) { options.shot = value; }},
+    {"--monkey", "SEED", "let random input use the program, in simulated time and without a window",
+     [](Options& options, const char* value) {
+       options.monkey = value;
+       options.stays = true;
+     }},
+    {"--events", "N", "so many events of it; 10000 when not given",
+     [](Options& options, const char* value) { options.events = value; }},
+    {"--monkey-trace", "FILE", "write that input as a trace; monkey-SEED.trace when not given",
+     [](Options& options, const char* value) { options.monkeyTrace = value; }},
+    {"--stay", nullptr, "show the menu again where the user leaves the program, as with --monkey",
+     [](Options& options, const char*) { options.stays = true; }},
     {"--verbose", nullptr, "write the toolkit's log to stderr",
      [](Options& options, const char*) { options.verbose = true; }},
 });
@@ -83,6 +100,24 @@ std::string wrongDevice(const std::string& name) {
   return error;
 }
 
+bool isNumber(const std::string& text) {
+  uint64_t number = 0;
+  const char* const end = text.data() + text.size();
+  const auto [stop, failure] = std::from_chars(text.data(), end, number);
+  return failure == std::errc() && stop == end;
+}
+
+std::string wrongMonkey(const Options& options) {
+  if (options.monkey.empty()) return "--events and --monkey-trace belong to --monkey";
+  return "--monkey and --events need numbers";
+}
+
+std::string wrongLanguage(const std::string& code) {
+  std::string error = "unknown language '" + code + "', known are:";
+  for (const std::string_view each : languages()) error.append(" ").append(each);
+  return error;
+}
+
 std::string wrongTest(const std::string& id) {
   std::string error = "unknown test '" + id + "', known are:";
   for (const TestEntry& entry : testEntries()) error.append(" ").append(entry.id);
@@ -116,6 +151,17 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
     error = wrongDevice(options.device);
     return {};
   }
+  const bool isMonkeys = !options.events.empty() || !options.monkeyTrace.empty();
+  if (options.monkey.empty()
+          ? isMonkeys
+          : !isNumber(options.monkey) || (!options.events.empty() && !isNumber(options.events))) {
+    error = wrongMonkey(options);
+    return {};
+  }
+  if (!options.language.empty() && std::ranges::count(languages(), options.language) == 0) {
+    error = wrongLanguage(options.language);
+    return {};
+  }
   if (!options.test.empty() && placeOf(options.test) == testEntries().size()) {
     error = wrongTest(options.test);
     return {};
@@ -133,6 +179,7 @@ std::string usage() {
     if (row.value != nullptr) name.append(" ").append(row.value);
     text += helpLine(std::move(name), kNameColumns, row.meaning);
   }
+  text += recordsUsage();
   text +=
       "\nEnvironment:\n"
       "  BRIMOL_DISPLAY=window|browser|headless\n"

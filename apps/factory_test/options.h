@@ -13,6 +13,7 @@ struct Options {
   Action action = Action::Run;
   bool headless = false;      // draw to memory, without a window
   std::string device = {};    // the phone's screen that is played; empty: what BRIMOL_DEVICE says
+  std::string language = {};  // as chooseLanguage() takes it; empty: the environment's
   bool verbose = false;       // write the toolkit's log to stderr
   std::string test = {};      // the page of this id comes first; empty: the menu
   std::string shot = {};      // draw once, write this PNG file and end; empty: no
@@ -22,6 +23,10 @@ struct Options {
   bool run = false;           // perform the plan from its first step to its last, without a menu
   std::string simulate = {};  // failures to rehearse; empty: none
   std::string log = {};       // the file that the log viewer shows; empty: the program's own log
+  std::string monkey = {};    // the seed of random input; empty: none
+  std::string events = {};    // how many of it; empty: as the platform says
+  std::string monkeyTrace = {};    // where it is written; empty: beside the caller
+  bool stays = false;              // the user cannot end it
   std::string shell = "uname -a";  // what the shell runs, for /bin/sh
 };
 
