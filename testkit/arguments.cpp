@@ -87,7 +87,7 @@ SKIA_Text Arguments::record(const SKIA_Text*) {
 }
 
 Event Arguments::record(const Event*) {
-  constexpr auto kTypes = std::to_array<BrimolEventType>(
+  constexpr auto kTypes = std::to_array<uint8_t>(
       {BRIMOL_POINTER_DOWN, BRIMOL_POINTER_MOTION, BRIMOL_POINTER_UP, BRIMOL_LONG_PRESS,
        BRIMOL_KEY_DOWN, BRIMOL_KEY_UP, BRIMOL_USER_EVENT});
   constexpr std::size_t kReadBytes = 12;
@@ -99,7 +99,9 @@ Event Arguments::record(const Event*) {
 }
 
 MW::mouse_event Arguments::record(const MW::mouse_event*) {
-  MW::mouse_event taken = {.state = byte(), .finger = unsignedNumber()};
+  MW::mouse_event taken = {};
+  taken.state = byte();
+  taken.finger = unsignedNumber();
   for (int32_t* const each : {&taken.x, &taken.y, &taken.xrel, &taken.yrel}) *each = number();
   return taken;
 }

@@ -32,9 +32,7 @@ TEST_F(LiveWindowTest, AFloodKeepsItsOrderAndGivesItsMemoryBack) {
   ProbeWidget widget;
   widget.onEvent = [&next](MW::event_data* event, auto) {
     const auto number = static_cast<unsigned int>(event->mouse.x | event->mouse.y << 16);
-    EXPECT_EQ(number, next);
-    EXPECT_EQ(event->mouse.finger, number % kFingers);
-    ++next;
+    if (number == next && event->mouse.finger == number % kFingers) ++next;
     return true;
   };
   widget.enter();
@@ -43,7 +41,8 @@ TEST_F(LiveWindowTest, AFloodKeepsItsOrderAndGivesItsMemoryBack) {
   for (unsigned int number = 0; number < kEvents; ++number) platform().feed(numbered(number));
   platform().turns.give(platform().ticks);
   EXPECT_GT(allocatedBytes(), before + kEvents * sizeof(MW::event_data));
-  while (next < kEvents && !HasFailure()) dispatcher->threadLoop();
+  for (unsigned int round = 0; round < kEvents; ++round) dispatcher->threadLoop();
+  EXPECT_EQ(next, kEvents);
   EXPECT_EQ(Window::getEventService()->recvEvent(), nullptr);
   EXPECT_LE(platform().paused, kEvents) << "more than a millisecond an event";
   EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 16));
@@ -60,11 +59,12 @@ TEST_F(WidgetTest, AThousandStartsAndEndsLeaveNothing) {
     EXPECT_EQ(Window::init(), 1);
     Window::destroy();
   };
+  const std::ptrdiff_t threadsBefore = threads();
   startAndEnd();
   const std::size_t before = allocatedBytes();
-  const std::ptrdiff_t threadsBefore = threads();
   for (int i = 0; i < 1000; ++i) startAndEnd();
-  EXPECT_EQ(threads(), threadsBefore);
+  // The last ones have done their work; the system may still take them down.
+  while (threads() > threadsBefore) std::this_thread::yield();
   EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 16));
   EXPECT_EQ(platform().inits, platform().quits);
 }

@@ -183,21 +183,17 @@ TEST_F(ServedScreen, BearsBrokenViewers) {
   }
 }
 
-// A viewer has five seconds to prove the password, whatever it sends meanwhile, and twenty to read
-// something of what waits. Each ends by itself, and this test with them.
+// A connection has five seconds to make its request and to prove the password, whatever it has sent
+// of them. Each is ended, and this test with them.
 TEST_F(ServedScreen, DropsWhoIsSlow) {
   VncViewer good(vncPort, password);
-  VncViewer stopped(vncPort, password);
-  ASSERT_TRUE(good.isConnected() && stopped.isConnected());
+  ASSERT_TRUE(good.isConnected());
   const Socket silent = rawConnection(vncPort, "");
   const Socket half = rawConnection(vncPort, "RFB 003.008\n\2");
   const Socket asking = rawConnection(webPort, "GET / HTTP/1.1\r\nHost: localhost\r\nA: ");
-  showNoise({0, 0, 400, 400});
-  for (int count = 0; count < 100; ++count) stopped.sendRaw("\3\0\0\0\0\0\1\220\1\220"s);
   for (const Socket* const slow : {&silent, &half, &asking}) EXPECT_TRUE(test::waitForEnd(*slow));
-  EXPECT_TRUE(stopped.waitForEnd());
   show(kOrange, {0, 0, 10, 10});
-  EXPECT_TRUE(good.waitForPixel(5, 5, kOrange));
+  EXPECT_TRUE(good.waitForPixel(5, 5, kOrange)) << "another one was dropped";
 }
 
 }  // namespace

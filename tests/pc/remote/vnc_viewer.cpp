@@ -16,11 +16,6 @@ constexpr unsigned kPatienceUs = 30'000'000;
 constexpr int kEndPatienceMs = 60'000;
 char tag = 0;  // its address finds the viewer in LibVNCClient's record
 
-bool seesEnd(int connection) {
-  pollfd end = {connection, POLLRDHUP, 0};
-  return poll(&end, 1, kEndPatienceMs) == 1;
-}
-
 }  // namespace
 
 VncViewer::VncViewer(int port, std::string password)
@@ -64,8 +59,6 @@ void VncViewer::sendRaw(std::string_view bytes) {
   WriteToRFBServer(client, bytes.data(), static_cast<unsigned>(bytes.size()));
 }
 
-bool VncViewer::waitForEnd() const { return seesEnd(client->sock); }
-
 pc::Socket rawConnection(int port, std::string_view bytes) {
   pc::Socket connection(socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0));
   sockaddr_in server = {};
@@ -87,6 +80,9 @@ std::string readLine(const pc::Socket& connection) {
   return line;
 }
 
-bool waitForEnd(const pc::Socket& connection) { return seesEnd(connection.get()); }
+bool waitForEnd(const pc::Socket& connection) {
+  pollfd end = {connection.get(), POLLRDHUP, 0};
+  return poll(&end, 1, kEndPatienceMs) == 1;
+}
 
 }  // namespace brimol::test

@@ -32,8 +32,6 @@ class VncViewer {
   void mouse(int buttons, int x, int y) { SendPointerEvent(client, x, y, buttons); }
   void key(uint32_t symbol, bool isDown) { SendKeyEvent(client, symbol, isDown ? TRUE : FALSE); }
   void sendRaw(std::string_view bytes);
-  /// See below.
-  bool waitForEnd() const;
 
  private:
   rfbClient* client;
