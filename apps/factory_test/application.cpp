@@ -18,6 +18,7 @@
 
 #include "complain.h"
 #include "factory_test.h"
+#include "task.h"
 #include "pages/table.h"
 
 namespace factory_test {
@@ -25,6 +26,7 @@ namespace factory_test {
 namespace {
 
 constexpr unsigned int kLoopMs = 5;
+constexpr int kUsageError = 2;
 
 volatile std::sig_atomic_t interrupted = 0;
 
@@ -80,13 +82,18 @@ int runApplication(const Options& options) {
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   std::string error;
+  const auto task = chooseTask(options, error);
+  if (!task) {
+    complain(error);
+    return kUsageError;
+  }
   RunStart run;
   for (const TestEntry& each : testEntries()) {
     if (each.plan == DefaultPlan::In) run.tests.emplace_back(each.id);
   }
   auto book = ResultBook::open({.json = options.results, .junit = options.junit}, run, error);
   if (!book) return fail(error);
-  Context context = {*book, log, {}, options.shell};
+  Context context = {*book, log, {}, options.shell, task->plan};
   if (!options.log.empty()) {
     context.logText = readText(options.log, error);
     if (!context.logText) return fail(error);

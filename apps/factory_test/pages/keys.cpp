@@ -8,11 +8,15 @@
 #include <atomic>
 #include <memory>
 #include <optional>
+#include <string>
+#include <vector>
 
 #include "current.h"
+#include "key_bounce.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
+#include "plan/catalog.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -41,6 +45,7 @@ constexpr auto kAsked = std::to_array<KeyName>({
     {kTwice, "Twice"},
     {kThreeTimes, "Three times"},
 });
+constexpr auto kKeys = static_cast<std::ptrdiff_t>(kAsked.size()) - 2;
 
 /// All that was asked for passes by itself. The back key three times in a row fails.
 class KeyTest : public PageTest {
@@ -53,7 +58,12 @@ class KeyTest : public PageTest {
   void enter() override {
     page.ask(VerdictBar::Keys::Free);
     key.emplace();
-    key->keyPressCallback = [](MW::kbd_event* event) { Current<KeyTest>::get().mark(event->code); };
+    key->keyPressCallback = [](MW::kbd_event* event) {
+      Current<KeyTest>::get().press(event->code);
+    };
+    key->keyReleaseCallback = [](MW::kbd_event* event) {
+      Current<KeyTest>::get().bounce.release(event->code, GetTicks());
+    };
     key->doubleKeyCallback = [](MW::kbd_event*) { Current<KeyTest>::get().mark(kTwice); };
     key->tripleKeyCallback = [](MW::kbd_event* event) {
       if (event->code == kKeyBack) Current<KeyTest>::get().failed = true;
@@ -77,7 +87,22 @@ class KeyTest : public PageTest {
     for (std::size_t i = 0; i < kAsked.size(); ++i) drawKey(static_cast<int>(i), pressed.at(i));
   }
 
+  std::vector<Measure> values() const override {
+    const auto seen = std::count(pressed.begin(), pressed.begin() + kKeys, true);
+    return {measured("keys", "keys seen", static_cast<double>(seen)),
+            measured("keys", "bounces", bounce.count()),
+            measured("keys", "longest bounce", bounce.longestMs())};
+  }
+
  private:
+  void press(unsigned int code) {
+    const int before = bounce.count();
+    bounce.press(code, GetTicks());
+    mark(code);
+    if (bounce.count() == before) return;
+    page.say(("Bounce, " + std::to_string(bounce.longestMs()) + " ms at most").c_str());
+  }
+
   void mark(unsigned int code) {
     const auto* const row = std::ranges::find(kAsked, code, &KeyName::code);
     if (row == kAsked.end()) return;
@@ -94,6 +119,7 @@ class KeyTest : public PageTest {
   Current<KeyTest> current{this};
   std::atomic<bool> failed = false;
   std::array<std::atomic<bool>, kAsked.size()> pressed = {};
+  KeyBounce bounce;  // dispatch thread; main thread after leave()
   std::optional<MW::Key> key;
 };
 

@@ -72,12 +72,13 @@ const TestKind& testKind(std::string_view test) {
 }
 
 Measure measured(std::string_view test, std::string_view name, double value) {
+  constexpr double kParts = 100;
   const auto kinds = testKind(test).values;
   const auto kind = std::ranges::find(kinds, name, &ValueKind::name);
   assert(kind != kinds.end());
   return {.name = std::string(name),
           .unit = std::string(kind->unit),
-          .value = std::isfinite(value) ? value : 0};
+          .value = std::isfinite(value) ? std::round(value * kParts) / kParts : 0};
 }
 
 }  // namespace factory_test

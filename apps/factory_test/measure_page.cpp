@@ -1,0 +1,127 @@
+#include "measure_page.h"
+
+#include <MW/window.h>
+#include <brimol/display.h>
+#include <brimol/input.h>
+
+#include <algorithm>
+#include <cmath>
+#include <sstream>
+
+#include "layout.h"
+#include "results/measure_text.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr uint32_t kStillMs = 2000;
+constexpr double kStillMm = 2;
+constexpr int kLinePercent = 4;  // of the screen's longer side, from one line to the next
+
+}  // namespace
+
+MeasurePage::MeasurePage(const Context& program, const char* test, const char* title,
+                         const char* usualWords)
+    : LookTest(title, ""), step(stepOf(program, test)) {
+  instructions = step.text.empty() ? usualWords : step.text;
+}
+
+std::string MeasurePage::question() const {
+  return isDone() ? "Done. Is it right?" : "Not everything was seen.";
+}
+
+int MeasurePage::wordsAt() const {
+  constexpr int kMiddle = 40;
+  return kMiddle;
+}
+
+Measure MeasurePage::measure(std::string_view name, double value) const {
+  Measure measure = measured(step.test, name, value);
+  const auto limits = step.limits.find(measure.name);
+  if (limits != step.limits.end()) {
+    measure.least = limits->second.least;
+    measure.most = limits->second.most;
+  }
+  return measure;
+}
+
+double MeasurePage::millimetres(double pixels) {
+  constexpr double kInch = 25.4;
+  float across = 0;
+  float down = 0;
+  getDpi(&across, &down);
+  return across > 0 ? pixels * kInch / across : 0;
+}
+
+void MeasurePage::updateLook() {
+  const uint32_t now = GetTicks();
+  for (const Input& input : watch->take()) {
+    if (input.kind == Input::Kind::KeyPress && input.key == kKeyBack) finishLook();
+    if (isOfAnOldTouch(input)) continue;
+    followStill(input);
+    follow(input);
+    MW::isDisplayUpdate(1);
+  }
+  updateAt(now);
+  if (still && now - still->since >= kStillMs) finishLook();
+  if (!isDone()) return;
+  if (isForEyes()) {
+    finishLook();
+  } else {
+    hasPassed = true;
+  }
+}
+
+// The finger that chose this page may still be down.
+bool MeasurePage::isOfAnOldTouch(const Input& input) const {
+  using enum Input::Kind;
+  return (input.kind == Move || input.kind == Lift) && !fingers.contains(input.finger);
+}
+
+void MeasurePage::followStill(const Input& input) {
+  using enum Input::Kind;
+  if (input.kind == Press) fingers.insert(input.finger);
+  if (input.kind == Lift) fingers.erase(input.finger);
+  if (input.kind == Press && fingers.size() == 1) {
+    still = {input.finger, input.x, input.y, input.ticks};
+  } else if (still && !(input.kind == Move && isWhereItWas(input))) {
+    still.reset();
+  }
+}
+
+bool MeasurePage::isWhereItWas(const Input& input) const {
+  return millimetres(std::hypot(input.x - still->x, input.y - still->y)) <= kStillMm;
+}
+
+std::vector<std::string> MeasurePage::lines() const {
+  std::vector<std::string> words;
+  std::istringstream text(instructions);
+  for (std::string line; std::getline(text, line);) words.push_back(line);
+  words.emplace_back("Hold a finger still, or Back: end.");
+  for (const Measure& each : values()) words.push_back(each.name + ": " + measureText(each));
+  return words;
+}
+
+void MeasurePage::drawWords(const std::vector<std::string>& words) const {
+  const ScreenSize screen = screenSize();
+  const int height = percentOf(std::max(screen.width, screen.height), kLinePercent);
+  int top = percentOf(screen.height, wordsAt());
+  for (const std::string& each : words) {
+    skia_add_label_c({0, top, screen.width, height, 0},
+                     textOf(each.c_str(), MW::kColorWhite, SKIA_ALIGN_CENTRE, textSize(screen)));
+    top += height;
+  }
+}
+
+void MeasurePage::draw() {
+  if (page.isAsking()) {
+    page.draw();
+    drawWords(lines());
+    return;
+  }
+  drawLook();
+  if (hasWords()) drawWords(lines());
+}
+
+}  // namespace factory_test
