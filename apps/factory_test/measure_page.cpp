@@ -65,7 +65,7 @@ void MeasurePage::updateLook() {
   }
   updateAt(now);
   if (still && now - still->since >= kStillMs) finishLook();
-  if (!isDone()) return;
+  if (!isDone() || (waitsForLift() && !fingers.empty())) return;
   if (isForEyes()) {
     finishLook();
   } else {

@@ -37,6 +37,8 @@ class MeasurePage : public LookTest {
   /// Where the words stand, in per cent of the screen's height; whether they are there.
   virtual int wordsAt() const;
   virtual bool hasWords() const { return true; }
+  /// Whether it goes on while a finger is down, which would move the menu that comes next.
+  virtual bool waitsForLift() const { return true; }
   /// Whether only the operator can say if what was seen is right: he is asked then.
   virtual bool isForEyes() const { return false; }
   std::string question() const override;

@@ -41,6 +41,8 @@ class StuckTouchPage : public MeasurePage {
 
   bool isDone() const override { return began && secondsLeft <= 0; }
 
+  bool waitsForLift() const override { return false; }
+
   void drawLook() override {
     const ScreenSize screen = screenSize();
     skia_add_box_c({0, 0, screen.width, screen.height, kGroundColor});
