@@ -15,9 +15,11 @@
 #include <sstream>
 #include <string>
 #include <utility>
+#include <vector>
 
 #include "complain.h"
 #include "factory_test.h"
+#include "pages/table.h"
 
 namespace factory_test {
 
@@ -28,12 +30,35 @@ constexpr unsigned int kLoopMs = 5;
 volatile std::sig_atomic_t interrupted = 0;
 
 void endOnSignals() {
-  for (const int number : {SIGINT, SIGTERM}) std::signal(number, [](int) { interrupted = 1; });
+  for (const int number : {SIGINT, SIGTERM, SIGHUP}) std::signal(number, [](int) { interrupted = 1; });
 }
 
-int fail(const std::string& why) {
+ExitCode fail(const std::string& why) {
   complain(why);
-  return EXIT_FAILURE;
+  return ExitCode::Trouble;
+}
+
+// The tests that the exit code counts.
+std::vector<const char*> testsOf(const Options& options) {
+  std::vector<const char*> tests;
+  for (const TestEntry& entry : testEntries()) {
+    const bool isAsked = options.test == entry.id;
+    if (options.test.empty() ? entry.plan == DefaultPlan::In : isAsked) tests.push_back(entry.id);
+  }
+  return tests;
+}
+
+std::string wrongScreen() {
+  constexpr int kLeastShort = 320;  // pixels
+  constexpr int kLeastLong = 480;
+  constexpr int kMostRatio = 3;
+  int width = 0;
+  int height = 0;
+  brimol_host_screen_size(&width, &height);
+  const auto [shorter, longer] = std::minmax(width, height);
+  if (shorter >= kLeastShort && longer >= kLeastLong && longer <= kMostRatio * shorter) return {};
+  return "the screen of " + std::to_string(width) + "x" + std::to_string(height) +
+         " pixels has no room for the pages: at least 320x480, and no side three times the other";
 }
 
 void loop(FactoryTest& test) {
@@ -60,21 +85,21 @@ std::optional<std::string> readText(const std::string& path, std::string& error)
   return {};
 }
 
-int showScreens(const Options& options, ResultBook& book, const Context& context) {
+ExitCode showScreens(const Options& options, ResultBook& book, const Context& context) {
   FactoryTest test(book, context, options.junit);
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
     loop(test);
-    return EXIT_SUCCESS;
+    return judgeRun(book, testsOf(options));
   }
   if (brimol_host_screenshot(options.shot.c_str()) == 0) return fail(brimol_host_error());
-  return EXIT_SUCCESS;
+  return ExitCode::Passed;
 }
 
 }  // namespace
 
-int runApplication(const Options& options) {
+ExitCode runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
@@ -86,11 +111,12 @@ int runApplication(const Options& options) {
     context.logText = readText(options.log, error);
     if (!context.logText) return fail(error);
   }
-  if (brimol_host_open() == 0) return EXIT_FAILURE;
+  if (brimol_host_open() == 0) return ExitCode::Trouble;
+  if (const std::string wrong = wrongScreen(); !wrong.empty()) return fail(wrong);
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;
-  const int result =
+  const ExitCode result =
       started ? showScreens(options, *book, context) : fail("no memory for the dispatch thread");
   MW::Window::destroy();
   return result;

@@ -9,10 +9,9 @@
 #include "application.h"
 #include "complain.h"
 #include "options.h"
+#include "version.h"
 
 namespace {
-
-constexpr int kUsageError = 2;
 
 void printHelp() {
   std::printf("%s\nOn a PC:\n%s", factory_test::usage().c_str(), brimol_host_help());
@@ -26,11 +25,15 @@ int main(int count, char** arguments) {
   const auto options = factory_test::parseOptions(all.subspan(all.empty() ? 0 : 1), error);
   if (!options) {
     factory_test::complain(error);
-    return kUsageError;
+    return static_cast<int>(factory_test::ExitCode::WrongUse);
   }
   if (options->action == factory_test::Options::Action::Help) {
     printHelp();
     return EXIT_SUCCESS;
   }
-  return factory_test::runApplication(*options);
+  if (options->action == factory_test::Options::Action::Version) {
+    std::printf("factory_test %s\n", factory_test::kVersion);
+    return EXIT_SUCCESS;
+  }
+  return static_cast<int>(factory_test::runApplication(*options));
 }

@@ -8,7 +8,7 @@
 namespace factory_test {
 
 struct Options {
-  enum class Action { Run, Help };
+  enum class Action { Run, Help, Version };
 
   Action action = Action::Run;
   bool headless = false;     // draw to memory, without a window
@@ -28,7 +28,7 @@ using Arguments = std::span<const char* const>;
 /// `arguments` does not hold the program's name.
 std::optional<Options> parseOptions(Arguments arguments, std::string& error);
 
-/// What --help prints, a line for each option, without the keys of the host.
+/// What --help prints: options, exit codes, environment, devices; without the keys of the host.
 std::string usage();
 
 }  // namespace factory_test
