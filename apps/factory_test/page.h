@@ -13,7 +13,7 @@ namespace factory_test {
 /// the verdicts. Hold it before the test's own widgets: the verdicts then go after them.
 class Page {
  public:
-  /// Instructions may have several lines.
+  /// Instructions begin with what to do, and may have two lines.
   Page(const char* title, const char* instructions);
 
   /// On the main thread, before the window's widgets are drawn: all of it, or in two steps.
@@ -30,10 +30,15 @@ class Page {
   void endAsking() { bar.reset(); }
   /// What was chosen; Running while nothing was, or was not asked for.
   Outcome outcome() const { return bar ? bar->outcome() : Outcome::Running; }
+  /// Nothing was chosen.
+  void takeBack() {
+    if (bar) bar->takeBack();
+  }
 
  private:
   MW::Box ground;
-  MW::Textbox titleBar;
+  MW::Box head;
+  MW::Label titleText;
   MW::Label hint;
   MW::Textbox line;
   std::optional<VerdictBar> bar;

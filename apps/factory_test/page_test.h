@@ -14,6 +14,7 @@ namespace factory_test {
 class PageTest : public Test {
  public:
   Outcome verdict() const override { return page.outcome(); }
+  void takeBack() override { page.takeBack(); }
   void draw() override { page.draw(); }
 
  protected:

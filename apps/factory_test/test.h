@@ -21,8 +21,10 @@ class Test {
   virtual void enter() = 0;
   /// Takes them off again. No callback runs any more when it returns.
   virtual void leave() = 0;
-  /// Anything but Running ends the test.
+  /// Anything but Running ends the test, unless it is taken back.
   virtual Outcome verdict() const = 0;
+  /// A PASS was not taken: the test goes on.
+  virtual void takeBack() {}
 
   /// What it measured so far; asked for at the verdict, after leave().
   virtual std::vector<Measure> values() const { return {}; }
