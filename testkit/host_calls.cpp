@@ -33,7 +33,7 @@ int brimol_host_screenshot(const char* path) {
   return writePicture(paint(frame, {platform().width, platform().height}), path) ? 1 : 0;
 }
 
-int64_t brimol_host_utc_ms() { return platform().utcMs + GetTicks(); }
+int64_t brimol_host_utc_ms() { return platform().utcMs + (GetTicks() - brimol::test::clockBase()); }
 uint32_t brimol_host_random() { return platform().random++; }
 
 int brimol_host_figure(const char* name, const char*, char* value, int bytes) {

@@ -4,8 +4,12 @@
 #include <brimol/display.h>
 #include <brimol/frame.h>
 #include <brimol/properties.h>
+#include <brimol3_widget_test/failure.h>
 
+#include <charconv>
 #include <chrono>
+#include <cstdlib>
+#include <cstring>
 #include <new>
 
 namespace brimol::test {
@@ -46,12 +50,23 @@ int draw(Call call, const SKIA_Rect& rect, const SKIA_Text& text = {}, const SKI
 
 RecordingPlatform& platform() { return thePlatform; }
 
+unsigned int clockBase() {
+  const char* const wanted = std::getenv("BRIMOL_TEST_CLOCK");
+  if (wanted == nullptr) return 0;
+  unsigned int base = 0;
+  const char* const end = wanted + std::strlen(wanted);
+  const auto [stop, problem] = std::from_chars(wanted, end, base);
+  if (problem == std::errc() && stop == end) return base;
+  throw Failure(Here::now(),
+                std::string("BRIMOL_TEST_CLOCK: no number of milliseconds: ") + wanted);
+}
+
 void RecordingPlatform::reset() {
   __android_log_set_logger(receiveLog);
   __android_log_set_minimum_priority(ANDROID_LOG_VERBOSE);
   const std::lock_guard guard(lock);
   static_cast<PlatformState&>(*this) = {};
-  ticks = 0;
+  ticks = clockBase();
   testThread = std::this_thread::get_id();
 }
 

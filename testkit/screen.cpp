@@ -49,7 +49,7 @@ void expectSame(const std::string& what, uint32_t expected, uint32_t actual, con
 Screen::Screen(ScreenSize size, Loop applicationsLoop, float dpi)
     : screen(size), loop(std::move(applicationsLoop)), fingers(kFingers, Spot{0, 0}) {
   platform().reset();
-  platform().ticks = kStartTicks;
+  platform().ticks = startTicks();
   platform().width = MW::Window::width = size.width;
   platform().height = MW::Window::height = size.height;
   platform().xdpi = platform().ydpi = dpi;

@@ -6,6 +6,7 @@
 #include <brimol/input.h>
 
 #include <algorithm>
+#include <array>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
@@ -15,7 +16,6 @@
 #include <sstream>
 #include <string>
 #include <utility>
-#include <vector>
 
 #include "complain.h"
 #include "factory_test.h"
@@ -30,7 +30,8 @@ constexpr unsigned int kLoopMs = 5;
 volatile std::sig_atomic_t interrupted = 0;
 
 void endOnSignals() {
-  for (const int number : {SIGINT, SIGTERM, SIGHUP}) std::signal(number, [](int) { interrupted = 1; });
+  for (const int number : {SIGINT, SIGTERM, SIGHUP})
+    std::signal(number, [](int) { interrupted = 1; });
 }
 
 ExitCode fail(const std::string& why) {
@@ -38,14 +39,10 @@ ExitCode fail(const std::string& why) {
   return ExitCode::Trouble;
 }
 
-// The tests that the exit code counts.
-std::vector<const char*> testsOf(const Options& options) {
-  std::vector<const char*> tests;
-  for (const TestEntry& entry : testEntries()) {
-    const bool isAsked = options.test == entry.id;
-    if (options.test.empty() ? entry.plan == DefaultPlan::In : isAsked) tests.push_back(entry.id);
-  }
-  return tests;
+// What the exit code tells of.
+ExitCode judge(const Options& options, const ResultBook& book) {
+  if (options.test.empty()) return judgeRun(book, book.run().tests);
+  return judgeRun(book, std::array{options.test});
 }
 
 std::string wrongScreen() {
@@ -86,12 +83,12 @@ std::optional<std::string> readText(const std::string& path, std::string& error)
 }
 
 ExitCode showScreens(const Options& options, ResultBook& book, const Context& context) {
-  FactoryTest test(book, context, options.junit);
+  FactoryTest test(book, context);
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
     loop(test);
-    return judgeRun(book, testsOf(options));
+    return judge(options, book);
   }
   if (brimol_host_screenshot(options.shot.c_str()) == 0) return fail(brimol_host_error());
   return ExitCode::Passed;
@@ -104,7 +101,11 @@ ExitCode runApplication(const Options& options) {
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   std::string error;
-  auto book = ResultBook::open(options.results, error);
+  RunStart run;
+  for (const TestEntry& each : testEntries()) {
+    if (each.plan == DefaultPlan::In) run.tests.emplace_back(each.id);
+  }
+  auto book = ResultBook::open({.json = options.results, .junit = options.junit}, run, error);
   if (!book) return fail(error);
   Context context = {*book, log, {}, options.shell};
   if (!options.log.empty()) {

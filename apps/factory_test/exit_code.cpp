@@ -20,19 +20,20 @@ constexpr auto kRows = std::to_array<ExitRow>({
 
 std::span<const ExitRow> exitRows() { return kRows; }
 
-ExitCode judgeRun(const ResultBook& book, std::span<const char* const> tests) {
+ExitCode judgeRun(const ResultBook& book, std::span<const std::string> tests) {
   const bool isKept = std::ranges::all_of(
       book.results(), [&](const TestResult& result) { return book.isSaved(result.test); });
   if (!isKept) return ExitCode::NotSaved;
-  const auto has = [&](const char* test, Verdict verdict) {
+  const auto has = [&](const std::string& test, Verdict verdict) {
     const TestResult* const result = book.find(test);
     return result != nullptr && result->verdict == verdict;
   };
-  if (std::ranges::any_of(tests, [&](auto* test) { return has(test, Verdict::Fail); })) {
+  if (std::ranges::any_of(tests,
+                          [&](const std::string& test) { return has(test, Verdict::Fail); })) {
     return ExitCode::Failed;
   }
   const bool isDone =
-      std::ranges::all_of(tests, [&](auto* test) { return has(test, Verdict::Pass); });
+      std::ranges::all_of(tests, [&](const std::string& test) { return has(test, Verdict::Pass); });
   return isDone ? ExitCode::Passed : ExitCode::Incomplete;
 }
 

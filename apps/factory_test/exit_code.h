@@ -2,6 +2,7 @@
 #pragma once
 
 #include <span>
+#include <string>
 
 #include "results/results.h"
 
@@ -19,6 +20,6 @@ std::span<const ExitRow> exitRows();
 
 /// What became of the tests of these ids. What is worst for a line wins: a result that is not kept,
 /// then a FAIL, then a test without a verdict.
-ExitCode judgeRun(const ResultBook& book, std::span<const char* const> tests);
+ExitCode judgeRun(const ResultBook& book, std::span<const std::string> tests);
 
 }  // namespace factory_test

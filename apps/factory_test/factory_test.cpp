@@ -7,13 +7,13 @@
 
 #include "complain.h"
 #include "layout.h"
-#include "results/junit.h"
+#include "run_progress.h"
 #include "world.h"
 
 namespace factory_test {
 
-FactoryTest::FactoryTest(ResultBook& results, const Context& program, std::string reportPath)
-    : book(results), context(program), junitPath(std::move(reportPath)), menu(book) {
+FactoryTest::FactoryTest(ResultBook& results, const Context& program)
+    : book(results), context(program), menu(book) {
   menu.show();
 }
 
@@ -25,7 +25,7 @@ void FactoryTest::open(std::size_t entry, uint32_t now) {
 
 void FactoryTest::update(uint32_t now) {
   if (prompt) {
-    updatePrompt();
+    updatePrompt(now);
   } else if (running) {
     updateTest(now);
   } else {
@@ -36,7 +36,7 @@ void FactoryTest::update(uint32_t now) {
 void FactoryTest::updateMenu(uint32_t now) {
   menu.update(now);
   if (menu.takeLeave()) {
-    prompt.emplace();
+    ask(Asked::Leave, {"Leave", "End the factory test?", "OK", "CANCEL"});
   } else if (const auto chosen = menu.takeChosen()) {
     menu.hide();
     start(*chosen, now);
@@ -46,21 +46,46 @@ void FactoryTest::updateMenu(uint32_t now) {
 void FactoryTest::updateTest(uint32_t now) {
   running->test->update(now);
   const Outcome outcome = running->test->verdict();
-  if (outcome != Outcome::Running) finish(outcome, now);
+  if (outcome == Outcome::Running) return;
+  if (outcome == Outcome::Pass && !running->test->isComplete()) {
+    ask(Asked::IncompletePass,
+        {"Not all was tested", "The test has not shown or asked all that it must. Pass anyway?",
+         "PASS", "GO ON"});
+    return;
+  }
+  finish(outcome, now);
 }
 
-void FactoryTest::updatePrompt() {
-  const LeavePrompt::Answer answer = prompt->answer();
-  if (answer == LeavePrompt::Answer::None) return;
-  ended = answer == LeavePrompt::Answer::Yes;
+void FactoryTest::ask(Asked what, const Question& question) {
+  asked = what;
+  prompt.emplace(question);
+}
+
+void FactoryTest::updatePrompt(uint32_t now) {
+  const Prompt::Answer answer = prompt->answer();
+  if (answer == Prompt::Answer::None) return;
+  const bool isYes = answer == Prompt::Answer::Yes;
   prompt.reset();
   MW::isDisplayUpdate(1);
+  switch (asked) {
+    case Asked::Leave: ended = isYes; break;
+    case Asked::IncompletePass:
+      if (isYes) {
+        finish(Outcome::Pass, now);
+      } else {
+        running->test->takeBack();
+      }
+      break;
+    case Asked::SaveAgain:
+      if (std::string error; isYes) showKept(book.saveAgain(error), error);
+  }
 }
 
 void FactoryTest::start(std::size_t entry, uint32_t now) {
   const TestEntry& chosen = testEntries()[entry];
   context.log.add(std::string("Test ") + chosen.id);
   running = Running{entry, chosen.make(context), presentTime(), now};
+  running->test->showProgress(progressOf(book));
   running->test->enter();
   MW::isDisplayUpdate(1);
 }
@@ -86,17 +111,21 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
 void FactoryTest::keep(const Running& done, Verdict verdict, uint32_t now) {
   context.log.add(std::string("Verdict ") + verdictName(verdict));
   std::string error;
-  if (!book.record({.test = testEntries()[done.entry].id,
-                    .verdict = verdict,
-                    .started = done.started,
-                    .duration = std::chrono::milliseconds(now - done.startTicks),
-                    .screen = screenSize(),
-                    .values = done.test->values()},
-                   error)) {
-    complain(error);
-  }
-  if (!junitPath.empty() && !writeJunit(junitPath, book.results(), error)) complain(error);
-  menu.showVerdict(done.entry, verdict);
+  const bool isKept = book.record({.test = testEntries()[done.entry].id,
+                                   .verdict = verdict,
+                                   .started = done.started,
+                                   .duration = std::chrono::milliseconds(now - done.startTicks),
+                                   .screen = screenSize(),
+                                   .values = done.test->values()},
+                                  error);
+  showKept(isKept, error);
+}
+
+void FactoryTest::showKept(bool isKept, const std::string& error) {
+  menu.showVerdicts();
+  if (isKept) return;
+  complain(error);
+  ask(Asked::SaveAgain, {"Not saved", error, "TRY AGAIN", "LATER"});
 }
 
 void FactoryTest::draw() {
@@ -105,9 +134,10 @@ void FactoryTest::draw() {
     running->test->draw();
   } else {
     const ScreenSize screen = screenSize();
-    skia_add_box_c({0, 0, screen.width, screen.height, kGroundColor});
+    skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
   }
   MW::Window::show();
+  if (running && !prompt) running->test->drawOver();
   skia_end_frame_c();
 }
 

@@ -7,9 +7,9 @@
 #include <optional>
 #include <string>
 
-#include "leave_prompt.h"
 #include "menu.h"
 #include "pages/table.h"
+#include "prompt.h"
 #include "results/results.h"
 
 namespace factory_test {
@@ -17,9 +17,8 @@ namespace factory_test {
 /// Used on the main thread.
 class FactoryTest {
  public:
-  /// Keeps verdicts in `results`, which outlives it, as does the context. `reportPath`: the
-  /// report for a CI system; empty: none.
-  FactoryTest(ResultBook& results, const Context& program, std::string reportPath);
+  /// Keeps verdicts in `results`, which outlives it, as does the context.
+  FactoryTest(ResultBook& results, const Context& program);
 
   /// Shows a page of testEntries() in the place of the menu.
   void open(std::size_t entry, uint32_t now);
@@ -37,20 +36,24 @@ class FactoryTest {
     uint32_t startTicks;
   };
 
+  enum class Asked { Leave, IncompletePass, SaveAgain };
+
   void updateMenu(uint32_t now);
   void updateTest(uint32_t now);
-  void updatePrompt();
+  void updatePrompt(uint32_t now);
+  void ask(Asked what, const Question& question);
   void start(std::size_t entry, uint32_t now);
   void finish(Outcome outcome, uint32_t now);
   void keep(const Running& done, Verdict verdict, uint32_t now);
+  void showKept(bool isKept, const std::string& error);
 
   ResultBook& book;
   const Context& context;
-  std::string junitPath;
   bool ended = false;
   Menu menu;
   std::optional<Running> running;
-  std::optional<LeavePrompt> prompt;
+  Asked asked = Asked::Leave;
+  std::optional<Prompt> prompt;
 };
 
 }  // namespace factory_test

@@ -47,6 +47,11 @@ int entryHeight(ScreenSize screen) {
   return pixelsOf(kFinger, percentOf(longer, kLeastPercent), percentOf(longer, kMostPercent));
 }
 
+int groupHeight(ScreenSize screen) {
+  constexpr int kTextPercent = 150;
+  return percentOf(textSize(screen), kTextPercent);
+}
+
 SKIA_Rect contentArea() { return layOutPage(screenSize()).content; }
 
 SKIA_Text textOf(const char* words, uint32_t color, int align, int size) {

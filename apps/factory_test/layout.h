@@ -112,8 +112,8 @@ constexpr SKIA_Rect cellOf(const SKIA_Rect& area, int gap, const Grid& grid, int
 }
 static_assert(cellOf({100, 0, 1000, 50, 0}, 40, {1, 2}, 1).x == 620);
 
-/// A row of the menu between its entries, in per cent of the screen's height.
-inline constexpr int kGroupPercent = 3;
+/// A row of the menu between its entries.
+int groupHeight(ScreenSize screen);
 
 /// What a finger hits on every screen: 6 per cent of its longer side, or more where that is too
 /// low.
@@ -122,27 +122,28 @@ int entryHeight(ScreenSize screen);
 /// What every page is made of.
 struct PageLayout {
   SKIA_Rect ground;
-  SKIA_Rect head;                      ///< the bar of the title
-  SKIA_Rect leave;                     ///< the way out, in it
-  SKIA_Rect title;                     ///< the same
-  SKIA_Rect hint;                      ///< what to do
-  SKIA_Rect line;                      ///< what happens
-  SKIA_Rect content;                   ///< the page's own
-  std::array<SKIA_Rect, 3> verdicts;   ///< from left to right, or from the top
+  SKIA_Rect head;                     ///< the bar of the title
+  SKIA_Rect leave;                    ///< the way out, in it
+  SKIA_Rect progress;                 ///< at its foot
+  SKIA_Rect title;                    ///< the same
+  SKIA_Rect hint;                     ///< what to do
+  SKIA_Rect line;                     ///< what happens
+  SKIA_Rect content;                  ///< the page's own
+  std::array<SKIA_Rect, 3> verdicts;  ///< from left to right, or from the top
 };
 
 constexpr PageLayout layOutPage(ScreenSize screen) {
   const int gap = gapOf(screen);
   const SKIA_Rect whole = {0, 0, screen.width, screen.height, kPageInk.ground};
   const bool isWide = isLandscape(screen);
-  const auto [head, rest] =
-      rowsOf<2>(whole, 0, isWide ? std::array{10, 90} : std::array{7, 93});
+  const auto [head, rest] = rowsOf<2>(whole, 0, isWide ? std::array{10, 90} : std::array{7, 93});
   const auto [leave, title, nothing] =
       columnsOf<3>(inColor(within(head, gap / 2), kHeadInk.ground), gap, {3, 8, 3});
   const SKIA_Rect body = within(rest, 2 * gap);
   PageLayout page = {.ground = whole,
                      .head = inColor(head, kHeadInk.ground),
                      .leave = inColor(leave, kButtonInk.ground),
+                     .progress = rowsOf<2>(head, 0, {11, 1})[1],
                      .title = title,
                      .hint = {},
                      .line = {},
@@ -152,14 +153,14 @@ constexpr PageLayout layOutPage(ScreenSize screen) {
     const auto [left, right] = columnsOf<2>(body, 2 * gap, {4, 1});
     const auto [hint, line, content] = rowsOf<3>(left, gap, {12, 8, 80});
     page.hint = hint;
-    page.line = inColor(line, kLineInk.ground);
+    page.line = inColor(line, kPanelInk.ground);
     page.content = content;
     page.verdicts = rowsOf<3>(right, 2 * gap, {1, 1, 1});
     return page;
   }
   const auto [hint, line, content, verdicts] = rowsOf<4>(body, gap, {12, 7, 68, 13});
   page.hint = hint;
-  page.line = inColor(line, kLineInk.ground);
+  page.line = inColor(line, kPanelInk.ground);
   page.content = content;
   page.verdicts = columnsOf<3>(verdicts, gap, {1, 1, 1});
   return page;

@@ -17,7 +17,6 @@ inline constexpr uint32_t kDark = 0xFF10151D;
 
 inline constexpr Ink kPageInk = {0xFF161C26, kLight};
 inline constexpr Ink kHeadInk = {0xFF23507A, kLight};
-inline constexpr Ink kLineInk = {0xFFE8ECF2, kDark};
 inline constexpr Ink kPanelInk = {0xFF2B3545, kLight};
 inline constexpr Ink kButtonInk = {0xFFC9D3E1, kDark};
 inline constexpr Ink kRowInk = {0xFF3D4757, kLight};
@@ -27,8 +26,7 @@ inline constexpr Ink kFailInk = {0xFF9E2F2F, kLight};
 inline constexpr Ink kMarkInk = {0xFFFFD24A, kDark};
 
 /// All of them; a text can be read on each.
-inline constexpr auto kInks =
-    std::to_array<Ink>({kPageInk, kHeadInk, kLineInk, kPanelInk, kButtonInk, kRowInk, kPassInk,
-                        kFailInk, kMarkInk});
+inline constexpr auto kInks = std::to_array<Ink>(
+    {kPageInk, kHeadInk, kPanelInk, kButtonInk, kRowInk, kPassInk, kFailInk, kMarkInk});
 
 }  // namespace factory_test

@@ -9,6 +9,8 @@
 #include "application.h"
 #include "complain.h"
 #include "options.h"
+#include "plan/plan_json.h"
+#include "task.h"
 #include "version.h"
 
 namespace {
@@ -33,6 +35,15 @@ int main(int count, char** arguments) {
   }
   if (options->action == factory_test::Options::Action::Version) {
     std::printf("factory_test %s\n", factory_test::kVersion);
+    return EXIT_SUCCESS;
+  }
+  const auto task = factory_test::chooseTask(*options, error);
+  if (!task) {
+    factory_test::complain(error);
+    return static_cast<int>(factory_test::ExitCode::WrongUse);
+  }
+  if (options->action == factory_test::Options::Action::PrintPlan) {
+    std::fputs(factory_test::planJson(task->plan).c_str(), stdout);
     return EXIT_SUCCESS;
   }
   return static_cast<int>(factory_test::runApplication(*options));

@@ -8,17 +8,20 @@
 namespace factory_test {
 
 struct Options {
-  enum class Action { Run, Help, Version };
+  enum class Action { Run, Help, Version, PrintPlan };
 
   Action action = Action::Run;
-  bool headless = false;     // draw to memory, without a window
-  std::string device = {};   // the phone's screen that is played; empty: what BRIMOL_DEVICE says
-  bool verbose = false;      // write the toolkit's log to stderr
-  std::string test = {};     // the page of this id comes first; empty: the menu
-  std::string shot = {};     // draw once, write this PNG file and end; empty: no
-  std::string results = {};  // the JSON file that keeps the verdicts; empty: none
-  std::string junit = {};    // the same as a report for a CI system; empty: none
-  std::string log = {};      // the file that the log viewer shows; empty: the program's own log
+  bool headless = false;      // draw to memory, without a window
+  std::string device = {};    // the phone's screen that is played; empty: what BRIMOL_DEVICE says
+  bool verbose = false;       // write the toolkit's log to stderr
+  std::string test = {};      // the page of this id comes first; empty: the menu
+  std::string shot = {};      // draw once, write this PNG file and end; empty: no
+  std::string results = {};   // the JSON file that keeps the verdicts; empty: none
+  std::string junit = {};     // the same as a report for a CI system; empty: none
+  std::string plan = {};      // the JSON file of what to test; empty: the default plan
+  bool run = false;           // perform the plan from its first step to its last, without a menu
+  std::string simulate = {};  // failures to rehearse; empty: none
+  std::string log = {};       // the file that the log viewer shows; empty: the program's own log
   std::string shell = "uname -a";  // what the shell runs, for /bin/sh
 };
 

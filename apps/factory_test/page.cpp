@@ -26,7 +26,7 @@ Record hintRecord(const char* instructions) {
           textOf(instructions, kPageInk.text, SKIA_ALIGN_LEFT, textSize(screen))};
 }
 
-Record lineRecord() { return {layOutPage(screenSize()).line, captionOf("", kLineInk.text)}; }
+Record lineRecord() { return {layOutPage(screenSize()).line, captionOf("", kPanelInk.text)}; }
 
 template <typename Primitive>
 Primitive make(const Record& record) {
@@ -56,6 +56,7 @@ void Page::drawGround() { ground.show(); }
 
 void Page::drawFront() {
   head.show();
+  drawProgress(progress, layOutPage(screenSize()).progress);
   titleText.show();
   hint.show();
   line.show();

@@ -5,6 +5,7 @@
 
 #include <optional>
 
+#include "run_progress.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -20,6 +21,8 @@ class Page {
   void draw();
   void drawGround();
   void drawFront();
+  /// How much of the title's bar is full.
+  void showProgress(const RunProgress& newProgress) { progress = newProgress; }
   /// Changes the line; the next frame shows it. Any thread.
   void say(const char* words);
 
@@ -36,6 +39,7 @@ class Page {
   }
 
  private:
+  RunProgress progress;
   MW::Box ground;
   MW::Box head;
   MW::Label titleText;

@@ -46,7 +46,8 @@ std::string wrapped(const std::string& words, std::size_t columns) {
 
 std::size_t columnsIn(int width, int size) {
   constexpr int kLetterPercent = 60;  // of the text's size: what a wide letter takes
-  return static_cast<std::size_t>(std::max(width / std::max(percentOf(size, kLetterPercent), 1), 1));
+  return static_cast<std::size_t>(
+      std::max(width / std::max(percentOf(size, kLetterPercent), 1), 1));
 }
 
 }  // namespace

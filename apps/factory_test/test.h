@@ -8,6 +8,8 @@
 
 namespace factory_test {
 
+struct RunProgress;
+
 /// What became of a test so far.
 enum class Outcome { Running, Pass, Fail, Retry, Left };
 
@@ -17,6 +19,8 @@ class Test {
  public:
   virtual ~Test() = default;
 
+  /// How far the run had come before; asked for by a page that shows it.
+  virtual void showProgress(const RunProgress&) {}
   /// Puts the test's widgets on the screen.
   virtual void enter() = 0;
   /// Takes them off again. No callback runs any more when it returns.
@@ -33,6 +37,8 @@ class Test {
 
   /// Draws what stands under the window's widgets.
   virtual void draw() = 0;
+  /// Draws what stands over them.
+  virtual void drawOver() {}
   /// Comes in every round of the main loop, at GetTicks() milliseconds.
   virtual void update(uint32_t now) { static_cast<void>(now); }
 };

@@ -21,10 +21,10 @@ class MW_API Window {
   /// Starts input and the dispatch thread. Returns 1, or 0 after an error line when there is no
   /// memory or the dispatch thread could not be created; input may run already and does so until
   /// destroy(). Without memory or a thread for input it logs an error line and returns 1, and no
-  /// input comes. A second call before destroy() changes nothing and returns 1. Any thread: a call
-  /// waits while another thread is inside init() or destroy(); in a handler it returns 0 instead,
-  /// after an error line. If a handler calls destroy() meanwhile, the window is ended again before
-  /// init() returns.
+  /// input comes. A second call before destroy() changes nothing but the log, which tells of it,
+  /// and returns 1. Any thread: a call waits while another thread is inside init() or destroy(); in
+  /// a handler it returns 0 instead, after an error line. If a handler calls destroy() meanwhile,
+  /// the window is ended again before init() returns.
   static int init();
   /// Stops the dispatch thread and then input, and waits for both. Returns 1. The widgets stay as
   /// they are. Any thread: a call waits while another thread is inside init() or destroy().

@@ -38,12 +38,17 @@ struct PlatformState {
   int width = 1440, height = 2560;  ///< of the screen, pixels
   bool closeRequested = false;      ///< the user has asked to close the window
   int brightness = 100;             ///< per cent, as last set
-  int64_t utcMs = kDefaultUtcMs;    ///< since 1970, when the ticks were 0
+  int64_t utcMs = kDefaultUtcMs;    ///< since 1970, when the clock stood at clockBase()
   uint32_t random = 1;              ///< the next random number; the one behind it is one more
   std::map<std::string, std::string> figures;  ///< by name; a figure that is not here is empty
 
   static constexpr int64_t kDefaultUtcMs = 1'767'225'600'000;  ///< 2026-01-01T00:00:00Z
 };
+
+/// Where the clocks of all tests begin, in milliseconds: what BRIMOL_TEST_CLOCK says, 0 to 2^32 -
+/// 1, or 0. With 4294962296, five seconds before the clock's end, tests show what a program does
+/// when the clock starts over. Throws Failure for anything else.
+unsigned int clockBase();
 
 /// The one platform. The platform's calls may come from any thread, and so may these.
 struct RecordingPlatform : PlatformState {

@@ -112,7 +112,7 @@ inline Step appEvent(int value) {
   return [value] { detail::offerStep({.type = MW::kEventApplication, .value = value}); };
 }
 
-/// The clock, in GetTicks() milliseconds. It starts at kStartTicks.
+/// The clock, in GetTicks() milliseconds. It starts at startTicks().
 inline Step at(unsigned int ticks) {
   return [ticks] { platform().ticks = ticks; };
 }
@@ -121,7 +121,7 @@ inline Step later(unsigned int ms) {
   return [ms] { platform().ticks += ms; };
 }
 /// When the clock starts, in milliseconds.
-inline constexpr unsigned int kStartTicks = 1000;
+inline unsigned int startTicks() { return clockBase() + 1000; }
 
 /// An operation on the widget: call(&MW::Widget::onHideTimer, 500), or any function of it. That of
 /// a class of its own names it: call<MW::Slide>(...).
@@ -176,7 +176,7 @@ using Maker = std::function<std::unique_ptr<MW::Widget>()>;
 /// The journal of the steps, played on a new widget; they end where the widget is deleted.
 inline std::string played(const Maker& make, const Steps& steps, int deletingCall = 0) {
   stage = {};
-  platform().ticks = kStartTicks;
+  platform().ticks = startTicks();
   platform().takeLog();
   MW::isDisplayUpdate(0);
   stage.widget = make();

@@ -31,7 +31,7 @@ struct Loop {
 
 /// One at a time, made and used on one thread. It stands for the application's main loop, the
 /// platform and the user: it starts the toolkit and ends it. Widgets are made after it and deleted
-/// before it. Its clock, which GetTicks() says, begins at kStartTicks and moves with advance() and
+/// before it. Its clock, which GetTicks() says, begins at startTicks() and moves with advance() and
 /// with taps and keys alone; handlers run on the toolkit's own thread while the test waits for
 /// them.
 ///
@@ -49,7 +49,7 @@ class Screen {
   Screen(const Screen&) = delete;
   Screen& operator=(const Screen&) = delete;
 
-  static constexpr unsigned int kStartTicks = 1000;  ///< milliseconds
+  static unsigned int startTicks() { return clockBase() + 1000; }  ///< milliseconds
 
   // Time.
 

@@ -91,7 +91,11 @@ bool startDispatcher() {
   return true;
 }
 
-bool start() { return isRunning() || (startService() && startDispatcher()); }
+bool start() {
+  if (!isRunning()) return startService() && startDispatcher();
+  kLog.print(LogLevel::Warning, "init: it runs already");
+  return true;
+}
 
 // A word that applications may set, and that any thread may read.
 template <typename Number>

@@ -22,21 +22,23 @@ inline constexpr MenuRow kTouch = {2, 2};
 inline constexpr MenuRow kKeys = {2, 3};
 
 constexpr SKIA_Rect areaOf(const MenuRow& row) {
-  constexpr int kListTop = 510;  // of MW::MainList with its extended header
+  constexpr int kListTop = MW::MainList::kTitleHeight;
   constexpr int kGap = 3;
-  const int group = percentOf(kScreen.height, kGroupPercent) + kGap;
+  constexpr int kGroupHeight = 42;  // one and a half of its text
+  const int group = kGroupHeight + kGap;
   constexpr int kEntryHeight = 88;  // 7.1 mm
   const int entry = kEntryHeight + kGap;
   return {0, kListTop + kGap + row.groupsAbove * group + row.entriesAbove * entry, kScreen.width,
           entry - kGap, 0};
 }
 
-/// Black on the menu alone, wherever its list is scrolled.
-inline constexpr SKIA_Rect kMenuHeader = {0, 0, kScreen.width, 340, MW::kColorBlack};
+/// Of the ground's colour on the menu, of another on a page, wherever the list is scrolled: above
+/// the words that say what to do.
+inline constexpr SKIA_Rect kMenuHeader = {0, 58, kScreen.width, 8, kPageInk.ground};
 
-// The verdicts: three squares of 220 pixels, 14 from each other and from the edges.
-inline constexpr SKIA_Rect kPass = {14, 1046, 220, 220, MW::kColorWhite};
-inline constexpr SKIA_Rect kFail = {482, 1046, 220, 220, MW::kColorWhite};
+inline constexpr PageLayout kPage = layOutPage(kScreen);
+inline constexpr SKIA_Rect kPass = inColor(kPage.verdicts[0], kPassInk.ground);
+inline constexpr SKIA_Rect kFail = inColor(kPage.verdicts[2], kFailInk.ground);
 
 inline constexpr SKIA_Rect kCentre = {350, 630, 20, 20, 0};
 

@@ -69,7 +69,7 @@ struct Tap {
 Play tapped(const char* name, std::initializer_list<Tap> taps, const char* journal) {
   Steps steps;
   for (const auto& [ms, y] : taps) {
-    steps.insert(steps.end(), {at(kStartTicks + ms), press(30, kTop + y), release()});
+    steps.insert(steps.end(), {at(startTicks() + ms), press(30, kTop + y), release()});
   }
   steps.push_back(markers());
   return {name, kTree, steps, journal};

@@ -10,12 +10,6 @@ using nlohmann::json;
 
 constexpr std::string_view kReplacement = "\xef\xbf\xbd";  // U+FFFD
 
-// The JSON library checks the texts that it writes.
-std::string validUtf8(std::string_view bytes) {
-  return json::parse(json(bytes).dump(-1, ' ', false, json::error_handler_t::replace))
-      .get<std::string>();
-}
-
 std::string escaped(char letter) {
   switch (letter) {
     case '&': return "&amp;";
@@ -31,6 +25,12 @@ std::string escaped(char letter) {
 }
 
 }  // namespace
+
+// The JSON library checks the texts that it writes.
+std::string validUtf8(std::string_view bytes) {
+  return json::parse(json(bytes).dump(-1, ' ', false, json::error_handler_t::replace))
+      .get<std::string>();
+}
 
 std::string escaped(std::string_view bytes) {
   std::string text;

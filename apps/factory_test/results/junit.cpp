@@ -2,10 +2,11 @@
 
 #include <algorithm>
 #include <iomanip>
+#include <set>
 #include <sstream>
 
+#include "results/measure_text.h"
 #include "results/utc_time.h"
-#include "results/whole_file.h"
 #include "xml/xml_text.h"
 
 namespace factory_test {
@@ -16,48 +17,98 @@ using brimol::xml::escaped;
 
 constexpr int kSecondDecimals = 3;
 
-const char* verdictElement(Verdict verdict) {
-  switch (verdict) {
-    case Verdict::Pass: return "";
-    case Verdict::Fail: return "      <failure message=\"FAIL\"/>\n";
-    default: return "      <skipped/>\n";
-  }
+void addProperty(std::ostream& xml, const std::string& name, const std::string& value) {
+  xml << R"(        <property name=")" << escaped(name) << R"(" value=")" << escaped(value)
+      << "\"/>\n";
 }
 
-void addCase(std::ostream& xml, const TestResult& result) {
-  const std::chrono::duration<double> seconds = result.duration;
+void addProperties(std::ostream& xml, const TestResult& result) {
   const auto [width, height] = result.screen;
-  xml << R"(    <testcase classname="factory_test" name=")" << escaped(result.test) << R"(" time=")"
-      << seconds.count() << R"(">
-      <properties>
-        <property name="started" value=")"
-      << utcText(result.started) << R"("/>
-        <property name="screen" value=")"
-      << width << 'x' << height << R"("/>
-      </properties>
-)" << verdictElement(result.verdict)
-      << "    </testcase>\n";
+  xml << "      <properties>\n";
+  addProperty(xml, "started", utcText(result.started));
+  addProperty(xml, "screen", std::to_string(width) + "x" + std::to_string(height));
+  addProperty(xml, "attempt", std::to_string(result.attempt));
+  for (const Measure& each : result.values) addProperty(xml, each.name, measureText(each));
+  xml << "      </properties>\n";
+}
+
+// What a failure says first: the values that are at fault.
+std::string failureText(const TestResult& result) {
+  std::string text;
+  for (const Measure& each : result.values) {
+    if (each.isWithin()) continue;
+    text += (text.empty() ? "" : "; ") + each.name + " " + measureText(each);
+  }
+  return text.empty() ? "FAIL" : text;
+}
+
+void addVerdict(std::ostream& xml, const TestResult& result) {
+  if (result.verdict == Verdict::None) xml << "      <skipped message=\"no verdict\"/>\n";
+  if (result.verdict != Verdict::Fail) return;
+  xml << R"(      <failure message=")" << escaped(failureText(result)) << "\"/>\n";
+}
+
+// A null `result`: not run.
+void addCase(std::ostream& xml, const std::string& test, const TestResult* result) {
+  const std::chrono::duration<double> seconds =
+      result == nullptr ? std::chrono::milliseconds(0) : result->duration;
+  xml << R"(    <testcase classname="factory_test" name=")" << escaped(test) << R"(" time=")"
+      << seconds.count() << "\">\n";
+  if (result == nullptr) {
+    xml << "      <skipped message=\"not run\"/>\n";
+  } else {
+    addProperties(xml, *result);
+    addVerdict(xml, *result);
+  }
+  xml << "    </testcase>\n";
+}
+
+// The planned tests, then what was done besides.
+std::vector<std::string> allTests(const JunitSuite& suite) {
+  std::vector<std::string> tests = suite.planned;
+  std::set<std::string> known(tests.begin(), tests.end());
+  for (const TestResult& each : suite.results) {
+    if (known.insert(each.test).second) tests.push_back(each.test);
+  }
+  return tests;
+}
+
+// The newest result of a test; null: it has none.
+const TestResult* newest(const JunitSuite& suite, const std::string& test) {
+  const auto found = std::find_if(suite.results.rbegin(), suite.results.rend(),
+                                  [&test](const TestResult& each) { return each.test == test; });
+  return found == suite.results.rend() ? nullptr : &*found;
+}
+
+void addSuite(std::ostream& xml, const JunitSuite& suite) {
+  const std::vector<std::string> tests = allTests(suite);
+  std::size_t failures = 0;
+  std::size_t skipped = 0;
+  std::chrono::duration<double> seconds = {};
+  std::ostringstream cases;
+  cases << std::fixed << std::setprecision(kSecondDecimals);
+  for (const std::string& test : tests) {
+    const TestResult* const result = newest(suite, test);
+    addCase(cases, test, result);
+    failures += result != nullptr && result->verdict == Verdict::Fail ? 1U : 0U;
+    skipped += result == nullptr || result->verdict == Verdict::None ? 1U : 0U;
+    if (result != nullptr) seconds += result->duration;
+  }
+  xml << R"(  <testsuite name=")" << escaped(suite.name) << R"(" tests=")" << tests.size()
+      << R"(" failures=")" << failures << R"(" errors="0" skipped=")" << skipped << R"(" time=")"
+      << seconds.count() << "\">\n"
+      << cases.str() << "  </testsuite>\n";
 }
 
 }  // namespace
 
-std::string junitXml(std::span<const TestResult> results) {
+std::string junitXml(std::span<const JunitSuite> suites) {
   std::ostringstream xml;
   xml << std::fixed << std::setprecision(kSecondDecimals)
-      << R"(<?xml version="1.0" encoding="UTF-8"?>
-<testsuites>
-  <testsuite name="factory_test" tests=")"
-      << results.size() << R"(" failures=")"
-      << std::ranges::count(results, Verdict::Fail, &TestResult::verdict) << R"(" skipped=")"
-      << std::ranges::count(results, Verdict::None, &TestResult::verdict) << "\">\n";
-  for (const TestResult& result : results) addCase(xml, result);
-  xml << "  </testsuite>\n</testsuites>\n";
+      << "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<testsuites>\n";
+  for (const JunitSuite& suite : suites) addSuite(xml, suite);
+  xml << "</testsuites>\n";
   return xml.str();
-}
-
-bool writeJunit(const std::filesystem::path& path, std::span<const TestResult> results,
-                std::string& error) {
-  return replaceFile(path, junitXml(results), error);
 }
 
 }  // namespace factory_test

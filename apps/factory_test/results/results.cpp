@@ -4,51 +4,126 @@
 #include <system_error>
 #include <utility>
 
+#include "results/junit.h"
 #include "results/results_json.h"
 #include "results/whole_file.h"
 
 namespace factory_test {
 
-std::optional<ResultBook> ResultBook::open(const std::filesystem::path& path, std::string& error) {
-  ResultBook book;
-  book.file = path;
-  std::error_code failure;
-  const bool exists = std::filesystem::exists(path, failure) || failure;
-  // Written at once, a file tells before the first test that it cannot be written.
-  if (exists ? book.resume(error) : book.save(error)) return book;
-  return {};
+namespace {
+
+bool isBlank(const std::string& text) {
+  return text.find_first_not_of(" \t\r\n") == std::string::npos;
 }
 
-bool ResultBook::resume(std::string& error) {
-  const auto text = readFile(file, error);
-  if (!text) return false;
-  std::string reason;
-  auto results = parseResults(*text, reason);
-  if (!results) {
-    error = file.native() + ": " + reason;
-    return false;
+}  // namespace
+
+std::optional<ResultBook> ResultBook::open(const Keeping& places, const RunStart& start,
+                                           std::string& error) {
+  ResultBook book(places);
+  if (!book.lockFiles(error) || !book.resumeFile(error)) return {};
+  if (!places.database.empty()) {
+    book.database = Database::open(places.database, error);
+    if (!book.database) return {};
   }
-  for (TestResult& result : *results) put(std::move(result));
+  if (!book.begin(start, error)) return {};
+  return book;
+}
+
+bool ResultBook::lockFiles(std::string& error) {
+  for (const auto& file : {files.json, files.junit}) {
+    if (file.empty()) continue;
+    auto lock = FileLock::take(file, error);
+    if (!lock) return false;
+    locks.push_back(std::move(*lock));
+  }
   return true;
 }
 
-bool ResultBook::save(std::string& error) {
-  if (!file.empty() && !replaceFile(file, resultsJson(kept), error)) return false;
-  unsaved.clear();
+// With a database the file is only looked at: it must not be something else that is written over.
+bool ResultBook::resumeFile(std::string& error) {
+  std::error_code failure;
+  if (files.json.empty() || (!std::filesystem::exists(files.json, failure) && !failure))
+    return true;
+  const auto text = readFile(files.json, error);
+  if (!text) return false;
+  if (isBlank(*text)) return true;
+  std::string reason;
+  auto file = parseResults(*text, reason);
+  if (!file) {
+    error = files.json.native() + ": " + reason;
+    return false;
+  }
+  if (!files.database.empty()) return true;
+  begun.unit = std::move(file->unit);
+  for (TestResult& result : file->results) put(std::move(result));
+  return true;
+}
+
+bool ResultBook::begin(const RunStart& start, std::string& error) {
+  RunStart wanted = storable(start);
+  if (database) {
+    std::vector<TestResult> resumed;
+    if (!database->startRun(wanted, files.resume, resumed, error)) return false;
+    kept.clear();
+    for (TestResult& result : resumed) put(std::move(result));
+  } else if (!kept.empty() && !begun.unit.empty() && begun.unit != wanted.unit) {
+    if (!wanted.unit.empty()) {
+      error = (files.json.empty() ? "the program" : files.json.native()) +
+              ": holds the results of unit " + begun.unit + ", not of " + wanted.unit;
+      return false;
+    }
+    wanted.unit = begun.unit;
+  }
+  begun = std::move(wanted);
+  return saveFiles(error);
+}
+
+bool ResultBook::startUnit(const RunStart& start, std::string& error) {
+  return saveAgain(error) && begin(start, error);
+}
+
+bool ResultBook::saveFiles(std::string& error) {
+  const bool isKept =
+      files.json.empty() || replaceFile(files.json, resultsJson(begun.unit, kept), error);
+  const JunitSuite suite = {.planned = begun.tests, .results = kept};
+  const bool isReported =
+      files.junit.empty() || replaceFile(files.junit, junitXml({&suite, 1}), error);
+  if (isKept && isReported) unsavedTests.clear();
+  return isKept && isReported;
+}
+
+bool ResultBook::saveDatabase(std::string& error) {
+  if (!database || unsavedVerdicts.empty()) return true;
+  if (!database->keep(unsavedVerdicts, error)) return false;
+  unsavedVerdicts.clear();
   return true;
 }
 
 bool ResultBook::record(TestResult result, std::string& error) {
-  unsaved.insert(result.test);
-  put(clamped(std::move(result)));
-  return save(error);
+  result = clamped(std::move(result));
+  if (const TestResult* const earlier = find(result.test)) {
+    result.attempt = std::max(result.attempt, earlier->attempt + 1);
+  }
+  if (database) unsavedVerdicts.push_back(result);
+  unsavedTests.push_back(result.test);
+  put(std::move(result));
+  return saveAgain(error);
 }
 
 bool ResultBook::isSaved(std::string_view test) const {
-  return find(test) != nullptr && !unsaved.contains(test);
+  return find(test) != nullptr && std::ranges::find(unsavedTests, test) == unsavedTests.end() &&
+         std::ranges::find(unsavedVerdicts, test, &TestResult::test) == unsavedVerdicts.end();
 }
 
-bool ResultBook::saveAgain(std::string& error) { return unsaved.empty() || save(error); }
+bool ResultBook::saveAgain(std::string& error) {
+  const bool isStored = saveDatabase(error);
+  return (unsavedTests.empty() || saveFiles(error)) && isStored;
+}
+
+bool ResultBook::finish(std::string& error) {
+  return saveAgain(error) && (!database || database->finishRun(error));
+}
 
 void ResultBook::put(TestResult result) {
   const auto earlier = std::ranges::find(kept, result.test, &TestResult::test);

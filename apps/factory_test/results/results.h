@@ -1,57 +1,87 @@
-/// The results file of a factory test.
+/// The results of a factory test, and where they are kept.
 #pragma once
 
 #include <filesystem>
-#include <functional>
+#include <memory>
 #include <optional>
-#include <set>
 #include <string>
 #include <string_view>
 #include <vector>
 
+#include "records/database.h"
+#include "records/run.h"
+#include "results/file_lock.h"
 #include "results/test_result.h"
 
 namespace factory_test {
 
-/// The results of all tests that were done, a test's newest only, and the file that keeps them.
-/// The file's layout stands in results_json.h. One thread at a time uses a book, one book at a time
-/// a file; nothing here throws.
+/// Where results are kept; an empty path: not there.
+struct Keeping {
+  std::filesystem::path json = {};      // the newest results, see results_json.h
+  std::filesystem::path junit = {};     // a report for a CI system, see junit.h
+  std::filesystem::path database = {};  // all verdicts of all units, see records/database.h
+  Database::Resume resume = Database::Resume::Yes;
+};
+
+/// The newest result of each test of one unit, and what keeps them. One thread at a time uses a
+/// book; nothing here throws. Where something cannot be written, the results stay in memory, the
+/// files hold what they held before, and an error says why in one line that begins with the file's
+/// name.
 class ResultBook {
  public:
-  /// Resumes the file at `path`, or writes one without results if there is none. An empty `path`:
-  /// the results stay in memory. Nothing is returned for a file that cannot be read, is damaged or
-  /// cannot be written anew; `error` then says so in one line that begins with the file's name, and
-  /// what is there stays as it is.
-  static std::optional<ResultBook> open(const std::filesystem::path& path, std::string& error);
+  /// Begins a run: with a database as Database::startRun() does, else with what the file at
+  /// `places.json` holds, which must be of the same unit or of none. All files are written at once,
+  /// so that one that cannot be is found before the first test. Nothing is returned for that, for a
+  /// file that another program keeps its results in, and for one that cannot be read; `error` then
+  /// says why, and what is there stays as it is.
+  static std::optional<ResultBook> open(const Keeping& places, const RunStart& start,
+                                        std::string& error);
+  /// A file alone, or none: the results stay in memory.
+  static std::optional<ResultBook> open(const std::filesystem::path& json, std::string& error) {
+    return open(Keeping{.json = json}, {}, error);
+  }
 
-  /// Puts `result`, clamped(), in the place of the test's earlier one or at the end, and writes the
-  /// whole file. False: the result stays in memory and goes out with the next record(), the file
-  /// holds what it held before, and `error` says why in one line. Waits for the disk, often some
-  /// milliseconds.
+  /// Ends the run, and begins one of another unit or by another operator, as open() does. Without a
+  /// database that works as long as there is no result, since a file holds those of one unit.
+  bool startUnit(const RunStart& start, std::string& error);
+  const RunStart& run() const { return begun; }
+
+  /// Puts `result`, clamped(), in the place of the test's earlier one, whose attempts it goes on to
+  /// count, or at the end; then writes. False: it goes out with the next record() or saveAgain().
+  /// Waits for the disk, often some milliseconds.
   bool record(TestResult result, std::string& error);
 
   /// Whether the test has a result, and all that it is kept in holds it.
   bool isSaved(std::string_view test) const;
-
   /// Tries again to write what record() could not. True: nothing is left unsaved, or was.
   bool saveAgain(std::string& error);
 
-  /// The test's result, or null. Valid until the next record().
-  const TestResult* find(std::string_view test) const;
+  /// The plan is through, though tests may be left: a failure ended it. Without this a run is
+  /// finished once all tests of its plan have a verdict, and aborted when the program ends before.
+  bool finish(std::string& error);
 
-  /// In the order in which the tests were recorded first. Valid until the next record().
+  /// The test's result, or null. Valid until the next record() or startUnit().
+  const TestResult* find(std::string_view test) const;
+  /// In the order in which the tests were recorded first. Valid as long.
   const std::vector<TestResult>& results() const { return kept; }
 
  private:
-  ResultBook() = default;
+  explicit ResultBook(const Keeping& places) : files(places) {}
 
-  bool resume(std::string& error);
-  bool save(std::string& error);
+  bool lockFiles(std::string& error);
+  bool resumeFile(std::string& error);
+  bool begin(const RunStart& start, std::string& error);
+  bool saveDatabase(std::string& error);
+  bool saveFiles(std::string& error);
   void put(TestResult result);
 
-  std::filesystem::path file = {};  // empty: in memory only
+  Keeping files;
+  std::vector<FileLock> locks = {};
+  std::unique_ptr<Database> database = {};
+  RunStart begun = {};
   std::vector<TestResult> kept = {};
-  std::set<std::string, std::less<>> unsaved = {};  // tests whose result the file does not hold
+  std::vector<TestResult> unsavedVerdicts = {};  // the database has yet to take them, oldest first
+  std::vector<std::string> unsavedTests = {};    // the files do not hold their newest result
 };
 
 }  // namespace factory_test

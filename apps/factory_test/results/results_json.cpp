@@ -1,11 +1,12 @@
 #include "results/results_json.h"
 
+#include <algorithm>
 #include <array>
 #include <cstdint>
 #include <limits>
-#include <nlohmann/json.hpp>
 #include <utility>
 
+#include "results/result_entry.h"
 #include "results/utc_time.h"
 
 namespace factory_test {
@@ -16,6 +17,8 @@ using nlohmann::json;
 using nlohmann::ordered_json;
 
 constexpr int kIndent = 2;
+constexpr int kVersion = 2;
+constexpr int kFirstVersion = 1;  // of the files that say none
 
 // A member of an object. Null: it is missing, or `object` is none. Not by value: a copy of what is
 // nested very deep would overflow the stack.
@@ -34,11 +37,13 @@ bool readCount(const json& value, int& count) {
   return true;
 }
 
-bool readTest(const json& value, TestResult& result) {
+bool readText(const json& value, std::string& text) {
   if (!value.is_string()) return false;
-  result.test = value.get<std::string>();
+  text = value.get<std::string>();
   return true;
 }
+
+bool readTest(const json& value, TestResult& result) { return readText(value, result.test); }
 
 bool readVerdict(const json& value, TestResult& result) {
   for (const auto verdict : {Verdict::None, Verdict::Pass, Verdict::Fail}) {
@@ -67,6 +72,32 @@ bool readScreen(const json& value, TestResult& result) {
          readCount(memberOf(value, "height"), result.screen.height);
 }
 
+bool readAttempt(const json& value, TestResult& result) {
+  return value.is_null() || (readCount(value, result.attempt) && result.attempt > 0);
+}
+
+bool readLimit(const json& value, std::optional<double>& limit) {
+  if (value.is_number()) limit = value.get<double>();
+  return value.is_number() || value.is_null();
+}
+
+bool readMeasure(const json& entry, Measure& measure) {
+  const json& value = memberOf(entry, "value");
+  if (!value.is_number()) return false;
+  measure.value = value.get<double>();
+  return readText(memberOf(entry, "name"), measure.name) &&
+         readText(memberOf(entry, "unit"), measure.unit) &&
+         readLimit(memberOf(entry, "least"), measure.least) &&
+         readLimit(memberOf(entry, "most"), measure.most);
+}
+
+bool readValues(const json& value, TestResult& result) {
+  if (value.is_null()) return true;
+  if (!value.is_array()) return false;
+  result.values.resize(value.size());
+  return std::ranges::equal(value, result.values, readMeasure);
+}
+
 struct Member {
   const char* name;
   bool (*read)(const json& value, TestResult& result);
@@ -74,9 +105,11 @@ struct Member {
 constexpr auto kMembers = std::to_array<Member>({
     {"test", readTest},
     {"verdict", readVerdict},
+    {"attempt", readAttempt},
     {"started", readStarted},
     {"duration_ms", readDuration},
     {"screen", readScreen},
+    {"values", readValues},
 });
 
 // The name of the first member that is missing or wrong. Null: none is.
@@ -87,38 +120,78 @@ const char* readResult(const json& entry, TestResult& result) {
   return nullptr;
 }
 
-ordered_json resultEntry(const TestResult& result) {
-  return {{"test", result.test},
-          {"verdict", verdictName(result.verdict)},
-          {"started", utcText(result.started)},
-          {"duration_ms", result.duration.count()},
-          {"screen", {{"width", result.screen.width}, {"height", result.screen.height}}}};
+ordered_json measureEntry(const Measure& measure) {
+  ordered_json entry = {{"name", measure.name}, {"unit", measure.unit}, {"value", measure.value}};
+  if (measure.least) entry["least"] = *measure.least;
+  if (measure.most) entry["most"] = *measure.most;
+  return entry;
+}
+
+// Nothing but a version that is known may be read; a newer program's file would lose by it.
+bool checkVersion(const json& root, std::string& reason) {
+  const json& member = memberOf(root, "version");
+  int version = kFirstVersion;
+  if (!member.is_null() && !readCount(member, version)) {
+    reason = "has no valid \"version\"";
+    return false;
+  }
+  if (version > kVersion) {
+    reason = "is of version " + std::to_string(version) + ", newer than this program's " +
+             std::to_string(kVersion);
+  }
+  return version <= kVersion;
+}
+
+bool readResults(const json& list, std::vector<TestResult>& results, std::string& reason) {
+  results.resize(list.size());
+  for (std::size_t i = 0; i < results.size(); ++i) {
+    if (const char* const wrong = readResult(list[i], results[i])) {
+      reason = "result " + std::to_string(i + 1) + " has no valid \"" + wrong + "\"";
+      return false;
+    }
+  }
+  return true;
 }
 
 }  // namespace
 
-std::string resultsJson(std::span<const TestResult> results) {
-  ordered_json list = ordered_json::array();
-  for (const TestResult& result : results) list.push_back(resultEntry(result));
-  const ordered_json root = {{"results", std::move(list)}};
+ordered_json resultEntry(const TestResult& result) {
+  ordered_json values = ordered_json::array();
+  for (const Measure& each : result.values) values.push_back(measureEntry(each));
+  return {{"test", result.test},
+          {"verdict", verdictName(result.verdict)},
+          {"attempt", result.attempt},
+          {"started", utcText(result.started)},
+          {"duration_ms", result.duration.count()},
+          {"screen", {{"width", result.screen.width}, {"height", result.screen.height}}},
+          {"values", std::move(values)}};
+}
+
+std::string jsonText(const ordered_json& root) {
   return root.dump(kIndent, ' ', false, json::error_handler_t::replace) + "\n";
 }
 
-std::optional<std::vector<TestResult>> parseResults(std::string_view text, std::string& reason) {
+std::string resultsJson(const std::string& unit, std::span<const TestResult> results) {
+  ordered_json root = {{"version", kVersion}};
+  if (!unit.empty()) root["unit"] = unit;
+  ordered_json& list = root["results"] = ordered_json::array();
+  for (const TestResult& result : results) list.push_back(resultEntry(result));
+  return jsonText(root);
+}
+
+std::optional<ResultFile> parseResults(std::string_view text, std::string& reason) {
   const json root = json::parse(text, nullptr, false);  // without exceptions
   const json& list = memberOf(root, "results");
   if (!list.is_array()) {
     reason = root.is_discarded() ? "is not JSON" : "has no list of \"results\"";
     return {};
   }
-  std::vector<TestResult> results(list.size());
-  for (std::size_t i = 0; i < results.size(); ++i) {
-    if (const char* const wrong = readResult(list[i], results[i])) {
-      reason = "result " + std::to_string(i + 1) + " has no valid \"" + wrong + "\"";
-      return {};
-    }
-  }
-  return results;
+  ResultFile file;
+  if (!checkVersion(root, reason) || !readResults(list, file.results, reason)) return {};
+  const json& unit = memberOf(root, "unit");
+  if (unit.is_null() || readText(unit, file.unit)) return file;
+  reason = "has no valid \"unit\"";
+  return {};
 }
 
 }  // namespace factory_test

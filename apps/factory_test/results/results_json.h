@@ -1,19 +1,27 @@
-/// The results file's text.
+/// The results file's text. schema/results.schema.json says the same for a machine.
 ///
 ///     {
+///       "version": 2,
+///       "unit": "A1234",
 ///       "results": [
 ///         {
 ///           "test": "display colours",
 ///           "verdict": "PASS",
+///           "attempt": 1,
 ///           "started": "2026-11-21T07:00:00Z",
 ///           "duration_ms": 4200,
-///           "screen": {"width": 1440, "height": 2560}
+///           "screen": {"width": 1440, "height": 2560},
+///           "values": [
+///             {"name": "colour steps", "unit": "", "value": 8, "least": 8}
+///           ]
 ///         }
 ///       ]
 ///     }
 ///
-/// All of these members must be there, in any order; others are passed over. "verdict" is "PASS",
-/// "FAIL" or "none", "started" UTC, a figure 0 to INT_MAX.
+/// Members may come in any order; unknown ones are passed over. "verdict" is "PASS", "FAIL" or
+/// "none", "started" UTC, a figure 0 to INT_MAX, "attempt" 1 or more. "unit" is the serial number
+/// of what was tested, left out where nobody said one; "least" and "most" are left out where there
+/// is no limit. Version 1, which says no version, has neither units, attempts nor values.
 #pragma once
 
 #include <optional>
@@ -26,10 +34,16 @@
 
 namespace factory_test {
 
-/// The file's text for results that are clamped(). Bytes of a name that are no UTF-8 become U+FFFD.
-std::string resultsJson(std::span<const TestResult> results);
+/// What a file holds.
+struct ResultFile {
+  std::string unit = {};  // empty: unknown
+  std::vector<TestResult> results = {};
+};
 
-/// The results in `text`. Nothing for any other text; `reason` then says what is wrong.
-std::optional<std::vector<TestResult>> parseResults(std::string_view text, std::string& reason);
+/// The file's text for results that are clamped(). Bytes of a name that are no UTF-8 become U+FFFD.
+std::string resultsJson(const std::string& unit, std::span<const TestResult> results);
+
+/// What `text` holds. Nothing for any other text; `reason` then says what is wrong.
+std::optional<ResultFile> parseResults(std::string_view text, std::string& reason);
 
 }  // namespace factory_test

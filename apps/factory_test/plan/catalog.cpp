@@ -1,0 +1,83 @@
+#include "plan/catalog.h"
+
+#include <algorithm>
+#include <array>
+#include <cassert>
+#include <cmath>
+
+namespace factory_test {
+
+namespace {
+
+constexpr Limits none() { return {}; }
+constexpr Limits least(double value) { return {.least = value, .most = {}}; }
+constexpr Limits most(double value) { return {.least = {}, .most = value}; }
+
+// The pages say what each value is; docs/plans.md says it to those who write plans.
+constexpr auto kColours = std::to_array<ValueKind>({{"colours confirmed", "", least(5)}});
+constexpr auto kDeadPixels = std::to_array<ValueKind>({{"patterns confirmed", "", least(12)}});
+constexpr auto kBacklight = std::to_array<ValueKind>({{"steps confirmed", "", least(5)}});
+constexpr auto kGrid = std::to_array<ValueKind>({
+    {"cells", "", least(1)},
+    {"cells missed", "", most(0)},
+});
+constexpr auto kGridParameters = std::to_array<ParameterKind>({{"cell mm", 3, 30, 8}});
+constexpr auto kLines = std::to_array<ValueKind>({
+    {"lines followed", "", least(2)},
+    {"worst distance", "mm", most(5)},
+});
+constexpr auto kTrails = std::to_array<ValueKind>({
+    {"fingers counted", "", least(2)},
+    {"longest trail", "mm", none()},
+});
+constexpr auto kFingers = std::to_array<ParameterKind>({{"fingers", 2, 10, 2}});
+constexpr auto kRate = std::to_array<ValueKind>({
+    {"event rate", "1/s", least(20)},
+    {"longest gap", "ms", none()},
+    {"latency", "ms", most(100)},
+});
+constexpr auto kRateParameters = std::to_array<ParameterKind>({{"seconds", 1, 30, 3}});
+constexpr auto kPinch = std::to_array<ValueKind>({
+    {"fingers counted", "", least(2)},
+    {"narrowest", "mm", none()},
+    {"widest", "mm", none()},
+});
+constexpr auto kStuck = std::to_array<ValueKind>({{"touches seen", "", most(0)}});
+constexpr auto kStuckParameters = std::to_array<ParameterKind>({{"seconds", 1, 600, 60}});
+constexpr auto kKeys = std::to_array<ValueKind>({
+    {"keys seen", "", least(10)},
+    {"bounces", "", most(0)},
+    {"longest bounce", "ms", none()},
+});
+
+constexpr auto kTests = std::to_array<TestKind>({
+    {"colours", 0, kColours},
+    {"dead_pixels", 0, kDeadPixels},
+    {"backlight", 0, kBacklight},
+    {"touch_grid", 120, kGrid, kGridParameters},
+    {"touch_lines", 60, kLines},
+    {"touch_trails", 60, kTrails, kFingers},
+    {"touch_rate", 60, kRate, kRateParameters},
+    {"pinch", 60, kPinch, kFingers},
+    {"stuck_touch", 0, kStuck, kStuckParameters},
+    {"keys", 120, kKeys},
+});
+constexpr TestKind kMeasuresNothing = {""};
+
+}  // namespace
+
+const TestKind& testKind(std::string_view test) {
+  const auto* const found = std::ranges::find(kTests, test, &TestKind::test);
+  return found == kTests.end() ? kMeasuresNothing : *found;
+}
+
+Measure measured(std::string_view test, std::string_view name, double value) {
+  const auto kinds = testKind(test).values;
+  const auto kind = std::ranges::find(kinds, name, &ValueKind::name);
+  assert(kind != kinds.end());
+  return {.name = std::string(name),
+          .unit = std::string(kind->unit),
+          .value = std::isfinite(value) ? value : 0};
+}
+
+}  // namespace factory_test

@@ -1,0 +1,45 @@
+/// What tests measure, and what about them can be set.
+#pragma once
+
+#include <optional>
+#include <span>
+#include <string_view>
+
+#include "results/test_result.h"
+
+namespace factory_test {
+
+struct Limits {
+  std::optional<double> least = {};
+  std::optional<double> most = {};
+
+  bool operator==(const Limits&) const = default;
+};
+
+struct ValueKind {
+  std::string_view name;
+  std::string_view unit;  // empty: a count
+  Limits usual = {};      // in the default plan
+};
+
+struct ParameterKind {
+  std::string_view name;
+  double least;
+  double most;
+  double usual;
+};
+
+/// Tests that are not in the catalogue measure nothing and have no parameters.
+struct TestKind {
+  std::string_view test;
+  int timeout = 0;  // seconds, in the default plan; 0: none
+  std::span<const ValueKind> values = {};
+  std::span<const ParameterKind> parameters = {};
+};
+
+const TestKind& testKind(std::string_view test);
+
+/// A value of the catalogue as the test delivers it; what is not finite becomes 0.
+Measure measured(std::string_view test, std::string_view name, double value);
+
+}  // namespace factory_test

@@ -1,0 +1,57 @@
+#include "records/run_locks.h"
+
+#include <fcntl.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <system_error>
+
+#include "records/sqlite.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr mode_t kMode = 0666;  // less what the user's mask takes
+
+struct flock byteOf(std::int64_t run, short kind) {
+  struct flock lock = {};
+  lock.l_type = kind;
+  lock.l_whence = SEEK_SET;
+  lock.l_start = run;
+  lock.l_len = 1;
+  return lock;
+}
+
+}  // namespace
+
+RunLocks::RunLocks(const std::filesystem::path& database) {
+  const std::filesystem::path file = std::filesystem::path(database).concat(".lock");
+  descriptor = ::open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kMode);
+  if (descriptor >= 0) return;
+  throw StoreError(file.native() +
+                   ": cannot be written: " + std::generic_category().message(errno));
+}
+
+RunLocks::~RunLocks() { ::close(descriptor); }
+
+bool RunLocks::isHeld(std::int64_t run) const {
+  if (run == own) return true;
+  struct flock lock = byteOf(run, F_WRLCK);
+  return ::fcntl(descriptor, F_OFD_GETLK, &lock) == 0 && lock.l_type != F_UNLCK;
+}
+
+bool RunLocks::take(std::int64_t run) {
+  struct flock lock = byteOf(run, F_WRLCK);
+  if (::fcntl(descriptor, F_OFD_SETLK, &lock) != 0) return false;
+  own = run;
+  return true;
+}
+
+void RunLocks::release(std::int64_t run) {
+  struct flock lock = byteOf(run, F_UNLCK);
+  ::fcntl(descriptor, F_OFD_SETLK, &lock);
+  own = 0;
+}
+
+}  // namespace factory_test

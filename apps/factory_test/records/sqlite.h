@@ -1,0 +1,104 @@
+/// SQLite for the records: connections, statements and transactions that end by themselves.
+#pragma once
+
+#include <sqlite3.h>
+
+#include <cstdint>
+#include <filesystem>
+#include <functional>
+#include <initializer_list>
+#include <memory>
+#include <optional>
+#include <span>
+#include <stdexcept>
+#include <string>
+#include <string_view>
+#include <variant>
+#include <vector>
+
+namespace factory_test {
+
+/// What went wrong with a database, in one line. The records' own parts throw it; none of their
+/// public operations lets it out.
+class StoreError : public std::runtime_error {
+ public:
+  using std::runtime_error::runtime_error;
+};
+
+/// A row as texts; nothing for null. Numbers read as the same number again.
+using Cells = std::vector<std::optional<std::string>>;
+using RowReader = std::function<void(const Cells& row)>;
+
+/// One thread at a time uses a connection.
+class Sqlite {
+ public:
+  enum class Mode { Read, Write };
+
+  /// A parameter's value; texts are only read during the call.
+  using Value = std::variant<std::nullptr_t, std::int64_t, double, std::string_view>;
+  using Values = std::span<const Value>;
+
+  /// Opens the database; Mode::Write makes one that is missing. Waits up to kBusyMs for others
+  /// that write.
+  Sqlite(const std::filesystem::path& path, Mode mode);
+
+  /// One statement; its rows go to `reader`.
+  void run(const char* sql, Values values = {}, const RowReader& reader = {});
+  void run(const char* sql, std::initializer_list<Value> values, const RowReader& reader = {}) {
+    run(sql, Values(values.begin(), values.size()), reader);
+  }
+  /// Statements without parameters.
+  void runAll(const char* sql);
+  /// The first cell of the first row; nothing for none.
+  std::optional<std::string> cell(const char* sql, Values values = {});
+  std::int64_t number(const char* sql, Values values = {});
+  /// How many rows the last statement changed.
+  int changes() const { return sqlite3_changes(handle.get()); }
+
+ private:
+  struct Closer {
+    void operator()(sqlite3* open) const { sqlite3_close_v2(open); }
+  };
+  struct Finalizer {
+    void operator()(sqlite3_stmt* prepared) const { sqlite3_finalize(prepared); }
+  };
+  using Statement = std::unique_ptr<sqlite3_stmt, Finalizer>;
+
+  Statement prepare(const char* sql) const;
+  void bind(sqlite3_stmt* statement, Values values) const;
+  void check(int code) const;
+
+  static constexpr int kBusyMs = 3000;
+
+  std::filesystem::path file;
+  std::unique_ptr<sqlite3, Closer> handle;
+};
+
+/// Writes all or nothing. It waits for other writers when it begins, so that it never fails for
+/// them later.
+class Transaction {
+ public:
+  explicit Transaction(Sqlite& database);
+  ~Transaction();
+  Transaction(const Transaction&) = delete;
+  Transaction& operator=(const Transaction&) = delete;
+
+  /// Without it, the destructor takes everything back.
+  void commit();
+
+ private:
+  Sqlite& store;
+  bool isOpen = true;
+};
+
+/// A limit or another figure that may be missing.
+inline Sqlite::Value orNull(const std::optional<double>& figure) {
+  return figure ? Sqlite::Value(*figure) : Sqlite::Value(nullptr);
+}
+
+/// An empty text stands for a missing one.
+inline Sqlite::Value orNull(const std::string& text) {
+  return text.empty() ? Sqlite::Value(nullptr) : Sqlite::Value(text);
+}
+
+}  // namespace factory_test
