@@ -58,8 +58,8 @@ std::string wrongScreen() {
          " pixels has no room for the pages: at least 320x480, and no side three times the other";
 }
 
-void loop(FactoryTest& test) {
-  while (!test.isEnded() && brimol_host_close_requested() == 0 && interrupted == 0) {
+void loop(FactoryTest& test, bool stays) {
+  while ((stays || !test.isEnded()) && brimol_host_close_requested() == 0 && interrupted == 0) {
     test.update(GetTicks());
     if (MW::isDisplayUpdate(0) == 1) test.draw();
     MW::Window::updateTimer(MW::kUnused);
@@ -82,13 +82,22 @@ std::optional<std::string> readText(const std::string& path, std::string& error)
   return {};
 }
 
+void letMonkeyPlay(const Options& options) {
+  const std::string events = options.events.empty() ? "" : ":" + options.events;
+  const std::string trace =
+      options.monkeyTrace.empty() ? "monkey-" + options.monkey + ".trace" : options.monkeyTrace;
+  setenv("BRIMOL_MONKEY", (options.monkey + events).c_str(), 1);
+  setenv("BRIMOL_RECORD", trace.c_str(), 1);
+  setenv("BRIMOL_DISPLAY", "headless", 1);
+}
+
 ExitCode showScreens(const Options& options, ResultBook& book, const Context& context) {
   FactoryTest test(book, context);
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
-    loop(test);
-    return judge(options, book);
+    loop(test, options.stays);
+    return options.monkey.empty() ? judge(options, book) : ExitCode::Passed;
   }
   if (brimol_host_screenshot(options.shot.c_str()) == 0) return fail(brimol_host_error());
   return ExitCode::Passed;
@@ -100,6 +109,7 @@ ExitCode runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
+  if (!options.monkey.empty()) letMonkeyPlay(options);
   std::string error;
   RunStart run;
   for (const TestEntry& each : testEntries()) {

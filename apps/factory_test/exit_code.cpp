@@ -8,7 +8,8 @@ namespace factory_test {
 namespace {
 
 constexpr auto kRows = std::to_array<ExitRow>({
-    {ExitCode::Passed, "all tests passed, or only a picture or this help was asked for"},
+    {ExitCode::Passed,
+     "all tests passed, or none was to be done (--help, --shot, --monkey and the like)"},
     {ExitCode::Trouble, "the screen cannot be opened, or a file not read or written"},
     {ExitCode::WrongUse, "a wrong option"},
     {ExitCode::Failed, "a test failed"},

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <array>
+#include <charconv>
 #include <cmath>
 #include <filesystem>
 #include <string_view>
@@ -49,6 +50,17 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char* value) { options.test = value; }},
     {"--shot", "FILE.png", "draw the first screen, write it to FILE.png and end",
      [](Options& options, const char* value) { options.shot = value; }},
+    {"--monkey", "SEED", "let random input use the program, in simulated time and without a window",
+     [](Options& options, const char* value) {
+       options.monkey = value;
+       options.stays = true;
+     }},
+    {"--events", "N", "so many events of it; 10000 when not given",
+     [](Options& options, const char* value) { options.events = value; }},
+    {"--monkey-trace", "FILE", "write that input as a trace; monkey-SEED.trace when not given",
+     [](Options& options, const char* value) { options.monkeyTrace = value; }},
+    {"--stay", nullptr, "show the menu again where the user leaves the program, as with --monkey",
+     [](Options& options, const char*) { options.stays = true; }},
     {"--verbose", nullptr, "write the toolkit's log to stderr",
      [](Options& options, const char*) { options.verbose = true; }},
 });
@@ -112,6 +124,18 @@ std::string wrongDevice(const std::string& name) {
   return error;
 }
 
+bool isNumber(const std::string& text) {
+  uint64_t number = 0;
+  const char* const end = text.data() + text.size();
+  const auto [stop, failure] = std::from_chars(text.data(), end, number);
+  return failure == std::errc() && stop == end;
+}
+
+std::string wrongMonkey(const Options& options) {
+  if (options.monkey.empty()) return "--events and --monkey-trace belong to --monkey";
+  return "--monkey and --events need numbers";
+}
+
 std::string wrongTest(const std::string& id) {
   std::string error = "unknown test '" + id + "', known are:";
   for (const TestEntry& entry : testEntries()) error.append(" ").append(entry.id);
@@ -144,6 +168,13 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
   }
   if (!options.device.empty() && brimol_device_named(options.device.c_str()) == nullptr) {
     error = wrongDevice(options.device);
+    return {};
+  }
+  const bool isMonkeys = !options.events.empty() || !options.monkeyTrace.empty();
+  if (options.monkey.empty()
+          ? isMonkeys
+          : !isNumber(options.monkey) || (!options.events.empty() && !isNumber(options.events))) {
+    error = wrongMonkey(options);
     return {};
   }
   if (!options.test.empty() && placeOf(options.test) == testEntries().size()) {

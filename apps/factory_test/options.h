@@ -22,6 +22,10 @@ struct Options {
   bool run = false;           // perform the plan from its first step to its last, without a menu
   std::string simulate = {};  // failures to rehearse; empty: none
   std::string log = {};       // the file that the log viewer shows; empty: the program's own log
+  std::string monkey = {};    // the seed of random input; empty: none
+  std::string events = {};    // how many of it; empty: as the platform says
+  std::string monkeyTrace = {};    // where it is written; empty: beside the caller
+  bool stays = false;              // the user cannot end it
   std::string shell = "uname -a";  // what the shell runs, for /bin/sh
 };
 

@@ -11,6 +11,7 @@
 #include <string>
 
 #include "current.h"
+#include "layout.h"
 #include "on_top.h"
 #include "press_guard.h"
 #include "veil.h"
@@ -24,6 +25,24 @@ struct Question {
   const char* yes;
   const char* no;
 };
+
+struct PromptLayout {
+  SKIA_Rect frame;
+  SKIA_Rect title;
+  SKIA_Rect words;
+  std::array<SKIA_Rect, 2> buttons;
+};
+
+constexpr PromptLayout layOutPrompt(ScreenSize screen) {
+  const int gap = gapOf(screen);
+  const SKIA_Rect whole = {0, 0, screen.width, screen.height, 0};
+  const auto middle = rowsOf<3>(whole, 0, {3, 4, 3})[1];
+  const bool isWide = isLandscape(screen);
+  const SKIA_Rect frame = isWide ? columnsOf<3>(middle, 0, {1, 2, 1})[1] : within(middle, gap);
+  const auto [title, words, buttons] = rowsOf<3>(within(frame, gap), gap, {2, 5, 3});
+  return {inColor(frame, kPanelInk.ground), inColor(title, kHeadInk.ground), words,
+          columnsOf<2>(inColor(buttons, kButtonInk.ground), 2 * gap, {1, 1})};
+}
 
 /// Stands in the top layer from construction to destruction. The left button or the select key says
 /// yes, the right button or the back key no. There is one at a time.
