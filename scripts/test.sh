@@ -4,6 +4,7 @@
 #   release  the unit, thread and end-to-end tests, optimised
 #   asan     the same under the address and undefined-behaviour sanitizers
 #   tsan     the same under the thread sanitizer
+#   fuzz     the fuzzers, a few seconds each
 #   phone    the library alone, without the PC platform
 #   tidy     formatting and clang-tidy, everywhere
 set -euo pipefail
@@ -21,7 +22,7 @@ build() {
 
 run_suite() {
   case $1 in
-    release | asan | tsan)
+    release | asan | tsan | fuzz)
       build "$1"
       echo "== Testing $1"
       ctest --preset "$1" --parallel "$(nproc)"
@@ -29,14 +30,14 @@ run_suite() {
     phone) build phone ;;
     tidy) scripts/tidy.sh ;;
     *)
-      echo "test.sh: unknown suite '$1': release, asan, tsan, phone or tidy" >&2
+      echo "test.sh: unknown suite '$1': release, asan, tsan, fuzz, phone or tidy" >&2
       exit 2
       ;;
   esac
 }
 
 suites=("$@")
-((${#suites[@]} > 0)) || suites=(phone tidy asan tsan release)
+((${#suites[@]} > 0)) || suites=(phone tidy asan tsan fuzz release)
 scripts/install_packages.sh
 for suite in "${suites[@]}"; do run_suite "$suite"; done
 echo "== Passed: ${suites[*]}"

@@ -34,8 +34,8 @@ void receiveLog(const __android_logger_data* data, const char* message) {
 
 DrawnText drawn(const SKIA_Text& text) {
   const auto length = static_cast<std::size_t>(text.string_len);
-  // A length outside the record is kept as text that no expectation names.
-  if (length >= SKIA_TEXT_BYTES) return {"length outside the record", 0, 0, text.string_len};
+  // A length outside the record is kept as a text that fits into none.
+  if (length >= SKIA_TEXT_BYTES) return {std::string(SKIA_TEXT_BYTES, '?'), 0, 0, text.string_len};
   return {std::string(text.text, length), text.color, text.align, text.size};
 }
 

@@ -6,6 +6,7 @@
 #include <brimol/input.h>
 
 #include <algorithm>
+#include <array>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
@@ -18,29 +19,49 @@
 
 #include "complain.h"
 #include "factory_test.h"
-#include "task.h"
 #include "pages/table.h"
+#include "plan/plan_json.h"
+#include "task.h"
 
 namespace factory_test {
 
 namespace {
 
 constexpr unsigned int kLoopMs = 5;
-constexpr int kUsageError = 2;
 
 volatile std::sig_atomic_t interrupted = 0;
 
 void endOnSignals() {
-  for (const int number : {SIGINT, SIGTERM}) std::signal(number, [](int) { interrupted = 1; });
+  for (const int number : {SIGINT, SIGTERM, SIGHUP})
+    std::signal(number, [](int) { interrupted = 1; });
 }
 
-int fail(const std::string& why) {
+ExitCode fail(const std::string& why) {
   complain(why);
-  return EXIT_FAILURE;
+  return ExitCode::Trouble;
 }
 
-void loop(FactoryTest& test) {
-  while (!test.isEnded() && brimol_host_close_requested() == 0 && interrupted == 0) {
+// What the exit code tells of.
+ExitCode judge(const Options& options, const ResultBook& book) {
+  if (options.test.empty()) return judgeRun(book, book.run().tests);
+  return judgeRun(book, std::array{options.test});
+}
+
+std::string wrongScreen() {
+  constexpr int kLeastShort = 320;  // pixels
+  constexpr int kLeastLong = 480;
+  constexpr int kMostRatio = 3;
+  int width = 0;
+  int height = 0;
+  brimol_host_screen_size(&width, &height);
+  const auto [shorter, longer] = std::minmax(width, height);
+  if (shorter >= kLeastShort && longer >= kLeastLong && longer <= kMostRatio * shorter) return {};
+  return "the screen of " + std::to_string(width) + "x" + std::to_string(height) +
+         " pixels has no room for the pages: at least 320x480, and no side three times the other";
+}
+
+void loop(FactoryTest& test, bool stays) {
+  while ((stays || !test.isEnded()) && brimol_host_close_requested() == 0 && interrupted == 0) {
     test.update(GetTicks());
     if (MW::isDisplayUpdate(0) == 1) test.draw();
     MW::Window::updateTimer(MW::kUnused);
@@ -63,34 +84,43 @@ std::optional<std::string> readText(const std::string& path, std::string& error)
   return {};
 }
 
-int showScreens(const Options& options, ResultBook& book, const Context& context) {
-  FactoryTest test(book, context);
+void letMonkeyPlay(const Options& options) {
+  const std::string events = options.events.empty() ? "" : ":" + options.events;
+  const std::string trace =
+      options.monkeyTrace.empty() ? "monkey-" + options.monkey + ".trace" : options.monkeyTrace;
+  setenv("BRIMOL_MONKEY", (options.monkey + events).c_str(), 1);
+  setenv("BRIMOL_RECORD", trace.c_str(), 1);
+  setenv("BRIMOL_DISPLAY", "headless", 1);
+}
+
+ExitCode showScreens(const Options& options, ResultBook& book, const Context& context,
+                     const Task& task) {
+  FactoryTest test(book, context, task);
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
-    loop(test);
-    return EXIT_SUCCESS;
+    loop(test, options.stays);
+    return options.monkey.empty() ? judge(options, book) : ExitCode::Passed;
   }
   if (brimol_host_screenshot(options.shot.c_str()) == 0) return fail(brimol_host_error());
-  return EXIT_SUCCESS;
+  return ExitCode::Passed;
 }
 
 }  // namespace
 
-int runApplication(const Options& options) {
+ExitCode runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
+  if (!options.monkey.empty()) letMonkeyPlay(options);
   std::string error;
   const auto task = chooseTask(options, error);
   if (!task) {
     complain(error);
-    return kUsageError;
+    return ExitCode::WrongUse;
   }
-  RunStart run;
-  for (const TestEntry& each : testEntries()) {
-    if (each.plan == DefaultPlan::In) run.tests.emplace_back(each.id);
-  }
+  RunStart run = {.planName = task->plan.name, .planHash = planHash(task->plan)};
+  for (const PlanStep& step : task->plan.steps) run.tests.push_back(step.test);
   auto book = ResultBook::open({.json = options.results, .junit = options.junit}, run, error);
   if (!book) return fail(error);
   Context context = {*book, log, {}, options.shell, task->plan};
@@ -98,12 +128,13 @@ int runApplication(const Options& options) {
     context.logText = readText(options.log, error);
     if (!context.logText) return fail(error);
   }
-  if (brimol_host_open() == 0) return EXIT_FAILURE;
+  if (brimol_host_open() == 0) return ExitCode::Trouble;
+  if (const std::string wrong = wrongScreen(); !wrong.empty()) return fail(wrong);
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;
-  const int result =
-      started ? showScreens(options, *book, context) : fail("no memory for the dispatch thread");
+  const ExitCode result = started ? showScreens(options, *book, context, *task)
+                                  : fail("no memory for the dispatch thread");
   MW::Window::destroy();
   return result;
 }

@@ -2,13 +2,14 @@
 #pragma once
 
 #include <algorithm>
+#include <atomic>
 #include <cstdint>
 #include <map>
 
 namespace factory_test {
 
 /// Counts presses that follow a release of the same key sooner than a finger can. It is told what
-/// happened and when, in GetTicks() milliseconds, which may wrap.
+/// happened and when, in GetTicks() milliseconds, which may wrap, on one thread, and asked on any.
 class KeyBounce {
  public:
   static constexpr uint32_t kFingerMs = 40;  ///< the least from a release to the next press
@@ -18,15 +19,15 @@ class KeyBounce {
     const auto last = released.find(code);
     if (last == released.end() || now - last->second >= kFingerMs) return;
     ++bounces;
-    longest = std::max(longest, now - last->second);
+    longest = std::max(longest.load(), now - last->second);
   }
   int count() const { return bounces; }
   uint32_t longestMs() const { return longest; }
 
  private:
   std::map<unsigned int, uint32_t> released;  // when, by code
-  int bounces = 0;
-  uint32_t longest = 0;
+  std::atomic<int> bounces = 0;
+  std::atomic<uint32_t> longest = 0;
 };
 
 }  // namespace factory_test

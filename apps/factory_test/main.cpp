@@ -11,10 +11,9 @@
 #include "options.h"
 #include "plan/plan_json.h"
 #include "task.h"
+#include "version.h"
 
 namespace {
-
-constexpr int kUsageError = 2;
 
 void printHelp() {
   std::printf("%s\nOn a PC:\n%s", factory_test::usage().c_str(), brimol_host_help());
@@ -25,7 +24,7 @@ int printPlan(const factory_test::Options& options) {
   const auto task = factory_test::chooseTask(options, error);
   if (!task) {
     factory_test::complain(error);
-    return kUsageError;
+    return static_cast<int>(factory_test::ExitCode::WrongUse);
   }
   std::fputs(factory_test::planJson(task->plan).c_str(), stdout);
   return EXIT_SUCCESS;
@@ -39,12 +38,16 @@ int main(int count, char** arguments) {
   const auto options = factory_test::parseOptions(all.subspan(all.empty() ? 0 : 1), error);
   if (!options) {
     factory_test::complain(error);
-    return kUsageError;
+    return static_cast<int>(factory_test::ExitCode::WrongUse);
   }
   if (options->action == factory_test::Options::Action::Help) {
     printHelp();
     return EXIT_SUCCESS;
   }
+  if (options->action == factory_test::Options::Action::Version) {
+    std::printf("factory_test %s\n", factory_test::kVersion);
+    return EXIT_SUCCESS;
+  }
   if (options->action == factory_test::Options::Action::PrintPlan) return printPlan(*options);
-  return factory_test::runApplication(*options);
+  return static_cast<int>(factory_test::runApplication(*options));
 }

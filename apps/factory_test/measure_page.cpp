@@ -23,9 +23,7 @@ constexpr int kLinePercent = 4;  // of the screen's longer side, from one line t
 
 MeasurePage::MeasurePage(const Context& program, const char* test, const char* title,
                          const char* usualWords)
-    : LookTest(title, ""), step(stepOf(program, test)) {
-  instructions = step.text.empty() ? usualWords : step.text;
-}
+    : LookTest(title, ""), step(stepOf(program, test)), instructions(usualWords) {}
 
 std::string MeasurePage::question() const {
   return isDone() ? "Done. Is it right?" : "Not everything was seen.";
@@ -109,7 +107,7 @@ void MeasurePage::drawWords(const std::vector<std::string>& words) const {
   int top = percentOf(screen.height, wordsAt());
   for (const std::string& each : words) {
     skia_add_label_c({0, top, screen.width, height, 0},
-                     textOf(each.c_str(), MW::kColorWhite, SKIA_ALIGN_CENTRE, textSize(screen)));
+                     textOf(each.c_str(), kPageInk.text, SKIA_ALIGN_CENTRE, textSize(screen)));
     top += height;
   }
 }

@@ -21,6 +21,7 @@ class MeasurePage : public LookTest {
   Outcome verdict() const final { return hasPassed ? Outcome::Pass : page.outcome(); }
   bool isComplete() const final { return hasPassed || isDone(); }
   void draw() final;
+  void instruct(const std::string& words) final { instructions = words; }
 
  protected:
   /// `usualWords`: what to do, unless the plan says it.

@@ -47,7 +47,7 @@ void StepPage::moveBy(int by, uint32_t now) {
 
 void StepPage::drawLook() {
   const ScreenSize screen = screenSize();
-  skia_add_box_c({0, 0, screen.width, screen.height, kGroundColor});
+  skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
   if (step >= 0) drawStep(step);
 }
 

@@ -13,6 +13,7 @@ needs() {
 library=libbrimol3-widget$INTERFACE
 needs "$library" android-libutils
 needs "$library" libsdl2-2.0-0
+needs "$library" 'libwebsockets[0-9]+'
 needs "$library" fonts-roboto
 needs libbrimol3-widget-dev "$library"
 needs brimol3-widget-tools "$library"

@@ -23,7 +23,10 @@ for program in "$staged"/bin/*; do
 done
 
 desktop-file-validate "$staged/share/applications/factory_test.desktop"
-"$staged/bin/factory_test" --headless --shot "$WORK/menu.png"
+
+# What is for windows and browsers alone is opened for them alone.
+opened=$(LD_DEBUG=files "$staged/bin/factory_test" --headless --shot "$WORK/menu.png" 2>&1)
+! grep -E 'libSDL2|libwebsockets|libvncserver' <<<"$opened" || fail "A session without a user opens these."
 
 # The devices stand in one table of the platform; the manual page and the layout lint name all of them.
 page=$(gzip -dc "$staged/share/man/man7/brimol3_widget.7.gz" | sed 's/\\-/-/g')

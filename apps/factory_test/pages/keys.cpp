@@ -52,8 +52,7 @@ class KeyTest : public PageTest {
  public:
   KeyTest()
       : PageTest("Keys",
-                 "Press every key once, one key twice\nand one three times in a row.\n"
-                 "Back three times: FAIL.") {}
+                 "Press every key once, one twice and one\nthree times. Back three times: FAIL.") {}
 
   void enter() override {
     page.ask(VerdictBar::Keys::Free);
@@ -76,9 +75,12 @@ class KeyTest : public PageTest {
     page.endAsking();
   }
 
+  bool isComplete() const override {
+    return std::ranges::all_of(pressed, [](const auto& each) { return each.load(); });
+  }
+
   Outcome verdict() const override {
-    const bool isDone = std::ranges::all_of(pressed, [](const auto& each) { return each.load(); });
-    if (isDone) return Outcome::Pass;
+    if (isComplete()) return Outcome::Pass;
     return failed ? Outcome::Fail : page.outcome();
   }
 
@@ -112,14 +114,16 @@ class KeyTest : public PageTest {
 
   static void drawKey(int index, bool isPressed) {
     const ScreenSize screen = screenSize();
-    skia_add_textbox_c(cellOf(screen, kKeyGrid, index, isPressed ? kPassColor : kButtonColor),
-                       captionOf(kAsked.at(static_cast<std::size_t>(index)).name));
+    const Grid grid = isLandscape(screen) ? Grid{3, 4} : Grid{4, 3};
+    const Ink ink = isPressed ? kPassInk : kButtonInk;
+    skia_add_textbox_c(inColor(cellOf(contentArea(), gapOf(screen), grid, index), ink.ground),
+                       captionOf(kAsked.at(static_cast<std::size_t>(index)).name, ink.text));
   }
 
   Current<KeyTest> current{this};
   std::atomic<bool> failed = false;
   std::array<std::atomic<bool>, kAsked.size()> pressed = {};
-  KeyBounce bounce;  // dispatch thread; main thread after leave()
+  KeyBounce bounce;  // told on the dispatch thread
   std::optional<MW::Key> key;
 };
 

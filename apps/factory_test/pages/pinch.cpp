@@ -50,7 +50,7 @@ class PinchPage : public MeasurePage {
   void drawLook() override {
     constexpr int kWidth = 6;  // pixels
     const ScreenSize screen = screenSize();
-    skia_add_box_c({0, 0, screen.width, screen.height, kGroundColor});
+    skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
     const Middle at = middle();
     for (const auto& [finger, input] : fingers) {
       skia_add_line_c(

@@ -45,11 +45,11 @@ class StuckTouchPage : public MeasurePage {
 
   void drawLook() override {
     const ScreenSize screen = screenSize();
-    skia_add_box_c({0, 0, screen.width, screen.height, kGroundColor});
+    skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
     const std::string words = std::to_string(secondsLeft) + " s";
     const int size = 4 * textSize(screen);
     skia_add_label_c({0, percentOf(screen.height, 15), screen.width, 2 * size, 0},
-                     textOf(words.c_str(), MW::kColorWhite, SKIA_ALIGN_CENTRE, size));
+                     textOf(words.c_str(), kPageInk.text, SKIA_ALIGN_CENTRE, size));
   }
 
  private:

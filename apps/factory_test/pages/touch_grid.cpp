@@ -48,7 +48,7 @@ class TouchGridPage : public MeasurePage {
       const int right = (i % grid.columns + 1) * screen.width / grid.columns;
       const int bottom = (i / grid.columns + 1) * screen.height / grid.rows;
       skia_add_box_c({left, top, right - left - kGap, bottom - top - kGap,
-                      painted.at(static_cast<std::size_t>(i)) ? kPassColor : kGroundColor});
+                      painted.at(static_cast<std::size_t>(i)) ? kPassInk.ground : kPageInk.ground});
     }
   }
 

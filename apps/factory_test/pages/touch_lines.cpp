@@ -76,10 +76,10 @@ class TouchLinesPage : public MeasurePage {
   void drawLook() override {
     constexpr int kWidth = 4;  // pixels
     const ScreenSize screen = screenSize();
-    skia_add_box_c({0, 0, screen.width, screen.height, kGroundColor});
+    skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
     for (const Line& line : lines) {
       skia_add_line_c({line.from.x, line.from.y, line.to.x, line.to.y,
-                       line.isFollowed ? kPassColor : kLineColor, kWidth});
+                       line.isFollowed ? kPassInk.ground : kLineColor, kWidth});
     }
     for (std::size_t i = 1; i < trace.size(); ++i) {
       skia_add_line_c(

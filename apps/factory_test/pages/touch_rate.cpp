@@ -42,7 +42,7 @@ class TouchRatePage : public MeasurePage {
 
   void drawLook() override {
     const ScreenSize screen = screenSize();
-    skia_add_box_c({0, 0, screen.width, screen.height, kGroundColor});
+    skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
     if (last) {
       const int side = 2 * textSize(screen);
       skia_add_roundbox_c({last->x - side / 2, last->y - side / 2, side, side, kDotColor});

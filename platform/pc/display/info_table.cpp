@@ -14,8 +14,8 @@ constexpr int kLeastLetter = 6;  // pixels
 constexpr double kPanelAlpha = 0.93;
 constexpr int kNatural = -1;  // Pango's width of a text that is not wrapped
 
-TextLayout layoutOf(const Fonts& fonts, std::string_view text, int letter, int width) {
-  TextLayout layout(pango_layout_new(fonts.context()));
+TextLayout layoutOf(Fonts& fonts, std::string_view text, int letter, int width) {
+  TextLayout layout(pango_layout_new(fonts.contextFor(text)));
   const FontDescription font = projectFonts(letter);
   pango_layout_set_font_description(layout.get(), font.get());
   pango_layout_set_text(layout.get(), text.data(), static_cast<int>(text.size()));
@@ -49,8 +49,7 @@ void show(cairo_t* context, const TextLayout& layout, int left, int top) {
 
 }  // namespace
 
-InfoTable::InfoTable(const Fonts& fonts, const std::vector<HelpRow>& rows, int wantedLetter,
-                     Size room)
+InfoTable::InfoTable(Fonts& fonts, const std::vector<HelpRow>& rows, int wantedLetter, Size room)
     : letter(std::max(wantedLetter, kLeastLetter)) {
   layOut(fonts, rows, room.w);
   while (letter > kLeastLetter && (extent.h > room.h || extent.w > room.w)) {
@@ -60,7 +59,7 @@ InfoTable::InfoTable(const Fonts& fonts, const std::vector<HelpRow>& rows, int w
 }
 
 // Around the words and between the columns is a letter's height, between the rows a third of it.
-void InfoTable::layOut(const Fonts& fonts, const std::vector<HelpRow>& rows, int width) {
+void InfoTable::layOut(Fonts& fonts, const std::vector<HelpRow>& rows, int width) {
   constexpr int kMargins = 3;
   constexpr int kGapPart = 3;
   lines.clear();

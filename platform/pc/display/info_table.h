@@ -16,7 +16,7 @@ namespace brimol::pc {
 class InfoTable {
  public:
   /// In letters of `letter` pixels, or of fewer where the room is too small for them.
-  InfoTable(const Fonts& fonts, const std::vector<HelpRow>& rows, int letter, Size room);
+  InfoTable(Fonts& fonts, const std::vector<HelpRow>& rows, int letter, Size room);
 
   /// Of the panel.
   Size size() const { return extent; }
@@ -29,7 +29,7 @@ class InfoTable {
     int height;
   };
 
-  void layOut(const Fonts& fonts, const std::vector<HelpRow>& rows, int width);
+  void layOut(Fonts& fonts, const std::vector<HelpRow>& rows, int width);
 
   int letter;  // pixels
   int labelWidth = 0;

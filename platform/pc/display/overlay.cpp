@@ -158,7 +158,7 @@ cairo_surface_t* Overlay::drawOver(cairo_surface_t* shown, const WindowFit& fit)
   return picture.get();
 }
 
-const Fonts& Overlay::fonts() {
+Fonts& Overlay::fonts() {
   if (!borrowed) borrowed = borrowFonts();
   return *borrowed;
 }

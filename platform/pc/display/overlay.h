@@ -33,7 +33,7 @@ class Overlay {
   cairo_surface_t* drawOver(cairo_surface_t* shown, const WindowFit& fit);
 
  private:
-  const Fonts& fonts();
+  Fonts& fonts();
   void drawFigures(cairo_t* context, const WindowFit& fit);
   void drawKeys(cairo_t* context, const WindowFit& fit);
 

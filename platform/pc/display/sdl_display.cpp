@@ -1,7 +1,5 @@
 #include "display/sdl_display.h"
 
-#include <SDL.h>
-
 #include <algorithm>
 #include <cstdlib>
 #include <limits>
@@ -24,35 +22,35 @@ const char* visibleDrivers() {
 
 void setHints() {
   // The default priority leaves the last word to the environment.
-  SDL_SetHintWithPriority(SDL_HINT_VIDEODRIVER, visibleDrivers(), SDL_HINT_DEFAULT);
-  SDL_SetHint(SDL_HINT_NO_SIGNAL_HANDLERS, "1");        // Ctrl-C is the application's
-  SDL_SetHint(SDL_HINT_MOUSE_FOCUS_CLICKTHROUGH, "1");  // the click that brings the focus counts
-  SDL_SetHint(SDL_HINT_TOUCH_MOUSE_EVENTS, "0");
-  SDL_SetHint(SDL_HINT_MOUSE_TOUCH_EVENTS, "0");
-  SDL_SetHint(SDL_HINT_VIDEO_ALLOW_SCREENSAVER, "1");
-  SDL_SetHint(SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0");
+  sdl().setHintWithPriority(SDL_HINT_VIDEODRIVER, visibleDrivers(), SDL_HINT_DEFAULT);
+  sdl().setHint(SDL_HINT_NO_SIGNAL_HANDLERS, "1");        // Ctrl-C is the application's
+  sdl().setHint(SDL_HINT_MOUSE_FOCUS_CLICKTHROUGH, "1");  // the click that brings the focus counts
+  sdl().setHint(SDL_HINT_TOUCH_MOUSE_EVENTS, "0");
+  sdl().setHint(SDL_HINT_MOUSE_TOUCH_EVENTS, "0");
+  sdl().setHint(SDL_HINT_VIDEO_ALLOW_SCREENSAVER, "1");
+  sdl().setHint(SDL_HINT_VIDEO_X11_NET_WM_BYPASS_COMPOSITOR, "0");
 }
 
 // The detour over a texture, which SDL prefers, costs what WindowPixels says.
 void chooseShortWay() {
-  const std::string driver = SDL_GetCurrentVideoDriver();
+  const std::string driver = sdl().getCurrentVideoDriver();
   if (driver == "x11") {
-    SDL_SetHintWithPriority(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0", SDL_HINT_DEFAULT);
+    sdl().setHintWithPriority(SDL_HINT_FRAMEBUFFER_ACCELERATION, "0", SDL_HINT_DEFAULT);
   }
 }
 
 // The room that the desktop has for a window's content.
 Size desktopRoom(SDL_Window* window) {
   SDL_Rect usable = {};
-  const int desktop = window != nullptr ? std::max(SDL_GetWindowDisplayIndex(window), 0) : 0;
-  if (SDL_GetDisplayUsableBounds(desktop, &usable) != 0) {
+  const int desktop = window != nullptr ? std::max(sdl().getWindowDisplayIndex(window), 0) : 0;
+  if (sdl().getDisplayUsableBounds(desktop, &usable) != 0) {
     return {std::numeric_limits<int>::max(), std::numeric_limits<int>::max()};
   }
   int top = 0;
   int left = 0;
   int bottom = 0;
   int right = 0;
-  if (window != nullptr) SDL_GetWindowBordersSize(window, &top, &left, &bottom, &right);
+  if (window != nullptr) sdl().getWindowBordersSize(window, &top, &left, &bottom, &right);
   return {std::max(usable.w - left - right, 1), std::max(usable.h - top - bottom, 1)};
 }
 
@@ -61,32 +59,36 @@ Size openingSize(Size screen, Size room) {
   return fittedSize(screen, {std::min(room.w, screen.w), std::min(room.h, screen.h)});
 }
 
+OpenedDisplay failed(const std::string& reason) {
+  return {nullptr, "cannot open a window: " + reason + " (BRIMOL_DISPLAY=headless does without)"};
+}
+
 }  // namespace
 
 SdlVideo::SdlVideo() {
   setHints();
-  isOpen = SDL_Init(SDL_INIT_VIDEO) == 0;
+  isOpen = sdl().init(SDL_INIT_VIDEO) == 0;
   if (!isOpen) return;
   chooseShortWay();
-  SDL_StopTextInput();  // keys are keys here, no input method composes with them
+  sdl().stopTextInput();  // keys are keys here, no input method composes with them
 }
 
-SdlVideo::~SdlVideo() { SDL_Quit(); }
+SdlVideo::~SdlVideo() { sdl().quit(); }
 
 OpenedDisplay SdlDisplay::open(Size screen, InputTranslator& input, const InputService& service) {
+  if (const std::string& missing = sdl().library.error(); !missing.empty()) return failed(missing);
   std::unique_ptr<SdlDisplay> display(new SdlDisplay(screen, input, service));
   if (display->window) return {std::move(display), {}};
-  return {nullptr, std::string("cannot open a window: ") + SDL_GetError() +
-                       " (BRIMOL_DISPLAY=headless does without)"};
+  return failed(sdl().getError());
 }
 
 SdlDisplay::SdlDisplay(Size screenSize, InputTranslator& target, const InputService& clock)
     : screen(screenSize), input(screenSize, target), service(clock) {
   if (!video.isOpen) return;
   wantedSize = openingSize(screen, desktopRoom(nullptr));
-  window.reset(SDL_CreateWindow(kTitle, SDL_WINDOWPOS_UNDEFINED, SDL_WINDOWPOS_UNDEFINED,
-                                wantedSize.w, wantedSize.h,
-                                SDL_WINDOW_RESIZABLE | SDL_WINDOW_ALLOW_HIGHDPI));
+  window.reset(sdl().createWindow(kTitle, SDL_WINDOWPOS_UNDEFINED, SDL_WINDOWPOS_UNDEFINED,
+                                  wantedSize.w, wantedSize.h,
+                                  SDL_WINDOW_RESIZABLE | SDL_WINDOW_ALLOW_HIGHDPI));
   if (!window) return;
   pixels = WindowPixels::of(window.get());
   takeWindowSize();
@@ -103,11 +105,11 @@ void SdlDisplay::wait(std::optional<uint32_t> ms) {
   const std::optional<uint32_t> tick = input.msToTick(service.now());
   const uint32_t least = std::min({ms.value_or(kLongest), tick.value_or(kLongest), kLongest});
   SDL_Event event;
-  int isEvent =
-      ms || tick ? SDL_WaitEventTimeout(&event, static_cast<int>(least)) : SDL_WaitEvent(&event);
+  int isEvent = ms || tick ? sdl().waitEventTimeout(&event, static_cast<int>(least))
+                           : sdl().waitEvent(&event);
   for (int count = 1; isEvent != 0; ++count) {
     handle(event);
-    isEvent = count < kEventsPerWait ? SDL_PollEvent(&event) : 0;
+    isEvent = count < kEventsPerWait ? sdl().pollEvent(&event) : 0;
   }
   input.tick(service.now());
   if (overlay.setFingers(input.fingers())) showAll();
@@ -118,7 +120,7 @@ void SdlDisplay::wake() {
   SDL_Event event = {};
   event.type = kWakeEvent;
   // A full queue has no room for it, and ends the wait without it.
-  if (SDL_PushEvent(&event) != 1) wakeIsComing = false;
+  if (sdl().pushEvent(&event) != 1) wakeIsComing = false;
 }
 
 void SdlDisplay::handle(const SDL_Event& event) {
@@ -162,8 +164,8 @@ void SdlDisplay::play(DisplayKey key) {
 }
 
 void SdlDisplay::toggleFullScreen() {
-  const bool isFull = (SDL_GetWindowFlags(window.get()) & SDL_WINDOW_FULLSCREEN_DESKTOP) != 0;
-  SDL_SetWindowFullscreen(window.get(), isFull ? 0 : SDL_WINDOW_FULLSCREEN_DESKTOP);
+  const bool isFull = (sdl().getWindowFlags(window.get()) & SDL_WINDOW_FULLSCREEN_DESKTOP) != 0;
+  sdl().setWindowFullscreen(window.get(), isFull ? 0 : SDL_WINDOW_FULLSCREEN_DESKTOP);
 }
 
 // The borders are known only once a window manager has put them around the window. A window that
@@ -172,11 +174,11 @@ void SdlDisplay::fitToDesktop() {
   const Size fitted = openingSize(screen, desktopRoom(window.get()));
   if (fitted == wantedSize || points != wantedSize) return;
   wantedSize = fitted;
-  SDL_SetWindowSize(window.get(), fitted.w, fitted.h);
+  sdl().setWindowSize(window.get(), fitted.w, fitted.h);
 }
 
 void SdlDisplay::takeWindowSize() {
-  SDL_GetWindowSize(window.get(), &points.w, &points.h);
+  sdl().getWindowSize(window.get(), &points.w, &points.h);
   canvas.emplace(screen, pixels->size());
   if (latest != nullptr) canvas->update(latest, {{0, 0, screen.w, screen.h}});
   showAll();

@@ -1,9 +1,6 @@
 /// The window on a desktop or a bare console.
 #pragma once
 
-#include <SDL_events.h>
-#include <SDL_video.h>
-
 #include <atomic>
 #include <memory>
 #include <optional>
@@ -11,6 +8,7 @@
 
 #include "display/display.h"
 #include "display/overlay.h"
+#include "display/sdl_calls.h"
 #include "display/sdl_input.h"
 #include "display/window_canvas.h"
 #include "display/window_pixels.h"
@@ -19,7 +17,7 @@
 namespace brimol::pc {
 
 struct SdlWindowDeleter {
-  void operator()(SDL_Window* window) const { SDL_DestroyWindow(window); }
+  void operator()(SDL_Window* window) const { sdl().destroyWindow(window); }
 };
 
 /// SDL's video part, begun with the object and ended with it. Nothing else in the process uses it.

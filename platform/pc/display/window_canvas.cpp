@@ -2,6 +2,8 @@
 
 #include <cstddef>
 
+#include "scene/new_picture.h"
+
 namespace brimol::pc {
 namespace {
 
@@ -27,8 +29,7 @@ Region toWindow(const WindowFit& fit, const Region& changed) {
 WindowCanvas::WindowCanvas(Size screen, Size window)
     : placement(WindowFit::of(screen, window)),
       scaler(screen, {placement.shown.width, placement.shown.height}),
-      content(
-          cairo_image_surface_create(CAIRO_FORMAT_RGB24, placement.window.w, placement.window.h)) {}
+      content(newPicture(placement.window)) {}
 
 Region WindowCanvas::update(cairo_surface_t* picture, const Region& changed) {
   Region parts = toWindow(placement, changed);

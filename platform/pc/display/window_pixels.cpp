@@ -1,19 +1,19 @@
 #include "display/window_pixels.h"
 
-#include <SDL.h>
-
 #include <algorithm>
 #include <string_view>
 #include <vector>
+
+#include "display/sdl_calls.h"
 
 namespace brimol::pc {
 
 namespace {
 
 struct SdlDeleter {
-  void operator()(SDL_Surface* surface) const { SDL_FreeSurface(surface); }
-  void operator()(SDL_Renderer* renderer) const { SDL_DestroyRenderer(renderer); }
-  void operator()(SDL_Texture* texture) const { SDL_DestroyTexture(texture); }
+  void operator()(SDL_Surface* surface) const { sdl().freeSurface(surface); }
+  void operator()(SDL_Renderer* renderer) const { sdl().destroyRenderer(renderer); }
+  void operator()(SDL_Texture* texture) const { sdl().destroyTexture(texture); }
 };
 using Surface = std::unique_ptr<SDL_Surface, SdlDeleter>;
 using Renderer = std::unique_ptr<SDL_Renderer, SdlDeleter>;
@@ -23,7 +23,7 @@ constexpr Uint32 kFormat = SDL_PIXELFORMAT_RGB888;
 
 // The pixels as SDL sees them, which stay the content's.
 Surface surfaceOf(cairo_surface_t* content) {
-  return Surface(SDL_CreateRGBSurfaceWithFormatFrom(
+  return Surface(sdl().createRGBSurfaceWithFormatFrom(
       cairo_image_surface_get_data(content), cairo_image_surface_get_width(content),
       cairo_image_surface_get_height(content), SDL_BITSPERPIXEL(kFormat),
       cairo_image_surface_get_stride(content), kFormat));
@@ -40,22 +40,22 @@ class SurfacePixels : public WindowPixels {
 
   Size size() override {
     Size pixels = {};
-    SDL_GetWindowSize(window, &pixels.w, &pixels.h);
+    sdl().getWindowSize(window, &pixels.w, &pixels.h);
     return pixels;
   }
 
   void show(cairo_surface_t* content, const Region& parts) override {
-    SDL_Surface* const shown = SDL_GetWindowSurface(window);
+    SDL_Surface* const shown = sdl().getWindowSurface(window);
     const Surface pixels = surfaceOf(content);
     if (shown == nullptr || !pixels || parts.empty()) return;
     std::vector<SDL_Rect> updated;
     for (const cairo_rectangle_int_t& part : parts) {
       const SDL_Rect from = toSdl(part);
       SDL_Rect to = from;
-      SDL_BlitSurface(pixels.get(), &from, shown, &to);  // leaves in `to` what the window has of it
+      sdl().upperBlit(pixels.get(), &from, shown, &to);  // leaves in `to` what the window has of it
       updated.push_back(to);
     }
-    SDL_UpdateWindowSurfaceRects(window, updated.data(), static_cast<int>(updated.size()));
+    sdl().updateWindowSurfaceRects(window, updated.data(), static_cast<int>(updated.size()));
   }
 
  private:
@@ -69,7 +69,7 @@ class TexturePixels : public WindowPixels {
 
   Size size() override {
     Size pixels = {};
-    SDL_GetRendererOutputSize(renderer.get(), &pixels.w, &pixels.h);
+    sdl().getRendererOutputSize(renderer.get(), &pixels.w, &pixels.h);
     return pixels;
   }
 
@@ -80,15 +80,15 @@ class TexturePixels : public WindowPixels {
     if (isNew) makeTexture(wanted);
     if (!texture) return;
     update(content, isNew ? Region{{0, 0, wanted.w, wanted.h}} : parts);
-    SDL_RenderCopy(renderer.get(), texture.get(), nullptr, nullptr);
-    SDL_RenderPresent(renderer.get());
+    sdl().renderCopy(renderer.get(), texture.get(), nullptr, nullptr);
+    sdl().renderPresent(renderer.get());
   }
 
  private:
   void makeTexture(Size wanted) {
     textureSize = wanted;
-    texture.reset(SDL_CreateTexture(renderer.get(), kFormat, SDL_TEXTUREACCESS_STREAMING, wanted.w,
-                                    wanted.h));
+    texture.reset(sdl().createTexture(renderer.get(), kFormat, SDL_TEXTUREACCESS_STREAMING,
+                                      wanted.w, wanted.h));
   }
 
   void update(cairo_surface_t* content, const Region& parts) {
@@ -96,10 +96,10 @@ class TexturePixels : public WindowPixels {
     const int stride = cairo_image_surface_get_stride(content);
     for (const cairo_rectangle_int_t& part : parts) {
       const SDL_Rect to = toSdl(part);
-      SDL_UpdateTexture(texture.get(), &to,
-                        cairo_image_surface_get_data(content) + std::ptrdiff_t{part.y} * stride +
-                            std::ptrdiff_t{part.x} * kPixelBytes,
-                        stride);
+      sdl().updateTexture(texture.get(), &to,
+                          cairo_image_surface_get_data(content) + std::ptrdiff_t{part.y} * stride +
+                              std::ptrdiff_t{part.x} * kPixelBytes,
+                          stride);
     }
   }
 
@@ -114,8 +114,8 @@ class TexturePixels : public WindowPixels {
 // every change, and threads and start-up time of a graphics driver; the other drivers know no other
 // way, and without a renderer of our own SDL gives them no more pixels than points.
 std::unique_ptr<WindowPixels> WindowPixels::of(SDL_Window* window) {
-  if (std::string_view(SDL_GetCurrentVideoDriver()) != "x11") {
-    Renderer renderer(SDL_CreateRenderer(window, -1, 0));
+  if (std::string_view(sdl().getCurrentVideoDriver()) != "x11") {
+    Renderer renderer(sdl().createRenderer(window, -1, 0));
     if (renderer) return std::make_unique<TexturePixels>(std::move(renderer));
   }
   return std::make_unique<SurfacePixels>(window);

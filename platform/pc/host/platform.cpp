@@ -11,6 +11,7 @@
 #include "host/session.h"
 #include "painter/painter.h"
 #include "remote/browser_display.h"
+#include "scene/new_picture.h"
 
 namespace brimol::pc {
 namespace {
@@ -23,9 +24,8 @@ using std::chrono::steady_clock;
 constexpr std::chrono::seconds kLongestAnswer{1};
 
 CairoSurface copyOf(cairo_surface_t* picture) {
-  CairoSurface copy(cairo_image_surface_create(CAIRO_FORMAT_RGB24,
-                                               cairo_image_surface_get_width(picture),
-                                               cairo_image_surface_get_height(picture)));
+  CairoSurface copy =
+      newPicture({cairo_image_surface_get_width(picture), cairo_image_surface_get_height(picture)});
   const CairoContext context(cairo_create(copy.get()));
   cairo_set_operator(context.get(), CAIRO_OPERATOR_SOURCE);
   cairo_set_source_surface(context.get(), picture, 0, 0);

@@ -70,6 +70,7 @@ Session::Session(SessionSettings wanted) : settings(std::move(wanted)), problem(
   if (settings.clock != ClockChoice::Real) startClock();
   if (!settings.reportFolder.empty()) startReport();
   if (isRecording()) startRecording();
+  if (settings.monkey) startMonkey();
   if (!isPlaying()) return;
   std::ranges::for_each(worldAtStart(parsed.trace),
                         [this](const WorldChange& change) { world.change(change, 0); });
@@ -126,6 +127,16 @@ void Session::startRecording() {
     problem = "BRIMOL_RECORD=" + error;
     return;
   }
+  if (settings.monkey) {  // its world is that of a script
+    recorder->startScript(turns->ticksAtStart());
+  } else {
+    recordWorld();
+  }
+  recorder->screen(screenSize);
+  if (density != kDefaultDensity) recorder->density(density);
+}
+
+void Session::recordWorld() {
   std::random_device seeds;
   const uint64_t seed = seeds();
   const auto since1970 = std::chrono::system_clock::now().time_since_epoch();
@@ -133,8 +144,6 @@ void Session::startRecording() {
   world.change({WorldChange::Kind::Time, static_cast<uint64_t>(utc), {}, {}}, 0);
   world.change({WorldChange::Kind::Random, seed, {}, {}}, 0);
   recorder->start(turns->ticksAtStart(), static_cast<uint64_t>(utc), seed);
-  recorder->screen(screenSize);
-  if (density != kDefaultDensity) recorder->density(density);
 }
 
 std::string Session::prepare() {
@@ -164,7 +173,7 @@ void Session::close() {
   if (runner) runner->seeEnd();
   endIfFailed();
   isOver = true;
-  if (recorder) recorder->end(now());
+  if (recorder && !monkey) recorder->end(now());
   if (report) report->end(now(), 0, "closed");
   open = nullptr;
 }
@@ -193,11 +202,13 @@ TraceStage Session::stage() {
 
 std::optional<uint64_t> Session::due(uint64_t soonest) {
   if (isOver) return std::nullopt;
-  if (isRecording()) {
+  if (isRecording() && !isDriven()) {
     const std::lock_guard lock(arrivalMutex);
     return arrivals.empty() ? std::nullopt : std::optional(soonest);
   }
   const std::lock_guard lock(mutex);
+  if (closedBy) return std::max(*closedBy, soonest);
+  if (monkey) return monkey->due(soonest);
   return runner ? runner->due(soonest) : std::nullopt;
 }
 
@@ -207,6 +218,7 @@ void Session::act(uint64_t moment) {
     if (isOver) return;
     hasPosted = false;
     if (runner) runner->act(moment);
+    if (monkey) followMonkey(moment);
     endIfFailed();
     takeArrivals(moment);
     if (!hasPosted) return;
@@ -241,7 +253,7 @@ void Session::deliver(const Event& record) {
 void Session::askToClose() { closeAsked = true; }
 
 void Session::userInput(const Event& record) {
-  if (!isRecording() || isOver) return;
+  if (!isRecording() || isDriven() || isOver) return;
   {
     const std::lock_guard lock(arrivalMutex);
     arrivals.push_back({record, false});
@@ -250,7 +262,7 @@ void Session::userInput(const Event& record) {
 }
 
 void Session::userCloses() {
-  if (!isRecording() || isOver) return;
+  if (!isRecording() || isDriven() || isOver) return;
   {
     const std::lock_guard lock(arrivalMutex);
     arrivals.push_back({{}, true});
@@ -259,7 +271,7 @@ void Session::userCloses() {
 }
 
 std::optional<bool> Session::isCloseRequested() const {
-  if (!isPlaying() && !isRecording()) return std::nullopt;
+  if (!isDriven() && !isRecording()) return std::nullopt;
   return closeAsked.load();
 }
 
@@ -283,7 +295,8 @@ void Session::frame(Platform& platform, Frame&& shown) {
     report->frame({now(), frames, lastFrame, items}, screenSize, picture.get(),
                   std::chrono::duration_cast<std::chrono::microseconds>(taken).count());
   }
-  if (recorder) recorder->frame(now(), items);
+  if (recorder && !monkey) recorder->frame(now(), items);
+  if (monkey) monkey->seeFrame(now());
   if (runner) runner->seeFrame(now(), lastFrame, items);
   endIfFailed();
 }
@@ -337,7 +350,7 @@ std::optional<std::string> Session::figure(const std::string& name, const std::s
   if (!turns) return std::nullopt;
   turns->takePart();
   const std::lock_guard lock(mutex);
-  if (!isRecording()) return world.figure(name);
+  if (!isRecording() || isDriven()) return world.figure(name);
   bool isNew = false;
   std::string value = world.record(name, real, now(), isNew);
   if (isNew && !isOver) recorder->figure(now(), name, value);

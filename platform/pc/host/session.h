@@ -12,6 +12,7 @@
 #include "host/session_report.h"
 #include "host/session_settings.h"
 #include "host/world.h"
+#include "input/monkey.h"
 #include "input/trace_parser.h"
 #include "input/trace_recorder.h"
 #include "input/trace_runner.h"
@@ -66,15 +67,21 @@ class Session {
   };
 
   bool isPlaying() const { return !settings.trace.empty(); }
+  // By a monkey or a trace, and not by the display's user.
+  bool isDriven() const { return isPlaying() || settings.monkey; }
   bool isRecording() const { return !settings.recording.empty(); }
   void startClock();
   void startRecording();
+  void recordWorld();
+  void startMonkey();
   void takeScreen();
   void takeDensity(const Settings& wanted);
   void startReport();
   TraceStage stage();
   std::optional<uint64_t> due(uint64_t soonest);
   void act(uint64_t moment);
+  void followMonkey(uint64_t moment);
+  void tellOfMonkey() const;
   void takeArrivals(uint64_t moment);
   void deliver(const Event& record);
   void askToClose();
@@ -87,6 +94,7 @@ class Session {
 
   // How it ends before the application does; none returns.
   [[noreturn]] void endWithBadTrace();
+  [[noreturn]] void endMonkey(const std::string& why);
   [[noreturn]] void endWithFailure(const TraceFailure& failure);
   std::string keepFailure();
 
@@ -102,6 +110,8 @@ class Session {
   std::optional<SessionReport> report;
   std::optional<TraceRecorder> recorder;
   std::optional<TraceRunner> runner;
+  std::optional<Monkey> monkey;
+  std::optional<uint64_t> closedBy;  // when the application is to have ended, after a monkey
   World world;
   Platform* open = nullptr;
   Frame lastFrame;

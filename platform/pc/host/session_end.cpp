@@ -44,6 +44,15 @@ void Session::endIfFailed() {
   if (runner && runner->failure()) endWithFailure(*runner->failure());
 }
 
+void Session::endMonkey(const std::string& why) {
+  isOver = true;
+  std::cerr << "brimol: monkey " << settings.monkey->seed << ": " << why
+            << "\nTexts on the screen, at " << now() << " ms:\n"
+            << textsOf(lastFrame, screenSize);
+  if (report) report->end(now(), kFailed, "failed");
+  endProcess(kFailed);
+}
+
 void Session::endWithFailure(const TraceFailure& failure) {
   isOver = true;
   const TraceLine& line = failure.line;

@@ -12,6 +12,7 @@ namespace {
 
 constexpr const char* kClockVariable = "BRIMOL_CLOCK";
 constexpr const char* kStartVariable = "BRIMOL_CLOCK_START";
+constexpr const char* kMonkeyVariable = "BRIMOL_MONKEY";
 constexpr const char* kPicturesVariable = "BRIMOL_REPORT_PICTURES";
 constexpr const char* kItemsVariable = "BRIMOL_REPORT_ITEMS";
 
@@ -30,6 +31,7 @@ constexpr auto kClocks = std::to_array<ClockRow>({{"real", ClockChoice::Real},
 
 // What stands for no choice.
 ClockChoice usualClock(const SessionSettings& settings) {
+  if (settings.monkey) return ClockChoice::Simulated;
   if (!settings.recording.empty()) return ClockChoice::Paced;
   return settings.trace.empty() ? ClockChoice::Real : ClockChoice::Simulated;
 }
@@ -43,7 +45,7 @@ std::string readClock(const VariableLookup& lookup, SessionSettings& settings) {
     return std::string(kClockVariable) + "=" + value + ": wanted real, simulated or paced";
   }
   settings.clock = row->clock;
-  const bool isSession = !settings.trace.empty() || !settings.recording.empty();
+  const bool isSession = !settings.trace.empty() || !settings.recording.empty() || settings.monkey;
   if (isSession && settings.clock == ClockChoice::Real) {
     return "BRIMOL_CLOCK=real: a real clock plays no trace and records none";
   }
@@ -61,6 +63,20 @@ std::string readStart(const VariableLookup& lookup, SessionSettings& settings) {
   }
   settings.clockStart = start;
   return {};
+}
+
+// "SEED" or "SEED:EVENTS".
+std::string readMonkey(const VariableLookup& lookup, SessionSettings& settings) {
+  const std::string value = valueOf(lookup, kMonkeyVariable);
+  if (value.empty()) return {};
+  MonkeyWish& wish = settings.monkey.emplace();
+  const char* const end = value.data() + value.size();
+  std::from_chars_result read = std::from_chars(value.data(), end, wish.seed);
+  if (read.ec == std::errc() && read.ptr != end && *read.ptr == ':') {
+    read = std::from_chars(read.ptr + 1, end, wish.events);
+  }
+  if (read.ec == std::errc() && read.ptr == end) return {};
+  return std::string(kMonkeyVariable) + "=" + value + ": wanted SEED or SEED:EVENTS";
 }
 
 std::string readPictures(const VariableLookup& lookup, SessionSettings& settings) {
@@ -84,13 +100,17 @@ SessionSettings readSessionSettings(const VariableLookup& lookup) {
   settings.trace = valueOf(lookup, "BRIMOL_TRACE");
   settings.recording = valueOf(lookup, "BRIMOL_RECORD");
   settings.reportFolder = valueOf(lookup, "BRIMOL_REPORT_DIR");
+  const std::string monkeyError = readMonkey(lookup, settings);
   const std::string clockError = readClock(lookup, settings);
-  for (const std::string& error : {clockError, readStart(lookup, settings),
+  for (const std::string& error : {monkeyError, clockError, readStart(lookup, settings),
                                    readPictures(lookup, settings), readItems(lookup, settings)}) {
     if (settings.error.empty()) settings.error = error;
   }
   if (!settings.trace.empty() && !settings.recording.empty()) {
     settings.error = "BRIMOL_TRACE and BRIMOL_RECORD: a session is played or recorded, not both";
+  }
+  if (!settings.trace.empty() && settings.monkey) {
+    settings.error = "BRIMOL_TRACE and BRIMOL_MONKEY: only one of the two plays";
   }
   return settings;
 }

@@ -11,18 +11,25 @@ namespace brimol::pc {
 
 enum class ClockChoice { Real, Simulated, Paced };
 
+/// Random input: the seed, and how many records at least.
+struct MonkeyWish {
+  uint64_t seed = 0;
+  uint64_t events = 10'000;
+};
+
 struct SessionSettings {
   ClockChoice clock = ClockChoice::Real;
   std::optional<uint32_t> clockStart;
-  std::string trace;          // what is played; empty: nothing
-  std::string recording;      // what is recorded into; empty: nothing
-  std::string reportFolder;   // empty: none
-  bool keepsPictures = true;  // of the frames, in that folder
-  bool listsItems = false;    // of the frames, in the session's file
-  std::string error;          // one line about the first wrong value; empty: none is wrong
+  std::string trace;                 // what is played; empty: nothing
+  std::string recording;             // what is recorded into; empty: nothing
+  std::optional<MonkeyWish> monkey;  // who plays instead of a trace or a user
+  std::string reportFolder;          // empty: none
+  bool keepsPictures = true;         // of the frames, in that folder
+  bool listsItems = false;           // of the frames, in the session's file
+  std::string error;                 // one line about the first wrong value; empty: none is wrong
 };
 
-/// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_TRACE, BRIMOL_RECORD,
+/// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_TRACE, BRIMOL_RECORD, BRIMOL_MONKEY,
 /// BRIMOL_REPORT_DIR, BRIMOL_REPORT_PICTURES and BRIMOL_REPORT_ITEMS; an empty value is no value.
 SessionSettings readSessionSettings(const VariableLookup& lookup);
 

@@ -12,6 +12,14 @@ Event pointerRecord(BrimolEventType type, int finger, ScreenPoint at) {
   return record;
 }
 
+Event userRecord(uint32_t word1, uint32_t word2) {
+  Event record = {};
+  record.user.type = BRIMOL_USER_EVENT;
+  record.user.word1 = word1;
+  record.user.word2 = word2;
+  return record;
+}
+
 Event keyRecord(BrimolEventType type, uint32_t code) {
   Event record = {};
   record.key.type = static_cast<uint8_t>(type);

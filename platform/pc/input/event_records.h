@@ -16,6 +16,9 @@ struct ScreenPoint {
 /// `finger` is 0 to 255, `at` within 0 to 65535.
 Event pointerRecord(BrimolEventType type, int finger, ScreenPoint at);
 
+/// A record of type 24.
+Event userRecord(uint32_t word1, uint32_t word2);
+
 /// A record of type 2 or 3. Its state byte is 1 for a down, 0 for an up.
 Event keyRecord(BrimolEventType type, uint32_t code);
 

@@ -36,6 +36,9 @@ std::string pointerWords(const BrimolPointerEvent& pointer) {
 }  // namespace
 
 std::string textOfRecord(const Event& record) {
+  if (record.type == BRIMOL_USER_EVENT) {
+    return "user " + std::to_string(record.user.word1) + ' ' + std::to_string(record.user.word2);
+  }
   for (const auto& [type, word] : kRecordNames) {
     if (type != record.type) continue;
     const bool isKey = type == BRIMOL_KEY_DOWN || type == BRIMOL_KEY_UP;
@@ -51,6 +54,11 @@ TraceRecorder::TraceRecorder(const std::string& path, std::string& error)
 
 // A full disk ends the recording, not the session.
 void TraceRecorder::write(const std::string& line) { file << line << '\n' << std::flush; }
+
+void TraceRecorder::startScript(uint32_t clockStart) {
+  write("brimol-trace 1");
+  write("clock start " + std::to_string(clockStart));
+}
 
 void TraceRecorder::start(uint32_t clockStart, uint64_t utcMs, uint64_t seed) {
   write("brimol-trace 1 recording");

@@ -19,7 +19,9 @@ class TraceRecorder {
   /// Begins the file anew. `error` says in one line why it cannot be written.
   TraceRecorder(const std::string& path, std::string& error);
 
-  /// The lines at the head, to be written first. Time of day in milliseconds since 1970.
+  /// The lines at the head, to be written first: of a script, whose frames are not compared, or of
+  /// a recording. Time of day in milliseconds since 1970.
+  void startScript(uint32_t clockStart);
   void start(uint32_t clockStart, uint64_t utcMs, uint64_t seed);
   void screen(Size size);
   void density(float dotsPerInch);

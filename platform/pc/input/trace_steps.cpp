@@ -191,6 +191,11 @@ TraceStep::Action readKeyRecord(TraceWords& words) {
       keyRecord(kType, static_cast<uint32_t>(words.number("a key's code", kMostWord)))};
 }
 
+TraceStep::Action readUserRecord(TraceWords& words) {
+  const auto first = static_cast<uint32_t>(words.number("a word", kMostWord));
+  return RawRecord{userRecord(first, static_cast<uint32_t>(words.number("a word", kMostWord)))};
+}
+
 struct StepRow {
   std::string_view word;
   TraceStep::Action (*read)(TraceWords& words);
@@ -215,6 +220,7 @@ constexpr auto kSteps = std::to_array<StepRow>({
     {"long", readFingerRecord<BRIMOL_LONG_PRESS>},
     {"keydown", readKeyRecord<BRIMOL_KEY_DOWN>},
     {"keyup", readKeyRecord<BRIMOL_KEY_UP>},
+    {"user", readUserRecord},
 });
 
 [[noreturn]] void refuseTime(const std::string& text) {

@@ -4,6 +4,7 @@
 
 #include "painter/blend.h"
 #include "scene/item.h"
+#include "scene/new_picture.h"
 
 namespace brimol::pc {
 
@@ -22,7 +23,7 @@ void fillRun(uint32_t* pixels, std::size_t count, uint32_t color) {
 }  // namespace
 
 Canvas::Canvas(Size size)
-    : picture(cairo_image_surface_create(CAIRO_FORMAT_RGB24, size.w, size.h)),
+    : picture(newPicture(size)),
       drawing(cairo_create(picture.get())),
       pixels(reinterpret_cast<uint32_t*>(cairo_image_surface_get_data(picture.get()))),
       stride(cairo_image_surface_get_stride(picture.get()) /

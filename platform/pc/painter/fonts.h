@@ -2,6 +2,9 @@
 #pragma once
 
 #include <memory>
+#include <optional>
+#include <span>
+#include <string_view>
 
 #include "painter/text_handles.h"
 
@@ -19,12 +22,24 @@ class Fonts {
   Fonts(const Fonts&) = delete;
   Fonts& operator=(const Fonts&) = delete;
 
-  PangoContext* context() const { return placing.get(); }
+  /// What lays out a text, valid or not, from all the fonts. Where those that are quickly read draw
+  /// all of it, the others are not read: since they come last, the text is the same without them.
+  PangoContext* contextFor(std::string_view words);
 
  private:
-  FontConfig config;
-  FontMap map;
-  TextContext placing;
+  struct Context {
+    explicit Context(std::span<const char* const> files);
+    FontConfig config;
+    FontMap map;
+    TextContext placing;
+  };
+
+  bool isDrawnByCommon(gunichar letter) const;
+  bool isDrawnByCommon(std::string_view words) const;
+
+  Context common;
+  CharacterSet commonCharacters;
+  std::optional<Context> all;  // once a text has needed it
 };
 
 struct FontsReturner {

@@ -10,6 +10,7 @@ namespace brimol::pc {
 
 struct TextDeleter {
   void operator()(FcConfig* config) const { FcConfigDestroy(config); }
+  void operator()(FcCharSet* characters) const { FcCharSetDestroy(characters); }
   void operator()(PangoFontMap* map) const { g_object_unref(map); }
   void operator()(PangoContext* context) const { g_object_unref(context); }
   void operator()(PangoLayout* layout) const { g_object_unref(layout); }
@@ -19,6 +20,7 @@ struct TextDeleter {
 };
 
 using FontConfig = std::unique_ptr<FcConfig, TextDeleter>;
+using CharacterSet = std::unique_ptr<FcCharSet, TextDeleter>;
 using FontMap = std::unique_ptr<PangoFontMap, TextDeleter>;
 using TextContext = std::unique_ptr<PangoContext, TextDeleter>;
 using TextLayout = std::unique_ptr<PangoLayout, TextDeleter>;

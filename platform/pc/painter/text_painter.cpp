@@ -25,7 +25,8 @@ TextInk TextPainter::inkOf(const SKIA_Rect& rect, const SKIA_Text& text) {
   if (!isDrawn(text)) return {};
   images.trim();
   PlainShapes none;
-  const LaidText laid({fonts->context(), images, none}, shownText(text), textSizeOf(text));
+  const std::string_view words = shownText(text);
+  const LaidText laid({fonts->contextFor(words), images, none}, words, textSizeOf(text));
   return laid.ink(edgesOf(rect), text.align);
 }
 
@@ -33,7 +34,7 @@ const LaidText& TextPainter::laidText(const SKIA_Text& text) {
   const KeyView key = {shownText(text), textSizeOf(text)};
   if (const LaidText* const known = texts.find(key)) return *known;
   images.trim();
-  LaidText laid({fonts->context(), images, shapes}, key.text, key.size);
+  LaidText laid({fonts->contextFor(key.text), images, shapes}, key.text, key.size);
   const std::size_t cost = key.text.size() + laid.bytes();
   return texts.put({std::string(key.text), key.size}, std::move(laid), cost);
 }

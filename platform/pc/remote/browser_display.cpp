@@ -57,6 +57,9 @@ void tellAddress(const Listeners& listeners, const std::string& host, const std:
 
 OpenedDisplay BrowserDisplay::open(Size screen, const std::optional<ListenAddress>& address,
                                    InputTranslator& input, const InputService& service) {
+  for (const OnDemand* const library : {&websockets().library, &rfb().library}) {
+    if (!library->error().empty()) return {nullptr, "cannot serve browsers: " + library->error()};
+  }
   std::string error;
   auto listeners = listenAt(address, error);
   if (!listeners) return {nullptr, error};

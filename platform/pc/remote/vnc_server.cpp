@@ -52,7 +52,8 @@ rfbCursor* makeArrow() {
   std::string mask = kArrow;
   std::ranges::replace(outline, '.', ' ');
   std::ranges::replace(mask, '.', 'x');
-  rfbCursor* const arrow = rfbMakeXCursor(kArrowWidth, kArrowHeight, outline.data(), mask.data());
+  rfbCursor* const arrow =
+      rfb().makeXCursor(kArrowWidth, kArrowHeight, outline.data(), mask.data());
   arrow->foreRed = arrow->foreGreen = arrow->foreBlue = 0;
   arrow->backRed = arrow->backGreen = arrow->backBlue = 0xFFFF;
   return arrow;
@@ -94,9 +95,10 @@ void VncServer::stop() {
 void VncServer::setUpServer(Size size) {
   fingers.newClient = welcome;
   fingers.handleMessage = takeFinger;
-  rfbLogEnable(0);
-  rfbRegisterProtocolExtension(&fingers);
-  server.reset(rfbGetScreen(nullptr, nullptr, size.w, size.h, kColourBits, kColours, kPixelBytes));
+  rfb().logEnable(0);
+  rfb().registerProtocolExtension(&fingers);
+  server.reset(
+      rfb().getScreen(nullptr, nullptr, size.w, size.h, kColourBits, kColours, kPixelBytes));
   if (!server || bell.get() < 0) std::abort();  // no memory or no descriptor is left
   server->serverFormat.redShift = kRedShift;
   server->serverFormat.greenShift = kGreenShift;
@@ -104,7 +106,7 @@ void VncServer::setUpServer(Size size) {
   server->frameBuffer = reinterpret_cast<char*>(shown.row(0, 0));
   server->desktopName = "brimol";
   server->authPasswdData = static_cast<void*>(passwords.data());
-  server->passwordCheck = rfbCheckPasswordByList;
+  server->passwordCheck = rfb().checkPasswordByList;
   server->ptrAddEvent = takePointer;
   server->kbdAddEvent = takeKey;
   server->alwaysShared = TRUE;
@@ -139,13 +141,13 @@ void VncServer::lookAgain() const { eventfd_write(bell.get(), 1); }
 void VncServer::run() {
   blockBrokenPipes();
   while (!isOver) {
-    for (Guest* const guest : waitForInput()) rfbProcessClientMessage(guest->client);
+    for (Guest* const guest : waitForInput()) rfb().processClientMessage(guest->client);
     takeNewcomers();
     takePicture();
     sendChanges();
     removeGone();
   }
-  for (const Guest& guest : guests) rfbCloseClient(guest.client);
+  for (const Guest& guest : guests) rfb().closeClient(guest.client);
   removeGone();
 }
 
@@ -174,7 +176,7 @@ void VncServer::takeNewcomers() {
     taken.swap(newcomers);
   }
   for (auto& [end, viewer] : taken) {
-    rfbClientRec* const client = rfbNewClient(server.get(), end.release());
+    rfbClientRec* const client = rfb().newClient(server.get(), end.release());
     if (client == nullptr) continue;
     guests.push_back({client, std::move(viewer), ViewerHands(++guestsSoFar, actions)});
     client->clientData = &guests.back();
@@ -183,14 +185,15 @@ void VncServer::takeNewcomers() {
 
 void VncServer::takePicture() {
   for (const cairo_rectangle_int_t& part : handover.take(shown)) {
-    rfbMarkRectAsModified(server.get(), part.x, part.y, part.x + part.width, part.y + part.height);
+    rfb().markRectAsModified(server.get(), part.x, part.y, part.x + part.width,
+                             part.y + part.height);
   }
 }
 
 void VncServer::sendChanges() {
   for (const Guest& guest : guests) {
     if (guest.client->state == rfbClientRec::RFB_NORMAL) guest.viewer->isAdmitted = true;
-    if (!isBehind(*guest.viewer)) rfbUpdateClient(guest.client);
+    if (!isBehind(*guest.viewer)) rfb().updateClient(guest.client);
   }
 }
 
@@ -202,7 +205,7 @@ void VncServer::removeGone() {
     }
     guest->hands.letGo();
     freeExtensions(guest->client);
-    rfbClientConnectionGone(guest->client);
+    rfb().clientConnectionGone(guest->client);
     guest = guests.erase(guest);
   }
 }
@@ -226,8 +229,8 @@ void VncServer::takeKey(rfbBool isDown, rfbKeySym symbol, rfbClientPtr client) {
 rfbBool VncServer::takeFinger(rfbClientPtr client, void*, const rfbClientToServerMsg* message) {
   if (message->type != MessageGate::kFingerMessage) return FALSE;
   std::array<unsigned char, MessageGate::kFingerBytes - 1> rest = {};  // the number is taken
-  if (rfbReadExact(client, reinterpret_cast<char*>(rest.data()), rest.size()) <= 0) {
-    rfbCloseClient(client);
+  if (rfb().readExact(client, reinterpret_cast<char*>(rest.data()), rest.size()) <= 0) {
+    rfb().closeClient(client);
     return TRUE;
   }
   const auto word = [&rest](std::size_t at) { return rest[at] << kColourBits | rest[at + 1]; };

@@ -1,8 +1,6 @@
 /// LibVNCServer, on a thread of its own.
 #pragma once
 
-#include <rfb/rfb.h>
-
 #include <atomic>
 #include <list>
 #include <memory>
@@ -14,17 +12,18 @@
 #include "remote/action_queue.h"
 #include "remote/handover.h"
 #include "remote/listener.h"
+#include "remote/rfb_calls.h"
 #include "remote/viewer.h"
 #include "remote/viewer_hands.h"
 
 namespace brimol::pc {
 
 struct VncScreenDeleter {
-  void operator()(rfbScreenInfo* screen) const { rfbScreenCleanup(screen); }
+  void operator()(rfbScreenInfo* screen) const { rfb().screenCleanup(screen); }
 };
 
 struct VncCursorDeleter {
-  void operator()(rfbCursor* cursor) const { rfbFreeCursor(cursor); }
+  void operator()(rfbCursor* cursor) const { rfb().freeCursor(cursor); }
 };
 
 /// Sends viewers what changes of the picture, and takes what they do. It never meets their

@@ -54,7 +54,7 @@ bool isOutOfResources(int error) { return error != EAGAIN && error != ECONNABORT
 std::optional<std::string> header(lws* wsi, lws_token_indexes token) {
   constexpr int kLongest = 256;
   std::array<char, kLongest> text = {};
-  const int length = lws_hdr_copy(wsi, text.data(), kLongest, token);
+  const int length = websockets().hdrCopy(wsi, text.data(), kLongest, token);
   if (length <= 0) return std::nullopt;
   return std::string(text.data(), static_cast<std::size_t>(length));
 }
@@ -70,25 +70,26 @@ int sendText(lws* wsi, const WebAnswer& answer) {
   unsigned char* const start = head.data() + LWS_PRE;
   unsigned char* place = start;
   unsigned char* const end = head.data() + head.size();
-  if (lws_add_http_common_headers(wsi, HTTP_STATUS_OK, answer.type, answer.text.size(), &place,
-                                  end) != 0 ||
-      lws_finalize_write_http_header(wsi, start, &place, end) != 0) {
+  if (websockets().addHttpCommonHeaders(wsi, HTTP_STATUS_OK, answer.type, answer.text.size(),
+                                        &place, end) != 0 ||
+      websockets().finalizeWriteHttpHeader(wsi, start, &place, end) != 0) {
     return 1;
   }
   std::vector<unsigned char> body(LWS_PRE);
   body.insert(body.end(), answer.text.begin(), answer.text.end());
-  const int sent = lws_write(wsi, body.data() + LWS_PRE, answer.text.size(), LWS_WRITE_HTTP_FINAL);
-  return sent < 0 || lws_http_transaction_completed(wsi) != 0 ? 1 : 0;
+  const int sent =
+      websockets().write(wsi, body.data() + LWS_PRE, answer.text.size(), LWS_WRITE_HTTP_FINAL);
+  return sent < 0 || websockets().httpTransactionCompleted(wsi) != 0 ? 1 : 0;
 }
 
 int sendFile(lws* wsi, const WebAnswer& answer) {
-  const int result = lws_serve_http_file(wsi, answer.file.c_str(), answer.type, nullptr, 0);
-  return result < 0 || (result > 0 && lws_http_transaction_completed(wsi) != 0) ? 1 : 0;
+  const int result = websockets().serveHttpFile(wsi, answer.file.c_str(), answer.type, nullptr, 0);
+  return result < 0 || (result > 0 && websockets().httpTransactionCompleted(wsi) != 0) ? 1 : 0;
 }
 
 int refuse(lws* wsi, unsigned int status) {
-  return lws_return_http_status(wsi, status, nullptr) != 0 ||
-                 lws_http_transaction_completed(wsi) != 0
+  return websockets().returnHttpStatus(wsi, status, nullptr) != 0 ||
+                 websockets().httpTransactionCompleted(wsi) != 0
              ? 1
              : 0;
 }
@@ -108,7 +109,7 @@ WebServer::WebServer(Listeners listeners, std::size_t queueBytes, ViewerService 
 
 WebServer::~WebServer() {
   isOver = true;
-  lws_cancel_service(context.get());
+  websockets().cancelService(context.get());
   thread.join();
 }
 
@@ -119,7 +120,7 @@ const lws_protocols* WebServer::protocols() {
 }
 
 void WebServer::createContext() {
-  lws_set_log_level(0, nullptr);
+  websockets().setLogLevel(0, nullptr);
   lws_context_creation_info info = {};
   info.options = LWS_SERVER_OPTION_EXPLICIT_VHOSTS |
                  LWS_SERVER_OPTION_HTTP_HEADERS_SECURITY_BEST_PRACTICES_ENFORCE;
@@ -132,31 +133,32 @@ void WebServer::createContext() {
   info.retry_and_idle_policy = &kNoProbes;
   info.vhost_name = "brimol";
   const BrokenPipeKeeper keeper;  // libwebsockets has it ignored in the whole process
-  context.reset(lws_create_context(&info));
-  if (context) host = lws_create_vhost(context.get(), &info);
+  context.reset(websockets().createContext(&info));
+  if (context) host = websockets().createVhost(context.get(), &info);
   if (host == nullptr) std::abort();  // no memory or no descriptor is left
 }
 
 void WebServer::listen(Listener listener, Door door) {
   lws_sock_file_fd_type descriptor = {};
   descriptor.filefd = listener.socket.release();
-  lws* const wsi =
-      lws_adopt_descriptor_vhost(host, LWS_ADOPT_RAW_FILE_DESC, descriptor, kProtocol, nullptr);
+  lws* const wsi = websockets().adoptDescriptorVhost(host, LWS_ADOPT_RAW_FILE_DESC, descriptor,
+                                                     kProtocol, nullptr);
   if (wsi == nullptr) std::abort();  // no memory is left
   doors[wsi] = door;
 }
 
 void WebServer::run() {
   blockBrokenPipes();
-  while (!isOver) lws_service(context.get(), 0);
+  while (!isOver) websockets().service(context.get(), 0);
 }
 
 int WebServer::callback(lws* wsi, lws_callback_reasons reason, void* user, void* in,
                         std::size_t length) {
-  auto* const server = static_cast<WebServer*>(lws_context_user(lws_get_context(wsi)));
+  auto* const server =
+      static_cast<WebServer*>(websockets().contextUser(websockets().getContext(wsi)));
   int result = 0;
   if (server->isHandled(wsi, reason, bytesAt(in, length), result)) return result;
-  return lws_callback_http_dummy(wsi, reason, user, in, length);
+  return websockets().callbackHttpDummy(wsi, reason, user, in, length);
 }
 
 bool WebServer::isHandled(lws* wsi, lws_callback_reasons reason, std::string_view in, int& result) {
@@ -180,7 +182,7 @@ bool WebServer::isHandled(lws* wsi, lws_callback_reasons reason, std::string_vie
 
 void WebServer::accept(lws* wsi) {
   const Door door = doors.at(wsi);
-  const int listener = lws_get_socket_fd(wsi);
+  const int listener = websockets().getSocketFd(wsi);
   while (true) {
     Socket connection(::accept4(listener, nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
     if (connection.get() >= 0) {
@@ -200,8 +202,8 @@ void WebServer::receive(Socket connection, Door door) {
   descriptor.sockfd = connection.release();
   const auto kind = static_cast<lws_adoption_type>(
       door == Door::Web ? LWS_ADOPT_SOCKET | LWS_ADOPT_HTTP : LWS_ADOPT_SOCKET);
-  lws* const wsi = lws_adopt_descriptor_vhost(host, kind, descriptor,
-                                              door == Door::Web ? nullptr : kProtocol, nullptr);
+  lws* const wsi = websockets().adoptDescriptorVhost(
+      host, kind, descriptor, door == Door::Web ? nullptr : kProtocol, nullptr);
   if (wsi == nullptr) return;
   connections.insert(wsi);
   if (door == Door::Vnc) begin(wsi, door);
@@ -228,8 +230,8 @@ bool WebServer::hasRoom() const {
 
 void WebServer::begin(lws* wsi, Door door) {
   lines[wsi] = std::make_shared<Line>(Line{{}, door, wsi});
-  lws_set_timeout(wsi, PENDING_TIMEOUT_USER_OK, kSecondsToIntroduce);
-  lws_callback_on_writable(wsi);
+  websockets().setTimeout(wsi, PENDING_TIMEOUT_USER_OK, kSecondsToIntroduce);
+  websockets().callbackOnWritable(wsi);
 }
 
 int WebServer::hear(lws* wsi, std::string_view bytes) {
@@ -246,8 +248,8 @@ int WebServer::hear(lws* wsi, std::string_view bytes) {
 int WebServer::hearViewer(Line& line, std::string_view bytes) {
   if (line.isEnding) return 0;
   if (!line.caller.hear(bytes)) return 1;
-  if (line.caller.forServer().size() > kEnoughForServer) lws_rx_flow_control(line.outer, 0);
-  if (line.inner != nullptr) lws_callback_on_writable(line.inner);
+  if (line.caller.forServer().size() > kEnoughForServer) websockets().rxFlowControl(line.outer, 0);
+  if (line.inner != nullptr) websockets().callbackOnWritable(line.inner);
   return 0;
 }
 
@@ -255,11 +257,11 @@ int WebServer::hearServer(Line& line, std::string_view bytes) const {
   const bool wasEmpty = line.caller.forViewer().isEmpty();
   line.caller.answer(bytes);
   if (line.caller.forViewer().size() > maxQueued) {
-    shutdown(lws_get_socket_fd(line.inner), SHUT_RDWR);  // the server must not wait for it
+    shutdown(websockets().getSocketFd(line.inner), SHUT_RDWR);  // the server must not wait for it
     return 1;
   }
   if (wasEmpty) watch(line);
-  lws_callback_on_writable(line.outer);
+  websockets().callbackOnWritable(line.outer);
   return 0;
 }
 
@@ -274,11 +276,12 @@ bool WebServer::connectToServer(const LinePointer& line) {
   const ssize_t sent = ::send(ends[0], first.data(), first.size(), MSG_NOSIGNAL);
   lws_sock_file_fd_type descriptor = {};
   descriptor.sockfd = ends[0];
-  line->inner = lws_adopt_descriptor_vhost(host, LWS_ADOPT_SOCKET, descriptor, kProtocol, nullptr);
+  line->inner =
+      websockets().adoptDescriptorVhost(host, LWS_ADOPT_SOCKET, descriptor, kProtocol, nullptr);
   if (line->inner == nullptr || sent < 0) return false;
   line->caller.forServer().drop(static_cast<std::size_t>(sent));
   lines[line->inner] = line;
-  lws_callback_on_writable(line->inner);
+  websockets().callbackOnWritable(line->inner);
   service.attach(std::move(other), line->caller.shared());
   return true;
 }
@@ -295,11 +298,12 @@ int WebServer::sendToViewer(Line& line) {
   if (chunk.empty()) return line.isEnding ? 1 : 0;
   std::ranges::copy(chunk, buffer.begin() + LWS_PRE);
   const auto kind = line.door == Door::Web ? LWS_WRITE_BINARY : LWS_WRITE_RAW;
-  if (lws_write(line.outer, buffer.data() + LWS_PRE, chunk.size(), kind) < 0) return 1;
+  if (websockets().write(line.outer, buffer.data() + LWS_PRE, chunk.size(), kind) < 0) return 1;
   line.caller.drop(chunk.size());
   watch(line);
   service.lookAgain();
-  if (!line.caller.forViewer().isEmpty() || line.isEnding) lws_callback_on_writable(line.outer);
+  if (!line.caller.forViewer().isEmpty() || line.isEnding)
+    websockets().callbackOnWritable(line.outer);
   return 0;
 }
 
@@ -309,13 +313,13 @@ int WebServer::sendToServer(Line& line) {
   ByteQueue& queue = line.caller.forServer();
   const std::string_view chunk = queue.front(kChunk);
   const ssize_t sent =
-      ::send(lws_get_socket_fd(line.inner), chunk.data(), chunk.size(), MSG_NOSIGNAL);
+      ::send(websockets().getSocketFd(line.inner), chunk.data(), chunk.size(), MSG_NOSIGNAL);
   if (sent < 0 && errno != EAGAIN) return 1;
   if (sent > 0) queue.drop(static_cast<std::size_t>(sent));
   if (!queue.isEmpty()) {
-    lws_callback_on_writable(line.inner);
+    websockets().callbackOnWritable(line.inner);
   } else if (line.outer != nullptr) {
-    lws_rx_flow_control(line.outer, 1);
+    websockets().rxFlowControl(line.outer, 1);
   }
   return 0;
 }
@@ -324,9 +328,9 @@ int WebServer::sendToServer(Line& line) {
 void WebServer::watch(const Line& line) {
   if (!line.caller.shared()->isAdmitted) return;
   if (line.caller.forViewer().isEmpty()) {
-    lws_set_timeout(line.outer, NO_PENDING_TIMEOUT, 0);
+    websockets().setTimeout(line.outer, NO_PENDING_TIMEOUT, 0);
   } else {
-    lws_set_timeout(line.outer, PENDING_TIMEOUT_USER_OK, kSecondsToRead);
+    websockets().setTimeout(line.outer, PENDING_TIMEOUT_USER_OK, kSecondsToRead);
   }
 }
 
@@ -338,13 +342,13 @@ void WebServer::end(lws* wsi) {
   if (wsi == line->inner) {
     line->inner = nullptr;
     line->isEnding = true;
-    if (line->outer != nullptr) lws_callback_on_writable(line->outer);
+    if (line->outer != nullptr) websockets().callbackOnWritable(line->outer);
     return;
   }
   line->outer = nullptr;
   line->caller.shared()->queuedBytes = 0;
   // Both sides of the pair see its end.
-  if (line->inner != nullptr) shutdown(lws_get_socket_fd(line->inner), SHUT_RDWR);
+  if (line->inner != nullptr) shutdown(websockets().getSocketFd(line->inner), SHUT_RDWR);
 }
 
 }  // namespace brimol::pc

@@ -1,8 +1,6 @@
 /// libwebsockets, on a thread of its own: the page, and the connections of all viewers.
 #pragma once
 
-#include <libwebsockets.h>
-
 #include <atomic>
 #include <cstddef>
 #include <functional>
@@ -16,6 +14,7 @@
 
 #include "remote/caller.h"
 #include "remote/listener.h"
+#include "remote/web_calls.h"
 
 namespace brimol::pc {
 
@@ -28,7 +27,7 @@ struct ViewerService {
 };
 
 struct WebContextDeleter {
-  void operator()(lws_context* context) const { lws_context_destroy(context); }
+  void operator()(lws_context* context) const { websockets().contextDestroy(context); }
 };
 
 /// Answers browsers with the page, and stands between viewers and the VNC server: it takes whatever

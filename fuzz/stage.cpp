@@ -1,0 +1,140 @@
+#include "stage.h"
+
+#include <MW/event_service.h>
+#include <MW/widget_list.h>
+#include <MW/window.h>
+#include <brimol3_widget_test/platform.h>
+
+#include <algorithm>
+#include <cstdlib>
+#include <iostream>
+
+#include "core/dispatch_thread.h"
+
+namespace brimol::fuzz {
+
+namespace {
+
+using test::platform;
+
+struct ScreenSize {
+  int width;
+  int height;
+};
+constexpr auto kScreens = std::to_array<ScreenSize>({
+    {1440, 2560},
+    {1440, 2560},
+    {480, 800},
+    {2560, 1440},
+    {0, 0},
+    {1, 7},
+    {-1080, -5},
+    {INT32_MAX, INT32_MIN},
+});
+constexpr unsigned int kStartTicks = 1000;
+
+MW::func_dispatchEvent& dispatcher() {
+  static const android::sp<MW::func_dispatchEvent> only = new MW::func_dispatchEvent;
+  return *only;
+}
+
+void endToolkit() {
+  platform().turns.letGo();
+  MW::Window::destroy();
+}
+
+}  // namespace
+
+// Called by the fuzzer before its first run.
+extern "C" int LLVMFuzzerInitialize(int*, char***) {
+  constexpr std::size_t kThreads = 2;
+  platform().reset();
+  platform().records = false;
+  platform().turns.hold();
+  if (MW::Window::init() == 0) std::abort();
+  platform().turns.await(kThreads);
+  return std::atexit(endToolkit);
+}
+
+Stage::Stage(test::Arguments& given) : from(given) {
+  const ScreenSize& screen = kScreens.at(from.below(kScreens.size()));
+  MW::Window::width = screen.width;
+  MW::Window::height = screen.height;
+  MW::Window::xdpi = MW::Window::ydpi = 0;
+  platform().xdpi = platform().ydpi = static_cast<float>(from.byte());
+  platform().ticks = kStartTicks + from.take<unsigned int>();
+  MW::WidgetList::index_num = 0;
+}
+
+Stage::~Stage() {
+  test::whenTold = nullptr;
+  for (Occupant& each : occupants) each.reset();
+  while (MW::Window::getEventService()->recvEvent() != nullptr) continue;
+  MW::WidgetList::destroy();
+  MW::isDisplayUpdate(0);
+}
+
+void Stage::make(std::size_t place) {
+  const auto& classes = test::widgetClasses();
+  const test::WidgetClass& chosen = classes.at(from.below(classes.size()));
+  auto made = chosen.make(from);
+  chosen.listen(*made);
+  made->setActive(1);
+  occupants.at(place) = {std::move(made), &chosen};
+}
+
+void Stage::operate(std::size_t place) {
+  const Occupant& occupant = occupants.at(place);
+  if (occupant.widget == nullptr) return;
+  const auto& own = occupant.itsClass->operations;
+  const auto& base = test::baseOperations();
+  const std::size_t which = from.below(base.size() + own.size());
+  const test::Operation& chosen =
+      which < base.size() ? base.at(which) : own.at(which - base.size());
+  chosen(*occupant.widget, from);
+}
+
+void Stage::dispatch(const Event& event) {
+  MW::Window::getEventService()->sendEvent(&event);
+  dispatcher().threadLoop();
+}
+
+void Stage::dispatchTouch() {
+  constexpr auto kTypes = std::to_array<BrimolEventType>(
+      {BRIMOL_POINTER_DOWN, BRIMOL_POINTER_MOTION, BRIMOL_POINTER_UP, BRIMOL_LONG_PRESS});
+  constexpr int64_t kSteps = 256;
+  const auto part = [this](int side) {
+    return static_cast<uint16_t>(int64_t{side} * from.byte() / kSteps);
+  };
+  const uint8_t what = from.byte();
+  Event event = {};
+  event.pointer.type = static_cast<uint8_t>(kTypes.at(what % kTypes.size()));
+  event.pointer.finger = static_cast<uint8_t>(what / kTypes.size() % 3);
+  event.pointer.x = part(MW::Window::width);
+  event.pointer.y = part(MW::Window::height);
+  event.pointer.xrel = static_cast<int8_t>(from.byte());
+  event.pointer.yrel = static_cast<int8_t>(from.byte());
+  dispatch(event);
+}
+
+void Stage::wait() {
+  constexpr unsigned int kStepMs = 8;
+  const unsigned int steps = from.byte();
+  platform().ticks += steps < UINT8_MAX ? steps * kStepMs : from.take<unsigned int>();
+}
+
+void Stage::round() {
+  MW::Window::updateTimer(platform().ticks);
+  platform().records = true;
+  MW::Window::show(platform().ticks);
+  platform().records = false;
+  platform().takeLog();
+  const auto isOutside = [](const test::Drawing& each) {
+    return each.text.text.size() >= SKIA_TEXT_BYTES;
+  };
+  if (!std::ranges::any_of(platform().takeDrawings(), isOutside)) return;
+  std::cerr << "a text is drawn beyond its record\n";
+  std::abort();
+}
+
+}  // namespace brimol::fuzz

@@ -1,0 +1,49 @@
+#!/usr/bin/env bash
+# Fuzzes: scripts/fuzz.sh [TARGET [SECONDS]]; without a target each in turn, without a time for a
+# minute each. What was learnt is kept in build/fuzz/learnt/TARGET, what was found beside it as
+# TARGET-crash-... or the like: rerun the target's program with that file alone.
+#
+#   scripts/fuzz.sh --keep TARGET   makes of what was learnt the small corpus that is committed
+set -euo pipefail
+cd "$(dirname "$0")/.."
+
+readonly most_files=24 most_bytes=400
+keep=no
+if [[ ${1:-} == --keep ]]; then
+  keep=yes
+  shift
+fi
+target=${1:-} seconds=${2:-60}
+targets=("$target")
+[[ -n $target ]] || mapfile -t targets < <(ls fuzz/corpus)
+
+if command -v ccache >/dev/null; then
+  export CMAKE_C_COMPILER_LAUNCHER=ccache CMAKE_CXX_COMPILER_LAUNCHER=ccache
+fi
+cmake --preset fuzz >/dev/null
+cmake --build --preset fuzz
+export LSAN_OPTIONS="suppressions=$PWD/cmake/lsan.supp:print_suppressions=0"
+export UBSAN_OPTIONS=print_stacktrace=1
+
+# The smallest of the files that together reach all that small files reach.
+keep_corpus() {
+  local merged=build/fuzz/merged/$1
+  rm -rf "$merged"
+  mkdir -p "$merged"
+  "build/fuzz/fuzz/fuzz_$1" -merge=1 -use_value_profile=0 -max_len=$most_bytes "$merged" \
+    "build/fuzz/learnt/$1" "fuzz/corpus/$1" 2>/dev/null
+  find "$merged" -type f -printf '%s %p\n' | sort -rn | head -n $most_files | cut -d' ' -f2- |
+    while read -r file; do cp "$file" "fuzz/corpus/$1/"; done
+}
+
+for name in "${targets[@]}"; do
+  mkdir -p "build/fuzz/learnt/$name"
+  if [[ $keep == yes ]]; then
+    keep_corpus "$name"
+    continue
+  fi
+  echo "== $name for $seconds seconds"
+  "build/fuzz/fuzz/fuzz_$name" -max_total_time="$seconds" -max_len=4000 -timeout=10 \
+    -rss_limit_mb=1500 -print_final_stats=1 -artifact_prefix="build/fuzz/learnt/$name-" \
+    "build/fuzz/learnt/$name" "fuzz/corpus/$name" 2>&1 | grep --line-buffered -v ' NEW \|REDUCE\|RELOAD'
+done

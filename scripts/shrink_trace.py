@@ -1,0 +1,92 @@
+#!/usr/bin/env python3
+"""Makes a trace that crashes a program as short as it goes: shrink_trace.py TRACE SHORT -- PROGRAM [ARGUMENT...]
+
+The program is run under ever shorter traces (BRIMOL_TRACE, without a window). A run counts as the same failure
+if it ends by the same signal, or, with --exit CODE before the names, with that exit code. What is left goes to
+SHORT: without any line of it the failure does not come.
+"""
+
+import argparse
+import os
+import pathlib
+import re
+import subprocess
+import sys
+import tempfile
+
+STEP = re.compile(r"(\d+) (.+)")
+LONGEST_PAUSE = 1000  # ms; what an application does by itself takes less
+
+
+class Shrinker:
+    def __init__(self, program, code, seconds):
+        self.program, self.code, self.seconds = program, code, seconds
+        self.folder = tempfile.TemporaryDirectory()
+        self.trace = pathlib.Path(self.folder.name, "try.trace")
+        self.runs = 0
+
+    def fails(self, head, steps):
+        """Whether the program fails as wanted under these steps."""
+        self.runs += 1
+        self.trace.write_text("".join(head) + "".join(f"+{pause} {words}\n" for pause, words in steps))
+        environment = {**os.environ, "BRIMOL_TRACE": str(self.trace), "BRIMOL_DISPLAY": "headless"}
+        try:
+            ended = subprocess.run(self.program, env=environment, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL,
+                                   stdin=subprocess.DEVNULL, timeout=self.seconds, check=False).returncode
+        except subprocess.TimeoutExpired:
+            return False
+        if self.code is None and ended < 0:
+            self.code = ended  # from here on the same signal
+        return ended == self.code
+
+    def shrink(self, head, steps):
+        """Leaves out parts, large ones first, until no single step can go."""
+        size = len(steps) // 2
+        while size > 0:
+            start = 0
+            while start < len(steps):
+                rest = steps[:start] + steps[start + size:]
+                if self.fails(head, rest):
+                    steps = rest
+                    print(f"{len(steps)} steps", flush=True)
+                else:
+                    start += size
+            size //= 2
+        return steps
+
+
+def read(path):
+    """The lines at the head, and the steps, each with the pause before it."""
+    head, steps, last = [], [], 0
+    for line in path.read_text().splitlines(keepends=True):
+        found = STEP.fullmatch(line.strip())
+        if not found:
+            head.append(line)
+            continue
+        time = int(found[1])
+        steps.append((min(time - last, LONGEST_PAUSE), found[2]))
+        last = time
+    return head, steps
+
+
+def main():
+    parser = argparse.ArgumentParser(description=__doc__.split(":")[0], usage=__doc__.splitlines()[0].split(": ")[1])
+    parser.add_argument("--exit", type=int, help="the exit code of the failure, instead of a signal")
+    parser.add_argument("--seconds", type=float, default=60, help="how long a run may take")
+    parser.add_argument("trace", type=pathlib.Path)
+    parser.add_argument("short", type=pathlib.Path)
+    parser.add_argument("program", nargs="+")
+    wanted = parser.parse_args()
+    try:
+        head, steps = read(wanted.trace)
+    except (OSError, UnicodeDecodeError) as error:
+        sys.exit(f"shrink_trace.py: {wanted.trace}: {getattr(error, 'strerror', None) or error}")
+    shrinker = Shrinker(wanted.program, wanted.exit, wanted.seconds)
+    if not shrinker.fails(head, steps):
+        sys.exit(f"shrink_trace.py: {wanted.trace}: the program does not fail under it")
+    steps = shrinker.shrink(head, steps)
+    wanted.short.write_text("".join(head) + "".join(f"+{pause} {words}\n" for pause, words in steps))
+    print(f"{len(steps)} steps after {shrinker.runs} runs: {wanted.short}")
+
+
+main()

@@ -1,0 +1,64 @@
+"""What a monkey finds, and how short it becomes: monkey_test.py PLANTED FACTORY_TEST SHRINK"""
+
+import os
+import pathlib
+import signal
+import subprocess
+import sys
+import tempfile
+import unittest
+
+PLANTED, FACTORY_TEST, SHRINK = sys.argv[1:4]
+
+
+class MonkeyTest(unittest.TestCase):
+    def setUp(self):
+        folder = self.enterContext(tempfile.TemporaryDirectory())
+        self.folder = pathlib.Path(folder)
+
+    def run_program(self, *command, **environment):
+        settings = {**os.environ, "BRIMOL_DISPLAY": "headless", "BRIMOL_DEVICE": "", "BRIMOL_SCREEN": "480x800",
+                    **environment}
+        return subprocess.run(command, env=settings, cwd=self.folder, capture_output=True, text=True, timeout=100,
+                              check=False)
+
+    def test_a_crash_on_the_third_screen_is_found_and_made_short(self):
+        trace, short = self.folder / "long.trace", self.folder / "short.trace"
+        found = self.run_program(PLANTED, BRIMOL_MONKEY="1:5000", BRIMOL_RECORD=str(trace))
+        self.assertEqual(found.returncode, -signal.SIGABRT, found.stderr)
+        self.assertEqual(self.run_program(PLANTED, BRIMOL_TRACE=str(trace)).returncode, -signal.SIGABRT)
+        shrunk = self.run_program(SHRINK, str(trace), str(short), "--", PLANTED)
+        self.assertEqual(shrunk.returncode, 0, shrunk.stdout + shrunk.stderr)
+        self.assertEqual(self.run_program(PLANTED, BRIMOL_TRACE=str(short)).returncode, -signal.SIGABRT)
+        steps = [line for line in short.read_text().splitlines() if line.startswith("+")]
+        self.assertLessEqual(len(steps), 20, steps)
+
+    def test_what_does_not_fail_is_not_made_short(self):
+        trace = self.folder / "quiet.trace"
+        trace.write_text("brimol-trace 1\n100 down 0 1 1\n200 up 0 1 1\n")
+        self.assertIn("does not fail", self.run_program(SHRINK, str(trace), "short", "--", PLANTED).stderr)
+
+    def test_the_factory_test_holds_and_does_the_same_again(self):
+        traces = []
+        for name in "one", "other":
+            ended = self.run_program(FACTORY_TEST, "--monkey", "7", "--events", "3000", "--monkey-trace", name)
+            self.assertEqual(ended.returncode, 0, ended.stderr)
+            traces.append((self.folder / name).read_text())
+        self.assertGreater(traces[0].count("\n"), 3000)
+        self.assertEqual(traces[0], traces[1])
+
+    def test_a_program_that_ignores_everything_is_told_of(self):
+        deaf = "8:20000"
+        ended = self.run_program(PLANTED, BRIMOL_MONKEY=deaf, BRIMOL_SCREEN="30x30")
+        self.assertEqual(ended.returncode, 1, ended.stderr)
+        self.assertIn("nothing has changed on the screen for 5000 events", ended.stderr)
+
+    def test_wrong_wishes_are_refused(self):
+        for wish in "x", "1:", "1:2:3", "-1":
+            ended = self.run_program(PLANTED, BRIMOL_MONKEY=wish)
+            self.assertEqual(ended.returncode, 1, wish)
+            self.assertIn(f"BRIMOL_MONKEY={wish}: wanted SEED or SEED:EVENTS", ended.stderr)
+
+
+if __name__ == "__main__":
+    unittest.main(argv=sys.argv[:1], verbosity=2)
