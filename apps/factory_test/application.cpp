@@ -19,8 +19,9 @@
 
 #include "complain.h"
 #include "factory_test.h"
+#include "language/language.h"
 #include "pages/table.h"
-#include "plan/plan_json.h"
+#include "run_start.h"
 #include "task.h"
 
 namespace factory_test {
@@ -110,6 +111,7 @@ ExitCode showScreens(const Options& options, ResultBook& book, const Context& co
 
 ExitCode runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
+  chooseLanguage(options.language);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   if (!options.monkey.empty()) letMonkeyPlay(options);
@@ -119,9 +121,7 @@ ExitCode runApplication(const Options& options) {
     complain(error);
     return ExitCode::WrongUse;
   }
-  RunStart run = {.planName = task->plan.name, .planHash = planHash(task->plan)};
-  for (const PlanStep& step : task->plan.steps) run.tests.push_back(step.test);
-  auto book = ResultBook::open({.json = options.results, .junit = options.junit}, run, error);
+  auto book = ResultBook::open(keepingOf(options), runStartOf(options, task->plan), error);
   if (!book) return fail(error);
   Context context = {*book, log, {}, options.shell, task->plan};
   if (!options.log.empty()) {
@@ -136,6 +136,10 @@ ExitCode runApplication(const Options& options) {
   const ExitCode result = started ? showScreens(options, *book, context, *task)
                                   : fail("no memory for the dispatch thread");
   MW::Window::destroy();
+  const auto line = book->lineStatus();
+  if (line && !line->error.empty()) {
+    complain(std::to_string(line->waiting) + " verdicts wait for the line: " + line->error);
+  }
   return result;
 }
 

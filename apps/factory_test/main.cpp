@@ -10,6 +10,7 @@
 #include "complain.h"
 #include "options.h"
 #include "plan/plan_json.h"
+#include "records/commands.h"
 #include "task.h"
 #include "version.h"
 
@@ -35,7 +36,9 @@ int printPlan(const factory_test::Options& options) {
 int main(int count, char** arguments) {
   std::string error;
   const std::span<const char* const> all(arguments, static_cast<std::size_t>(count));
-  const auto options = factory_test::parseOptions(all.subspan(all.empty() ? 0 : 1), error);
+  const auto words = all.subspan(all.empty() ? 0 : 1);
+  if (const auto done = factory_test::runRecordsCommand(words)) return *done;
+  const auto options = factory_test::parseOptions(words, error);
   if (!options) {
     factory_test::complain(error);
     return static_cast<int>(factory_test::ExitCode::WrongUse);

@@ -12,7 +12,10 @@
 #include <utility>
 
 #include "exit_code.h"
+#include "language/language.h"
 #include "pages/table.h"
+#include "records/commands.h"
+#include "run_start.h"
 
 namespace factory_test {
 
@@ -34,10 +37,22 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char*) { options.headless = true; }},
     {"--device", "NAME", "play on that phone's screen, see below",
      [](Options& options, const char* value) { options.device = value; }},
+    {"--language", "CODE", "show texts in en, de, ko or ar, instead of the environment's language",
+     [](Options& options, const char* value) { options.language = value; }},
     {"--results", "FILE.json", "keep the verdicts in FILE.json, and go on from what it holds",
      [](Options& options, const char* value) { options.results = value; }},
     {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
      [](Options& options, const char* value) { options.junit = value; }},
+    {"--database", "FILE", "keep all runs in FILE, and go on with the unit's aborted one",
+     [](Options& options, const char* value) { options.database = value; }},
+    {"--new-run", nullptr, "begin a new run even so",
+     [](Options& options, const char*) { options.newRun = true; }},
+    {"--line", "postgresql://...", "send the database's runs there, too",
+     [](Options& options, const char* value) { options.line = value; }},
+    {"--serial", "SERIAL", "the unit's serial number, instead of the property ro.serialno",
+     [](Options& options, const char* value) { options.serial = value; }},
+    {"--operator", "NAME", "who tests",
+     [](Options& options, const char* value) { options.operatorName = value; }},
     {"--plan", "FILE.json", "test what this plan says, see docs/plans.md",
      [](Options& options, const char* value) { options.plan = value; }},
     {"--print-plan", nullptr, "print the plan with every field, and end",
@@ -141,6 +156,12 @@ std::string wrongMonkey(const Options& options) {
   return "--monkey and --events need numbers";
 }
 
+std::string wrongLanguage(const std::string& code) {
+  std::string error = "unknown language '" + code + "', known are:";
+  for (const std::string_view each : languages()) error.append(" ").append(each);
+  return error;
+}
+
 std::string wrongTest(const std::string& id) {
   std::string error = "unknown test '" + id + "', known are:";
   for (const TestEntry& entry : testEntries()) error.append(" ").append(entry.id);
@@ -171,6 +192,8 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
     error = "--results and --junit name the same file";
     return {};
   }
+  error = wrongRecords(options);
+  if (!error.empty()) return {};
   if (!options.device.empty() && brimol_device_named(options.device.c_str()) == nullptr) {
     error = wrongDevice(options.device);
     return {};
@@ -180,6 +203,10 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
           ? isMonkeys
           : !isNumber(options.monkey) || (!options.events.empty() && !isNumber(options.events))) {
     error = wrongMonkey(options);
+    return {};
+  }
+  if (!options.language.empty() && std::ranges::count(languages(), options.language) == 0) {
+    error = wrongLanguage(options.language);
     return {};
   }
   if (!options.test.empty() && placeOf(options.test) == testEntries().size()) {
@@ -203,6 +230,7 @@ std::string usage() {
   for (const ExitRow& row : exitRows()) {
     text += helpLine(std::to_string(static_cast<int>(row.code)), kCodeColumns, row.meaning);
   }
+  text += recordsUsage();
   text +=
       "\nEnvironment:\n"
       "  BRIMOL_DISPLAY=window|browser|headless\n"

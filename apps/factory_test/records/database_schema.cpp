@@ -68,6 +68,32 @@ create table measures (
   primary key (verdict, position)
 ) strict, without rowid;
 )sql",
+    // What a line has to be told of, in order, and how far each line was.
+    R"sql(
+alter table runs add column revision integer not null default 1;
+create table changes (
+  number integer primary key autoincrement,
+  run text not null references runs (id),
+  verdict text references verdicts
+) strict;
+create table lines (
+  id text primary key,
+  sent integer not null
+) strict, without rowid;
+insert into changes (run) select id from runs order by number;
+insert into changes (run, verdict)
+  select v.run, v.id from verdicts v join runs r on r.id = v.run order by r.number, v.number;
+create trigger run_begins after insert on runs begin
+  insert into changes (run) values (new.id);
+end;
+create trigger run_changes after update of operator, ended, state on runs begin
+  update runs set revision = revision + 1 where number = new.number;
+  insert into changes (run) values (new.id);
+end;
+create trigger verdict_is_given after insert on verdicts begin
+  insert into changes (run, verdict) values (new.run, new.id);
+end;
+)sql",
 });
 
 std::string named(const fs::path& path, const std::string& what) {

@@ -166,7 +166,7 @@ Query queryOf(Sqlite& store) {
   return [&store](const std::string& sql, const std::vector<std::string>& parameters,
                   const RowReader& reader) {
     const std::vector<Sqlite::Value> values(parameters.begin(), parameters.end());
-    store.run(sql.c_str(), values, reader);
+    store.run(sql.c_str(), Sqlite::Values(values), reader);
   };
 }
 

@@ -109,7 +109,7 @@ void Sqlite::runAll(const char* sql) {
   check(sqlite3_exec(handle.get(), sql, nullptr, nullptr, nullptr));
 }
 
-std::optional<std::string> Sqlite::cell(const char* sql, Values values) {
+std::optional<std::string> Sqlite::cell(const char* sql, List values) {
   std::optional<std::string> first;
   bool isRead = false;
   run(sql, values, [&](const Cells& row) {
@@ -118,7 +118,7 @@ std::optional<std::string> Sqlite::cell(const char* sql, Values values) {
   return first;
 }
 
-std::int64_t Sqlite::number(const char* sql, Values values) {
+std::int64_t Sqlite::number(const char* sql, List values) {
   const std::string text = cell(sql, values).value_or("");
   std::int64_t number = 0;
   std::from_chars(text.data(), text.data() + text.size(), number);

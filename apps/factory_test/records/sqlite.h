@@ -37,21 +37,22 @@ class Sqlite {
   /// A parameter's value; texts are only read during the call.
   using Value = std::variant<std::nullptr_t, std::int64_t, double, std::string_view>;
   using Values = std::span<const Value>;
+  using List = std::initializer_list<Value>;
 
   /// Opens the database; Mode::Write makes one that is missing. Waits up to kBusyMs for others
   /// that write.
   Sqlite(const std::filesystem::path& path, Mode mode);
 
   /// One statement; its rows go to `reader`.
-  void run(const char* sql, Values values = {}, const RowReader& reader = {});
-  void run(const char* sql, std::initializer_list<Value> values, const RowReader& reader = {}) {
+  void run(const char* sql, Values values, const RowReader& reader = {});
+  void run(const char* sql, List values = {}, const RowReader& reader = {}) {
     run(sql, Values(values.begin(), values.size()), reader);
   }
   /// Statements without parameters.
   void runAll(const char* sql);
   /// The first cell of the first row; nothing for none.
-  std::optional<std::string> cell(const char* sql, Values values = {});
-  std::int64_t number(const char* sql, Values values = {});
+  std::optional<std::string> cell(const char* sql, List values = {});
+  std::int64_t number(const char* sql, List values = {});
   /// How many rows the last statement changed.
   int changes() const { return sqlite3_changes(handle.get()); }
 

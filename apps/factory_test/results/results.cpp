@@ -25,6 +25,7 @@ std::optional<ResultBook> ResultBook::open(const Keeping& places, const RunStart
   if (!places.database.empty()) {
     book.database = Database::open(places.database, error);
     if (!book.database) return {};
+    if (!places.line.empty()) book.line = std::make_unique<Line>(places.database, places.line);
   }
   if (!book.begin(start, error)) return {};
   return book;
@@ -97,6 +98,7 @@ bool ResultBook::saveDatabase(std::string& error) {
   if (!database || unsavedVerdicts.empty()) return true;
   if (!database->keep(unsavedVerdicts, error)) return false;
   unsavedVerdicts.clear();
+  if (line) line->wake();
   return true;
 }
 
@@ -123,6 +125,10 @@ bool ResultBook::saveAgain(std::string& error) {
 
 bool ResultBook::finish(std::string& error) {
   return saveAgain(error) && (!database || database->finishRun(error));
+}
+
+std::optional<LineStatus> ResultBook::lineStatus() const {
+  return line ? std::optional(line->status()) : std::nullopt;
 }
 
 void ResultBook::put(TestResult result) {

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "records/database.h"
+#include "records/line.h"
 #include "records/run.h"
 #include "results/file_lock.h"
 #include "results/test_result.h"
@@ -21,6 +22,7 @@ struct Keeping {
   std::filesystem::path junit = {};     // a report for a CI system, see junit.h
   std::filesystem::path database = {};  // all verdicts of all units, see records/database.h
   Database::Resume resume = Database::Resume::Yes;
+  std::string line = {};  // the address of the line's database, see records/line.h; empty: none
 };
 
 /// The newest result of each test of one unit, and what keeps them. One thread at a time uses a
@@ -60,6 +62,9 @@ class ResultBook {
   /// finished once all tests of its plan have a verdict, and aborted when the program ends before.
   bool finish(std::string& error);
 
+  /// How the line's database is kept up to date; nothing without one.
+  std::optional<LineStatus> lineStatus() const;
+
   /// The test's result, or null. Valid until the next record() or startUnit().
   const TestResult* find(std::string_view test) const;
   /// In the order in which the tests were recorded first. Valid as long.
@@ -77,7 +82,8 @@ class ResultBook {
 
   Keeping files;
   std::vector<FileLock> locks = {};
-  std::unique_ptr<Database> database = {};
+  std::unique_ptr<Line> line = {};
+  std::unique_ptr<Database> database = {};  // ends its run before the line does
   RunStart begun = {};
   std::vector<TestResult> kept = {};
   std::vector<TestResult> unsavedVerdicts = {};  // the database has yet to take them, oldest first

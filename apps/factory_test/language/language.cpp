@@ -1,0 +1,64 @@
+#include "language/language.h"
+
+#include <libintl.h>
+
+#include <algorithm>
+#include <array>
+#include <clocale>
+#include <cstdlib>
+#include <filesystem>
+#include <string_view>
+#include <system_error>
+
+namespace factory_test {
+
+namespace {
+
+constexpr const char* kDomain = "factory_test";
+constexpr auto kLanguages = std::to_array<std::string_view>({"en", "de", "ko", "ar", "xx"});
+
+bool isKnown(std::string_view code) { return std::ranges::count(kLanguages, code) > 0; }
+
+// Of "de_AT.UTF-8" the language, if there is a catalogue for it.
+std::string environmentsLanguage() {
+  for (const char* const name : {"LC_ALL", "LC_MESSAGES", "LANG"}) {
+    const char* const value = std::getenv(name);
+    if (value == nullptr || *value == '\0') continue;
+    const std::string_view locale = value;
+    const std::string_view code = locale.substr(0, locale.find_first_of("_.@"));
+    return isKnown(code) ? std::string(code) : "en";
+  }
+  return "en";
+}
+
+// Beside the program where it was built, and where it is installed.
+std::filesystem::path catalogues() {
+  std::error_code failed;
+  const auto folder = std::filesystem::read_symlink("/proc/self/exe", failed).parent_path();
+  const auto built = folder / "locale";
+  return std::filesystem::exists(built, failed) ? built : folder.parent_path() / "share" / "locale";
+}
+
+}  // namespace
+
+std::span<const std::string_view> languages() { return kLanguages; }
+
+void chooseLanguage(const std::string& code) {
+  // Catalogues are read under any locale but "C", and this one is always there. LANGUAGE says
+  // whose.
+  std::setlocale(LC_MESSAGES, "C.UTF-8");
+  setenv("LANGUAGE", (code.empty() ? environmentsLanguage() : code).c_str(), 1);
+  bindtextdomain(kDomain, catalogues().c_str());
+  bind_textdomain_codeset(kDomain, "UTF-8");
+}
+
+// The empty text is that of a catalogue's head.
+const char* tr(const char* english) {
+  return *english == '\0' ? english : dgettext(kDomain, english);
+}
+
+const char* trn(const char* one, const char* many, unsigned long count) {
+  return dngettext(kDomain, one, many, count);
+}
+
+}  // namespace factory_test

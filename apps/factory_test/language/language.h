@@ -1,0 +1,28 @@
+/// The language of the program's texts. Catalogues are gettext's, one file a language in this
+/// folder.
+#pragma once
+
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace factory_test {
+
+/// Their codes: "en", "de", "ko", "ar", and "xx", a made-up language of long words with accents, by
+/// which one sees what a translation would break.
+std::span<const std::string_view> languages();
+
+/// Chooses one of languages(). Empty: that of the environment (LC_ALL, LC_MESSAGES, LANG), or
+/// English. Call it before tr(), on the main thread, while there is no other.
+void chooseLanguage(const std::string& code);
+
+/// The text in the chosen language, in UTF-8; English where the catalogue lacks it. It stays valid.
+/// Any thread.
+const char* tr(const char* english);
+/// The text of a number of things, in the form that the language has for so many.
+const char* trn(const char* one, const char* many, unsigned long count);
+
+/// Marks a text that stands in a table and goes through tr() where it is shown.
+constexpr const char* msg(const char* english) { return english; }
+
+}  // namespace factory_test

@@ -1,0 +1,152 @@
+#include "records/line.h"
+
+#include <poll.h>
+#include <sys/eventfd.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <array>
+#include <condition_variable>
+#include <mutex>
+#include <random>
+#include <thread>
+#include <utility>
+
+#include "records/line_transfer.h"
+
+namespace factory_test {
+
+namespace {
+
+using std::chrono::milliseconds;
+
+constexpr milliseconds kForever{-1};
+
+// A signal to a thread that waits in poll().
+class Bell {
+ public:
+  Bell() : descriptor(::eventfd(0, EFD_CLOEXEC | EFD_NONBLOCK)) {}
+  ~Bell() { ::close(descriptor); }
+  Bell(const Bell&) = delete;
+  Bell& operator=(const Bell&) = delete;
+
+  void ring() const { ::eventfd_write(descriptor, 1); }
+  void clear() const {
+    eventfd_t count = 0;
+    ::eventfd_read(descriptor, &count);
+  }
+  int id() const { return descriptor; }
+
+ private:
+  int descriptor;
+};
+
+}  // namespace
+
+struct Line::Shared {
+  Shared(std::filesystem::path database, std::string address, LinePace failurePace)
+      : station(std::move(database)), url(std::move(address)), pace(failurePace) {}
+
+  const std::filesystem::path station;
+  const std::string url;
+  const LinePace pace;
+  Bell stop;
+  Bell news;
+
+  mutable std::mutex mutex;  // guards what follows
+  std::condition_variable changed;
+  LineStatus status;
+  int asked = 0;   // how often there was news
+  int served = 0;  // the news whose verdicts are sent
+  bool hasEnded = false;
+
+  // Whether to go on: stop has not rung. Returns on news, too, where they are waited for.
+  bool wait(milliseconds most, const Bell* alsoFor) const {
+    std::array<pollfd, 2> bells = {{{stop.id(), POLLIN, 0}, {-1, POLLIN, 0}}};
+    if (alsoFor != nullptr) bells[1].fd = alsoFor->id();
+    ::poll(bells.data(), bells.size(), static_cast<int>(most.count()));
+    return bells[0].revents == 0;
+  }
+
+  template <typename Change>
+  void set(const Change& change) {
+    const std::lock_guard guard(mutex);
+    change();
+    changed.notify_all();
+  }
+
+  // Sends until there is nothing more; then waits for news, and so on until it is stopped.
+  void serve(milliseconds& pause) {
+    set([this] { ++status.attempts; });
+    LineTransfer transfer(station, url, stop.id());
+    do {
+      int serving = 0;
+      set([&] { news.clear(), serving = asked; });
+      while (wait(milliseconds(0), nullptr) && transfer.sendSome()) {
+        const std::int64_t left = transfer.waiting();
+        set([this, left] { status.waiting = left; });
+        pause = pace.first;
+      }
+      set([&] { served = serving, status.waiting = 0, status.error.clear(); });
+    } while (wait(kForever, &news));
+  }
+
+  void fail(const std::string& why) {
+    std::int64_t left = 0;
+    try {
+      Sqlite store(station, Sqlite::Mode::Read);
+      left = store.number(
+          "select count(*) from changes where verdict is not null and number > "
+          "coalesce((select max(sent) from lines), 0)");
+    } catch (const StoreError&) {
+      left = 0;  // unknown
+    }
+    set([&] { status.waiting = left, status.error = why; });
+  }
+};
+
+Line::Line(std::filesystem::path station, std::string url, LinePace pace)
+    : shared(std::make_shared<Shared>(std::move(station), std::move(url), pace)) {
+  std::thread(work, shared).detach();
+}
+
+void Line::work(const std::shared_ptr<Shared>& shared) {
+  std::minstd_rand random{std::random_device{}()};
+  milliseconds pause = shared->pace.first;
+  milliseconds delay{0};
+  while (shared->wait(delay, nullptr)) {
+    try {
+      shared->serve(pause);
+    } catch (const StoreError& failure) {
+      shared->fail(failure.what());
+    }
+    // Half of it by chance: stations that lost the server together do not come back together.
+    std::uniform_int_distribution<milliseconds::rep> share(pause.count() / 2, pause.count());
+    delay = milliseconds(share(random));
+    pause = std::min(pause * 2, shared->pace.most);
+  }
+  shared->set([&] { shared->hasEnded = true; });
+}
+
+Line::~Line() {
+  wake();
+  const auto isDone = [this] {
+    return shared->served == shared->asked || !shared->status.error.empty();
+  };
+  std::unique_lock lock(shared->mutex);
+  shared->changed.wait_for(lock, kGrace, isDone);
+  shared->stop.ring();
+  shared->changed.wait_for(lock, kGrace, [this] { return shared->hasEnded; });
+}
+
+void Line::wake() {
+  shared->set([this] { ++shared->asked; });
+  shared->news.ring();
+}
+
+LineStatus Line::status() const {
+  const std::lock_guard guard(shared->mutex);
+  return shared->status;
+}
+
+}  // namespace factory_test

@@ -1,0 +1,50 @@
+/// The background work that keeps a line's database up to date.
+#pragma once
+
+#include <chrono>
+#include <cstdint>
+#include <filesystem>
+#include <memory>
+#include <string>
+
+namespace factory_test {
+
+struct LineStatus {
+  std::int64_t waiting = 0;  // verdicts that the line's database does not hold, when it last looked
+  std::string error = {};    // why not; empty: it sends, or has nothing to send
+  int attempts = 0;          // connections that were tried
+};
+
+/// How long it waits after a failure: each time twice as long.
+struct LinePace {
+  std::chrono::milliseconds first{1000};
+  std::chrono::milliseconds most{60'000};
+};
+
+/// Sends what a station's database holds to one PostgreSQL database, from construction to
+/// destruction, on a thread of its own: every verdict once, whatever was sent before, by whom, and
+/// however often the server or the network goes away. Nothing here waits for the network.
+class Line {
+ public:
+  /// `station` is a database that Database has opened before; `url` is as libpq reads it.
+  Line(std::filesystem::path station, std::string url, LinePace pace = {});
+  /// Gives a server that answers kGrace for the rest. What is left goes out at the next start.
+  ~Line();
+  Line(const Line&) = delete;
+  Line& operator=(const Line&) = delete;
+
+  /// There are new verdicts. Any thread.
+  void wake();
+  LineStatus status() const;
+
+ private:
+  struct Shared;
+  static void work(const std::shared_ptr<Shared>& shared);
+
+  static constexpr std::chrono::milliseconds kGrace{1000};
+
+  // The thread's, too: it may stay behind in the look-up of a host's name, which cannot be ended.
+  std::shared_ptr<Shared> shared;
+};
+
+}  // namespace factory_test

@@ -1,0 +1,292 @@
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+#include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <csignal>
+#include <fstream>
+#include <iterator>
+
+#include "records/database_schema.h"
+#include "records/history.h"
+#include "records/statistics.h"
+#include "results/results.h"
+
+namespace factory_test {
+namespace {
+
+namespace fs = std::filesystem;
+using testing::ElementsAre;
+
+constexpr std::chrono::sys_seconds kMorning(std::chrono::seconds(1'795'244'400));
+
+RunStart startOf(const std::string& unit) {
+  return {unit, "Ann", "Line A", "hash", {"keys", "touch"}, "1.0", "bench7", kMorning};
+}
+
+TestResult resultOf(const std::string& test, Verdict verdict, int attempt = 1) {
+  const Measure distance = {"worst distance", "mm", 0.1, {}, 2.5};
+  return {test,       verdict,    kMorning, std::chrono::milliseconds(4200),
+          {480, 800}, {distance}, attempt};
+}
+const TestResult kKeys = resultOf("keys", Verdict::Pass);
+const TestResult kTouch = resultOf("touch", Verdict::Fail);
+
+class Records : public testing::Test {
+ protected:
+  Records() { fs::create_directory(folder); }
+  ~Records() override { fs::remove_all(folder); }
+
+  std::optional<ResultBook> open(const RunStart& start) {
+    return ResultBook::open({.database = file}, start, error);
+  }
+  // What the database says of its runs, read as others read it.
+  std::vector<RunRecord> history() const {
+    Sqlite store(file, Sqlite::Mode::Read);
+    EXPECT_EQ(store.cell("pragma integrity_check"), "ok");
+    return readHistory(queryOf(store), {});
+  }
+  std::vector<std::string> states() const {
+    std::vector<std::string> words;
+    for (const RunRecord& run : history()) words.emplace_back(stateName(run.state));
+    return words;
+  }
+
+  const fs::path folder = testing::TempDir() + "records_test." + std::to_string(::getpid());
+  const fs::path file = folder / "station.db";
+  std::string error;
+};
+
+// Runs `task` in a process of its own and says how it ended.
+template <typename Task>
+int inChild(const Task& task) {
+  const pid_t child = ::fork();
+  if (child == 0) {
+    task();
+    ::_exit(0);
+  }
+  int end = 0;
+  ::waitpid(child, &end, 0);
+  return end;
+}
+
+TEST_F(Records, GoOnWithTheUnitsAbortedRunOnly) {
+  ASSERT_TRUE(open(startOf("A1"))->record(kKeys, error)) << error;
+  struct Other {
+    const char* name;
+    RunStart start;
+    Database::Resume resume;
+  };
+  RunStart plan = startOf("A1");
+  plan.planHash = "other";
+  RunStart software = startOf("A1");
+  software.software = "1.1";
+  for (const auto& [name, start, resume] : std::vector<Other>{
+           {"its run", startOf("A1"), Database::Resume::Yes},
+           {"another unit's", startOf("A2"), Database::Resume::Yes},
+           {"no unit's", startOf(""), Database::Resume::Yes},
+           {"not wanted", startOf("A1"), Database::Resume::No},
+       }) {
+    const auto book = ResultBook::open({.database = file, .resume = resume}, start, error);
+    ASSERT_TRUE(book) << error;
+    EXPECT_EQ(book->results().size(), name == std::string("its run") ? 1U : 0U) << name;
+  }
+  EXPECT_EQ(open(plan)->results().size(), 0U);
+  EXPECT_EQ(open(software)->results().size(), 0U);
+}
+
+TEST_F(Records, AreFinishedWithTheirPlan) {
+  ASSERT_TRUE(open(startOf("B1"))->record(kKeys, error));
+  auto book = open(startOf("B1"));
+  EXPECT_EQ(book->results(), std::vector{kKeys});
+  ASSERT_TRUE(book->record(kKeys, error)) << error;
+  EXPECT_THAT(states(), ElementsAre("running"));
+  ASSERT_TRUE(book->record(kTouch, error)) << error;
+  EXPECT_THAT(states(), ElementsAre("finished")) << "with the plan's last test";
+  ASSERT_TRUE(book->startUnit(startOf("B1"), error)) << error;
+  EXPECT_TRUE(book->results().empty());
+  EXPECT_TRUE(book->finish(error)) << "a failure ended the plan";
+  book.reset();
+  EXPECT_THAT(states(), ElementsAre("finished", "finished"));
+  const auto runs = history();
+  const RunRecord& run = runs[0].verdicts.empty() ? runs[1] : runs[0];
+  EXPECT_EQ(run.start.tests, startOf("").tests);
+  EXPECT_EQ(run.ended, kMorning + std::chrono::seconds(4));
+  ASSERT_EQ(run.verdicts.size(), 3U);
+  EXPECT_EQ(run.verdicts[0].result, kKeys);
+  EXPECT_EQ(run.verdicts[1].result, resultOf("keys", Verdict::Pass, 2));
+}
+
+TEST_F(Records, KnowARunThatADeadProgramLeft) {
+  auto living = open(startOf("A1"));
+  ASSERT_TRUE(living) << error;
+  const int end = inChild([this] {
+    auto book = open(startOf("A2"));
+    book->record(kKeys, error);
+    ::raise(SIGKILL);
+  });
+  ASSERT_TRUE(WIFSIGNALED(end));
+  EXPECT_THAT(states(), ElementsAre("running", "running"));
+  const auto next = open(startOf("A3"));
+  ASSERT_TRUE(next) << error;
+  EXPECT_THAT(states(), testing::UnorderedElementsAre("running", "aborted", "running"));
+  const auto resumed = open(startOf("A2"));
+  EXPECT_EQ(resumed->results(), std::vector{kKeys});
+  // A run that a living program holds is nobody else's.
+  EXPECT_TRUE(open(startOf("A1"))->results().empty());
+  EXPECT_TRUE(living->record(kKeys, error));
+}
+
+TEST_F(Records, TakeSeveralProgramsAtOnce) {
+  constexpr int kPrograms = 4;
+  constexpr int kVerdicts = 25;
+  std::vector<pid_t> children;
+  for (int program = 0; program < kPrograms; ++program) {
+    children.push_back(::fork());
+    if (children.back() != 0) continue;
+    auto book = open(startOf("A" + std::to_string(program)));
+    for (int i = 0; book && i < kVerdicts; ++i) {
+      if (!book->record(kKeys, error)) ::_exit(1);
+    }
+    ::_exit(book ? 0 : 1);
+  }
+  for (const pid_t child : children) {
+    int end = 0;
+    ::waitpid(child, &end, 0);
+    EXPECT_EQ(end, 0);
+  }
+  ASSERT_EQ(history().size(), kPrograms);
+  for (const RunRecord& run : history()) EXPECT_EQ(run.verdicts.size(), kVerdicts);
+}
+
+TEST_F(Records, OfAnOlderVersionAreMigratedWithABackup) {
+  std::ifstream dump(RECORDS_V1);
+  const std::string sql((std::istreambuf_iterator<char>(dump)), {});
+  Sqlite(file, Sqlite::Mode::Write).runAll(sql.c_str());
+  fs::create_directory(file.native() + ".v1.bak");  // in the way
+  ASSERT_TRUE(open(startOf("C1"))) << error;
+  for (const auto& [path, version] : {std::pair(file, 2), {file.native() + ".v1.bak.2", 1}}) {
+    Sqlite store(path, Sqlite::Mode::Read);
+    EXPECT_EQ(store.number("pragma user_version"), version);
+    const auto runs = readHistory(queryOf(store), {.unit = "OLD 1"});
+    ASSERT_EQ(runs.size(), 1U);
+    EXPECT_EQ(runs[0].verdicts.at(1).result.values.at(0), (Measure{"gap", "mm", 0.25, {}, 1.5}));
+  }
+  Sqlite store(file, Sqlite::Mode::Read);
+  EXPECT_EQ(store.number("select count(*) from changes where verdict is not null"), 2);
+  EXPECT_EQ(store.number("select revision from runs where unit = 'OLD 1'"), 1);
+}
+
+TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
+  ASSERT_TRUE(open(startOf("A1"))->record(kKeys, error));
+  const auto damage = [this](std::streamoff at, const std::string& bytes) {
+    std::fstream(file).seekp(at).write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
+  };
+  const auto run = [this](const char* sql) { Sqlite(file, Sqlite::Mode::Write).runAll(sql); };
+  struct Case {
+    const char* says;
+    std::function<void()> prepare;
+  };
+  for (const auto& [says, prepare] : std::vector<Case>{
+           {"is of version 3, newer than this program's 2",
+            [&] { run("pragma user_version = 3"); }},
+           {"is another program's database", [&] { run("pragma application_id = 7"); }},
+           {"is damaged: put it aside, then begin a new one",
+            [&] {
+              run("pragma application_id = 1179927618; pragma user_version = 2");
+              for (int page = 1; page < 30; ++page) damage(page * 4096, std::string(64, '\x7f'));
+            }},
+           {"is not a database", [&] { damage(0, "no database at all"); }},
+           {"cannot be opened: Is a directory",
+            [&] { fs::remove(file), fs::create_directory(file); }},
+       }) {
+    prepare();
+    const auto size = fs::is_directory(file) ? 0 : fs::file_size(file);
+    EXPECT_FALSE(open(startOf("A1"))) << says;
+    EXPECT_EQ(error, file.native() + ": " + says);
+    EXPECT_EQ(fs::is_directory(file) ? 0 : fs::file_size(file), size);
+  }
+}
+
+TEST_F(Records, SayWhereTheyCannotBeWritten) {
+  EXPECT_FALSE(ResultBook::open({.database = folder / "none" / "x.db"}, {}, error));
+  EXPECT_THAT(error, testing::EndsWith("/none/x.db: cannot be opened: No such file or directory"));
+  const int end = inChild([this] {
+    fs::permissions(folder, fs::perms::owner_read | fs::perms::owner_exec);
+    if (::setuid(65'534) != 0 && ::getuid() == 0) ::_exit(2);
+    const bool isRefused =
+        !open(startOf("A1")) && error.starts_with(file.native() + ": cannot be ");
+    ::_exit(isRefused ? 0 : 1);
+  });
+  EXPECT_EQ(end, 0) << "a folder that cannot be written";
+  fs::permissions(folder, fs::perms::owner_all);
+}
+
+TEST_F(Records, SurviveAFullDiskAndALock) {
+  auto book =
+      ResultBook::open({.json = folder / "all.json", .database = file}, startOf("A1"), error);
+  ASSERT_TRUE(book && book->record(kKeys, error)) << error;
+  // Files of this process end after some bytes, as on a full disk.
+  (void)std::signal(SIGXFSZ, SIG_IGN);
+  rlimit former = {};
+  ::getrlimit(RLIMIT_FSIZE, &former);
+  const rlimit little = {4096, former.rlim_max};
+  ::setrlimit(RLIMIT_FSIZE, &little);
+  const bool isWritten = book->record(kTouch, error);
+  ::setrlimit(RLIMIT_FSIZE, &former);
+  EXPECT_FALSE(isWritten);
+  EXPECT_THAT(error, testing::StartsWith(file.native() + ": cannot be read or written"));
+  EXPECT_FALSE(book->isSaved("touch"));
+  EXPECT_TRUE(book->isSaved("keys"));
+  EXPECT_EQ(history().at(0).verdicts.size(), 1U);
+  {
+    Sqlite other(file, Sqlite::Mode::Write);
+    const Transaction lock(other);
+    EXPECT_FALSE(book->saveAgain(error));
+    EXPECT_EQ(error, file.native() + ": is locked by another program");
+  }
+  EXPECT_TRUE(book->saveAgain(error) && book->saveAgain(error)) << error;
+  EXPECT_TRUE(book->isSaved("touch"));
+  EXPECT_EQ(history().at(0).verdicts.size(), 2U) << "once each";
+}
+
+RunRecord runOf(const char* unit, RunState state, std::vector<TestResult> results) {
+  RunRecord run = {.id = unit, .start = startOf(unit), .state = state};
+  for (TestResult& each : results) run.verdicts.push_back({"", std::move(each)});
+  return run;
+}
+
+TEST_F(Records, TellYieldFailsAndValues) {
+  const TestResult touched = resultOf("touch", Verdict::Pass);
+  std::vector<RunRecord> runs = {
+      runOf("at first", RunState::Finished, {kKeys, touched}),
+      runOf("in the end", RunState::Finished, {kKeys, kTouch, touched}),
+      runOf("later", RunState::Aborted, {kTouch}),
+      runOf("later", RunState::Finished, {kKeys, touched}),
+      runOf("never", RunState::Finished, {kKeys, kTouch}),
+      runOf("stopped", RunState::Finished, {kKeys}),
+      runOf("unjudged", RunState::Aborted, {kKeys, touched}),
+  };
+  runs[0].verdicts[0].result.values[0].value = 9.5;
+  runs[5].start.started += std::chrono::days(1);
+  const Statistics all = statisticsOf(runs);
+  EXPECT_EQ(all.total.units, 5);
+  EXPECT_EQ(all.total.passed, 3);
+  EXPECT_EQ(all.total.passedAtFirst, 1);
+  EXPECT_EQ(all.days.size(), 2U);
+  EXPECT_EQ(all.aborted, 2);
+  ASSERT_EQ(all.tests.size(), 2U);
+  EXPECT_EQ(all.tests[0].test, "touch");
+  EXPECT_EQ(all.tests[0].fails, 3);
+  ASSERT_EQ(all.values.size(), 2U);
+  const Spread spread = spreadOf(all.values[0]);
+  EXPECT_EQ(spread.outside, 1);
+  EXPECT_EQ(spread.most, 9.5);
+  EXPECT_EQ(spread.median, 0.1);
+  EXPECT_NEAR(spread.deviation, 3.837, 0.001);
+  EXPECT_NEAR(*spread.capability, (2.5 - spread.mean) / 3 / spread.deviation, 1e-9);
+}
+
+}  // namespace
+}  // namespace factory_test
