@@ -35,13 +35,7 @@ int MeasurePage::wordsAt() const {
 }
 
 Measure MeasurePage::measure(std::string_view name, double value) const {
-  Measure measure = measured(step.test, name, value);
-  const auto limits = step.limits.find(measure.name);
-  if (limits != step.limits.end()) {
-    measure.least = limits->second.least;
-    measure.most = limits->second.most;
-  }
-  return measure;
+  return measured(step.test, name, value);
 }
 
 double MeasurePage::millimetres(double pixels) {
@@ -92,34 +86,47 @@ bool MeasurePage::isWhereItWas(const Input& input) const {
   return millimetres(std::hypot(input.x - still->x, input.y - still->y)) <= kStillMm;
 }
 
-std::vector<std::string> MeasurePage::lines() const {
+std::vector<std::string> MeasurePage::instructionLines() const {
   std::vector<std::string> words;
   std::istringstream text(instructions);
   for (std::string line; std::getline(text, line);) words.push_back(line);
   words.emplace_back("Hold a finger still, or Back: end.");
-  for (const Measure& each : values()) words.push_back(each.name + ": " + measureText(each));
   return words;
 }
 
-void MeasurePage::drawWords(const std::vector<std::string>& words) const {
+std::vector<std::string> MeasurePage::valueLines() const {
+  std::vector<std::string> words;
+  for (Measure each : values()) {
+    const auto limits = step.limits.find(each.name);
+    if (limits != step.limits.end()) {
+      each.least = limits->second.least;
+      each.most = limits->second.most;
+    }
+    words.push_back(each.name + ": " + measureText(each));
+  }
+  return words;
+}
+
+int MeasurePage::drawLines(const std::vector<std::string>& words, int top) {
   const ScreenSize screen = screenSize();
   const int height = percentOf(std::max(screen.width, screen.height), kLinePercent);
-  int top = percentOf(screen.height, wordsAt());
   for (const std::string& each : words) {
     skia_add_label_c({0, top, screen.width, height, 0},
                      textOf(each.c_str(), kPageInk.text, SKIA_ALIGN_CENTRE, textSize(screen)));
     top += height;
   }
+  return top;
 }
 
 void MeasurePage::draw() {
   if (page.isAsking()) {
     page.draw();
-    drawWords(lines());
+    drawLines(valueLines(), contentArea().y);
     return;
   }
   drawLook();
-  if (hasWords()) drawWords(lines());
+  if (!hasWords()) return;
+  drawLines(valueLines(), drawLines(instructionLines(), percentOf(screenSize().height, wordsAt())));
 }
 
 }  // namespace factory_test

@@ -63,8 +63,10 @@ class MeasurePage : public LookTest {
   bool isOfAnOldTouch(const Input& input) const;
   void followStill(const Input& input);
   bool isWhereItWas(const Input& input) const;
-  void drawWords(const std::vector<std::string>& words) const;
-  std::vector<std::string> lines() const;
+  std::vector<std::string> instructionLines() const;
+  std::vector<std::string> valueLines() const;  // with their limits
+  // Where the next line begins, in pixels.
+  static int drawLines(const std::vector<std::string>& words, int top);
 
   PlanStep step;
   std::string instructions;
