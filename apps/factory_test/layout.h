@@ -136,13 +136,12 @@ constexpr PageLayout layOutPage(ScreenSize screen) {
   const int gap = gapOf(screen);
   const SKIA_Rect whole = {0, 0, screen.width, screen.height, kPageInk.ground};
   const bool isWide = isLandscape(screen);
-  const auto [head, rest] = rowsOf<2>(whole, 0, isWide ? std::array{10, 90} : std::array{7, 93});
-  const auto [leave, title, nothing] =
-      columnsOf<3>(inColor(within(head, gap / 2), kHeadInk.ground), gap, {3, 8, 3});
+  const auto [head, rest] = rowsOf<2>(whole, 0, isWide ? std::array{10, 90} : std::array{9, 91});
+  const auto [leave, title, nothing] = columnsOf<3>(inColor(head, kHeadInk.ground), gap, {3, 8, 3});
   const SKIA_Rect body = within(rest, 2 * gap);
   PageLayout page = {.ground = whole,
                      .head = inColor(head, kHeadInk.ground),
-                     .leave = inColor(leave, kButtonInk.ground),
+                     .leave = inColor(rowsOf<2>(leave, 0, {11, 1})[0], kButtonInk.ground),
                      .progress = rowsOf<2>(head, 0, {11, 1})[1],
                      .title = title,
                      .hint = {},

@@ -73,7 +73,7 @@ int MenuHead::show(unsigned int) {
 
 // In letters of which the longest figure has room.
 void MenuHead::drawFigures(const SKIA_Rect& area, const Grid& grid) const {
-  constexpr int kLetterPercent = 60;  // of the text's size: what a wide letter takes
+  constexpr int kLetterPercent = 54;  // of the text's size: what a letter takes
   const ScreenSize screen = screenSize();
   const std::array<const std::string*, 6> all = {&figures.battery,    &figures.charger,
                                                  &figures.brightness, &figures.address,

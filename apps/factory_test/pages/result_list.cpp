@@ -59,8 +59,8 @@ std::string wordsOf(Group group, const ResultBook& book, Details details) {
     if (result->verdict != Verdict::None) ++done;
     words += wordsOf(entry, *result, details);
   }
-  const std::string count = std::to_string(done) + " of " + std::to_string(tests) + " done";
-  return lineOf(kGroup, count, "tests", nameOf(group)) + words;
+  const std::string count = std::to_string(done) + " of " + std::to_string(tests);
+  return lineOf(kGroup, count, "done", nameOf(group)) + words;
 }
 
 // The list never hides its last line, nor does that one open: it closes the list.
