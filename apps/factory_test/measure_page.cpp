@@ -17,13 +17,13 @@ namespace {
 
 constexpr uint32_t kStillMs = 2000;
 constexpr double kStillMm = 2;
-constexpr int kLinePercent = 4;  // of the screen's longer side, from one line to the next
+constexpr int kLinePercent = 3;  // of the screen's longer side, from one line to the next
 
 }  // namespace
 
 MeasurePage::MeasurePage(const Context& program, const char* test, const char* title,
                          const char* usualWords)
-    : LookTest(title, ""), step(stepOf(program, test)), instructions(usualWords) {}
+    : LookTest(title, usualWords), step(stepOf(program, test)), instructions(usualWords) {}
 
 std::string MeasurePage::question() const {
   return isDone() ? "Done. Is it right?" : "Not everything was seen.";
@@ -107,26 +107,34 @@ std::vector<std::string> MeasurePage::valueLines() const {
   return words;
 }
 
-int MeasurePage::drawLines(const std::vector<std::string>& words, int top) {
+int MeasurePage::drawLines(const std::vector<std::string>& words, SKIA_Rect area) {
   const ScreenSize screen = screenSize();
-  const int height = percentOf(std::max(screen.width, screen.height), kLinePercent);
+  area.h = percentOf(std::max(screen.width, screen.height), kLinePercent);
   for (const std::string& each : words) {
-    skia_add_label_c({0, top, screen.width, height, 0},
+    skia_add_label_c(area,
                      textOf(each.c_str(), kPageInk.text, SKIA_ALIGN_CENTRE, textSize(screen)));
-    top += height;
+    area.y += area.h;
   }
-  return top;
+  return area.y;
+}
+
+void MeasurePage::instruct(const std::string& words) {
+  instructions = words;
+  LookTest::instruct(words);
 }
 
 void MeasurePage::draw() {
   if (page.isAsking()) {
     page.draw();
-    drawLines(valueLines(), contentArea().y);
+    drawLines(valueLines(), contentArea());
     return;
   }
   drawLook();
   if (!hasWords()) return;
-  drawLines(valueLines(), drawLines(instructionLines(), percentOf(screenSize().height, wordsAt())));
+  const ScreenSize screen = screenSize();
+  SKIA_Rect area = {0, percentOf(screen.height, wordsAt()), screen.width, 0, 0};
+  area.y = drawLines(instructionLines(), area);
+  drawLines(valueLines(), area);
 }
 
 }  // namespace factory_test

@@ -21,7 +21,7 @@ class MeasurePage : public LookTest {
   Outcome verdict() const final { return hasPassed ? Outcome::Pass : page.outcome(); }
   bool isComplete() const final { return hasPassed || isDone(); }
   void draw() final;
-  void instruct(const std::string& words) final { instructions = words; }
+  void instruct(const std::string& words) final;
 
  protected:
   /// `usualWords`: what to do, unless the plan says it.
@@ -65,8 +65,8 @@ class MeasurePage : public LookTest {
   bool isWhereItWas(const Input& input) const;
   std::vector<std::string> instructionLines() const;
   std::vector<std::string> valueLines() const;  // with their limits
-  // Where the next line begins, in pixels.
-  static int drawLines(const std::vector<std::string>& words, int top);
+  // From the area's top; returns where the next line begins.
+  static int drawLines(const std::vector<std::string>& words, SKIA_Rect area);
 
   PlanStep step;
   std::string instructions;
