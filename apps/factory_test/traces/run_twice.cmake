@@ -1,11 +1,16 @@
 # Plays a run twice: the same frames, and the same results, byte for byte; then resumes it.
-# cmake -DREPLAY=<program> -DAPP=<program> -DTRACE=<file> -DFOLDER=<folder> -DDEVICE=<name> -P run_twice.cmake
+# cmake -DREPLAY=<program> -DAPP=<program> -DTRACE=<file> -DFOLDER=<folder> -DDEVICE=<name>
+#       [-DSCREEN=<width>x<height>] -P run_twice.cmake
+set(size)
+if(SCREEN)
+  set(size --screen ${SCREEN})
+endif()
 file(MAKE_DIRECTORY "${FOLDER}")
 set(other)
 foreach(run first second)
   file(REMOVE "${FOLDER}/${run}.json")
   execute_process(
-    COMMAND "${REPLAY}" --dir "${FOLDER}/${run}" --device ${DEVICE} --exit-code 3 ${other} "${TRACE}" -- "${APP}"
+    COMMAND "${REPLAY}" --dir "${FOLDER}/${run}" --device ${DEVICE} ${size} --exit-code 3 ${other} "${TRACE}" -- "${APP}"
             --results "${FOLDER}/${run}.json" --junit "${FOLDER}/${run}.xml" --shell "sleep 9" COMMAND_ERROR_IS_FATAL ANY)
   set(other --against "${FOLDER}/first")
 endforeach()
@@ -24,5 +29,5 @@ if(NOT count EQUAL 27)
 endif()
 get_filename_component(traces "${TRACE}" DIRECTORY)
 execute_process(
-  COMMAND "${REPLAY}" --dir "${FOLDER}/resumed" --device ${DEVICE} --exit-code 3 "${traces}/resumed.trace" -- "${APP}"
+  COMMAND "${REPLAY}" --dir "${FOLDER}/resumed" --device ${DEVICE} ${size} --exit-code 3 "${traces}/resumed.trace" -- "${APP}"
           --results "${FOLDER}/first.json" COMMAND_ERROR_IS_FATAL ANY)
