@@ -116,7 +116,7 @@ class KeyTest : public PageTest {
     const ScreenSize screen = screenSize();
     const Grid grid = isLandscape(screen) ? Grid{3, 4} : Grid{4, 3};
     const std::string words =
-        std::string(kAsked.at(static_cast<std::size_t>(index)).name) + (isPressed ? " OK" : "");
+        std::string(kAsked.at(static_cast<std::size_t>(index)).name) + (isPressed ? "\nOK" : "");
     const Ink ink = isPressed ? kPassInk : kButtonInk;
     skia_add_textbox_c(inColor(cellOf(contentArea(), gapOf(screen), grid, index), ink.ground),
                        captionOf(words.c_str(), ink.text));
