@@ -1,5 +1,6 @@
-// An application up to its first frame: a menu in a window's place. Prints, for start_bench, when the
-// frame was painted, in nanoseconds of the steady clock, and the kilobytes that are resident then.
+// An application up to its first frame: a menu in a window's place. Prints, for start_bench, when
+// the frame was painted, in nanoseconds of the steady clock, and the kilobytes that are resident
+// then.
 #include <MW/main_list.h>
 #include <MW/window.h>
 #include <android/log.h>
@@ -57,8 +58,8 @@ int main() {
     MW::Window::show();
     skia_end_frame_c();
     const auto painted = timeOfPaintedFrame().time_since_epoch();
-    std::printf("%lld %ld\n",
-                static_cast<long long>(std::chrono::nanoseconds(painted).count()), residentKb());
+    std::printf("%lld %ld\n", static_cast<long long>(std::chrono::nanoseconds(painted).count()),
+                residentKb());
     std::fflush(stdout);
   }
   MW::Window::destroy();

@@ -1,5 +1,5 @@
-// From the start of a process to its first painted frame, and what is resident then. The program that
-// is started stands in FIRST_FRAME.
+// From the start of a process to its first painted frame, and what is resident then. The program
+// that is started stands in FIRST_FRAME.
 #include <benchmark/benchmark.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -53,8 +53,7 @@ void toFirstFrame(benchmark::State& state, const char* screen) {
     Clock::rep painted = 0;
     double kilobytes = 0;
     output >> painted >> kilobytes;
-    times.push_back(
-        Milliseconds(Clock::time_point(Clock::duration(painted)) - start).count());
+    times.push_back(Milliseconds(Clock::time_point(Clock::duration(painted)) - start).count());
     constexpr double kMega = 1024;
     sizes.push_back(kilobytes / kMega);
   }

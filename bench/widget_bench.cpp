@@ -144,15 +144,15 @@ void valueSliderPass(benchmark::State& state) {
   compareWidget(state, slider, {{SKIA_BOX, 5}, {SKIA_TEXTBOX, 1}});
 }
 
-BENCHMARK(mainListPass)->Unit(benchmark::kMicrosecond);
-BENCHMARK(resultListPass)->Unit(benchmark::kMicrosecond);
-BENCHMARK(textViewerPass)->Unit(benchmark::kMicrosecond);
-BENCHMARK(keyboardPass)->Unit(benchmark::kMicrosecond);
-BENCHMARK(dialogPass)->Unit(benchmark::kMicrosecond);
-BENCHMARK(dialogNewPass)->Unit(benchmark::kMicrosecond);
-BENCHMARK(dialogListPass)->Unit(benchmark::kMicrosecond);
-BENCHMARK(dialogShellPass)->Unit(benchmark::kMicrosecond);
-BENCHMARK(padPass)->Unit(benchmark::kMicrosecond);
-BENCHMARK(valueSliderPass)->Unit(benchmark::kMicrosecond);
+BENCHMARK(mainListPass)->Name("drawing/main list of 64 rows");
+BENCHMARK(resultListPass)->Name("drawing/list of 64 results");
+BENCHMARK(textViewerPass)->Name("drawing/text viewer of 62 rows");
+BENCHMARK(keyboardPass)->Name("drawing/keyboard");
+BENCHMARK(dialogPass)->Name("drawing/Dialog");
+BENCHMARK(dialogNewPass)->Name("drawing/DialogNew of three lines");
+BENCHMARK(dialogListPass)->Name("drawing/DialogList of eight rows");
+BENCHMARK(dialogShellPass)->Name("drawing/DialogShell of 25 lines");
+BENCHMARK(padPass)->Name("drawing/Button8 of eight cells");
+BENCHMARK(valueSliderPass)->Name("drawing/SlideMove with its value");
 
 }  // namespace

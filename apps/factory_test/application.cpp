@@ -6,6 +6,7 @@
 #include <brimol/input.h>
 
 #include <algorithm>
+#include <array>
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
@@ -20,6 +21,8 @@
 #include "factory_test.h"
 #include "language/language.h"
 #include "pages/table.h"
+#include "run_start.h"
+#include "task.h"
 
 namespace factory_test {
 
@@ -30,12 +33,32 @@ constexpr unsigned int kLoopMs = 5;
 volatile std::sig_atomic_t interrupted = 0;
 
 void endOnSignals() {
-  for (const int number : {SIGINT, SIGTERM}) std::signal(number, [](int) { interrupted = 1; });
+  for (const int number : {SIGINT, SIGTERM, SIGHUP})
+    std::signal(number, [](int) { interrupted = 1; });
 }
 
-int fail(const std::string& why) {
+ExitCode fail(const std::string& why) {
   complain(why);
-  return EXIT_FAILURE;
+  return ExitCode::Trouble;
+}
+
+// What the exit code tells of.
+ExitCode judge(const Options& options, const ResultBook& book) {
+  if (options.test.empty()) return judgeRun(book, book.run().tests);
+  return judgeRun(book, std::array{options.test});
+}
+
+std::string wrongScreen() {
+  constexpr int kLeastShort = 320;  // pixels
+  constexpr int kLeastLong = 480;
+  constexpr int kMostRatio = 3;
+  int width = 0;
+  int height = 0;
+  brimol_host_screen_size(&width, &height);
+  const auto [shorter, longer] = std::minmax(width, height);
+  if (shorter >= kLeastShort && longer >= kLeastLong && longer <= kMostRatio * shorter) return {};
+  return "the screen of " + std::to_string(width) + "x" + std::to_string(height) +
+         " pixels has no room for the pages: at least 320x480, and no side three times the other";
 }
 
 void loop(FactoryTest& test, bool stays) {
@@ -71,45 +94,52 @@ void letMonkeyPlay(const Options& options) {
   setenv("BRIMOL_DISPLAY", "headless", 1);
 }
 
-int showScreens(const Options& options, ResultBook& book, const Context& context) {
-  FactoryTest test(book, context);
+ExitCode showScreens(const Options& options, ResultBook& book, const Context& context,
+                     const Task& task) {
+  FactoryTest test(book, context, task);
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
     loop(test, options.stays);
-    return EXIT_SUCCESS;
+    return options.monkey.empty() ? judge(options, book) : ExitCode::Passed;
   }
   if (brimol_host_screenshot(options.shot.c_str()) == 0) return fail(brimol_host_error());
-  return EXIT_SUCCESS;
+  return ExitCode::Passed;
 }
 
 }  // namespace
 
-int runApplication(const Options& options) {
+ExitCode runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
   chooseLanguage(options.language);
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   if (!options.monkey.empty()) letMonkeyPlay(options);
   std::string error;
-  RunStart run;
-  for (const TestEntry& each : testEntries()) {
-    if (each.plan == DefaultPlan::In) run.tests.emplace_back(each.id);
+  const auto task = chooseTask(options, error);
+  if (!task) {
+    complain(error);
+    return ExitCode::WrongUse;
   }
-  auto book = ResultBook::open({.json = options.results, .junit = options.junit}, run, error);
+  auto book = ResultBook::open(keepingOf(options), runStartOf(options, task->plan), error);
   if (!book) return fail(error);
-  Context context = {*book, log, {}, options.shell};
+  Context context = {*book, log, {}, options.shell, task->plan};
   if (!options.log.empty()) {
     context.logText = readText(options.log, error);
     if (!context.logText) return fail(error);
   }
-  if (brimol_host_open() == 0) return EXIT_FAILURE;
+  if (brimol_host_open() == 0) return ExitCode::Trouble;
+  if (const std::string wrong = wrongScreen(); !wrong.empty()) return fail(wrong);
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;
-  const int result =
-      started ? showScreens(options, *book, context) : fail("no memory for the dispatch thread");
+  const ExitCode result = started ? showScreens(options, *book, context, *task)
+                                  : fail("no memory for the dispatch thread");
   MW::Window::destroy();
+  const auto line = book->lineStatus();
+  if (line && !line->error.empty()) {
+    complain(std::to_string(line->waiting) + " verdicts wait for the line: " + line->error);
+  }
   return result;
 }
 

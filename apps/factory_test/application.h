@@ -1,13 +1,14 @@
 /// The factory test's main loop.
 #pragma once
 
+#include "exit_code.h"
 #include "options.h"
 
 namespace factory_test {
 
-/// Opens the screen, runs until it is ended (the end button, the window's close button, SIGINT or
-/// SIGTERM) and closes everything again. Returns the program's exit code: 0, or 1 with one line on
-/// stderr that says what went wrong. Call it on the main thread.
-int runApplication(const Options& options);
+/// Opens the screen, runs until it is ended (the end button, the window's close button, SIGINT,
+/// SIGTERM or SIGHUP) and closes everything again. The result of a run whose screen or files cannot
+/// be used is ExitCode::Trouble, with one line on stderr that says why. Call it on the main thread.
+ExitCode runApplication(const Options& options);
 
 }  // namespace factory_test

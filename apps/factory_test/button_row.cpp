@@ -6,8 +6,10 @@ namespace factory_test {
 
 ButtonRow::ButtonRow(const SKIA_Rect& area, std::span<const Face> faces) {
   for (std::size_t i = 0; i < faces.size(); ++i) {
-    const SKIA_Rect cell = cellOf(area, static_cast<int>(i), static_cast<int>(faces.size()));
-    const SKIA_Text caption = captionOf(faces[i].caption);
+    const Grid row = {1, static_cast<int>(faces.size())};
+    const SKIA_Rect cell =
+        inColor(cellOf(area, gapOf(screenSize()), row, static_cast<int>(i)), kButtonInk.ground);
+    const SKIA_Text caption = captionOf(faces[i].caption, kButtonInk.text);
     buttons.push_back(std::make_unique<MW::ButtonNew>(MW::ButtonNew::kFramed, &cell, &caption));
     buttons.back()->clickCallback = faces[i].clicked;
     buttons.back()->setBdColor(MW::kColorBlack);

@@ -17,7 +17,7 @@ class ButtonRow {
     void (*clicked)(int);  // called on the dispatch thread
   };
 
-  /// Divides `area` among the faces and takes its colour.
+  /// Divides `area` among the faces.
   ButtonRow(const SKIA_Rect& area, std::span<const Face> faces);
 
   /// Any thread.

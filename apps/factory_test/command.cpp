@@ -17,14 +17,16 @@ namespace {
 
 constexpr std::size_t kReadBytes = 4096;
 
-/// Where the command reads and writes, and the group that it leads.
+constexpr const char* kNowhere = "/dev/null";
+
+/// Where a process reads and writes, and the group that it leads.
 class SpawnPlan {
  public:
-  explicit SpawnPlan(int sink) {
+  SpawnPlan() {
     posix_spawn_file_actions_init(&actions);
-    posix_spawn_file_actions_addopen(&actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
-    posix_spawn_file_actions_adddup2(&actions, sink, STDOUT_FILENO);
-    posix_spawn_file_actions_adddup2(&actions, sink, STDERR_FILENO);
+    for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
+      posix_spawn_file_actions_addopen(&actions, stream, kNowhere, O_RDWR, 0);
+    }
     posix_spawnattr_init(&attributes);
     posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETPGROUP);
     posix_spawnattr_setpgroup(&attributes, 0);
@@ -36,6 +38,18 @@ class SpawnPlan {
   SpawnPlan(const SpawnPlan&) = delete;
   SpawnPlan& operator=(const SpawnPlan&) = delete;
 
+  void connect(int stream, int end) { posix_spawn_file_actions_adddup2(&actions, end, stream); }
+
+  /// Starts a line of the shell, with one argument. An error's number, or 0.
+  int start(std::string line, std::string argument, pid_t& process) const {
+    std::string name = "sh";
+    std::string option = "-c";
+    const std::array<char*, 5> arguments = {name.data(), option.data(), line.data(),
+                                            argument.data(), nullptr};
+    return posix_spawn(&process, "/bin/sh", &actions, &attributes, arguments.data(), environ);
+  }
+
+ private:
   posix_spawn_file_actions_t actions = {};
   posix_spawnattr_t attributes = {};
 };
@@ -55,17 +69,37 @@ Command::Command(const std::string& line) {
   }
   output = ends[0];
   fcntl(output, F_SETFL, O_NONBLOCK);
-  const SpawnPlan plan(ends[1]);
-  std::string name = "sh";
-  std::string option = "-c";
-  std::string words = line;
-  const std::array<char*, 4> arguments = {name.data(), option.data(), words.data(), nullptr};
-  const int failed =
-      posix_spawn(&process, "/bin/sh", &plan.actions, &plan.attributes, arguments.data(), environ);
+  SpawnPlan plan;
+  plan.connect(STDOUT_FILENO, ends[1]);
+  plan.connect(STDERR_FILENO, ends[1]);
+  const int failed = plan.start(line, "sh", process);
   close(ends[1]);
-  if (failed == 0) return;
+  if (failed == 0) {
+    watch();
+    return;
+  }
   process = 0;
   ended = std::strerror(failed);
+}
+
+// A process of its own waits for the end of a pipe into which nobody writes. It comes when the
+// application ends, which a signal or a lost display may do without a word.
+void Command::watch() {
+  std::array<int, 2> ends = {};
+  if (pipe2(ends.data(), O_CLOEXEC) != 0) return;
+  lifeline = ends[1];
+  SpawnPlan plan;
+  plan.connect(STDIN_FILENO, ends[0]);
+  if (plan.start("read line; kill -KILL -$0", std::to_string(process), watcher) != 0) watcher = 0;
+  close(ends[0]);
+}
+
+void Command::endWatch() {
+  if (watcher > 0) {
+    kill(watcher, SIGKILL);  // before the pipe ends: the group's number may be another's by now
+    waitpid(std::exchange(watcher, 0), nullptr, 0);
+  }
+  if (lifeline >= 0) close(std::exchange(lifeline, -1));
 }
 
 Command::~Command() {
@@ -73,6 +107,7 @@ Command::~Command() {
     kill(-process, SIGKILL);
     waitpid(process, nullptr, 0);
   }
+  endWatch();
   if (output >= 0) close(output);
 }
 
@@ -90,6 +125,7 @@ std::optional<std::string> Command::outcome() {
   if (process > 0 && waitpid(process, &status, WNOHANG) == process) {
     kill(-process, SIGKILL);
     process = 0;
+    endWatch();
     ended = wordsOf(status);
   }
   if (ended.empty() || output >= 0) return {};

@@ -8,7 +8,8 @@
 
 namespace factory_test {
 
-/// Runs from construction; destruction ends the command and all that it started. One thread.
+/// Runs from construction; destruction ends the command and all that it started, and so does the
+/// end of the application, however that comes. One thread.
 class Command {
  public:
   /// `line` is for /bin/sh. Its input is empty; read() gives its output and its errors.
@@ -24,7 +25,12 @@ class Command {
   std::optional<std::string> outcome();
 
  private:
+  void watch();
+  void endWatch();
+
   pid_t process = 0;  // the leader of a group of its own; 0: none runs
+  pid_t watcher = 0;  // kills that group when the application ends; 0: none
+  int lifeline = -1;  // the end of a pipe that the watcher reads from
   int output = -1;    // the end of a pipe that is read from; -1: closed
   std::string ended;  // empty: it has not
 };

@@ -25,10 +25,11 @@ int pixelsOf(double millimetres, int least, int most) {
 }
 
 int textSize(ScreenSize screen) {
-  constexpr double kReadable = 1.6;  // mm
-  constexpr int kLeast = 50;         // of the screen's height
+  constexpr double kReadable = 2.2;  // mm
+  constexpr int kLeast = 50;         // of the screen's longer side
   constexpr int kMost = 40;
-  return pixelsOf(kReadable, screen.height / kLeast, screen.height / kMost);
+  const int longer = std::max(screen.width, screen.height);
+  return pixelsOf(kReadable, longer / kLeast, longer / kMost);
 }
 
 int smallTextSize(ScreenSize screen) {
@@ -42,9 +43,16 @@ int entryHeight(ScreenSize screen) {
   constexpr double kFinger = 7.1;  // mm
   constexpr int kLeastPercent = 6;
   constexpr int kMostPercent = 11;
-  return pixelsOf(kFinger, percentOf(screen.height, kLeastPercent),
-                  percentOf(screen.height, kMostPercent));
+  const int longer = std::max(screen.width, screen.height);
+  return pixelsOf(kFinger, percentOf(longer, kLeastPercent), percentOf(longer, kMostPercent));
 }
+
+int groupHeight(ScreenSize screen) {
+  constexpr int kTextPercent = 150;
+  return percentOf(textSize(screen), kTextPercent);
+}
+
+SKIA_Rect contentArea() { return layOutPage(screenSize()).content; }
 
 SKIA_Text textOf(const char* words, uint32_t color, int align, int size) {
   SKIA_Text text = {};

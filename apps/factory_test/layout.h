@@ -4,17 +4,15 @@
 #include <MW/records.h>
 #include <brimol/scene.h>
 
+#include <algorithm>
+#include <array>
+#include <numeric>
+#include <span>
+
+#include "look.h"
 #include "screen_size.h"
 
 namespace factory_test {
-
-inline constexpr uint32_t kGroundColor = 0xFF1E2430;
-inline constexpr uint32_t kTitleColor = 0xFF2F5D8A;
-inline constexpr uint32_t kLineColor = 0xFFE8ECF2;
-inline constexpr uint32_t kButtonColor = 0xFFB8C4D6;
-inline constexpr uint32_t kRowColor = 0xFF606060;
-inline constexpr uint32_t kPassColor = 0xFF286E46;
-inline constexpr uint32_t kFailColor = 0xFFA63A3A;
 
 constexpr int percentOf(int length, int percent) {
   constexpr int kWhole = 100;
@@ -27,74 +25,153 @@ ScreenSize screenSize();
 /// Pixels of so many millimetres, at least `least` and at most `most`.
 int pixelsOf(double millimetres, int least, int most);
 
-/// A fiftieth of the screen's height, or more where that could not be read.
+/// What is read at arm's length: a fiftieth of the screen's longer side, or more on a small screen.
 int textSize(ScreenSize screen);
 /// Of long texts.
 int smallTextSize(ScreenSize screen);
 
-/// A row of the screen between the side margins, in per cent of the screen's height.
-constexpr SKIA_Rect rowOf(ScreenSize screen, int topPercent, int heightPercent, uint32_t color) {
-  constexpr int kMarginPercent = 5;
-  const int margin = percentOf(screen.width, kMarginPercent);
-  return {margin, percentOf(screen.height, topPercent), screen.width - 2 * margin,
-          percentOf(screen.height, heightPercent), color};
+constexpr bool isLandscape(ScreenSize screen) { return screen.width > screen.height; }
+
+/// Between things that belong together, and twice as much around them.
+constexpr int gapOf(ScreenSize screen) {
+  constexpr int kParts = 50;
+  return std::min(screen.width, screen.height) / kParts;
 }
 
-/// The part of a row at `column` of `columns`, which gaps divide.
-constexpr SKIA_Rect cellOf(const SKIA_Rect& row, int column, int columns) {
-  constexpr int kGapPercent = 4;
-  const int gap = percentOf(row.w, kGapPercent);
-  const int width = (row.w - gap * (columns - 1)) / columns;
-  return {row.x + column * (width + gap), row.y, width, row.h, row.color};
+/// What is left of an area within a margin.
+constexpr SKIA_Rect within(const SKIA_Rect& area, int margin) {
+  return {area.x + margin, area.y + margin, area.w - 2 * margin, area.h - 2 * margin, area.color};
 }
-static_assert(cellOf({100, 0, 1000, 50, 0}, 1, 2).x == 620);
 
-/// Cells of equal size in rows, in per cent of the screen's height.
+constexpr SKIA_Rect inColor(SKIA_Rect area, uint32_t color) {
+  area.color = color;
+  return area;
+}
+
+struct Stretch {
+  int from;
+  int length;
+};
+
+/// Of a length that gaps divide by weights, the part of that number.
+constexpr Stretch partOf(int length, int gap, std::span<const int> weights, std::size_t index) {
+  const auto upTo = [&](std::size_t count) {
+    return std::accumulate(weights.begin(), weights.begin() + static_cast<std::ptrdiff_t>(count),
+                           int64_t{0});
+  };
+  const int gaps = static_cast<int>(weights.size()) - 1;
+  const int64_t free = std::max(length - gap * gaps, 0);
+  const auto edge = [&](std::size_t count) {
+    return static_cast<int>(free * upTo(count) / std::max(upTo(weights.size()), int64_t{1}));
+  };
+  return {edge(index) + gap * static_cast<int>(index), edge(index + 1) - edge(index)};
+}
+
+/// The parts of an area one above the other.
+template <std::size_t count>
+constexpr std::array<SKIA_Rect, count> rowsOf(const SKIA_Rect& area, int gap,
+                                              const std::array<int, count>& weights) {
+  std::array<SKIA_Rect, count> rows = {};
+  for (std::size_t i = 0; i < count; ++i) {
+    const Stretch part = partOf(area.h, gap, weights, i);
+    rows.at(i) = {area.x, area.y + part.from, area.w, part.length, area.color};
+  }
+  return rows;
+}
+static_assert(rowsOf<2>({0, 100, 40, 310, 0}, 10, {1, 2})[1].y == 210);
+
+/// The parts of an area side by side.
+template <std::size_t count>
+constexpr std::array<SKIA_Rect, count> columnsOf(const SKIA_Rect& area, int gap,
+                                                 const std::array<int, count>& weights) {
+  std::array<SKIA_Rect, count> columns = {};
+  for (std::size_t i = 0; i < count; ++i) {
+    const Stretch part = partOf(area.w, gap, weights, i);
+    columns.at(i) = {area.x + part.from, area.y, part.length, area.h, area.color};
+  }
+  return columns;
+}
+
+/// A cell of a grid of equal ones, numbered row by row.
 struct Grid {
-  int top;
-  int pitch;
-  int height;
+  int rows;
   int columns;
 };
 
-constexpr SKIA_Rect cellOf(ScreenSize screen, const Grid& grid, int index, uint32_t color) {
+constexpr SKIA_Rect cellOf(const SKIA_Rect& area, int gap, const Grid& grid, int index) {
+  const auto edge = [&](int length, int parts, int part) {
+    return static_cast<int>(int64_t{length - gap * (parts - 1)} * part / parts);
+  };
   const int row = index / grid.columns;
-  return cellOf(rowOf(screen, grid.top + row * grid.pitch, grid.height, color),
-                index % grid.columns, grid.columns);
+  const int column = index % grid.columns;
+  const int x = edge(area.w, grid.columns, column);
+  const int y = edge(area.h, grid.rows, row);
+  return {area.x + x + gap * column, area.y + y + gap * row,
+          edge(area.w, grid.columns, column + 1) - x, edge(area.h, grid.rows, row + 1) - y,
+          area.color};
 }
+static_assert(cellOf({100, 0, 1000, 50, 0}, 40, {1, 2}, 1).x == 620);
 
-inline constexpr Grid kButtonGrid = {50, 12, 11, 3};
-inline constexpr Grid kKeyGrid = {34, 8, 7, 3};
+/// A row of the menu between its entries.
+int groupHeight(ScreenSize screen);
 
-/// A row of the menu between its entries, in per cent of the screen's height.
-inline constexpr int kGroupPercent = 3;
-
-/// What a finger hits on every screen: 6 per cent of its height, or more where that is too low.
+/// What a finger hits on every screen: 6 per cent of its longer side, or more where that is too
+/// low.
 int entryHeight(ScreenSize screen);
 
-/// What every test's page has above its own content, which begins at kContentTop per cent.
+/// What every page is made of.
 struct PageLayout {
   SKIA_Rect ground;
-  SKIA_Rect title;
-  SKIA_Rect hint;
-  SKIA_Rect line;
+  SKIA_Rect head;                     ///< the bar of the title
+  SKIA_Rect leave;                    ///< the way out, in it
+  SKIA_Rect progress;                 ///< at its foot
+  SKIA_Rect title;                    ///< the same
+  SKIA_Rect hint;                     ///< what to do
+  SKIA_Rect line;                     ///< what happens
+  SKIA_Rect content;                  ///< the page's own
+  std::array<SKIA_Rect, 3> verdicts;  ///< from left to right, or from the top
 };
 
-inline constexpr int kContentTop = 34;
-
 constexpr PageLayout layOutPage(ScreenSize screen) {
-  return {
-      .ground = {0, 0, screen.width, screen.height, kGroundColor},
-      .title = rowOf(screen, 1, 6, kTitleColor),
-      .hint = rowOf(screen, 10, 13, 0),
-      .line = rowOf(screen, 25, 7, kLineColor),
-  };
+  const int gap = gapOf(screen);
+  const SKIA_Rect whole = {0, 0, screen.width, screen.height, kPageInk.ground};
+  const bool isWide = isLandscape(screen);
+  const auto [head, rest] = rowsOf<2>(whole, 0, isWide ? std::array{10, 90} : std::array{9, 91});
+  const auto [leave, title, nothing] = columnsOf<3>(inColor(head, kHeadInk.ground), gap, {3, 8, 3});
+  const SKIA_Rect body = within(rest, 2 * gap);
+  PageLayout page = {.ground = whole,
+                     .head = inColor(head, kHeadInk.ground),
+                     .leave = inColor(rowsOf<2>(leave, 0, {11, 1})[0], kButtonInk.ground),
+                     .progress = rowsOf<2>(head, 0, {11, 1})[1],
+                     .title = title,
+                     .hint = {},
+                     .line = {},
+                     .content = {},
+                     .verdicts = {}};
+  if (isWide) {
+    const auto [left, right] = columnsOf<2>(body, 2 * gap, {4, 1});
+    const auto [hint, line, content] = rowsOf<3>(left, gap, {12, 8, 80});
+    page.hint = hint;
+    page.line = inColor(line, kPanelInk.ground);
+    page.content = content;
+    page.verdicts = rowsOf<3>(right, 2 * gap, {1, 1, 1});
+    return page;
+  }
+  const auto [hint, line, content, verdicts] = rowsOf<4>(body, gap, {12, 7, 68, 13});
+  page.hint = hint;
+  page.line = inColor(line, kPanelInk.ground);
+  page.content = content;
+  page.verdicts = columnsOf<3>(verdicts, gap, {1, 1, 1});
+  return page;
 }
+
+/// The part of the present screen that is a page's own.
+SKIA_Rect contentArea();
 
 /// A text record for `words`; what does not fit is cut.
 SKIA_Text textOf(const char* words, uint32_t color, int align, int size);
 
 /// The same as what stands on a button or a line: black, centred, in the screen's text size.
-SKIA_Text captionOf(const char* words, uint32_t color = MW::kColorBlack);
+SKIA_Text captionOf(const char* words, uint32_t color = kDark);
 
 }  // namespace factory_test

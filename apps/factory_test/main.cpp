@@ -12,13 +12,23 @@
 #include "plan/plan_json.h"
 #include "records/commands.h"
 #include "task.h"
+#include "version.h"
 
 namespace {
 
-constexpr int kUsageError = 2;
-
 void printHelp() {
   std::printf("%s\nOn a PC:\n%s", factory_test::usage().c_str(), brimol_host_help());
+}
+
+int printPlan(const factory_test::Options& options) {
+  std::string error;
+  const auto task = factory_test::chooseTask(options, error);
+  if (!task) {
+    factory_test::complain(error);
+    return static_cast<int>(factory_test::ExitCode::WrongUse);
+  }
+  std::fputs(factory_test::planJson(task->plan).c_str(), stdout);
+  return EXIT_SUCCESS;
 }
 
 }  // namespace
@@ -31,20 +41,16 @@ int main(int count, char** arguments) {
   const auto options = factory_test::parseOptions(words, error);
   if (!options) {
     factory_test::complain(error);
-    return kUsageError;
+    return static_cast<int>(factory_test::ExitCode::WrongUse);
   }
   if (options->action == factory_test::Options::Action::Help) {
     printHelp();
     return EXIT_SUCCESS;
   }
-  const auto task = factory_test::chooseTask(*options, error);
-  if (!task) {
-    factory_test::complain(error);
-    return kUsageError;
-  }
-  if (options->action == factory_test::Options::Action::PrintPlan) {
-    std::fputs(factory_test::planJson(task->plan).c_str(), stdout);
+  if (options->action == factory_test::Options::Action::Version) {
+    std::printf("factory_test %s\n", factory_test::kVersion);
     return EXIT_SUCCESS;
   }
-  return factory_test::runApplication(*options);
+  if (options->action == factory_test::Options::Action::PrintPlan) return printPlan(*options);
+  return static_cast<int>(factory_test::runApplication(*options));
 }

@@ -6,11 +6,11 @@
 #include <atomic>
 #include <cstdint>
 #include <optional>
-#include <set>
-#include <string>
 #include <vector>
 
 #include "current.h"
+#include "look.h"
+#include "menu_head.h"
 #include "results/results.h"
 
 namespace factory_test {
@@ -20,14 +20,15 @@ namespace factory_test {
 /// up and down move the mark; the back key, and the last row, ask to leave.
 class Menu {
  public:
-  /// Shows the verdicts that the book holds.
-  explicit Menu(const ResultBook& book);
+  /// Shows the verdicts of `results`, which outlives it.
+  explicit Menu(const ResultBook& results);
 
   void show();
   void hide();
   /// Reads the machine's figures anew when a second has passed.
   void update(uint32_t now);
-  void showVerdict(std::size_t entry, Verdict verdict);
+  /// Shows the book's verdicts anew.
+  void showVerdicts();
   /// Marks an entry as keys do, before the menu is shown first.
   void markEntry(std::size_t entry);
 
@@ -42,22 +43,23 @@ class Menu {
   void addGroup(const char* name);
   void addRow(const char* name);
   void mark(int row);
+  int markAbove();
   void choose(int row);
   void followKey(unsigned int code);
   void refreshFigures();
-  /// How many entries have a verdict.
-  std::string verdictsText() const;
+  void colourRow(int row);
 
   Current<Menu> current{this};
+  const ResultBook& book;
   std::vector<int> rowOfEntry;  // the list's rows; neither changes once the constructor is done
   int leaveRow = kNothing;
-  int countRow = kNothing;
   std::atomic<int> chosenRow = kNothing;
   std::atomic<bool> leaveAsked = false;
-  int markedRow = kNothing;        // dispatch thread
-  std::set<std::size_t> verdicts;  // entries that have one
-  uint32_t figuresRead = 0;        // GetTicks() milliseconds
+  std::atomic<int> markedRow = kNothing;     // dispatch thread; others only read it
+  std::vector<std::atomic<uint32_t>> faces;  // of the rows where no mark is; written by one thread
+  uint32_t figuresRead = 0;                  // GetTicks() milliseconds
   MW::MainList list;
+  MenuHead head;
 };
 
 }  // namespace factory_test

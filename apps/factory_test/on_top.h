@@ -3,6 +3,8 @@
 
 #include <MW/window.h>
 
+#include <utility>
+
 namespace factory_test {
 
 /// While a widget of the top layer is active, nothing below gets events: what is to be touched then
@@ -10,7 +12,8 @@ namespace factory_test {
 template <typename Kind>
 class OnTop : public Kind {
  public:
-  OnTop() {
+  template <typename... Arguments>
+  explicit OnTop(Arguments&&... arguments) : Kind(std::forward<Arguments>(arguments)...) {
     this->leaveWindow();
     this->setType(MW::kTopLayer);
     MW::Window::registerWidget(this);

@@ -6,13 +6,16 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <filesystem>
 #include <string_view>
 #include <system_error>
 #include <utility>
 
+#include "exit_code.h"
 #include "language/language.h"
 #include "pages/table.h"
 #include "records/commands.h"
+#include "run_start.h"
 
 namespace factory_test {
 
@@ -26,8 +29,10 @@ struct OptionRow {
 };
 
 constexpr auto kOptions = std::to_array<OptionRow>({
-    {"--help", nullptr, "print this and end",
+    {"--help", nullptr, "print this and end; also -h",
      [](Options& options, const char*) { options.action = Options::Action::Help; }},
+    {"--version", nullptr, "print the version and end",
+     [](Options& options, const char*) { options.action = Options::Action::Version; }},
     {"--headless", nullptr, "draw to memory instead of a window",
      [](Options& options, const char*) { options.headless = true; }},
     {"--device", "NAME", "play on that phone's screen, see below",
@@ -38,10 +43,25 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char* value) { options.results = value; }},
     {"--junit", "FILE.xml", "write the verdicts for a CI system, too",
      [](Options& options, const char* value) { options.junit = value; }},
+    {"--database", "FILE", "keep all runs in FILE, and go on with the unit's aborted one",
+     [](Options& options, const char* value) { options.database = value; }},
+    {"--new-run", nullptr, "begin a new run even so",
+     [](Options& options, const char*) { options.newRun = true; }},
+    {"--line", "postgresql://...", "send the database's runs there, too",
+     [](Options& options, const char* value) { options.line = value; }},
+    {"--serial", "SERIAL", "the unit's serial number, instead of the property ro.serialno",
+     [](Options& options, const char* value) { options.serial = value; }},
+    {"--operator", "NAME", "who tests",
+     [](Options& options, const char* value) { options.operatorName = value; }},
     {"--plan", "FILE.json", "test what this plan says, see docs/plans.md",
      [](Options& options, const char* value) { options.plan = value; }},
     {"--print-plan", nullptr, "print the plan with every field, and end",
      [](Options& options, const char*) { options.action = Options::Action::PrintPlan; }},
+    {"--run", nullptr, "perform the plan from first to last, without the menu",
+     [](Options& options, const char*) { options.run = true; }},
+    {"--simulate", "LIST",
+     "of fail:ID and retry:ID: rehearse failures: always, or at the first attempt",
+     [](Options& options, const char* value) { options.simulate = value; }},
     {"--log", "FILE", "show FILE in the log viewer, instead of the program's own log",
      [](Options& options, const char* value) { options.log = value; }},
     {"--shell", "CMD", "run CMD in the shell, instead of uname -a",
@@ -66,6 +86,7 @@ constexpr auto kOptions = std::to_array<OptionRow>({
 });
 
 constexpr std::size_t kNameColumns = 22;
+constexpr std::size_t kCodeColumns = 4;
 constexpr std::size_t kDeviceColumns = 14;
 
 std::span<const BrimolDevice> devices() {
@@ -76,22 +97,45 @@ std::span<const BrimolDevice> devices() {
 
 // What is left behind one option and its value; nothing, with `error`, where it is wrong.
 std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::string& error) {
-  const std::string_view name = arguments.front();
+  const std::string_view given = arguments.front();
+  const auto equals = given.starts_with("--") ? given.find('=') : std::string_view::npos;
+  const bool holdsValue = equals != std::string_view::npos;
+  const std::string name(given == "-h" ? "--help" : given.substr(0, equals));
+  arguments = arguments.subspan(1);
   const auto* const row = std::ranges::find(kOptions, name, &OptionRow::name);
   if (row == kOptions.end()) {
-    error = "unknown option '" + std::string(name) + "', see --help";
+    error = "unknown option '" + name + "', see --help";
     return {};
   }
   if (row->value == nullptr) {
+    if (holdsValue) error = name + " takes no value";
     row->apply(options, nullptr);
-    return arguments.subspan(1);
+    return holdsValue ? std::optional<Arguments>() : arguments;
   }
-  if (arguments.size() < 2 || *arguments[1] == '\0') {
-    error = std::string(name) + " needs a value: " + row->value;
+  const char* value = "";
+  if (holdsValue) {
+    value = given.substr(equals + 1).data();  // up to the argument's own end
+  } else if (!arguments.empty()) {
+    value = arguments.front();
+    arguments = arguments.subspan(1);
+  }
+  if (*value == '\0') {
+    error = name + " needs a value: " + row->value;
     return {};
   }
-  row->apply(options, arguments[1]);
-  return arguments.subspan(2);
+  row->apply(options, value);
+  return arguments;
+}
+
+// Whatever they are called: by what they are if both are there, else by where they would be.
+bool isSameFile(const std::string& one, const std::string& other) {
+  namespace fs = std::filesystem;
+  std::error_code failure;
+  if (fs::equivalent(one, other, failure)) return true;
+  const auto placeOfFile = [&](const std::string& name) {
+    return fs::weakly_canonical(fs::absolute(name, failure), failure);
+  };
+  return placeOfFile(one) == placeOfFile(other);
 }
 
 std::string wrongDevice(const std::string& name) {
@@ -143,10 +187,13 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
     if (!rest) return {};
     arguments = *rest;
   }
-  if (!options.results.empty() && options.results == options.junit) {
+  if (!options.results.empty() && !options.junit.empty() &&
+      isSameFile(options.results, options.junit)) {
     error = "--results and --junit name the same file";
     return {};
   }
+  error = wrongRecords(options);
+  if (!error.empty()) return {};
   if (!options.device.empty() && brimol_device_named(options.device.c_str()) == nullptr) {
     error = wrongDevice(options.device);
     return {};
@@ -178,6 +225,10 @@ std::string usage() {
     std::string name(row.name);
     if (row.value != nullptr) name.append(" ").append(row.value);
     text += helpLine(std::move(name), kNameColumns, row.meaning);
+  }
+  text += "\nExit codes:\n";
+  for (const ExitRow& row : exitRows()) {
+    text += helpLine(std::to_string(static_cast<int>(row.code)), kCodeColumns, row.meaning);
   }
   text += recordsUsage();
   text +=

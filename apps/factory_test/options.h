@@ -8,7 +8,7 @@
 namespace factory_test {
 
 struct Options {
-  enum class Action { Run, Help, PrintPlan };
+  enum class Action { Run, Help, Version, PrintPlan };
 
   Action action = Action::Run;
   bool headless = false;      // draw to memory, without a window
@@ -19,14 +19,19 @@ struct Options {
   std::string shot = {};      // draw once, write this PNG file and end; empty: no
   std::string results = {};   // the JSON file that keeps the verdicts; empty: none
   std::string junit = {};     // the same as a report for a CI system; empty: none
-  std::string plan = {};      // the JSON file of what to test; empty: the default plan
-  bool run = false;           // perform the plan from its first step to its last, without a menu
-  std::string simulate = {};  // failures to rehearse; empty: none
-  std::string log = {};       // the file that the log viewer shows; empty: the program's own log
-  std::string monkey = {};    // the seed of random input; empty: none
-  std::string events = {};    // how many of it; empty: as the platform says
-  std::string monkeyTrace = {};    // where it is written; empty: beside the caller
-  bool stays = false;              // the user cannot end it
+  std::string database = {};  // the station's database; empty: none
+  std::string line = {};      // the address of the line's database; empty: none
+  std::string serial = {};    // of the unit under test; empty: not said
+  std::string operatorName = {};  // empty: not said
+  bool newRun = false;            // do not go on with an aborted run
+  std::string plan = {};          // the JSON file of what to test; empty: the default plan
+  bool run = false;              // perform the plan from its first step to its last, without a menu
+  std::string simulate = {};     // failures to rehearse; empty: none
+  std::string log = {};          // the file that the log viewer shows; empty: the program's own log
+  std::string monkey = {};       // the seed of random input; empty: none
+  std::string events = {};       // how many of it; empty: as the platform says
+  std::string monkeyTrace = {};  // where it is written; empty: beside the caller
+  bool stays = false;            // the user cannot end it
   std::string shell = "uname -a";  // what the shell runs, for /bin/sh
 };
 
@@ -36,7 +41,7 @@ using Arguments = std::span<const char* const>;
 /// `arguments` does not hold the program's name.
 std::optional<Options> parseOptions(Arguments arguments, std::string& error);
 
-/// What --help prints, a line for each option, without the keys of the host.
+/// What --help prints: options, exit codes, environment, devices; without the keys of the host.
 std::string usage();
 
 }  // namespace factory_test

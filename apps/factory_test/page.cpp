@@ -16,33 +16,34 @@ struct Record {
 
 Record titleRecord(const char* title) {
   const ScreenSize screen = screenSize();
-  const int size = percentOf(textSize(screen), 140);
-  return {layOutPage(screen).title, textOf(title, MW::kColorWhite, SKIA_ALIGN_CENTRE, size)};
+  const int size = percentOf(textSize(screen), 120);
+  return {layOutPage(screen).title, textOf(title, kHeadInk.text, SKIA_ALIGN_CENTRE, size)};
 }
 
 Record hintRecord(const char* instructions) {
   const ScreenSize screen = screenSize();
   return {layOutPage(screen).hint,
-          textOf(instructions, MW::kColorWhite, SKIA_ALIGN_LEFT, textSize(screen))};
+          textOf(instructions, kPageInk.text, SKIA_ALIGN_LEFT, textSize(screen))};
 }
 
-Record lineRecord() { return {layOutPage(screenSize()).line, captionOf("")}; }
-
-MW::Box makeGround() {
-  const SKIA_Rect area = layOutPage(screenSize()).ground;
-  return MW::Box(&area);
-}
+Record lineRecord() { return {layOutPage(screenSize()).line, captionOf("", kPanelInk.text)}; }
 
 template <typename Primitive>
 Primitive make(const Record& record) {
   return Primitive(&record.area, &record.text);
 }
 
+MW::Box makeBox(SKIA_Rect PageLayout::*place) {
+  const PageLayout page = layOutPage(screenSize());
+  return MW::Box(&(page.*place));
+}
+
 }  // namespace
 
 Page::Page(const char* title, const char* instructions)
-    : ground(makeGround()),
-      titleBar(make<MW::Textbox>(titleRecord(title))),
+    : ground(makeBox(&PageLayout::ground)),
+      head(makeBox(&PageLayout::head)),
+      titleText(make<MW::Label>(titleRecord(title))),
       hint(make<MW::Label>(hintRecord(instructions))),
       line(make<MW::Textbox>(lineRecord())) {}
 
@@ -54,7 +55,9 @@ void Page::draw() {
 void Page::drawGround() { ground.show(); }
 
 void Page::drawFront() {
-  titleBar.show();
+  head.show();
+  drawProgress(progress, layOutPage(screenSize()).progress);
+  titleText.show();
   hint.show();
   line.show();
   if (bar) bar->draw();

@@ -5,6 +5,7 @@
 
 #include <optional>
 
+#include "run_progress.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -13,13 +14,17 @@ namespace factory_test {
 /// the verdicts. Hold it before the test's own widgets: the verdicts then go after them.
 class Page {
  public:
-  /// Instructions may have several lines.
+  /// Instructions begin with what to do, and may have two lines.
   Page(const char* title, const char* instructions);
 
   /// On the main thread, before the window's widgets are drawn: all of it, or in two steps.
   void draw();
   void drawGround();
   void drawFront();
+  /// How much of the title's bar is full.
+  void showProgress(const RunProgress& newProgress) { progress = newProgress; }
+  /// Changes the instructions.
+  void instruct(const char* words) { hint.setText(words); }
   /// Changes the line; the next frame shows it. Any thread.
   void say(const char* words);
 
@@ -30,10 +35,16 @@ class Page {
   void endAsking() { bar.reset(); }
   /// What was chosen; Running while nothing was, or was not asked for.
   Outcome outcome() const { return bar ? bar->outcome() : Outcome::Running; }
+  /// Nothing was chosen.
+  void takeBack() {
+    if (bar) bar->takeBack();
+  }
 
  private:
+  RunProgress progress;
   MW::Box ground;
-  MW::Textbox titleBar;
+  MW::Box head;
+  MW::Label titleText;
   MW::Label hint;
   MW::Textbox line;
   std::optional<VerdictBar> bar;

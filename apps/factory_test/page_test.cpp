@@ -1,8 +1,11 @@
 #include "page_test.h"
 
 #include <MW/window.h>
+#include <brimol/input.h>
 
 #include <algorithm>
+
+#include "layout.h"
 
 namespace factory_test {
 
@@ -26,6 +29,30 @@ void LookTest::finishLookOn(unsigned int code) {
   if (code == MW::kKeySelect || code == kKeyBack) finishLook();
 }
 
+// The bar is asked for events before the steps' own widgets, since it is there before them.
+void StepTest::beginLook() {
+  const ScreenSize screen = screenSize();
+  const int height = entryHeight(screen);
+  const SKIA_Rect foot = {0, screen.height - height, screen.width, height, kButtonInk.ground};
+  const SKIA_Text caption = captionOf("Hold here to end", kButtonInk.text);
+  end.emplace(&foot, &caption);
+  end->longPressCallback = [](int) { Current<StepTest>::get().finishLook(); };
+  end->setActive(1);
+  showStep(shown);
+}
+
+void StepTest::endLook() {
+  endSteps();
+  end.reset();
+}
+
+// The steps' widgets were drawn over it.
+void StepTest::drawOver() {
+  if (end) end->show(GetTicks());
+}
+
+void StepTest::moveOn() { wanted = std::min(shown + 1, lastStep()); }
+
 void StepTest::updateLook() {
   const int step = wanted;
   if (step == shown) return;
@@ -34,6 +61,7 @@ void StepTest::updateLook() {
     return;
   }
   shown = step;
+  furthest = std::max(furthest.load(), step);
   showStep(step);
   MW::isDisplayUpdate(1);
 }

@@ -1,9 +1,14 @@
 /// What the tests that have a page share.
 #pragma once
 
+#include <MW/button.h>
+
 #include <atomic>
+#include <optional>
 #include <string>
 
+#include "current.h"
+#include "on_top.h"
 #include "page.h"
 #include "test.h"
 
@@ -14,6 +19,9 @@ namespace factory_test {
 class PageTest : public Test {
  public:
   Outcome verdict() const override { return page.outcome(); }
+  void takeBack() override { page.takeBack(); }
+  void instruct(const std::string& words) override { page.instruct(words.c_str()); }
+  void showProgress(const RunProgress& progress) override { page.showProgress(progress); }
   void draw() override { page.draw(); }
 
  protected:
@@ -52,22 +60,34 @@ class LookTest : public PageTest {
 
 /// A look at one thing after another. The right, down and select keys show the next one, the left
 /// and up keys the one before, the back key ends the look; so does the step after the last one.
+/// Fingers stay at the last one, and end the look by holding a bar at the screen's foot.
 class StepTest : public LookTest {
+ public:
+  bool isComplete() const override { return furthest == lastStep(); }
+  void drawOver() override;
+
  protected:
   using LookTest::LookTest;
 
-  void beginLook() final { showStep(shown); }
+  void beginLook() final;
   void updateLook() final;
+  void endLook() final;
 
   virtual int lastStep() const = 0;
   /// Puts what belongs to a step, from 0, in the place of what is there.
   virtual void showStep(int step) = 0;
+  virtual void endSteps() = 0;
 
   /// Moves with the next round. Any thread.
   void move(int by);
   void followKey(unsigned int code);
+  /// What a touch does: the next one, if there is one.
+  void moveOn();
 
  private:
+  Current<StepTest> current{this};
+  std::optional<OnTop<MW::Button>> end;
+  std::atomic<int> furthest = 0;
   std::atomic<int> shown = 0;   // on the screen
   std::atomic<int> wanted = 0;  // by the user
 };

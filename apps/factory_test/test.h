@@ -2,11 +2,14 @@
 #pragma once
 
 #include <cstdint>
+#include <string>
 #include <vector>
 
 #include "results/test_result.h"
 
 namespace factory_test {
+
+struct RunProgress;
 
 /// What became of a test so far.
 enum class Outcome { Running, Pass, Fail, Retry, Left };
@@ -17,20 +20,28 @@ class Test {
  public:
   virtual ~Test() = default;
 
+  /// How far the run had come before; asked for by a page that shows it.
+  virtual void showProgress(const RunProgress&) {}
+  /// What the plan tells the operator, in the place of the page's own words; before enter().
+  virtual void instruct(const std::string& words) { static_cast<void>(words); }
   /// Puts the test's widgets on the screen.
   virtual void enter() = 0;
   /// Takes them off again. No callback runs any more when it returns.
   virtual void leave() = 0;
-  /// Anything but Running ends the test.
+  /// Anything but Running ends the test, unless it is taken back.
   virtual Outcome verdict() const = 0;
+  /// A PASS was not taken: the test goes on.
+  virtual void takeBack() {}
 
-  /// What it measured so far; asked for at the verdict, after leave().
+  /// What it measured so far.
   virtual std::vector<Measure> values() const { return {}; }
   /// Whether it has shown and asked all that it must.
   virtual bool isComplete() const { return true; }
 
   /// Draws what stands under the window's widgets.
   virtual void draw() = 0;
+  /// Draws what stands over them.
+  virtual void drawOver() {}
   /// Comes in every round of the main loop, at GetTicks() milliseconds.
   virtual void update(uint32_t now) { static_cast<void>(now); }
 };

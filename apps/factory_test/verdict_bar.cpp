@@ -10,60 +10,77 @@ namespace factory_test {
 
 namespace {
 
-struct VerdictButton {
-  MW::Button3::Position position;
+struct ButtonLook {
   const char* caption;
+  Ink ink;
+  int textPercent;  // of the page's text size
   Outcome outcome;
-  void (*clicked)(int);
 };
 
-using Bar = Current<VerdictBar>;
-
-// From left to right, as keys move over them.
-constexpr auto kVerdicts = std::to_array<VerdictButton>({
-    {MW::Button3::kBottomLeft, "PASS", Outcome::Pass,
-     [](int) { Bar::get().choose(Outcome::Pass); }},
-    {MW::Button3::kBottomCentre, "RETRY", Outcome::Retry,
-     [](int) { Bar::get().choose(Outcome::Retry); }},
-    {MW::Button3::kBottomRight, "FAIL", Outcome::Fail,
-     [](int) { Bar::get().choose(Outcome::Fail); }},
+// The verdicts as keys move over them.
+constexpr auto kLooks = std::to_array<ButtonLook>({
+    {"PASS", kPassInk, 150, Outcome::Pass},
+    {"RETRY", kRowInk, 150, Outcome::Retry},
+    {"FAIL", kFailInk, 150, Outcome::Fail},
+    {"Leave", kButtonInk, 100, Outcome::Left},
 });
 
-constexpr int kMarkWidth = 10;  // pixels around the button
+SKIA_Rect around(const SKIA_Rect& first, const SKIA_Rect& last) {
+  return {first.x, first.y, last.x + last.w - first.x, last.y + last.h - first.y, 0};
+}
 
 }  // namespace
 
-VerdictBar::VerdictBar(Keys keys) {
-  const int size = 2 * textSize(screenSize());
-  for (std::size_t i = 0; i < kButtons; ++i) {
-    const VerdictButton& row = kVerdicts.at(i);
-    const SKIA_Text caption = textOf(row.caption, MW::kColorBlack, SKIA_ALIGN_CENTRE, size);
-    MW::Button3& button = buttons.at(i).emplace(row.position, &caption);
-    button.clickCallback = row.clicked;
-    button.setActive(1);
-  }
+VerdictBar::VerdictBar(Keys keys)
+    : guards{PressGuard(GetTicks()), PressGuard(GetTicks()), PressGuard(GetTicks()),
+             PressGuard(GetTicks())} {
+  const PageLayout page = layOutPage(screenSize());
+  place<0>(page.verdicts[0]);
+  place<1>(page.verdicts[1]);
+  place<2>(page.verdicts[2]);
+  place<3>(page.leave);
+  veil.emplace(around(page.verdicts.front(), page.verdicts.back()), MW::kBaseLayer,
+               GetTicks() + PressGuard::kDeafMs);
   if (keys == Keys::Free) return;
-  key.emplace().keyPressCallback = [](MW::kbd_event* event) { Bar::get().followKey(event->code); };
+  key.emplace().keyPressCallback = [](MW::kbd_event* event) {
+    Current<VerdictBar>::get().followKey(event->code);
+  };
+}
+
+template <std::size_t index>
+void VerdictBar::place(const SKIA_Rect& area) {
+  using Bar = Current<VerdictBar>;
+  const ButtonLook& look = kLooks.at(index);
+  const int size = percentOf(textSize(screenSize()), look.textPercent);
+  const SKIA_Rect face = inColor(area, look.ink.ground);
+  const SKIA_Text caption = textOf(look.caption, look.ink.text, SKIA_ALIGN_CENTRE, size);
+  MW::Button& button = buttons.at(index).emplace(&face, &caption);
+  button.pressCallback = [](int) { Bar::get().guards.at(index).press(GetTicks()); };
+  button.clickCallback = [](int) { Bar::get().click(index); };
+  button.setActive(1);
+}
+
+void VerdictBar::click(std::size_t index) {
+  if (guards.at(index).takeClick()) chosen = kLooks.at(index).outcome;
 }
 
 void VerdictBar::draw() {
   const int index = marked;
   if (index < 0) return;
   const SKIA_Rect& face = *buttons.at(static_cast<std::size_t>(index))->getPositionAndSize();
-  skia_add_box_c({face.x - kMarkWidth, face.y - kMarkWidth, face.w + 2 * kMarkWidth,
-                  face.h + 2 * kMarkWidth, MW::kColorHighlight});
+  skia_add_box_c(inColor(within(face, -gapOf(screenSize())), kMarkInk.ground));
 }
 
 void VerdictBar::followKey(unsigned int code) {
-  constexpr int kLast = kButtons - 1;
+  constexpr int kLast = kVerdicts - 1;
   const int index = marked;
   switch (code) {
     case MW::kKeyLeft: marked = std::max(index - 1, 0); break;
     case MW::kKeyRight: marked = std::min(index + 1, kLast); break;
     case MW::kKeySelect:
-      if (index >= 0) choose(kVerdicts.at(static_cast<std::size_t>(index)).outcome);
+      if (index >= 0) chosen = kLooks.at(static_cast<std::size_t>(index)).outcome;
       break;
-    case kKeyBack: choose(Outcome::Left); break;
+    case kKeyBack: chosen = Outcome::Left; break;
     default:
       if (otherKey != nullptr) otherKey(code);
   }

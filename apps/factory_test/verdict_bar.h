@@ -1,21 +1,26 @@
-/// PASS, RETRY and FAIL at the foot of a test's screen.
+/// The verdicts of a test's screen, and the way out.
 #pragma once
 
-#include <MW/button3.h>
+#include <MW/button.h>
 #include <MW/key.h>
 #include <brimol/input.h>
 
 #include <array>
 #include <atomic>
+#include <cstdint>
 #include <optional>
 
 #include "current.h"
+#include "press_guard.h"
 #include "test.h"
+#include "veil.h"
 
 namespace factory_test {
 
-/// Three buttons, and the keys: left and right move between them, select takes one, back leaves the
-/// test. They are on the screen from construction to destruction; there is one bar at a time.
+/// PASS, RETRY, FAIL, and Leave in the title's bar. Fingers press them, but not at first
+/// (PressGuard), when a veil lies over the verdicts. Of keys left and right move between the
+/// verdicts, select takes one, back leaves the test. They are on the screen from construction to
+/// destruction; there is one bar at a time.
 class VerdictBar {
  public:
   /// What keys do: Choose as above; Free where the test itself wants them all.
@@ -31,17 +36,24 @@ class VerdictBar {
   void draw();
   /// What was chosen. Any thread.
   Outcome outcome() const { return chosen; }
-  void choose(Outcome outcome) { chosen = outcome; }
+  /// Nothing was chosen. Any thread.
+  void takeBack() { chosen = Outcome::Running; }
 
  private:
-  static constexpr std::size_t kButtons = 3;
+  static constexpr std::size_t kButtons = 4;
+  static constexpr int kVerdicts = 3;  // the first of them
 
+  template <std::size_t index>
+  void place(const SKIA_Rect& area);
+  void click(std::size_t index);
   void followKey(unsigned int code);
 
   Current<VerdictBar> current{this};
   std::atomic<Outcome> chosen = Outcome::Running;
   std::atomic<int> marked = -1;  // -1: no key moved it yet
-  std::array<std::optional<MW::Button3>, kButtons> buttons;
+  std::array<PressGuard, kButtons> guards;
+  std::array<std::optional<MW::Button>, kButtons> buttons;
+  std::optional<Veil> veil;
   std::optional<MW::Key> key;
 };
 

@@ -2,10 +2,13 @@
 /// hd-4.7.
 #pragma once
 
+#include <MW/main_list.h>
+
 #include <array>
 #include <string_view>
 
 #include "layout.h"
+#include "prompt.h"
 
 namespace factory_test::screens {
 
@@ -18,40 +21,46 @@ struct MenuRow {
   int entriesAbove;
 };
 inline constexpr MenuRow kColours = {1, 0};
-inline constexpr MenuRow kTouch = {2, 2};
-inline constexpr MenuRow kKeys = {2, 3};
+inline constexpr MenuRow kTouch = {2, 4};
+inline constexpr MenuRow kKeys = {2, 5};
 
 constexpr SKIA_Rect areaOf(const MenuRow& row) {
-  constexpr int kListTop = 510;  // of MW::MainList with its extended header
+  constexpr int kListTop = MW::MainList::kTitleHeight;
   constexpr int kGap = 3;
-  const int group = percentOf(kScreen.height, kGroupPercent) + kGap;
+  constexpr int kGroupHeight = 42;  // one and a half of its text
+  const int group = kGroupHeight + kGap;
   constexpr int kEntryHeight = 88;  // 7.1 mm
   const int entry = kEntryHeight + kGap;
   return {0, kListTop + kGap + row.groupsAbove * group + row.entriesAbove * entry, kScreen.width,
           entry - kGap, 0};
 }
 
-/// Black on the menu alone, wherever its list is scrolled.
-inline constexpr SKIA_Rect kMenuHeader = {0, 0, kScreen.width, 340, MW::kColorBlack};
+/// Of the ground's colour on the menu, wherever its list is scrolled, and of another on a page.
+inline constexpr SKIA_Rect kMenuHeader = {0, 70, kScreen.width, 4, kPageInk.ground};
 
-// The verdicts: three squares of 220 pixels, 14 from each other and from the edges.
-inline constexpr SKIA_Rect kPass = {14, 1046, 220, 220, MW::kColorWhite};
-inline constexpr SKIA_Rect kFail = {482, 1046, 220, 220, MW::kColorWhite};
+inline constexpr PageLayout kPage = layOutPage(kScreen);
+inline constexpr SKIA_Rect kPass = inColor(kPage.verdicts[0], kPassInk.ground);
+inline constexpr SKIA_Rect kFail = inColor(kPage.verdicts[2], kFailInk.ground);
 
 inline constexpr SKIA_Rect kCentre = {350, 630, 20, 20, 0};
 
-/// The knob of the first switch, at its left.
-inline constexpr SKIA_Rect kKnob = {36, 435, 258, 114, MW::kColorWhite};
+inline constexpr int kGap = gapOf(kScreen);
 
-/// The left button of a dialog that has two.
+/// The knob of the first switch, at its left: two fifths of it.
+inline constexpr SKIA_Rect kSwitch = rowsOf<5>(kPage.content, 2 * kGap, {1, 2, 2, 2, 1})[1];
+inline constexpr SKIA_Rect kKnob = {kSwitch.x, kSwitch.y, kSwitch.w * 2 / 5, kSwitch.h,
+                                    MW::kColorWhite};
+
+/// The left button of one of the toolkit's dialogs that has two, and of the application's own.
 inline constexpr SKIA_Rect kDialogOk = {82, 702, 273, 105, MW::kColorWhite};
-
-inline constexpr PageLayout kPage = layOutPage(kScreen);
+inline constexpr SKIA_Rect kPromptYes = layOutPrompt(kScreen).buttons[0];
 
 // The log viewer's page.
-inline constexpr SKIA_Rect kLogView = rowOf(kScreen, 34, 38, 0);
-inline constexpr SKIA_Rect kSearchButton = cellOf(rowOf(kScreen, 74, 6, kButtonColor), 0, 3);
-inline constexpr SKIA_Rect kKeyboard = rowOf(kScreen, 51, 29, 0);
+inline constexpr auto kLogRows = rowsOf<2>(kPage.content, kGap, {7, 1});
+inline constexpr SKIA_Rect kLogView = kLogRows[0];
+inline constexpr SKIA_Rect kSearchButton =
+    inColor(cellOf(kLogRows[1], kGap, {1, 3}, 0), kButtonInk.ground);
+inline constexpr SKIA_Rect kKeyboard = rowsOf<2>(kPage.content, kGap, {2, 3})[1];
 
 /// Keys of the keyboard: in rows of so many half keys' indent, each key two half keys wide.
 constexpr SKIA_Rect keyOf(char letter) {
@@ -85,7 +94,8 @@ enum ButtonPlace {
   kLateButton
 };
 constexpr SKIA_Rect areaOf(ButtonPlace place) {
-  return cellOf(kScreen, kButtonGrid, place, kButtonColor);
+  const SKIA_Rect buttons = rowsOf<3>(kPage.content, kGap, {12, 1, 30})[2];
+  return inColor(cellOf(buttons, kGap, {2, 3}, place), kButtonInk.ground);
 }
 
 }  // namespace factory_test::screens

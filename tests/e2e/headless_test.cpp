@@ -27,11 +27,12 @@ class HeadlessApplication : public testing::Test {
 
 TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
   std::ofstream(results) << "no JSON";
-  EXPECT_EQ(runApplication({.headless = true, .results = results}), EXIT_FAILURE);
+  EXPECT_EQ(runApplication({.headless = true, .results = results}), ExitCode::Trouble);
   EXPECT_EQ(std::filesystem::file_size(results), 7) << "a damaged file stays as it is";
-  EXPECT_EQ(runApplication({.headless = true, .shot = folder / "none" / "shot.png"}), EXIT_FAILURE);
-  EXPECT_EQ(runApplication({.headless = true, .log = folder / "none"}), EXIT_FAILURE);
-  EXPECT_EQ(runApplication({.headless = true, .log = folder}), EXIT_FAILURE);
+  EXPECT_EQ(runApplication({.headless = true, .shot = folder / "none" / "shot.png"}),
+            ExitCode::Trouble);
+  EXPECT_EQ(runApplication({.headless = true, .log = folder / "none"}), ExitCode::Trouble);
+  EXPECT_EQ(runApplication({.headless = true, .log = folder}), ExitCode::Trouble);
 
   struct WrongLine {
     std::vector<const char*> arguments;
@@ -44,7 +45,9 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
                               {{"--device", "wvga"}, "wvga-4.0"},
                               {{"--test", "colour"}, "colours"},
                               {{"file"}, "'file'"},
-                              {{"--results", "a", "--junit", "a"}, "same file"}}) {
+                              {{"--results", "a", "--junit", "a"}, "same file"},
+                              {{"--results=a", "--junit", "./a"}, "same file"},
+                              {{"--headless=yes"}, "takes no value"}}) {
     std::string error;
     EXPECT_FALSE(parseOptions(arguments, error)) << word;
     EXPECT_NE(error.find(word), std::string::npos) << error;

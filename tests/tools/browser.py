@@ -12,6 +12,36 @@ OPTIONS = ["--headless=new", "--no-sandbox", "--disable-gpu", "--disable-quic", 
 KEYS = {"Escape": "\ue00c", "Right": "\ue014", "Left": "\ue012", "Enter": "\ue007", "End": "\ue010",
         "Tab": "\ue004"}
 
+# Every element's text against what is behind it, as the accessibility guidelines count it.
+LOW_CONTRAST = """
+const channels = (colour) => colour.match(/[\\d.]+/g).map(Number);
+const light = ([r, g, b]) => {
+  const [R, G, B] = [r, g, b].map((c) => c / 255).map((c) => c <= 0.04045 ? c / 12.92 : ((c + 0.055) / 1.055) ** 2.4);
+  return 0.2126 * R + 0.7152 * G + 0.0722 * B;
+};
+const ground = (element) => {
+  for (; element; element = element.parentElement) {
+    const colour = channels(getComputedStyle(element).backgroundColor);
+    if (colour.length < 4 || colour[3] === 1) return colour;
+  }
+  return [255, 255, 255];
+};
+const low = [];
+for (const element of document.querySelectorAll("body *")) {
+  const hasText = [...element.childNodes].some((node) => node.nodeType === 3 && node.data.trim());
+  if (!hasText || !element.checkVisibility() || element.disabled || element.tagName === "SCRIPT") continue;
+  const [a, b] = [light(channels(getComputedStyle(element).color)), light(ground(element))];
+  if ((Math.max(a, b) + 0.05) / (Math.min(a, b) + 0.05) < 4.5) low.push(element.outerHTML.slice(0, 80));
+}
+return low;
+"""
+NAMELESS = """
+return [...document.querySelectorAll("button, a[href], input, dialog, [role=img], section, img")]
+    .filter((one) => !(one.textContent.trim() || one.getAttribute("aria-label") || one.alt ||
+                       one.labels?.length || one.getAttribute("aria-labelledby")))
+    .filter((one) => one.id !== "viewer-picture").map((one) => one.outerHTML.slice(0, 80));
+"""
+
 
 class Browser:
     """Use it in a with statement: it ends what it starts."""

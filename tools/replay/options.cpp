@@ -36,6 +36,12 @@ bool setTimeout(Options& options, std::string_view value) {
   return seconds >= 0;
 }
 
+bool setExitCode(Options& options, std::string_view value) {
+  constexpr int kMost = 255;
+  options.exitCode = numberOf(value);
+  return options.exitCode >= 0 && options.exitCode <= kMost;
+}
+
 bool setSpeed(Options& options, std::string_view value) {
   options.pace = Options::Pace::RealTime;
   return value == "1";
@@ -98,6 +104,7 @@ constexpr auto kOptions = std::to_array<OptionRow>({
     {"--speed", "1", "in a window and in real time, to watch it", setSpeed},
     {"--timeout", "SECONDS",
      "how long nothing may happen before it counts as hung: 60; 0: for ever", setTimeout},
+    {"--exit-code", "NUMBER", "with which the application is to end: 0", setExitCode},
     {"--help", "", "print this and end; also -h", setAction<Options::Action::Help>},
     {"--version", "", "print the version and end", setAction<Options::Action::Version>},
 });

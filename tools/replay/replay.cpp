@@ -196,7 +196,8 @@ Outcome runAndJudge(const Plan& plan) {
     outcome.comparison = compare(outcome.run, *outcome.other, kMostPairs);
   }
   const Session& session = outcome.run.session;
-  outcome.judgement = judge(session, outcome.end, outcome.comparison.differences);
+  outcome.judgement =
+      judge(session, outcome.end, outcome.comparison.differences, plan.options.exitCode);
   if (plan.options.lints) {
     outcome.judgement = judgeLayout(outcome.judgement, session, plan.accepted);
   }

@@ -103,17 +103,17 @@ Judgement judgeFailure(const Session& session, const SessionEnd& sessionEnd, int
   return {Verdict::Failed, "The application failed, with exit code " + std::to_string(code) + "."};
 }
 
-Judgement judgeExit(const Session& session, int code) {
+Judgement judgeExit(const Session& session, int code, int wantedCode) {
   if (!session.end) return judgeEarlyExit(session, code);
-  const bool hasFailed = code != 0 || session.end->exit != 0 || session.end->reason != "closed" ||
+  const bool hasFailed = code != wantedCode || session.end->exit != 0 || session.end->reason != "closed" ||
                          firstFailed(session) != nullptr;
   if (hasFailed) return judgeFailure(session, *session.end, code);
   return {Verdict::Passed, "The trace was played to its end, and all that it expects was met."};
 }
 
-Judgement judgeEnd(const Session& session, const RunEnd& end) {
+Judgement judgeEnd(const Session& session, const RunEnd& end, int wantedCode) {
   switch (end.kind) {
-    case RunEnd::Kind::Exited: return judgeExit(session, end.code);
+    case RunEnd::Kind::Exited: return judgeExit(session, end.code, wantedCode);
     case RunEnd::Kind::Signalled:
       return stoppedAt(Verdict::Crashed,
                        std::string("The application crashed: ") + ::strsignal(end.code) + ".",
@@ -138,8 +138,9 @@ const Happening* lastAction(const Session& session) {
   });
 }
 
-Judgement judge(const Session& session, const RunEnd& end, std::size_t differences) {
-  Judgement judgement = judgeEnd(session, end);
+Judgement judge(const Session& session, const RunEnd& end, std::size_t differences,
+                int wantedCode) {
+  Judgement judgement = judgeEnd(session, end, wantedCode);
   if (judgement.verdict != Verdict::Passed || differences == 0) return judgement;
   return {Verdict::Failed, std::to_string(differences) +
                                (differences == 1 ? " frame differs" : " frames differ") +

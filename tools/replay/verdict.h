@@ -33,7 +33,9 @@ struct Judgement {
 const char* verdictName(Verdict verdict);
 
 /// `differences`: how many frames differ from those of the run that it is compared with.
-Judgement judge(const Session& session, const RunEnd& end, std::size_t differences);
+/// `wantedCode`: with which the application is to end.
+Judgement judge(const Session& session, const RunEnd& end, std::size_t differences,
+                int wantedCode = 0);
 
 /// The exit code of brimol-replay.
 int exitCodeOf(Verdict verdict);

@@ -19,8 +19,8 @@ namespace {
 
 constexpr int kLeast = 10;  // per cent; on a darker screen the slider cannot be found
 constexpr int kFull = 100;
+constexpr int kDark = 50;  // what it must have come down to
 constexpr int kStep = 10;
-constexpr uint32_t kTrackColor = 0xFF2A3344;
 
 /// The screen follows the slider at once, and is bright again behind the test.
 class BrightnessTest : public PageTest {
@@ -34,10 +34,12 @@ class BrightnessTest : public PageTest {
       if (code == MW::kKeyUp) Current<BrightnessTest>::get().steps += 1;
       if (code == MW::kKeyDown) Current<BrightnessTest>::get().steps -= 1;
     };
-    const SKIA_Rect area = rowOf(screenSize(), 46, 8, kTrackColor);
+    const SKIA_Rect area = inColor(rowsOf<3>(contentArea(), 0, {2, 1, 4})[1], kPanelInk.ground);
     slider.emplace(&area, MW::SlideMove::kValueKnob, kLeast, kFull, kFull);
     slider->setActive(1);
   }
+
+  bool isComplete() const override { return wasDark; }
 
   void leave() override {
     slider.reset();
@@ -53,6 +55,7 @@ class BrightnessTest : public PageTest {
     const int value = slider->getValue();
     if (value == shown) return;
     shown = value;
+    wasDark = wasDark || value <= kDark;
     brimol_host_set_brightness(value);
     page.say(("Light " + std::to_string(value) + " %").c_str());
   }
@@ -61,6 +64,7 @@ class BrightnessTest : public PageTest {
   Current<BrightnessTest> current{this};
   std::atomic<int> steps = 0;  // by keys, not yet done
   int shown = kFull;           // per cent
+  bool wasDark = false;
   std::optional<MW::SlideMove> slider;
 };
 

@@ -3,7 +3,9 @@
 #include <MW/primitives.h>
 #include <MW/widget_list.h>
 
+#include <algorithm>
 #include <array>
+#include <atomic>
 #include <cstdio>
 #include <memory>
 #include <optional>
@@ -23,9 +25,7 @@ using MW::Callback;
 using MW::Widget;
 
 constexpr int kLateMs = 1000;
-constexpr uint32_t kBoxColor = 0xFF3FA66B;
-constexpr uint32_t kRulerColor = 0xFF4C5870;
-constexpr int kColumns = 3;
+constexpr Grid kGrid = {2, 3};
 
 /// Press, click, long press, double click and delayed show, each counted on the line.
 class ButtonTest : public PageTest {
@@ -36,6 +36,10 @@ class ButtonTest : public PageTest {
     page.ask();
     placePrimitives();
     for (std::size_t i = 0; i < kButtons.size(); ++i) placeButton(i);
+  }
+
+  bool isComplete() const override {
+    return std::ranges::all_of(counts, [](const auto& count) { return count > 0; });
   }
 
   void leave() override {
@@ -65,15 +69,15 @@ class ButtonTest : public PageTest {
 
   // What never changes goes to the display-item table, which keeps copies.
   static void placePrimitives() {
+    constexpr int kRulerWidth = 6;
     const ScreenSize screen = screenSize();
-    const SKIA_Rect row = rowOf(screen, kContentTop, 12, kBoxColor);
-    const SKIA_Rect words = cellOf(row, 0, kColumns);
-    const SKIA_Rect picture = cellOf(row, 1, kColumns);
-    const SKIA_Rect box = cellOf(row, 2, kColumns);
-    const SKIA_Rect under = rowOf(screen, kContentTop + 13, 1, 0);
-    const SKIA_Point ruler = {under.x, under.y, under.x + under.w, under.y, kRulerColor, 6};
+    const auto [top, under, buttons] = areas();
+    const auto [words, picture, plain] = columnsOf<3>(top, gapOf(screen), {1, 1, 1});
+    const SKIA_Rect box = inColor(plain, kPassInk.ground);
+    const SKIA_Point ruler = {under.x, under.y,          under.x + under.w,
+                              under.y, kPanelInk.ground, kRulerWidth};
     const SKIA_Text caption =
-        textOf("Label,\npicture,\nbox, line", MW::kColorWhite, SKIA_ALIGN_LEFT, textSize(screen));
+        textOf("Label,\npicture,\nbox, line", kPageInk.text, SKIA_ALIGN_LEFT, textSize(screen));
     const SKIA_Text name =
         textOf(picturePath("test_card.png").c_str(), MW::kUnused, MW::kUnused, MW::kUnused);
     MW::WidgetList::init();
@@ -83,11 +87,17 @@ class ButtonTest : public PageTest {
     MW::Line(&ruler).add_MWWList();
   }
 
+  // For the primitives, the ruler and the buttons.
+  static std::array<SKIA_Rect, 3> areas() {
+    return rowsOf<3>(contentArea(), gapOf(screenSize()), {12, 1, 30});
+  }
+
   void placeButton(std::size_t number) {
     const ButtonRow& look = kButtons.at(number);
-    const ScreenSize screen = screenSize();
-    const SKIA_Rect area = cellOf(screen, kButtonGrid, static_cast<int>(number), kButtonColor);
-    const SKIA_Text caption = captionOf(look.caption);
+    const SKIA_Rect area =
+        inColor(cellOf(areas().back(), gapOf(screenSize()), kGrid, static_cast<int>(number)),
+                kButtonInk.ground);
+    const SKIA_Text caption = captionOf(look.caption, kButtonInk.text);
     Button& button = buttons.at(number).emplace(&area, &caption);
     button.*look.callback = look.handler;
     if (number != kLate) button.setActive(1);
@@ -111,7 +121,7 @@ class ButtonTest : public PageTest {
   }
 
   Current<ButtonTest> current{this};
-  std::array<unsigned int, kButtonCount> counts = {};  // dispatch thread
+  std::array<std::atomic<unsigned int>, kButtonCount> counts = {};
   std::array<std::optional<Button>, kButtonCount> buttons;
 };
 

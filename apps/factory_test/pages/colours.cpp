@@ -3,13 +3,17 @@
 #include <MW/screen.h>
 #include <MW/window.h>
 
+#include <algorithm>
+#include <atomic>
 #include <memory>
 #include <optional>
+#include <vector>
 
 #include "current.h"
 #include "on_top.h"
 #include "page_test.h"
 #include "pages/table.h"
+#include "plan/catalog.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -18,18 +22,25 @@ namespace {
 
 constexpr int kColours = MW::FullScreen::kGrey + 1;
 
-/// A tap, or the right key, shows the next colour. A double tap, or the select key, ends the look,
+/// A tap, or the right key, shows the next colour. A long press, or the select key, ends the look,
 /// and the verdict is asked for.
 class ColourTest : public LookTest {
  public:
-  ColourTest() : LookTest("Colours", "Look for pixels and places that differ.") {}
+  ColourTest()
+      : LookTest("Colours", "Say what you saw: pixels and places\nthat differ are a fault.") {}
+
+  bool isComplete() const override { return shown >= kColours - 1; }
+
+  std::vector<Measure> values() const override {
+    return {measured("colours", "colours confirmed", std::min(shown + 1, kColours))};
+  }
 
  protected:
   void beginLook() override {
     colour.emplace(MW::FullScreen::kWhite).setActive(1);
     touch.emplace();
     touch->clickCallback = [](MW::mouse_event*) { Current<ColourTest>::get().next(); };
-    touch->doubleClickCallback = [](int) { Current<ColourTest>::get().finishLook(); };
+    touch->longPressCallback = [](MW::mouse_event*) { Current<ColourTest>::get().finishLook(); };
     touch->setActive(1);
     key.emplace();
     key->keyPressCallback = [](MW::kbd_event* event) {
@@ -55,7 +66,7 @@ class ColourTest : public LookTest {
   }
 
   Current<ColourTest> current{this};
-  int shown = 0;  // dispatch thread
+  std::atomic<int> shown = 0;  // how often it moved on
   std::optional<MW::FullScreen> colour;
   std::optional<OnTop<MW::Screen>> touch;
   std::optional<OnTop<MW::Key>> key;

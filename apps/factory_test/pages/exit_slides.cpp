@@ -13,8 +13,6 @@ namespace factory_test {
 
 namespace {
 
-constexpr uint32_t kBarColor = 0xFFC8D2E0;
-
 /// One slide passes the test, the other leaves it.
 class ExitSlideTest : public PageTest {
  public:
@@ -24,8 +22,9 @@ class ExitSlideTest : public PageTest {
 
   void enter() override {
     page.ask();
-    place(passing, 38, MW::SlideE::kFromLeft, "Slide to pass");
-    place(leaving, 56, MW::SlideE::kFromRight, "Slide to leave");
+    const auto rows = rowsOf<5>(inColor(contentArea(), kButtonInk.ground), 0, {1, 2, 1, 2, 1});
+    place(passing, rows[1], MW::SlideE::kFromLeft, "Slide to pass");
+    place(leaving, rows[3], MW::SlideE::kFromRight, "Slide to leave");
     passing->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Pass; };
     leaving->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Left; };
   }
@@ -36,16 +35,17 @@ class ExitSlideTest : public PageTest {
     page.endAsking();
   }
 
+  bool isComplete() const override { return ended == Outcome::Pass; }
+
   Outcome verdict() const override {
     const Outcome slid = ended;
     return slid != Outcome::Running ? slid : PageTest::verdict();
   }
 
  private:
-  static void place(std::optional<MW::SlideE>& slide, int top, MW::SlideE::State state,
-                    const char* words) {
-    const SKIA_Rect area = rowOf(screenSize(), top, 10, kBarColor);
-    const SKIA_Text caption = captionOf(words);
+  static void place(std::optional<MW::SlideE>& slide, const SKIA_Rect& area,
+                    MW::SlideE::State state, const char* words) {
+    const SKIA_Text caption = captionOf(words, kButtonInk.text);
     slide.emplace(state, &area, &caption, "");
     slide->setActive(1);
   }

@@ -14,10 +14,10 @@ namespace factory_test {
 
 namespace {
 
-/// A touch, too, shows the next dialog.
+/// A touch, too, shows the next dialog; the slide of the last one ends the look.
 class FreeFormTest : public StepTest {
  public:
-  FreeFormTest() : StepTest("Free-form dialogs", "Touch for the next dialog.") {}
+  FreeFormTest() : StepTest("Free-form dialogs", "Say whether every dialog looked right.") {}
 
  protected:
   std::string question() const override { return "Did all dialogs look right?"; }
@@ -30,11 +30,11 @@ class FreeFormTest : public StepTest {
     page.say(("Dialog " + std::to_string(step + 1)).c_str());
   }
 
-  void endLook() override { dialog.reset(); }
+  void endSteps() override { dialog.reset(); }
 
  private:
   static FreeFormTest& self() { return Current<FreeFormTest>::get(); }
-  static void next(MW::mouse_event*) { self().move(1); }
+  static void next(MW::mouse_event*) { self().moveOn(); }
   static void follow(MW::kbd_event* event) { self().followKey(event->code); }
 
   MW::DialogNew& put(const char* title) {
@@ -69,8 +69,8 @@ class FreeFormTest : public StepTest {
 
   void putSlide() {
     auto made = std::make_unique<MW::DialogSlide>(MW::DialogSlide::kRepeatPassedTest);
-    made->leftCallback = [](int) { self().move(1); };
-    made->rightCallback = [](int) { self().move(1); };
+    made->leftCallback = [](int) { self().finishLook(); };
+    made->rightCallback = [](int) { self().finishLook(); };
     made->keyPressCallback = follow;
     dialog = std::move(made);
   }

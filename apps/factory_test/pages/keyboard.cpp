@@ -17,8 +17,6 @@ namespace factory_test {
 
 namespace {
 
-constexpr uint32_t kKeyboardColor = 0xFF3C4A60;
-
 /// Tells what was entered. A button for each layout, and the up key for the next one.
 class KeyboardTest : public PageTest {
  public:
@@ -30,12 +28,13 @@ class KeyboardTest : public PageTest {
     page.ask().otherKey = [](unsigned int code) {
       if (code == MW::kKeyUp) self().change(self().layout + 1);
     };
-    const SKIA_Rect area = rowOf(screenSize(), kContentTop, 38, kKeyboardColor);
+    const auto [upper, lower] = rowsOf<2>(contentArea(), gapOf(screenSize()), {7, 1});
+    const SKIA_Rect area = inColor(upper, kPanelInk.ground);
     const SKIA_Text looks = captionOf("");
     keyboard.emplace(&area, &looks);
     keyboard->release_cb = [](int, MW::Ime* from) { self().follow(*from); };
     keyboard->setActive(1);
-    layouts.emplace(rowOf(screenSize(), 74, 6, kButtonColor), kFaces);
+    layouts.emplace(lower, kFaces);
   }
 
   void leave() override {

@@ -3,6 +3,7 @@
 #include <MW/static_text.h>
 #include <MW/window.h>
 
+#include <algorithm>
 #include <array>
 #include <memory>
 #include <mutex>
@@ -14,17 +15,39 @@
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
+#include "text_fit.h"
 
 namespace factory_test {
 
 namespace {
 
 constexpr uint32_t kPaper = 0xFFF4F4EC;
-constexpr uint32_t kKeyboardColor = 0xFF3C4A60;
-constexpr int kTopPercent = 34;    // of the screen's height, and so the next
-constexpr int kViewPercent = 38;   // of the viewer by itself
-constexpr int kAbovePercent = 16;  // of the viewer above the keyboard
-constexpr int kKeyboardPercent = 29;
+constexpr std::size_t kMostLines = 99999;  // what the viewer can number
+
+// Where the viewer stands by itself, and what is below it; with the keyboard it keeps the top part.
+struct LogLayout {
+  SKIA_Rect view;
+  SKIA_Rect buttons;
+  SKIA_Rect shortView;
+  SKIA_Rect keyboard;
+};
+
+LogLayout layOutLog() {
+  const int gap = gapOf(screenSize());
+  const auto [view, buttons] = rowsOf<2>(contentArea(), gap, {7, 1});
+  const auto [shortView, keyboard] = rowsOf<2>(contentArea(), gap, {2, 3});
+  return {inColor(view, kPaper), buttons, inColor(shortView, kPaper),
+          inColor(keyboard, kPanelInk.ground)};
+}
+
+// The newest lines that can be numbered; `left` is how many are left out.
+std::string newestLines(std::string text, std::size_t& left) {
+  const auto lines = static_cast<std::size_t>(std::ranges::count(text, '\n'));
+  left = lines > kMostLines ? lines - kMostLines : 0;
+  std::size_t from = 0;
+  for (std::size_t i = 0; i < left; ++i) from = text.find('\n', from) + 1;
+  return from == 0 ? text : text.substr(from);
+}
 
 /// The viewer with what the page tells of a search.
 class Viewer : public MW::StaticText {
@@ -45,7 +68,7 @@ class LogTest : public PageTest {
   explicit LogTest(const Context& program)
       : PageTest("Log",
                  "Drag to scroll. Search, then Previous\nand Next, or the keys up and down."),
-        text(program.logText ? *program.logText : program.log.text()) {}
+        text(newestLines(program.logText ? *program.logText : program.log.text(), leftOut)) {}
 
   void enter() override {
     page.ask().otherKey = [](unsigned int code) {
@@ -54,7 +77,8 @@ class LogTest : public PageTest {
     };
     placeViewer();
     placeKeyboard();
-    buttons.emplace(rowOf(screenSize(), 74, 6, kButtonColor), kFaces);
+    buttons.emplace(layOutLog().buttons, kFaces);
+    if (leftOut > 0) page.say((std::to_string(leftOut) + " older lines are left out").c_str());
   }
 
   void leave() override {
@@ -70,18 +94,33 @@ class LogTest : public PageTest {
   static const std::array<ButtonRow::Face, 3> kFaces;
 
   void placeViewer() {
-    const ScreenSize screen = screenSize();
-    const SKIA_Rect area = rowOf(screen, kTopPercent, kViewPercent, kPaper);
-    const SKIA_Text looks = textOf("", MW::kColorBlack, SKIA_ALIGN_LEFT, smallTextSize(screen));
+    const SKIA_Rect area = layOutLog().view;
+    const int size = smallTextSize(screenSize());
+    const SKIA_Text looks = textOf("", kDark, SKIA_ALIGN_LEFT, size);
     viewer.emplace(&area, &looks);
-    viewer->setRect(MW::kUnused, &area);  // room for the line numbers
+    const SKIA_Rect narrow = cutFor(area, size);
+    viewer->setRect(MW::kUnused, &narrow);  // also makes room for the line numbers
     viewer->setText(text.c_str());
+    viewer->setRect(MW::kUnused, &area);
     viewer->setActive(1);
   }
 
+  // The viewer cuts rows for letters of a usual width. An area for which it cuts them so short that
+  // wide letters, too, end before the scroll bar.
+  SKIA_Rect cutFor(SKIA_Rect area, int size) const {
+    constexpr int kUsualPercent = 63;  // of the size, the viewer's letter
+    constexpr int kNumberLetters = 8;
+    constexpr int kBarParts = 10;  // the scroll bar and the margins of the width
+    const int letter = std::max(percentOf(size, kUsualPercent), 1);
+    const auto usual = static_cast<std::size_t>(std::max(area.w / letter - kNumberLetters, 1));
+    const int width = area.w - area.w / kBarParts - 4 * size;
+    const std::size_t fitting = bytesThatFit(text, size, width, usual);
+    area.w = static_cast<int>(fitting + kNumberLetters) * size * kUsualPercent / 100;
+    return area;
+  }
+
   void placeKeyboard() {
-    const SKIA_Rect area =
-        rowOf(screenSize(), kTopPercent + kAbovePercent + 1, kKeyboardPercent, kKeyboardColor);
+    const SKIA_Rect area = layOutLog().keyboard;
     const SKIA_Text looks = captionOf("");
     keyboard.emplace(&area, &looks);
     keyboard->release_cb = [](int, MW::Ime* from) { self().follow(*from); };
@@ -89,9 +128,8 @@ class LogTest : public PageTest {
 
   // The keyboard takes the place of the viewer's lower part and of the buttons.
   void showKeyboard(bool isShown) {
-    const SKIA_Rect area =
-        rowOf(screenSize(), kTopPercent, isShown ? kAbovePercent : kViewPercent, kPaper);
-    viewer->setRect(MW::kUnused, &area);
+    const LogLayout layout = layOutLog();
+    viewer->setRect(MW::kUnused, isShown ? &layout.shortView : &layout.view);
     keyboard->setActive(isShown ? 1 : 0);
     buttons->setActive(!isShown);
     MW::isDisplayUpdate(1);
@@ -124,6 +162,7 @@ class LogTest : public PageTest {
   }
 
   Current<LogTest> current{this};
+  std::size_t leftOut = 0;
   const std::string text;
   std::optional<Viewer> viewer;
   std::optional<MW::Ime> keyboard;

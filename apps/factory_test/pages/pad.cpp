@@ -19,8 +19,8 @@ namespace factory_test {
 
 namespace {
 
+constexpr std::size_t kFingers = 2;  // that must have been down at once
 constexpr int kLayouts = MW::Button8::kTwoByFour + 1;
-constexpr uint32_t kPadColor = 0xFF3C4A60;
 
 /// Tells which cells are held. The button, or the up key, changes the layout.
 class PadTest : public PageTest {
@@ -40,8 +40,10 @@ class PadTest : public PageTest {
     pad->pressCallback = [](MW::mouse_event* mouse) { self().tell(mouse->state); };
     pad->clickCallback = [](MW::mouse_event* mouse) { self().tell(mouse->state); };
     pad->setActive(1);
-    changer.emplace(rowOf(screenSize(), kContentTop, 6, kButtonColor), kFaces);
+    changer.emplace(rows().front(), kFaces);
   }
+
+  bool isComplete() const override { return heldAtOnce >= kFingers; }
 
   void leave() override {
     changer.reset();
@@ -56,9 +58,13 @@ class PadTest : public PageTest {
 
   // Not wider than high: a single row of cells is as high as its width says.
   static SKIA_Rect padArea() {
-    const SKIA_Rect row = rowOf(screenSize(), 42, 38, kPadColor);
+    const SKIA_Rect row = rows().back();
     const int side = std::min(row.w, row.h);
-    return {row.x + (row.w - side) / 2, row.y, side, row.h, row.color};
+    return {row.x + (row.w - side) / 2, row.y, side, row.h, kRowInk.ground};
+  }
+
+  static std::array<SKIA_Rect, 2> rows() {
+    return rowsOf<2>(contentArea(), gapOf(screenSize()), {1, 7});
   }
 
   void nextLayout() {
@@ -71,12 +77,15 @@ class PadTest : public PageTest {
   }
 
   void tell(uint32_t mask) {
-    const std::string cells = std::bitset<MW::Button8::kCells>(mask).to_string();
+    const std::bitset<MW::Button8::kCells> held(mask);
+    heldAtOnce = std::max(heldAtOnce.load(), held.count());
+    const std::string cells = held.to_string();
     page.say(("Layout " + std::to_string(layout) + ", held " + cells).c_str());
   }
 
   Current<PadTest> current{this};
   std::atomic<int> layout = MW::Button8::kOneCell;
+  std::atomic<std::size_t> heldAtOnce = 0;  // the most cells so far
   std::optional<MW::Button8> pad;
   std::optional<ButtonRow> changer;
 };

@@ -13,10 +13,10 @@ namespace factory_test {
 
 namespace {
 
-/// A touch, too, shows the next kind, and the right button ends the look.
+/// A touch, too, shows the next kind.
 class PromptTest : public StepTest {
  public:
-  PromptTest() : StepTest("Prompts", "Touch for the next dialog;\nthe right button ends.") {}
+  PromptTest() : StepTest("Prompts", "Say whether every dialog looked right.") {}
 
  protected:
   std::string question() const override { return "Did all dialogs look right?"; }
@@ -25,8 +25,7 @@ class PromptTest : public StepTest {
   void showStep(int kind) override {
     dialog.reset();
     MW::Dialog& made = dialog.emplace(kind);
-    made.clickCallback = [](MW::mouse_event*) { Current<PromptTest>::get().move(1); };
-    made.button2Callback = [](int) { Current<PromptTest>::get().finishLook(); };
+    made.clickCallback = [](MW::mouse_event*) { Current<PromptTest>::get().moveOn(); };
     made.hookKeyCallback = [](int) { Current<PromptTest>::get().move(1); };
     made.keyPressCallback = [](MW::kbd_event* event) {
       Current<PromptTest>::get().followKey(event->code);
@@ -35,7 +34,7 @@ class PromptTest : public StepTest {
     page.say(("Dialog of kind " + std::to_string(kind)).c_str());
   }
 
-  void endLook() override { dialog.reset(); }
+  void endSteps() override { dialog.reset(); }
 
  private:
   Current<PromptTest> current{this};

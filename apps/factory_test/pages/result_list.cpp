@@ -2,6 +2,7 @@
 #include <MW/button_s.h>
 #include <MW/mpd_wid.h>
 
+#include <algorithm>
 #include <array>
 #include <memory>
 #include <optional>
@@ -30,16 +31,23 @@ std::string lineOf(Level level, const std::string& head, const std::string& name
   return line.append("[MPDIA] ").append(name).append("]").append(value).append("\n");
 }
 
-std::string wordsOf(const TestEntry& entry, const TestResult& result) {
-  const std::string screen =
-      std::to_string(result.screen.width) + " x " + std::to_string(result.screen.height);
-  return lineOf(kTest, entry.name, verdictName(result.verdict),
-                std::to_string(result.duration.count()) + " ms") +
-         lineOf(kDetail, "started", "UTC", utcText(result.started)) +
-         lineOf(kDetail, "screen", "pixels", screen);
+enum class Details { Shown, LeftOut };
+
+// The last column is the widest: names stand there.
+std::string wordsOf(const TestEntry& entry, const TestResult& result, Details details) {
+  std::string words = lineOf(kTest, verdictName(result.verdict),
+                             std::to_string(result.duration.count()) + " ms", entry.name);
+  if (details == Details::LeftOut) return words;
+  const std::string started = utcText(result.started);
+  constexpr std::size_t kDateBytes = 10;
+  constexpr std::size_t kTimeBytes = 8;
+  return words + lineOf(kDetail, started.substr(0, kDateBytes),
+                        started.substr(kDateBytes + 1, kTimeBytes),
+                        "UTC, " + std::to_string(result.screen.width) + " x " +
+                            std::to_string(result.screen.height));
 }
 
-std::string wordsOf(Group group, const ResultBook& book) {
+std::string wordsOf(Group group, const ResultBook& book, Details details) {
   int tests = 0;
   int done = 0;
   std::string words;
@@ -48,20 +56,29 @@ std::string wordsOf(Group group, const ResultBook& book) {
     ++tests;
     const TestResult* const result = book.find(entry.id);
     if (result == nullptr) continue;
-    ++done;
-    words += wordsOf(entry, *result);
+    if (result->verdict != Verdict::None) ++done;
+    words += wordsOf(entry, *result, details);
   }
   const std::string count = std::to_string(done) + " of " + std::to_string(tests);
-  return lineOf(kGroup, nameOf(group), count, "tests done") + words;
+  return lineOf(kGroup, count, "done", nameOf(group)) + words;
 }
 
 // The list never hides its last line, nor does that one open: it closes the list.
-std::string wordsOf(const ResultBook& book) {
+std::string wordsOf(const ResultBook& book, Details details) {
   std::string words;
   for (const Group group : {Group::Display, Group::Input, Group::Reports, Group::Toolkit}) {
-    words += wordsOf(group, book);
+    words += wordsOf(group, book, details);
   }
-  return words + lineOf(kGroup, "All", std::to_string(book.results().size()), "results");
+  const auto done = std::ranges::count_if(
+      book.results(), [](const TestResult& result) { return result.verdict != Verdict::None; });
+  return words + lineOf(kGroup, std::to_string(done), "verdicts", "All");
+}
+
+// What the list has room for.
+std::string wordsOf(const ResultBook& book) {
+  const std::string words = wordsOf(book, Details::Shown);
+  const bool hasRoom = std::ranges::count(words, '\n') <= MW::MpdWid::kItems;
+  return hasRoom ? words : wordsOf(book, Details::LeftOut);
 }
 
 /// Groups that open to their tests, and these to their details, by a double tap. The button in the
@@ -69,7 +86,16 @@ std::string wordsOf(const ResultBook& book) {
 class ResultListTest : public LookTest {
  public:
   explicit ResultListTest(const Context& program)
-      : LookTest("Results", ""), words(wordsOf(program.results)) {}
+      : LookTest("Results", "Say whether all results were there."),
+        words(wordsOf(program.results)) {}
+
+  void draw() override {
+    if (list) {
+      page.drawGround();
+    } else {
+      page.draw();
+    }
+  }
 
  protected:
   void beginLook() override {
@@ -77,11 +103,10 @@ class ResultListTest : public LookTest {
     list->key_press_cb = [](MW::kbd_event* event, MW::MpdWid*) {
       self().finishLookOn(event->code);
     };
-    const SKIA_Rect header = rowOf(screenSize(), 10, 10, MW::kColorWhite);
-    const SKIA_Rect left = cellOf(header, 0, 2);
+    const auto [left, right] = header();
     const SKIA_Text hint = captionOf("Tap a line twice");
     heading.emplace(MW::ButtonS::kTextBox, &left, &hint).setActive(1);
-    done.emplace(cellOf(header, 1, 2), kFaces);
+    done.emplace(right, kFaces);
   }
 
   void endLook() override {
@@ -94,6 +119,17 @@ class ResultListTest : public LookTest {
 
  private:
   static const std::array<ButtonRow::Face, 1> kFaces;
+
+  // In the list's empty box.
+  static std::array<SKIA_Rect, 2> header() {
+    constexpr int kAbove = 13;  // parts of the screen's height
+    constexpr int kHeight = 7;
+    const ScreenSize screen = screenSize();
+    const int gap = gapOf(screen);
+    const SKIA_Rect box = {gap, screen.height / kAbove, screen.width - 2 * gap,
+                           screen.height / kHeight, MW::kColorWhite};
+    return columnsOf<2>(within(box, 2 * gap), gap, {1, 1});
+  }
 
   static ResultListTest& self() { return Current<ResultListTest>::get(); }
 

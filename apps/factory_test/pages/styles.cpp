@@ -3,7 +3,9 @@
 #include <MW/button_new.h>
 #include <MW/button_s.h>
 
+#include <algorithm>
 #include <array>
+#include <atomic>
 #include <memory>
 #include <string>
 #include <utility>
@@ -28,25 +30,30 @@ std::unique_ptr<MW::Widget> makePlain(const SKIA_Rect& area, const SKIA_Text& ca
   return std::make_unique<MW::Button>(&area, &caption);
 }
 
+// By the numbers of kStyles.
+std::array<SKIA_Rect, 7> placesOf(const SKIA_Rect& content, int gap) {
+  const auto [upper, middle, lower] = rowsOf<3>(content, gap, {1, 1, 2});
+  const auto [box, text] = columnsOf<2>(upper, gap, {1, 1});
+  const auto [newBox, newText, framed] = columnsOf<3>(middle, gap, {1, 1, 1});
+  const SKIA_Rect inner = columnsOf<3>(rowsOf<3>(lower, 0, {6, 3, 1})[1], gap, {1, 1, 1})[1];
+  return {box, text, newBox, newText, framed, lower, inner};
+}
+
 struct StyleRow {
   const char* name;
-  int top;  // per cent of the screen's height, and so the next
-  int height;
-  int column;
-  int columns;
   uint32_t color;
   MakeButton make;
 };
 
 // Events come to the last but one first, and it lets the last one have them, too.
 constexpr auto kStyles = std::to_array<StyleRow>({
-    {"Button box", 36, 11, 0, 2, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kButtonBox>},
-    {"Text box", 36, 11, 1, 2, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kTextBox>},
-    {"Box", 49, 11, 0, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kButtonBox>},
-    {"Text", 49, 11, 1, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kTextBox>},
-    {"Framed", 49, 11, 2, 3, kButtonColor, makeStyled<MW::ButtonNew, MW::ButtonNew::kFramed>},
-    {"Both", 60, 20, 0, 1, kButtonColor, makeStyled<MW::ButtonS, MW::ButtonS::kPassOn>},
-    {"One", 72, 8, 1, 3, MW::kColorWhite, makePlain},
+    {"Button box", kButtonInk.ground, makeStyled<MW::ButtonS, MW::ButtonS::kButtonBox>},
+    {"Text box", kButtonInk.ground, makeStyled<MW::ButtonS, MW::ButtonS::kTextBox>},
+    {"Box", kButtonInk.ground, makeStyled<MW::ButtonNew, MW::ButtonNew::kButtonBox>},
+    {"Text", kButtonInk.ground, makeStyled<MW::ButtonNew, MW::ButtonNew::kTextBox>},
+    {"Framed", kButtonInk.ground, makeStyled<MW::ButtonNew, MW::ButtonNew::kFramed>},
+    {"Both", kButtonInk.ground, makeStyled<MW::ButtonS, MW::ButtonS::kPassOn>},
+    {"One", MW::kColorWhite, makePlain},
 });
 
 /// Counts the clicks of each.
@@ -59,6 +66,10 @@ class StyleTest : public PageTest {
   void enter() override {
     page.ask();
     placeAll(std::make_index_sequence<kStyles.size()>());
+  }
+
+  bool isComplete() const override {
+    return std::ranges::all_of(counts, [](const auto& count) { return count > 0; });
   }
 
   void leave() override {
@@ -74,9 +85,9 @@ class StyleTest : public PageTest {
 
   void place(std::size_t index, void (*clicked)(int)) {
     const StyleRow& row = kStyles.at(index);
-    const SKIA_Rect area =
-        cellOf(rowOf(screenSize(), row.top, row.height, row.color), row.column, row.columns);
-    buttons.at(index) = row.make(area, captionOf(row.name));
+    const auto places = placesOf(contentArea(), gapOf(screenSize()));
+    buttons.at(index) =
+        row.make(inColor(places.at(index), row.color), captionOf(row.name, kButtonInk.text));
     buttons.at(index)->setBdColor(MW::kColorBlack);  // of the framed one
     buttons.at(index)->clickCallback = clicked;
     buttons.at(index)->setActive(1);
@@ -84,19 +95,14 @@ class StyleTest : public PageTest {
 
   void count(std::size_t index) {
     ++counts.at(index);
-    std::string words;
-    for (std::size_t i = 0; i < counts.size(); ++i) {
-      if (counts.at(i) == 0) continue;
-      words.append(kStyles.at(i).name)
-          .append(" ")
-          .append(std::to_string(counts.at(i)))
-          .append("  ");
-    }
+    std::string words(kStyles.at(index).name);
+    words.append(" ").append(std::to_string(counts.at(index))).append(", all:");
+    for (const auto& each : counts) words.append(" ").append(std::to_string(each));
     page.say(words.c_str());
   }
 
   Current<StyleTest> current{this};
-  std::array<int, kStyles.size()> counts = {};  // dispatch thread
+  std::array<std::atomic<int>, kStyles.size()> counts = {};
   std::array<std::unique_ptr<MW::Widget>, kStyles.size()> buttons;
 };
 

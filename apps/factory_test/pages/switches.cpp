@@ -46,10 +46,8 @@ class SwitchTest : public PageTest {
   template <typename Kind>
   static void place(std::optional<Kind>& slide, int row, MW::Slide::State state,
                     const char* words) {
-    constexpr int kPitch = 13;  // per cent of the screen's height, and so the next
-    constexpr int kHeight = 9;
-    const ScreenSize screen = screenSize();
-    const SKIA_Rect area = rowOf(screen, kContentTop + row * kPitch, kHeight, 0);
+    const auto rows = rowsOf<5>(contentArea(), 2 * gapOf(screenSize()), {1, 2, 2, 2, 1});
+    const SKIA_Rect& area = rows.at(static_cast<std::size_t>(row) + 1);
     const SKIA_Text caption = captionOf(words);
     slide.emplace(state, &area, &caption, nullptr);
     slide->leftCallback = [](int) { Current<SwitchTest>::get().page.say("Left"); };

@@ -3,6 +3,7 @@
 #include <MW/timed.h>
 
 #include <array>
+#include <atomic>
 #include <memory>
 #include <optional>
 
@@ -17,7 +18,6 @@ namespace {
 
 constexpr int kToastMs = 2000;
 constexpr int kProgressMs = 3000;
-constexpr uint32_t kToastColor = 0xFF505A6C;
 
 /// Two buttons, or the keys up and down, start them.
 class TimedTest : public PageTest {
@@ -28,15 +28,19 @@ class TimedTest : public PageTest {
 
   void enter() override {
     page.ask().otherKey = [](unsigned int code) { Current<TimedTest>::get().followKey(code); };
-    const ScreenSize screen = screenSize();
-    const SKIA_Rect row = rowOf(screen, kContentTop, 11, kButtonColor);
-    placeButton(toastButton, cellOf(row, 0, 2), "Toast");
-    placeButton(progressButton, cellOf(row, 1, 2), "Progress");
+    const int gap = gapOf(screenSize());
+    // A progress bar is twice as high as its area.
+    const auto [row, above, lower, under] = rowsOf<4>(contentArea(), 2 * gap, {3, 3, 2, 3});
+    const auto [left, right] = columnsOf<2>(inColor(row, kButtonInk.ground), gap, {1, 1});
+    placeButton(toastButton, left, "Toast");
+    placeButton(progressButton, right, "Progress");
     toastButton->clickCallback = [](int) { Current<TimedTest>::get().startToast(); };
     progressButton->clickCallback = [](int) { Current<TimedTest>::get().startProgress(); };
-    placeToast(rowOf(screen, 47, 9, kToastColor));
-    placeProgress(rowOf(screen, 60, 7, kTitleColor));
+    placeToast(inColor(above, kRowInk.ground));
+    placeProgress(inColor(lower, kHeadInk.ground));
   }
+
+  bool isComplete() const override { return toasted && progressed; }
 
   void leave() override {
     progress.reset();
@@ -49,27 +53,29 @@ class TimedTest : public PageTest {
  private:
   static void placeButton(std::optional<MW::Button>& button, const SKIA_Rect& area,
                           const char* words) {
-    const SKIA_Text caption = captionOf(words);
+    const SKIA_Text caption = captionOf(words, kButtonInk.text);
     button.emplace(&area, &caption).setActive(1);
   }
 
   void placeToast(const SKIA_Rect& area) {
-    const SKIA_Text first = captionOf("A toast", MW::kColorWhite);
-    const SKIA_Text second = captionOf("goes in two seconds", MW::kColorWhite);
+    const SKIA_Text first = captionOf("A toast", kRowInk.text);
+    const SKIA_Text second = captionOf("goes in two seconds", kRowInk.text);
     toast.emplace(&area, &first, &second);
   }
 
   void placeProgress(const SKIA_Rect& area) {
-    const SKIA_Text caption = captionOf("Three seconds of work", MW::kColorWhite);
+    const SKIA_Text caption = captionOf("Three seconds of work", kHeadInk.text);
     progress.emplace(MW::kUnused, &area, &caption);
   }
 
   void startToast() {
+    toasted = true;
     toast->onHideTimer(kToastMs);
     page.say("Toast for two seconds");
   }
 
   void startProgress() {
+    progressed = true;
     progress->onProgressbar(kProgressMs);
     page.say("Progress for three seconds");
   }
@@ -80,6 +86,8 @@ class TimedTest : public PageTest {
   }
 
   Current<TimedTest> current{this};
+  std::atomic<bool> toasted = false;
+  std::atomic<bool> progressed = false;
   std::optional<MW::Button> toastButton;
   std::optional<MW::Button> progressButton;
   std::optional<MW::Toastbox> toast;

@@ -18,14 +18,16 @@ namespace factory_test {
 
 namespace {
 
-constexpr uint32_t kCross = 0xFFE8C040;
+constexpr uint32_t kCross = kMarkInk.ground;
 constexpr int kCrossWidth = 3;  // pixels
 
-/// Shows the coordinates of every touch, with a cross through the last one. A double tap, or the
+/// Shows the coordinates of every touch, with a cross through the last one. A long press, or the
 /// select key, ends the look, and the verdict is asked for.
 class TouchTest : public LookTest {
  public:
-  TouchTest() : LookTest("Touch", "Touch and drag everywhere.\nTap twice in one place to end.") {}
+  TouchTest() : LookTest("Touch", "Touch and drag everywhere.\nHold a finger still to end.") {}
+
+  bool isComplete() const override { return x >= 0; }
 
   void draw() override {
     page.drawGround();
@@ -39,13 +41,12 @@ class TouchTest : public LookTest {
     touch->pressCallback = [](MW::mouse_event* mouse) { self().tell("Press", *mouse); };
     touch->hoverCallback = [](MW::mouse_event* mouse) { self().tell("Move", *mouse); };
     touch->clickCallback = [](MW::mouse_event* mouse) { self().tell("Lift", *mouse); };
-    touch->longPressCallback = [](MW::mouse_event* mouse) { self().tell("Long press", *mouse); };
-    touch->doubleClickCallback = [](int) { self().finishLook(); };
+    touch->longPressCallback = [](MW::mouse_event*) { self().finishLook(); };
     touch->setActive(1);
     key.emplace().keyPressCallback = [](MW::kbd_event* event) { self().finishLookOn(event->code); };
   }
 
-  std::string question() const override { return "Double tap. Was every touch met?"; }
+  std::string question() const override { return "Long press. Was every touch met?"; }
 
   void endLook() override {
     key.reset();

@@ -20,7 +20,7 @@ constexpr uint32_t kCalm = 0xFF205080;
 /// A touch, too, shows the next page. Two releases of one key end the look.
 class WarningTest : public StepTest {
  public:
-  WarningTest() : StepTest("Warning pages", "Touch for the next page.") {}
+  WarningTest() : StepTest("Warning pages", "Say whether both pages looked right.") {}
 
  protected:
   std::string question() const override { return "Did both pages look right?"; }
@@ -37,16 +37,18 @@ class WarningTest : public StepTest {
     }
   }
 
-  void endLook() override { warning.reset(); }
+  void endSteps() override { warning.reset(); }
 
  private:
   template <typename Kind>
   void put(std::unique_ptr<Kind> made, const char* title, const char* words) {
     const ScreenSize screen = screenSize();
     const uint32_t ground = made->getBgColor();
-    made->setText(0, rowOf(screen, 30, 8, ground), captionOf(title, MW::kColorWhite));
-    made->setText(1, rowOf(screen, 42, 8, MW::kColorWhite), captionOf(words));
-    made->touchReleaseCallback = [](MW::mouse_event*) { self().move(1); };
+    const SKIA_Rect whole = {0, 0, screen.width, screen.height, ground};
+    const auto rows = rowsOf<5>(within(whole, gapOf(screen)), 0, {4, 1, 1, 1, 6});
+    made->setText(0, rows[1], captionOf(title, MW::kColorWhite));
+    made->setText(1, inColor(rows[3], kButtonInk.ground), captionOf(words, kButtonInk.text));
+    made->touchReleaseCallback = [](MW::mouse_event*) { self().moveOn(); };
     made->keyPressCallback = [](MW::kbd_event* event) { self().followKey(event->code); };
     made->doubleKeyCallback = [](MW::kbd_event*) { self().finishLook(); };
     made->setActive(1);

@@ -1,4 +1,4 @@
-#include <ranges>
+#include <algorithm>
 
 #include "records/export.h"
 #include "records/html.h"
@@ -48,7 +48,7 @@ void addRun(std::string& body, const RunRecord& run) {
 std::string historyHtml(std::span<const RunRecord> runs) {
   std::string body = "<p class=\"quiet\">" + std::to_string(runs.size()) +
                      " runs, newest first. Times are UTC.</p>\n<h2>Runs</h2>\n";
-  for (const RunRecord& run : runs | std::views::reverse) addRun(body, run);
+  std::for_each(runs.rbegin(), runs.rend(), [&body](const RunRecord& run) { addRun(body, run); });
   return htmlPage("Factory test: runs", body);
 }
 

@@ -38,10 +38,12 @@ figure { margin: 0.5rem 0 0; }
 figcaption { color: var(--quiet); font-size: 0.8125rem; }
 table { border-collapse: collapse; width: 100%; font-variant-numeric: tabular-nums; }
 th, td { text-align: left; padding: 0.25rem 0.75rem 0.25rem 0; border-bottom: 1px solid var(--line); vertical-align: top; }
-th { font-weight: 600; font-size: 0.8125rem; }
+th, td { overflow-wrap: break-word; }
+th { font-weight: 600; font-size: 0.8125rem; white-space: nowrap; }
 .PASS { color: var(--good); font-weight: 650; }
 .FAIL { color: var(--bad); font-weight: 650; }
 svg { display: block; width: 100%; height: auto; }
+figure svg { max-width: 40rem; }
 svg text { fill: var(--quiet); font: 12px system-ui, Roboto, "Noto Sans", sans-serif; }
 .axis { stroke: var(--line); fill: none; }
 .first { stroke: var(--accent); fill: none; stroke-width: 2; }
@@ -73,7 +75,7 @@ std::string htmlPage(std::string_view title, std::string_view body) {
 <head>
 <meta charset="utf-8">
 <meta name="viewport" content="width=device-width, initial-scale=1">
-<meta http-equiv="Content-Security-Policy" content="default-src 'none'; style-src 'unsafe-inline'">
+<meta http-equiv="Content-Security-Policy" content="default-src 'none'; img-src data:; style-src 'unsafe-inline'">
 <link rel="icon" href="data:,">
 <title>)";
   page.append(htmlText(title)).append("</title>\n<style>").append(kStyle);

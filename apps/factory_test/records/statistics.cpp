@@ -128,9 +128,9 @@ Spread spreadOf(const ValueSeries& series) {
   std::ranges::sort(values);
   const std::size_t middle = values.size() / 2;
   Spread spread = {values.front(), values.back()};
-  // Divided first: the sum of large values may be none.
-  const auto count = static_cast<double>(values.size());
-  for (const double value : values) spread.mean += value / count;
+  // Step by step, which keeps equal values as they are.
+  double count = 0;
+  for (const double value : values) spread.mean += (value - spread.mean) / ++count;
   spread.median =
       values.size() % 2 == 1 ? values[middle] : std::midpoint(values[middle - 1], values[middle]);
   spread.deviation = deviationOf(values, spread.mean);

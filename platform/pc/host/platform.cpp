@@ -161,7 +161,7 @@ void Platform::serve(Display& display, InputTranslator& input) {
 
 void Platform::show(const Frame& frame, Painter& painter, Display& display) const {
   const auto start = steady_clock::now();
-  const Region changed = painter.paint(frame);
+  const Region& changed = painter.paint(frame);
   const auto end = steady_clock::now();
   FrameFigures figures = {painter.frame(), changed, duration_cast<microseconds>(end - start), {}};
   if (const auto arrival = service.takeFirstArrival(); arrival && end - *arrival < kLongestAnswer) {

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <utility>
 
 #include "painter/canvas.h"
 
@@ -13,7 +14,7 @@ namespace {
 
 constexpr uint32_t kWhite = 0xFFFFFFFF;
 constexpr uint32_t kByte = 0xFF;
-constexpr int kGroup = CoveredGroup::kPixels;
+constexpr std::size_t kNodeBytes = 96;  // about what a map adds to an entry
 
 // The pixels that a glyph can touch: its edges are smooth.
 Pixels touched(PangoFont* font, PangoGlyph glyph) {
@@ -34,62 +35,32 @@ GlyphImage imageOf(PangoFont* font, PangoGlyph glyph) {
   return {coverageOf(font, {&placed, 1}, area), area};
 }
 
-// The smallest area around the pixels of `bounds` that are not 0.
-Pixels inked(std::span<const uint8_t> coverage, const Pixels& bounds) {
-  Edges edges = {bounds.width, bounds.height, 0, 0};
-  for (int y = 0, i = 0; y < bounds.height; ++y) {
-    for (int x = 0; x < bounds.width; ++x, ++i) {
-      if (coverage[static_cast<std::size_t>(i)] == 0) continue;
-      edges = {std::min<int64_t>(edges.left, x), std::min<int64_t>(edges.top, y),
-               std::max<int64_t>(edges.right, x + 1), y + 1};
-    }
-  }
-  Pixels area = within(edges, {0, 0, bounds.width, bounds.height});
-  area.x += bounds.x;
-  area.y += bounds.y;
-  return area;
-}
-
 }  // namespace
 
-GlyphImage::GlyphImage(std::span<const uint8_t> coverage, const Pixels& bounds)
-    : box(inked(coverage, bounds)) {
-  rows.push_back(0);
-  for (int y = 0; y < box.height; ++y) {
-    const int first = (box.y - bounds.y + y) * bounds.width + box.x - bounds.x;
-    const auto row =
-        coverage.subspan(static_cast<std::size_t>(first), static_cast<std::size_t>(box.width));
-    for (std::size_t x = 0; x < row.size(); ++x) {
-      if (row[x] == 0) continue;
-      CoveredGroup group = {static_cast<uint16_t>(x), {}};
-      std::ranges::copy(row.subspan(x, std::min<std::size_t>(kGroup, row.size() - x)),
-                        group.coverage.begin());
-      groups.push_back(group);
-      x += kGroup - 1;
-    }
-    rows.push_back(static_cast<uint32_t>(groups.size()));
-  }
+GlyphImage& GlyphImages::of(PangoFont* font, PangoGlyph glyph) {
+  auto& images = sheetOf(font).images;
+  const auto known = images.find(glyph);
+  if (known != images.end()) return known->second;
+  GlyphImage& image = images.emplace(glyph, imageOf(font, glyph)).first->second;
+  total += kNodeBytes + image.bytes();
+  return image;
 }
 
-void GlyphImages::trim() {
-  if (total <= kMostBytes) return;
+GlyphImages::Sum* GlyphImages::sumOf(const Pair& pair) {
+  const auto known = sums.find(pair);
+  return known == sums.end() ? nullptr : &known->second;
+}
+
+GlyphImages::Sum& GlyphImages::keepSum(const Pair& pair, Sum sum) {
+  total += kNodeBytes + (sum ? sum->bytes() : 0);
+  return sums.emplace(pair, std::move(sum)).first->second;
+}
+
+void GlyphImages::clear() {
+  sums.clear();
   sheets.clear();
   latest = nullptr;
   total = 0;
-}
-
-const GlyphImage& GlyphImages::of(PangoFont* font, PangoGlyph glyph) {
-  Sheet& sheet = sheetOf(font);
-  if (glyph >= sheet.images.size()) {
-    total += (glyph + 1 - sheet.images.size()) * sizeof sheet.images[0];
-    sheet.images.resize(glyph + 1);
-  }
-  std::unique_ptr<GlyphImage>& image = sheet.images[glyph];
-  if (!image) {
-    image = std::make_unique<GlyphImage>(imageOf(font, glyph));
-    total += image->bytes();
-  }
-  return *image;
 }
 
 GlyphImages::Sheet& GlyphImages::sheetOf(PangoFont* font) {

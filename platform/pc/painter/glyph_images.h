@@ -1,55 +1,55 @@
-/// The coverage of single glyphs, kept to compose lines of them.
+/// The images of glyphs, kept to compose lines of them.
 #pragma once
 
 #include <pango/pango.h>
 
-#include <cstdint>
 #include <map>
 #include <memory>
+#include <optional>
 #include <span>
+#include <tuple>
+#include <unordered_map>
 #include <vector>
 
-#include "painter/ink.h"
-#include "scene/rectangles.h"
+#include "painter/glyph_image.h"
 
 namespace brimol::pc {
-
-/// A glyph's covered pixels around its origin. A blank has no area.
-class GlyphImage {
- public:
-  GlyphImage() = default;
-  /// `coverage`: the pixels of `bounds` row by row, 0 to 255 each.
-  GlyphImage(std::span<const uint8_t> coverage, const Pixels& bounds);
-
-  /// The smallest area that has all covered pixels.
-  const Pixels& area() const { return box; }
-  /// Of a row of the area, from 0 on; places are counted from the area's left edge.
-  std::span<const CoveredGroup> row(std::size_t number) const {
-    return {groups.data() + rows[number], groups.data() + rows[number + 1]};
-  }
-  std::size_t groupCount() const { return groups.size(); }
-  std::size_t bytes() const {
-    return sizeof *this + groups.size() * sizeof groups[0] + rows.size() * sizeof rows[0];
-  }
-
- private:
-  Pixels box = {};
-  std::vector<CoveredGroup> groups;  // row by row, from left to right, none over another
-  std::vector<uint32_t> rows;        // where each row's groups begin, and where the last row's end
-};
 
 /// Renders glyphs once. One thread uses it.
 class GlyphImages {
  public:
-  /// Forgets all of them where they have become too many. References end here.
-  void trim();
+  /// Valid until clear().
+  GlyphImage& of(PangoFont* font, PangoGlyph glyph);
 
-  /// Valid until the next trim().
-  const GlyphImage& of(PangoFont* font, PangoGlyph glyph);
+  /// What two images show at once; none where only cairo can tell.
+  using Sum = std::optional<GlyphImage>;
 
-  /// Bytes of what is kept, after trim() bounded by kMostBytes.
+  /// Two images, and how far the second stands to the right and below: in pixels, and in the steps
+  /// by which cairo tells whether outlines come near each other.
+  struct Pair {
+    const GlyphImage* one;
+    const GlyphImage* other;
+    Place pixels;
+    Place steps;
+    friend bool operator<(const Pair& left, const Pair& right) {
+      const auto words = [](const Pair& pair) {
+        const auto& [one, other, pixels, steps] = pair;
+        return std::tuple(one, other, pixels.x, pixels.y, steps.x, steps.y);
+      };
+      return words(left) < words(right);
+    }
+  };
+
+  /// Null where none is kept.
+  Sum* sumOf(const Pair& pair);
+
+  /// Keeps the sum of a pair of which none is kept.
+  Sum& keepSum(const Pair& pair, Sum sum);
+
+  /// Forgets all of them. References end here.
+  void clear();
+
   std::size_t bytes() const { return total; }
-  static constexpr std::size_t kMostBytes = std::size_t{1} << 20;
 
  private:
   struct FontDeleter {
@@ -58,13 +58,14 @@ class GlyphImages {
   // The glyphs of a font, which lives as long as they are kept: no other one has its address.
   struct Sheet {
     std::unique_ptr<PangoFont, FontDeleter> font;
-    std::vector<std::unique_ptr<GlyphImage>> images;  // by glyph
+    std::unordered_map<PangoGlyph, GlyphImage> images;
   };
 
   Sheet& sheetOf(PangoFont* font);
 
   std::map<PangoFont*, Sheet> sheets;
   Sheet* latest = nullptr;
+  std::map<Pair, Sum> sums;
   std::size_t total = 0;
 };
 

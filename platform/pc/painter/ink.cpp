@@ -1,7 +1,9 @@
 #include "painter/ink.h"
 
+#include <algorithm>
 #include <bit>
 #include <cstring>
+#include <utility>
 
 #include "painter/blend.h"
 
@@ -12,8 +14,7 @@ namespace {
 constexpr std::size_t kGroupBytes = 16;
 using GroupBytes [[gnu::vector_size(kGroupBytes)]] = uint8_t;
 using GroupWords [[gnu::vector_size(2 * kGroupBytes)]] = uint16_t;
-using GroupPixels = std::array<uint32_t, CoveredGroup::kPixels>;
-static_assert(sizeof(GroupPixels) == kGroupBytes);
+static_assert(sizeof(Tint::Pixels) == kGroupBytes);
 
 struct Shares {
   std::array<uint16_t, kGroupBytes> parts;
@@ -29,7 +30,7 @@ inline void mix(uint32_t* pixels, const CoveredGroup& group, const Shares& color
   std::memcpy(&bytes, pixels, sizeof bytes);
   std::memcpy(&parts, color.parts.data(), sizeof parts);
   const auto four = std::bit_cast<uint32_t>(group.coverage);
-  const auto spread = std::bit_cast<GroupBytes>(GroupPixels{four, four, four, four});
+  const auto spread = std::bit_cast<GroupBytes>(Tint::Pixels{four, four, four, four});
   const GroupBytes each =
       __builtin_shufflevector(spread, spread, 0, 0, 0, 0, 1, 1, 1, 1, 2, 2, 2, 2, 3, 3, 3, 3);
   const GroupWords coverage = __builtin_convertvector(each, GroupWords);
@@ -84,13 +85,20 @@ void Ink::learn(uint32_t newGround) {
 
 // A table is learnt for a colour that comes twice in succession: over a picture it would be of no
 // use.
+void Ink::notice(uint32_t found) {
+  if (found == candidate && (found != ground || !isLearnt)) learn(found);
+  candidate = found;
+}
+
 void Ink::lay(uint32_t* row, int left, std::span<const CoveredGroup> groups) {
   if (groups.empty()) return;
-  const uint32_t first = row[left + groups.front().x];
-  if (first == candidate && (first != ground || !isLearnt)) learn(first);
-  candidate = first;
+  notice(row[left + groups.front().x]);
+  layGroups(row, left, groups);
+}
+
+void Ink::layGroups(uint32_t* row, int left, std::span<const CoveredGroup> groups) const {
   const Shares color = {parts, alpha};
-  const GroupPixels uniform = {ground, ground, ground, ground};
+  const Tint::Pixels uniform = {ground, ground, ground, ground};
   for (const CoveredGroup& group : groups) {
     uint32_t* const pixels = row + (left + group.x);
     if (std::memcmp(pixels, uniform.data(), sizeof uniform) != 0) {
@@ -99,6 +107,52 @@ void Ink::lay(uint32_t* row, int left, std::span<const CoveredGroup> groups) {
     }
     for (std::size_t i = 0; i < group.coverage.size(); ++i) pixels[i] = table[group.coverage[i]];
   }
+}
+
+void Ink::lay(uint32_t* left, std::ptrdiff_t stride, const CoveredRows& rows, Tint& tint) {
+  if (rows.starts.front() == rows.starts.back()) return;
+  const uint32_t found = left[rows.groups[rows.starts.front()].x];
+  notice(found);
+  const bool isTinted = prepare(tint, found, rows.groups);
+  for (std::size_t row = 1; row < rows.starts.size(); ++row, left += stride) {
+    const std::size_t first = rows.starts[row - 1];
+    const auto groups = rows.groups.subspan(first, rows.starts[row] - first);
+    isTinted ? layTinted(left, groups, tint.pixels.data() + first, found)
+             : layGroups(left, 0, groups);
+  }
+}
+
+// Pixels of another colour than the tint's ground are mixed.
+void Ink::layTinted(uint32_t* left, std::span<const CoveredGroup> groups,
+                    const Tint::Pixels* tinted, uint32_t below) const {
+  const Shares color = {parts, alpha};
+  const Tint::Pixels uniform = {below, below, below, below};
+  for (const CoveredGroup& group : groups) {
+    uint32_t* const pixels = left + group.x;
+    if (std::memcmp(pixels, uniform.data(), sizeof uniform) == 0) {
+      std::memcpy(pixels, tinted->data(), sizeof uniform);
+    } else {
+      mix(pixels, group, color);
+    }
+    ++tinted;
+  }
+}
+
+// True where the tint is for this colour over the one that was found. It is made for colours that
+// come twice in succession.
+bool Ink::prepare(Tint& tint, uint32_t found, std::span<const CoveredGroup> groups) const {
+  constexpr int kWord = 32;
+  const uint64_t colors = uint64_t{wanted} << kWord | found;
+  const bool isSecond = std::exchange(tint.latest, colors) == colors;
+  if (tint.colors == colors) return true;
+  if (!isSecond || !isLearnt || found != ground) return false;
+  tint.pixels.resize(groups.size());
+  std::ranges::transform(groups, tint.pixels.begin(), [this](const CoveredGroup& group) {
+    const auto& [one, two, three, four] = group.coverage;
+    return Tint::Pixels{table[one], table[two], table[three], table[four]};
+  });
+  tint.colors = colors;
+  return true;
 }
 
 }  // namespace brimol::pc

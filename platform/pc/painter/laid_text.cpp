@@ -3,10 +3,8 @@
 #include <pango/pangocairo.h>
 
 #include <algorithm>
-#include <optional>
 
 #include "painter/fonts.h"
-#include "painter/glyph_run.h"
 
 namespace brimol::pc {
 
@@ -43,10 +41,11 @@ bool hasAllGlyphs(const PangoGlyphString* glyphs) {
   });
 }
 
-// None where Pango must draw the run, which begins `start` Pango units from its line's left end.
-std::optional<LineMask> maskOf(const PangoGlyphItem& item, int start, GlyphImages& images) {
-  if (!hasAllGlyphs(item.glyphs)) return std::nullopt;
-  GlyphRun run(item.item->analysis.font, images);
+// What shows a run that begins `start` Pango units from its line's left end. False where Pango must
+// draw it.
+bool resolve(const PangoGlyphItem& item, int start, GlyphRun& run) {
+  if (!hasAllGlyphs(item.glyphs)) return false;
+  run.begin(item.item->analysis.font);
   start += item.start_x_offset;
   for (const PangoGlyphInfo& info : glyphsOf(item.glyphs)) {
     const PangoGlyphGeometry& geometry = info.geometry;
@@ -54,7 +53,7 @@ std::optional<LineMask> maskOf(const PangoGlyphItem& item, int start, GlyphImage
       run.add(info.glyph, start + geometry.x_offset, geometry.y_offset - item.y_offset);
     start += geometry.width;
   }
-  return run.mask();
+  return run.resolve();
 }
 
 TextLayout layOut(PangoContext* context, std::string_view words, int size) {
@@ -71,63 +70,67 @@ TextLayout layOut(PangoContext* context, std::string_view words, int size) {
 
 LaidText::LaidText(const Sources& sources, std::string_view words, int size) {
   const PlainShapes::Sheet* const sheet = sources.shapes.sheetFor(words, size);
-  if (sheet != nullptr && addPlainLine(*sheet, sources.images, words)) return;
+  if (sheet != nullptr && addPlainLine(*sheet, sources.run, words)) return;
   layout = layOut(sources.context, words, size);
   int units = 0;
   pango_layout_get_size(layout.get(), nullptr, &units);
   height = pixelsOf(units);
   const LayoutIterator iter(pango_layout_get_iter(layout.get()));
   do {
-    addLine(iter.get(), sources.images);
+    addLine(iter.get(), sources.run);
   } while (pango_layout_iter_next_line(iter.get()) != FALSE);
+  images.shrink_to_fit();
   const Line& first = lines.front();
   sources.shapes.learn(words, size, layout.get(), {height, first.middle, first.baseline});
-  if (std::ranges::all_of(lines, &Line::isMasked)) layout.reset();
+  if (std::ranges::none_of(lines, &Line::isByPango)) layout.reset();
 }
 
-// False, and nothing is added, where the line has no mask.
-bool LaidText::addPlainLine(const PlainShapes::Sheet& sheet, GlyphImages& images,
+// False, and nothing is added, where Pango must draw the line.
+bool LaidText::addPlainLine(const PlainShapes::Sheet& sheet, GlyphRun& run,
                             std::string_view words) {
-  GlyphRun run(sheet.font(), images);
+  run.begin(sheet.font());
   int x = 0;
   for (std::size_t i = 0; i < words.size(); ++i) {
     run.add(sheet.glyph(words[i]), x, 0);
     x += sheet.advance(words[i], i + 1 < words.size() ? words[i + 1] : '\0');
   }
-  std::optional<LineMask> mask = run.mask();
-  if (!mask) return false;
+  if (!run.resolve()) return false;
+  images = run.images();
   const LineMetrics& metrics = sheet.metrics();
   height = metrics.height;
-  lines.push_back({metrics.middle, metrics.baseline, pixelsOf(x), true, {}, {}});
-  lines.back().runs.push_back(std::move(*mask));
+  lines.push_back({metrics.middle, metrics.baseline, pixelsOf(x), false, images.size()});
   return true;
 }
 
-void LaidText::addLine(PangoLayoutIter* iter, GlyphImages& images) {
+void LaidText::addLine(PangoLayoutIter* iter, GlyphRun& run) {
+  PangoLayoutLine* const shaped = pango_layout_iter_get_line_readonly(iter);
   PangoRectangle extents = {};
-  pango_layout_iter_get_line_extents(iter, nullptr, &extents);
-  Line line = {pixelsOf(extents.y + extents.height / 2),
-               pixelsOf(pango_layout_iter_get_baseline(iter)),
-               pixelsOf(extents.width),
-               true,
-               {}};
-  int start = 0;
-  for (const GSList* each = pango_layout_iter_get_line_readonly(iter)->runs; each != nullptr;
-       each = each->next) {
-    const auto& run = *static_cast<const PangoGlyphItem*>(each->data);
-    std::optional<LineMask> mask = maskOf(run, start, images);
-    if (!mask) {
-      line.isMasked = false;
-      line.runs.clear();
-      break;
-    }
-    line.runs.push_back(std::move(*mask));
-    start += run.start_x_offset + pango_glyph_string_get_width(run.glyphs) + run.end_x_offset;
-  }
   PangoRectangle letters = {};
-  pango_layout_line_get_pixel_extents(pango_layout_iter_get_line_readonly(iter), &letters, nullptr);
-  line.letters = {letters.x, letters.y, letters.width, letters.height};
-  lines.push_back(std::move(line));
+  pango_layout_iter_get_line_extents(iter, nullptr, &extents);
+  pango_layout_line_get_pixel_extents(shaped, &letters, nullptr);
+  const bool isByPango = !addImages(*shaped, run);
+  lines.push_back({pixelsOf(extents.y + extents.height / 2),
+                   pixelsOf(pango_layout_iter_get_baseline(iter)),
+                   pixelsOf(extents.width),
+                   isByPango,
+                   images.size(),
+                   {letters.x, letters.y, letters.width, letters.height}});
+}
+
+// False, and nothing is added, where Pango must draw the line.
+bool LaidText::addImages(const PangoLayoutLine& line, GlyphRun& run) {
+  const std::size_t before = images.size();
+  int start = 0;
+  for (const GSList* each = line.runs; each != nullptr; each = each->next) {
+    const auto& item = *static_cast<const PangoGlyphItem*>(each->data);
+    if (!resolve(item, start, run)) {
+      images.resize(before);
+      return false;
+    }
+    images.insert(images.end(), run.images().begin(), run.images().end());
+    start += item.start_x_offset + pango_glyph_string_get_width(item.glyphs) + item.end_x_offset;
+  }
+  return true;
 }
 
 // Visits the lines with the place of each one's left end on its baseline. Line by line, since each
@@ -153,8 +156,11 @@ bool LaidText::visit(const Edges& box, int align, Visit each) const {
 void LaidText::draw(const Canvas& canvas, const Edges& box, int align, Ink& ink,
                     const Pixels& clip) const {
   visit(box, align, [&](std::size_t i, const Place& place) {
-    if (!lines[i].isMasked) drawByPango(canvas, i, place, ink.color(), clip);
-    for (const LineMask& run : lines[i].runs) run.draw(canvas, place, ink, clip);
+    if (lines[i].isByPango) return drawByPango(canvas, i, place, ink.color(), clip);
+    for (std::size_t each = i == 0 ? 0 : lines[i - 1].end; each < lines[i].end; ++each) {
+      const auto& [image, corner] = images[each];
+      image->draw(canvas, {place.x + corner.x, place.y + corner.y}, ink, clip);
+    }
   });
 }
 
@@ -187,12 +193,8 @@ void LaidText::drawByPango(const Canvas& canvas, std::size_t line, const Place& 
 
 std::size_t LaidText::bytes() const {
   constexpr std::size_t kLayoutBytes = 8192;  // about what Pango keeps for a short text
-  std::size_t sum = sizeof *this + (layout ? kLayoutBytes : 0);
-  for (const Line& line : lines) {
-    sum += sizeof line;
-    for (const LineMask& run : line.runs) sum += sizeof run + run.bytes();
-  }
-  return sum;
+  return sizeof *this + (layout ? kLayoutBytes : 0) + lines.capacity() * sizeof lines[0] +
+         images.capacity() * sizeof images[0];
 }
 
 }  // namespace brimol::pc

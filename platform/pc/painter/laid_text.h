@@ -4,8 +4,7 @@
 #include <string_view>
 #include <vector>
 
-#include "painter/glyph_images.h"
-#include "painter/line_mask.h"
+#include "painter/glyph_run.h"
 #include "painter/plain_shapes.h"
 #include "painter/text_handles.h"
 
@@ -20,10 +19,11 @@ struct TextInk {
 /// Lines of text. One thread uses it.
 class LaidText {
  public:
-  /// What a text is made from, and what is learnt for others meanwhile. Asked during the call.
+  /// What a text is made from, and what is learnt for others meanwhile. Asked during the call; the
+  /// images of the run outlive the text.
   struct Sources {
     PangoContext* context;
-    GlyphImages& images;
+    GlyphRun& run;
     PlainShapes& shapes;
   };
   LaidText(const Sources& sources, std::string_view words, int size);
@@ -42,21 +42,23 @@ class LaidText {
     int middle;
     int baseline;
     int width;
-    bool isMasked;  // false: Pango draws it
-    std::vector<LineMask> runs;
+    bool isByPango;       // it draws the line, which has no images
+    std::size_t end;      // of the line's images
     Pixels letters = {};  // where the outlines lie, from the line's left end and baseline
   };
 
   template <typename Visit>
   bool visit(const Edges& box, int align, Visit each) const;
-  bool addPlainLine(const PlainShapes::Sheet& sheet, GlyphImages& images, std::string_view words);
-  void addLine(PangoLayoutIter* iter, GlyphImages& images);
+  bool addPlainLine(const PlainShapes::Sheet& sheet, GlyphRun& run, std::string_view words);
+  void addLine(PangoLayoutIter* iter, GlyphRun& run);
+  bool addImages(const PangoLayoutLine& line, GlyphRun& run);
   void drawByPango(const Canvas& canvas, std::size_t line, const Place& place, uint32_t color,
                    const Pixels& clip) const;
 
   TextLayout layout;  // null where no line needs it
   int height = 0;
   std::vector<Line> lines;
+  std::vector<PlacedImage> images;  // line by line
 };
 
 }  // namespace brimol::pc

@@ -2,8 +2,9 @@
 #pragma once
 
 #include <functional>
+#include <iterator>
 #include <list>
-#include <map>
+#include <set>
 #include <utility>
 
 namespace brimol::pc {
@@ -15,24 +16,30 @@ class LruCache {
  public:
   explicit LruCache(std::size_t costBound) : bound(costBound) {}
 
-  /// The value, valid until the next put(), or null.
+  /// The value, valid until the next put() or clear(), or null.
   template <class Wanted>
   Value* find(const Wanted& key) {
     const auto found = places.find(key);
     if (found == places.end()) return nullptr;
-    entries.splice(entries.begin(), entries, found->second);
-    return &found->second->value;
+    entries.splice(entries.begin(), entries, *found);
+    return &entries.front().value;
   }
 
   /// Keeps `value` in place of an older one of that key. It stays until the next put() even if it
   /// alone costs more than the bound.
   Value& put(Key key, Value value, std::size_t cost) {
-    remove(key);
+    if (const auto older = places.find(key); older != places.end()) remove(older);
     entries.push_front({std::move(key), std::move(value), cost});
-    places.emplace(entries.front().key, entries.begin());
+    places.insert(entries.begin());
     total += cost;
-    while (total > bound && entries.size() > 1) remove(entries.back().key);
+    while (total > bound && entries.size() > 1) remove(places.find(entries.back().key));
     return entries.front().value;
+  }
+
+  void clear() {
+    places.clear();
+    entries.clear();
+    total = 0;
   }
 
   std::size_t size() const { return entries.size(); }
@@ -44,18 +51,33 @@ class LruCache {
     Value value;
     std::size_t cost;
   };
+  using Entries = std::list<Entry>;
+  using Place = typename Entries::iterator;
 
-  void remove(const Key& key) {
-    const auto found = places.find(key);
-    if (found == places.end()) return;
-    const auto entry = found->second;
+  // Orders the places by the keys that stand there.
+  struct ByKey {
+    using is_transparent = void;
+    static const Key& keyAt(const Place& place) { return place->key; }
+    template <class Wanted>
+    static const Wanted& keyAt(const Wanted& key) {
+      return key;
+    }
+    template <class One, class Other>
+    bool operator()(const One& one, const Other& other) const {
+      return Less()(keyAt(one), keyAt(other));
+    }
+  };
+  using Places = std::set<Place, ByKey>;
+
+  void remove(typename Places::iterator found) {
+    const auto entry = *found;
     total -= entry->cost;
     places.erase(found);
     entries.erase(entry);
   }
 
-  std::list<Entry> entries;  // the most recently used first
-  std::map<Key, typename std::list<Entry>::iterator, Less> places;
+  Entries entries;  // the most recently used first
+  Places places;
   std::size_t bound;
   std::size_t total = 0;
 };

@@ -44,7 +44,7 @@ Backdrop backdropOf(const Frame& frame, const Pixels& piece) {
 }  // namespace
 
 struct Painter::Parts {
-  explicit Parts(Size screen) : canvas(screen), items(canvas) {}
+  explicit Parts(Size screen) : canvas(screen), items(canvas), changes(canvas.size()) {}
 
   void paintPiece(const Frame& frame, const Pixels& piece) {
     covers.collect(frame, piece);
@@ -56,6 +56,7 @@ struct Painter::Parts {
   Canvas canvas;
   ItemPainter items;
   Covers covers;
+  Changes changes;
   Frame shown;
 };
 
@@ -63,8 +64,8 @@ Painter::Painter(Size screen) : parts(std::make_unique<Parts>(screen)) {}
 
 Painter::~Painter() = default;
 
-Region Painter::paint(const Frame& next) {
-  Region changed = changedRegion(parts->shown, next, parts->canvas.size());
+const Region& Painter::paint(const Frame& next) {
+  const Region& changed = parts->changes.between(parts->shown, next);
   for (const Pixels& piece : changed) parts->paintPiece(next, piece);
   parts->shown = next;
   cairo_surface_mark_dirty(picture());

@@ -20,8 +20,9 @@ class Painter {
   Painter(const Painter&) = delete;
   Painter& operator=(const Painter&) = delete;
 
-  /// Makes `next` the picture shown and returns the pixels that were repainted.
-  Region paint(const Frame& next);
+  /// Makes `next` the picture shown and returns the pixels that were repainted, valid until the
+  /// next call.
+  const Region& paint(const Frame& next);
 
   /// What the picture shows, as it was given.
   const Frame& frame() const;

@@ -23,20 +23,27 @@ void TextPainter::draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_T
 // From Pango itself, which knows where the outlines lie.
 TextInk TextPainter::inkOf(const SKIA_Rect& rect, const SKIA_Text& text) {
   if (!isDrawn(text)) return {};
-  images.trim();
+  trim();
   PlainShapes none;
   const std::string_view words = shownText(text);
-  const LaidText laid({fonts->contextFor(words), images, none}, words, textSizeOf(text));
+  const LaidText laid({fonts->contextFor(words), run, none}, words, textSizeOf(text));
   return laid.ink(edgesOf(rect), text.align);
 }
 
 const LaidText& TextPainter::laidText(const SKIA_Text& text) {
   const KeyView key = {shownText(text), textSizeOf(text)};
   if (const LaidText* const known = texts.find(key)) return *known;
-  images.trim();
-  LaidText laid({fonts->contextFor(key.text), images, shapes}, key.text, key.size);
+  trim();
+  LaidText laid({fonts->contextFor(key.text), run, shapes}, key.text, key.size);
   const std::size_t cost = key.text.size() + laid.bytes();
   return texts.put({std::string(key.text), key.size}, std::move(laid), cost);
+}
+
+// The texts go with the images, which they are made of.
+void TextPainter::trim() {
+  if (images.bytes() <= kMostImageBytes) return;
+  texts.clear();
+  images.clear();
 }
 
 }  // namespace brimol::pc

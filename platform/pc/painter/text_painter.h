@@ -19,7 +19,7 @@ namespace brimol::pc {
 /// Draws texts and keeps what was laid out for the recent ones. One thread uses it.
 class TextPainter {
  public:
-  TextPainter() : fonts(borrowFonts()), texts(kMostBytes) {}
+  TextPainter() : fonts(borrowFonts()), texts(kMostTextBytes) {}
 
   /// Draws the text in the middle of the rectangle's height, aligned as the record asks. Lines
   /// whose middle lies above or below the rectangle are left out. Only pixels in `clip` change: the
@@ -31,9 +31,9 @@ class TextPainter {
   /// draws nothing.
   TextInk inkOf(const SKIA_Rect& rect, const SKIA_Text& text);
 
-  /// Of what is kept, bounded by kMostBytes.
-  std::size_t bytes() const { return texts.cost(); }
-  static constexpr std::size_t kMostBytes = std::size_t{4} << 20;
+  /// Of what is kept, bounded by kMostBytes and what the latest text took.
+  std::size_t bytes() const { return texts.cost() + images.bytes(); }
+  static constexpr std::size_t kMostBytes = std::size_t{5} << 20;
 
  private:
   // A key, and what stands for it in a look-up.
@@ -53,10 +53,15 @@ class TextPainter {
     }
   };
 
+  static constexpr std::size_t kMostTextBytes = std::size_t{1} << 20;
+  static constexpr std::size_t kMostImageBytes = kMostBytes - kMostTextBytes;
+
   const LaidText& laidText(const SKIA_Text& text);
+  void trim();
 
   BorrowedFonts fonts;
   GlyphImages images;
+  GlyphRun run{images};
   PlainShapes shapes;
   Ink ink{0};
   LruCache<Key, LaidText, IsBefore> texts;

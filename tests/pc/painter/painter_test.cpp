@@ -88,12 +88,12 @@ TEST(Scene, RepaintsNoMoreThanWhatChanged) {
   more[0].text.string_len = kMost;  // and what lies behind a NUL is not drawn
   more[0].text.text[100] = 'x';
   more.insert(more.begin() + 1, boxItem({-5, 50, 10, kMost, kRed}));
-  EXPECT_THAT(changedRegion(some, more, kScreen), ElementsAre(Area{0, 50, 5, 10}));
-  EXPECT_THAT(changedRegion(more, some, kScreen), ElementsAre(Area{0, 50, 5, 10}));
+  EXPECT_THAT(Changes(kScreen).between(some, more), ElementsAre(Area{0, 50, 5, 10}));
+  EXPECT_THAT(Changes(kScreen).between(more, some), ElementsAre(Area{0, 50, 5, 10}));
   for (const int count : {32, 33, 900}) {
     Frame columns;
     for (int i = 0; i < count; ++i) columns.push_back(boxItem({i * 2, 0, 1, 5, kRed}));
-    EXPECT_EQ(changedRegion({}, columns, {2000, 10}).size(), count == 32 ? 32U : 1U);
+    EXPECT_EQ(Changes({2000, 10}).between({}, columns).size(), count == 32 ? 32U : 1U);
   }
 }
 

@@ -1,0 +1,62 @@
+#include "run_start.h"
+
+#include <brimol/properties.h>
+#include <unistd.h>
+
+#include <array>
+
+#include "plan/plan_json.h"
+#include "records/postgres.h"
+#include "version.h"
+#include "world.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr std::size_t kHostNameBytes = 256;
+
+std::string serialOfSystem() {
+  std::array<char, BRIMOL_PROPERTY_BYTES> value = {};
+  property_get("ro.serialno", value.data(), "");
+  std::string unused;
+  return isSerial(value.data(), unused) ? value.data() : "";
+}
+
+std::string stationName() {
+  std::array<char, kHostNameBytes + 1> name = {};  // a name that fills it is not ended
+  return ::gethostname(name.data(), kHostNameBytes) == 0 ? name.data() : "";
+}
+
+}  // namespace
+
+Keeping keepingOf(const Options& options) {
+  return {.json = options.results,
+          .junit = options.junit,
+          .database = options.database,
+          .resume = options.newRun ? Database::Resume::No : Database::Resume::Yes,
+          .line = options.line};
+}
+
+RunStart runStartOf(const Options& options, const Plan& plan) {
+  RunStart start = {.unit = options.serial.empty() ? serialOfSystem() : options.serial,
+                    .operatorName = options.operatorName,
+                    .planName = plan.name,
+                    .planHash = planHash(plan),
+                    .software = kVersion,
+                    .station = stationName(),
+                    .started = presentTime()};
+  for (const PlanStep& step : plan.steps) start.tests.push_back(step.test);
+  return start;
+}
+
+std::string wrongRecords(const Options& options) {
+  std::string why;
+  if (!options.serial.empty() && !isSerial(options.serial, why)) return "--serial: " + why;
+  if (options.line.empty()) return "";
+  if (options.database.empty()) return "--line needs --database, which always comes first";
+  return isPostgresUrl(options.line) ? ""
+                                     : "--line needs an address like postgresql://host/database";
+}
+
+}  // namespace factory_test

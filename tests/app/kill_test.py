@@ -1,0 +1,86 @@
+"""The whole application, killed at random moments of a run under load: kill_test.py FACTORY_TEST TRACE [KILLS] [SEED]"""
+
+import json
+import os
+import pathlib
+import random
+import sqlite3
+import subprocess
+import sys
+import tempfile
+import time
+import unittest
+
+FACTORY_TEST, TRACE = sys.argv[1:3]
+KILLS = int(sys.argv[3]) if len(sys.argv) > 3 else 4
+SEED = int(sys.argv[4]) if len(sys.argv) > 4 else random.getrandbits(30)
+LONGEST = 2.5  # seconds: a run under load takes longer
+
+
+class KillTest(unittest.TestCase):
+    def setUp(self):
+        self.folder = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
+        self.store = self.folder / "station.db"
+        self.results = self.folder / "results.json"
+        for _ in range(2):
+            load = subprocess.Popen([sys.executable, "-c", "while True: pass"])
+            self.addCleanup(load.wait)
+            self.addCleanup(load.kill)
+
+    def program(self, *options, trace=True):
+        played = {"BRIMOL_TRACE": TRACE} if trace else {}
+        return subprocess.Popen([FACTORY_TEST, "--headless", "--database", self.store, "--results", self.results,
+                                 "--serial", "A1", *options], stderr=subprocess.PIPE, text=True,
+                                env=os.environ | played)
+
+    def ask(self, sql):
+        store = sqlite3.connect(f"file:{self.store}?mode=ro", uri=True)
+        try:
+            return store.execute(sql).fetchall()
+        finally:
+            store.close()
+
+    def verdicts(self):
+        return set(self.ask("select * from verdicts")) if self.store.exists() else set()
+
+    def test_loses_at_most_the_running_test(self):
+        chance = random.Random(SEED)
+        for kill in range(KILLS):
+            with self.subTest(kill=kill, seed=SEED):
+                before = self.verdicts() if kill else set()
+                app = self.program("--new-run")
+                time.sleep(chance.uniform(0.05, LONGEST))
+                try:
+                    before |= self.verdicts()  # those that were given so far
+                except sqlite3.OperationalError:
+                    pass  # it has no tables yet
+                app.kill()
+                app.communicate()
+                if not self.store.exists():
+                    continue
+                self.assertEqual([("ok",)], self.ask("pragma integrity_check"))
+                self.assertEqual([], self.ask("pragma foreign_key_check"))
+                try:
+                    after = self.verdicts()
+                except sqlite3.OperationalError:
+                    after = set()
+                self.assertEqual(set(), before - after)
+                if self.results.exists():
+                    json.loads(self.results.read_text())
+        self.check_next_start()
+
+    def check_next_start(self):
+        """It goes on with the run that the last kill left."""
+        menu = self.program("--shot", self.folder / "menu.png", trace=False)
+        _, says = menu.communicate()
+        self.assertEqual((0, ""), (menu.returncode, says))
+        self.assertEqual([], self.ask("select id from runs where state = 'running'"))
+        newest = self.ask("select test from verdicts v join runs r on r.id = v.run where r.number = "
+                          "(select max(number) from runs) group by test order by min(v.number)")
+        results = json.loads(self.results.read_text())
+        self.assertEqual("A1", results["unit"])
+        self.assertEqual([test for test, in newest], [result["test"] for result in results["results"]])
+
+
+if __name__ == "__main__":
+    unittest.main(argv=sys.argv[:1])
