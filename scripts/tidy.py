@@ -15,10 +15,8 @@ import subprocess
 import sys
 from concurrent.futures import ThreadPoolExecutor
 
-MOST_FILES = 12
-# Of a line that starts at the margin, as every declaration outside functions and classes does here: what
-# stands before the first sign that ends a declared name.
-DECLARED = re.compile(r'^(?!namespace\b)[A-Za-z_][\w:<>,&* ]*?(?<!:)\b(\w+)(?:\[[^\]]*\])? ?(?:[=({;]|$)', re.MULTILINE)
+from batches import make_batches
+
 # What they would find is the batch itself: that it includes sources, and that a function's name hides another
 # file's. The compiler looks for hidden names in each file by itself.
 LEFT_OUT = ('--checks=-bugprone-suspicious-include', '--extra-arg=-Wno-shadow')
@@ -35,21 +33,13 @@ def read_units(folder, files):
     return units
 
 
-def make_batches(units):
+def batches_of(units):
     """Lists of files, each with the options that all of its files have."""
-    batches = []
-    for path, options in sorted(units.items(), key=lambda unit: (unit[1], unit[0])):
-        names = set(DECLARED.findall(pathlib.Path(path).read_text()))
-        for batch in batches:
-            fits = batch['options'] == options and len(batch['files']) < MOST_FILES
-            if fits and not names & batch['names']:
-                break
-        else:
-            batch = {'options': options, 'files': [], 'names': set()}
-            batches.append(batch)
-        batch['files'].append(path)
-        batch['names'] |= names
-    return batches
+    paths_by_options = {}
+    for path, options in sorted(units.items()):
+        paths_by_options.setdefault(options, []).append(path)
+    return [{'options': options, 'files': files}
+            for options, paths in sorted(paths_by_options.items()) for files in make_batches(paths)]
 
 
 def write_batches(folder, batches):
@@ -77,7 +67,7 @@ def look_at(folder, batch):
 def main():
     build = pathlib.Path(sys.argv[1]).resolve()
     units = read_units(build, {os.path.realpath(name) for name in sys.argv[2:]})
-    batches = make_batches(units)
+    batches = batches_of(units)
     folder = build / 'tidy'
     write_batches(folder, batches)
     print(f'{len(units)} files in {len(batches)} batches', flush=True)

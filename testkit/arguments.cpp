@@ -52,9 +52,12 @@ int32_t Arguments::number() {
 char* Arguments::text() {
   const std::string given = bytes();
   if (given.empty() && byte() % kNullEvery == 1) return nullptr;
-  const std::shared_ptr<char[]> block(new char[given.size() + 1]);  // NOLINT(*-avoid-c-arrays)
-  *std::ranges::copy(given, block.get()).out = '\0';
-  return keep(std::shared_ptr<char>(block, block.get()));
+  const std::size_t size = given.size() + 1;
+  auto* const block = static_cast<char*>(memory.allocate(size, 1));
+  *std::ranges::copy(given, block).out = '\0';
+  const auto release = [from = &memory, size](char* bytes) { from->deallocate(bytes, size, 1); };
+  return keep(
+      std::shared_ptr<char>(block, release, std::pmr::polymorphic_allocator<char>(&memory)));
 }
 
 SKIA_Rect Arguments::record(const SKIA_Rect*) {
@@ -84,7 +87,7 @@ SKIA_Text Arguments::record(const SKIA_Text*) {
 }
 
 Event Arguments::record(const Event*) {
-  constexpr auto kTypes = std::to_array<BrimolEventType>(
+  constexpr auto kTypes = std::to_array<uint8_t>(
       {BRIMOL_POINTER_DOWN, BRIMOL_POINTER_MOTION, BRIMOL_POINTER_UP, BRIMOL_LONG_PRESS,
        BRIMOL_KEY_DOWN, BRIMOL_KEY_UP, BRIMOL_USER_EVENT});
   constexpr std::size_t kReadBytes = 12;
@@ -96,7 +99,9 @@ Event Arguments::record(const Event*) {
 }
 
 MW::mouse_event Arguments::record(const MW::mouse_event*) {
-  MW::mouse_event taken = {.state = byte(), .finger = unsignedNumber()};
+  MW::mouse_event taken = {};
+  taken.state = byte();
+  taken.finger = unsignedNumber();
   for (int32_t* const each : {&taken.x, &taken.y, &taken.xrel, &taken.yrel}) *each = number();
   return taken;
 }

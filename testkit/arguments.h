@@ -9,6 +9,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <memory>
+#include <memory_resource>
 #include <span>
 #include <string>
 #include <type_traits>
@@ -21,11 +22,14 @@ namespace brimol::test {
 /// sanitizer sees who reads beyond. Where no byte is left, numbers are 0 and texts empty.
 class Arguments {
  public:
-  explicit Arguments(std::span<const uint8_t> given) : rest(given) {}
+  /// `blocks`: where they come from, which outlives this.
+  explicit Arguments(std::span<const uint8_t> given,
+                     std::pmr::memory_resource& blocks = *std::pmr::new_delete_resource())
+      : rest(given), memory(blocks), kept(&blocks) {}
 
   bool isAtEnd() const { return rest.empty(); }
   /// Frees what the pointers that were taken point to.
-  void forget() { blocks.clear(); }
+  void forget() { kept.clear(); }
 
   /// The next byte.
   uint8_t byte();
@@ -60,14 +64,15 @@ class Arguments {
     } else {
       // Handlers are not called without an event.
       if (!std::same_as<Pointed, MW::event_data> && byte() % 8 == 0) return nullptr;
-      return keep(std::make_shared<Pointed>(take<Pointed>()));
+      const std::pmr::polymorphic_allocator<Pointed> allocator(&memory);
+      return keep(std::allocate_shared<Pointed>(allocator, take<Pointed>()));
     }
   }
   template <typename Pointed>
   Pointed* keep(std::shared_ptr<Pointed> block) {
-    Pointed* const kept = block.get();
-    blocks.push_back(std::move(block));
-    return kept;
+    Pointed* const pointed = block.get();
+    kept.push_back(std::move(block));
+    return pointed;
   }
 
   // One for each record; the pointer, which is null, says which.
@@ -80,7 +85,8 @@ class Arguments {
   MW::event_data record(const MW::event_data*);
 
   std::span<const uint8_t> rest;
-  std::vector<std::shared_ptr<const void>> blocks;
+  std::pmr::memory_resource& memory;
+  std::pmr::vector<std::shared_ptr<const void>> kept;
 };
 
 }  // namespace brimol::test

@@ -6,11 +6,13 @@
 #include <brimol/properties.h>
 #include <brimol3_widget_test/failure.h>
 
+#include <algorithm>
 #include <charconv>
 #include <chrono>
 #include <cstdlib>
 #include <cstring>
 #include <new>
+#include <string_view>
 
 namespace brimol::test {
 
@@ -146,8 +148,13 @@ void getDpi(float* xdpi, float* ydpi) {
 // NOLINTNEXTLINE(readability-identifier-naming): the parameters are named as in the contract
 int property_get(const char* key, char* value, const char* default_value) {
   const std::lock_guard guard(platform().lock);
-  const auto found = platform().properties.find(key);
-  const std::string text = found != platform().properties.end() ? found->second : default_value;
+  if (!platform().hasProperties) return -1;
+  // Without memory: tests let allocations fail.
+  const auto& all = platform().properties;
+  const auto found = std::ranges::find(
+      all, std::string_view(key), [](const auto& each) { return std::string_view(each.first); });
+  const std::string_view text =
+      found != all.end() ? std::string_view(found->second) : default_value;
   const std::size_t length = text.copy(value, BRIMOL_PROPERTY_BYTES - 1);
   value[length] = '\0';
   return static_cast<int>(length);
@@ -155,6 +162,7 @@ int property_get(const char* key, char* value, const char* default_value) {
 
 int property_set(const char* key, const char* value) {
   const std::lock_guard guard(platform().lock);
+  if (!platform().hasProperties) return -1;
   platform().properties.insert_or_assign(key, value);
   return 0;
 }

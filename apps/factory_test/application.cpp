@@ -94,8 +94,9 @@ void letMonkeyPlay(const Options& options) {
   setenv("BRIMOL_DISPLAY", "headless", 1);
 }
 
-ExitCode showScreens(const Options& options, ResultBook& book, const Context& context) {
-  FactoryTest test(book, context);
+ExitCode showScreens(const Options& options, ResultBook& book, const Context& context,
+                     const Task& task) {
+  FactoryTest test(book, context, task);
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
@@ -116,10 +117,13 @@ ExitCode runApplication(const Options& options) {
   if (!options.monkey.empty()) letMonkeyPlay(options);
   std::string error;
   const auto task = chooseTask(options, error);
-  if (!task) return fail(error);
+  if (!task) {
+    complain(error);
+    return ExitCode::WrongUse;
+  }
   auto book = ResultBook::open(keepingOf(options), runStartOf(options, task->plan), error);
   if (!book) return fail(error);
-  Context context = {*book, log, {}, options.shell};
+  Context context = {*book, log, {}, options.shell, task->plan};
   if (!options.log.empty()) {
     context.logText = readText(options.log, error);
     if (!context.logText) return fail(error);
@@ -129,8 +133,8 @@ ExitCode runApplication(const Options& options) {
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;
-  const ExitCode result =
-      started ? showScreens(options, *book, context) : fail("no memory for the dispatch thread");
+  const ExitCode result = started ? showScreens(options, *book, context, *task)
+                                  : fail("no memory for the dispatch thread");
   MW::Window::destroy();
   const auto line = book->lineStatus();
   if (line && !line->error.empty()) {

@@ -90,7 +90,7 @@ void Command::watch() {
   lifeline = ends[1];
   SpawnPlan plan;
   plan.connect(STDIN_FILENO, ends[0]);
-  if (plan.start("read line; kill -9 -- -$0", std::to_string(process), watcher) != 0) watcher = 0;
+  if (plan.start("read line; kill -KILL -$0", std::to_string(process), watcher) != 0) watcher = 0;
   close(ends[0]);
 }
 

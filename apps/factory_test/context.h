@@ -4,6 +4,7 @@
 #include <optional>
 #include <string>
 
+#include "plan/plan.h"
 #include "results/results.h"
 #include "session_log.h"
 
@@ -15,6 +16,13 @@ struct Context {
   SessionLog& log;
   std::optional<std::string> logText;  // what the log viewer shows; none: the program's own log
   std::string shellCommand;            // for /bin/sh
+  const Plan& plan;
 };
+
+/// What the plan says of a test, or what is usual for one that is not in it.
+inline PlanStep stepOf(const Context& program, std::string_view test) {
+  const PlanStep* const step = program.plan.find(test);
+  return step != nullptr ? *step : usualStep(test);
+}
 
 }  // namespace factory_test

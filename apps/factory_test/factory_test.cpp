@@ -7,14 +7,20 @@
 
 #include "complain.h"
 #include "layout.h"
+#include "plan/judge.h"
+#include "results/measure_text.h"
 #include "run_progress.h"
 #include "world.h"
 
 namespace factory_test {
 
-FactoryTest::FactoryTest(ResultBook& results, const Context& program)
-    : book(results), context(program), menu(book) {
-  menu.show();
+FactoryTest::FactoryTest(ResultBook& results, const Context& program, const Task& task)
+    : book(results), context(program), simulation(task.simulation), menu(book) {
+  if (task.isRun) {
+    run.emplace(task.plan);
+  } else {
+    menu.show();
+  }
 }
 
 void FactoryTest::open(std::size_t entry, uint32_t now) {
@@ -28,6 +34,8 @@ void FactoryTest::update(uint32_t now) {
     updatePrompt(now);
   } else if (running) {
     updateTest(now);
+  } else if (run) {
+    updateRun(now);
   } else {
     updateMenu(now);
   }
@@ -46,14 +54,46 @@ void FactoryTest::updateMenu(uint32_t now) {
 void FactoryTest::updateTest(uint32_t now) {
   running->test->update(now);
   const Outcome outcome = running->test->verdict();
+  if (outcome == Outcome::Running && isOverdue(running->step, now - running->startTicks)) {
+    context.log.add("Time-out");
+    finish(Outcome::Fail, now);
+    return;
+  }
   if (outcome == Outcome::Running) return;
-  if (outcome == Outcome::Pass && !running->test->isComplete()) {
+  if (outcome == Outcome::Pass && !running->test->isComplete() && isWithinLimits()) {
     ask(Asked::IncompletePass,
         {"Not all was tested", "The test has not shown or asked all that it must. Pass anyway?",
          "PASS", "GO ON"});
     return;
   }
   finish(outcome, now);
+}
+
+// What is outside them fails, whatever the operator says.
+bool FactoryTest::isWithinLimits() const {
+  std::vector<Measure> values = running->test->values();
+  return judge(Verdict::Pass, values, running->step) == Verdict::Pass;
+}
+
+// Begins the next step, or asks what is to follow.
+void FactoryTest::updateRun(uint32_t now) {
+  const PlanStep& step = run->step();
+  const char* const name = testEntries()[placeOf(step.test)].name;
+  switch (run->state()) {
+    case PlanRun::State::Performing: start(placeOf(step.test), now); break;
+    case PlanRun::State::Asking:
+      ask(Asked::Repeat, {name, "The test has not passed. Repeat it?", "REPEAT", "NO"});
+      break;
+    default: endRun();
+  }
+}
+
+void FactoryTest::endRun() {
+  std::string error;
+  if (!book.finish(error)) complain(error);
+  const RunProgress progress = progressOf(book);
+  const bool isPassed = progress.passed == progress.tests;
+  ask(Asked::RunEnd, {isPassed ? "PASS" : "FAIL", progress.words(), "END", "MENU"});
 }
 
 void FactoryTest::ask(Asked what, const Question& question) {
@@ -67,6 +107,12 @@ void FactoryTest::updatePrompt(uint32_t now) {
   const bool isYes = answer == Prompt::Answer::Yes;
   prompt.reset();
   MW::isDisplayUpdate(1);
+  follow(isYes, now);
+}
+
+// What the answer to a question leads to.
+void FactoryTest::follow(bool isYes, uint32_t now) {
+  using Answer = PlanRun::Answer;
   switch (asked) {
     case Asked::Leave: ended = isYes; break;
     case Asked::IncompletePass:
@@ -78,13 +124,28 @@ void FactoryTest::updatePrompt(uint32_t now) {
       break;
     case Asked::SaveAgain:
       if (std::string error; isYes) showKept(book.saveAgain(error), error);
+      break;
+    case Asked::Repeat:
+      if (isYes) {
+        run->answer(Answer::Again);
+      } else {
+        ask(Asked::GoOn, {"Go on?", "The plan's other tests can still be done.", "GO ON", "STOP"});
+      }
+      break;
+    case Asked::GoOn: run->answer(isYes ? Answer::GoOn : Answer::Stop); break;
+    case Asked::RunEnd:
+      ended = isYes;
+      run.reset();
+      menu.show();
+      break;
   }
 }
 
 void FactoryTest::start(std::size_t entry, uint32_t now) {
   const TestEntry& chosen = testEntries()[entry];
   context.log.add(std::string("Test ") + chosen.id);
-  running = Running{entry, chosen.make(context), presentTime(), now};
+  running = Running{entry, stepOf(context, chosen.id), chosen.make(context), presentTime(), now};
+  if (!running->step.text.empty()) running->test->instruct(running->step.text);
   running->test->showProgress(progressOf(book));
   running->test->enter();
   MW::isDisplayUpdate(1);
@@ -98,27 +159,37 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
     start(entry, now);
     return;
   }
-  if (outcome == Outcome::Pass) keep(*running, Verdict::Pass, now);
-  if (outcome == Outcome::Fail) keep(*running, Verdict::Fail, now);
+  const Verdict given = outcome == Outcome::Pass   ? Verdict::Pass
+                        : outcome == Outcome::Fail ? Verdict::Fail
+                                                   : Verdict::None;
   // Looking at a test without a verdict keeps the one that it had.
-  if (outcome == Outcome::Left && book.find(testEntries()[entry].id) == nullptr) {
-    keep(*running, Verdict::None, now);
-  }
+  const bool isNew = given != Verdict::None || book.find(running->step.test) == nullptr;
+  const Verdict verdict = isNew ? keep(*running, given, now) : given;
   running.reset();
-  menu.show();
+  if (run) {
+    run->finish(verdict);
+  } else {
+    menu.show();
+  }
 }
 
-void FactoryTest::keep(const Running& done, Verdict verdict, uint32_t now) {
+Verdict FactoryTest::keep(const Running& done, Verdict given, uint32_t now) {
+  std::vector<Measure> values = done.test->values();
+  const PlanStep& step = done.step;
+  const Verdict verdict =
+      simulation.rehearsed(judge(given, values, step), step.test, run ? run->attempt() : 1);
+  for (const Measure& each : values) context.log.add(each.name + ": " + measureText(each));
   context.log.add(std::string("Verdict ") + verdictName(verdict));
   std::string error;
-  const bool isKept = book.record({.test = testEntries()[done.entry].id,
+  const bool isKept = book.record({.test = step.test,
                                    .verdict = verdict,
                                    .started = done.started,
                                    .duration = std::chrono::milliseconds(now - done.startTicks),
                                    .screen = screenSize(),
-                                   .values = done.test->values()},
+                                   .values = std::move(values)},
                                   error);
   showKept(isKept, error);
+  return verdict;
 }
 
 void FactoryTest::showKept(bool isKept, const std::string& error) {

@@ -9,16 +9,19 @@
 
 #include "menu.h"
 #include "pages/table.h"
+#include "plan/plan_run.h"
 #include "prompt.h"
 #include "results/results.h"
+#include "task.h"
 
 namespace factory_test {
 
 /// Used on the main thread.
 class FactoryTest {
  public:
-  /// Keeps verdicts in `results`, which outlives it, as does the context.
-  FactoryTest(ResultBook& results, const Context& program);
+  /// Keeps verdicts in `results`, which outlives it, as do the context and the task. A task that is
+  /// a run begins with the plan's first step.
+  FactoryTest(ResultBook& results, const Context& program, const Task& task);
 
   /// Shows a page of testEntries() in the place of the menu.
   void open(std::size_t entry, uint32_t now);
@@ -31,27 +34,34 @@ class FactoryTest {
  private:
   struct Running {
     std::size_t entry;
+    PlanStep step;
     std::unique_ptr<Test> test;
     std::chrono::sys_seconds started;
     uint32_t startTicks;
   };
 
-  enum class Asked { Leave, IncompletePass, SaveAgain };
+  enum class Asked { Leave, IncompletePass, SaveAgain, Repeat, GoOn, RunEnd };
 
   void updateMenu(uint32_t now);
   void updateTest(uint32_t now);
+  bool isWithinLimits() const;
+  void updateRun(uint32_t now);
   void updatePrompt(uint32_t now);
+  void follow(bool isYes, uint32_t now);
   void ask(Asked what, const Question& question);
   void start(std::size_t entry, uint32_t now);
   void finish(Outcome outcome, uint32_t now);
-  void keep(const Running& done, Verdict verdict, uint32_t now);
+  Verdict keep(const Running& done, Verdict given, uint32_t now);
+  void endRun();
   void showKept(bool isKept, const std::string& error);
 
   ResultBook& book;
   const Context& context;
+  const Simulation& simulation;
   bool ended = false;
   Menu menu;
   std::optional<Running> running;
+  std::optional<PlanRun> run;  // while a plan is performed without the menu
   Asked asked = Asked::Leave;
   std::optional<Prompt> prompt;
 };

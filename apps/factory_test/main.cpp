@@ -20,6 +20,17 @@ void printHelp() {
   std::printf("%s\nOn a PC:\n%s", factory_test::usage().c_str(), brimol_host_help());
 }
 
+int printPlan(const factory_test::Options& options) {
+  std::string error;
+  const auto task = factory_test::chooseTask(options, error);
+  if (!task) {
+    factory_test::complain(error);
+    return static_cast<int>(factory_test::ExitCode::WrongUse);
+  }
+  std::fputs(factory_test::planJson(task->plan).c_str(), stdout);
+  return EXIT_SUCCESS;
+}
+
 }  // namespace
 
 int main(int count, char** arguments) {
@@ -40,14 +51,6 @@ int main(int count, char** arguments) {
     std::printf("factory_test %s\n", factory_test::kVersion);
     return EXIT_SUCCESS;
   }
-  const auto task = factory_test::chooseTask(*options, error);
-  if (!task) {
-    factory_test::complain(error);
-    return static_cast<int>(factory_test::ExitCode::WrongUse);
-  }
-  if (options->action == factory_test::Options::Action::PrintPlan) {
-    std::fputs(factory_test::planJson(task->plan).c_str(), stdout);
-    return EXIT_SUCCESS;
-  }
+  if (options->action == factory_test::Options::Action::PrintPlan) return printPlan(*options);
   return static_cast<int>(factory_test::runApplication(*options));
 }

@@ -23,6 +23,8 @@ class Page {
   void drawFront();
   /// How much of the title's bar is full.
   void showProgress(const RunProgress& newProgress) { progress = newProgress; }
+  /// Changes the instructions.
+  void instruct(const char* words) { hint.setText(words); }
   /// Changes the line; the next frame shows it. Any thread.
   void say(const char* words);
 

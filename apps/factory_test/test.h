@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstdint>
+#include <string>
 #include <vector>
 
 #include "results/test_result.h"
@@ -21,6 +22,8 @@ class Test {
 
   /// How far the run had come before; asked for by a page that shows it.
   virtual void showProgress(const RunProgress&) {}
+  /// What the plan tells the operator, in the place of the page's own words; before enter().
+  virtual void instruct(const std::string& words) { static_cast<void>(words); }
   /// Puts the test's widgets on the screen.
   virtual void enter() = 0;
   /// Takes them off again. No callback runs any more when it returns.
@@ -30,7 +33,7 @@ class Test {
   /// A PASS was not taken: the test goes on.
   virtual void takeBack() {}
 
-  /// What it measured so far; asked for at the verdict, after leave().
+  /// What it measured so far.
   virtual std::vector<Measure> values() const { return {}; }
   /// Whether it has shown and asked all that it must.
   virtual bool isComplete() const { return true; }

@@ -19,19 +19,20 @@ namespace brimol::test {
 
 /// What a test sets and reads while no other thread runs or all of them are held.
 struct PlatformState {
-  bool records = true;            ///< false: drawings and log lines are dropped
-  int live = 1;                   ///< what skia_live_widget_c() returns
-  int liveAsked = 0;              ///< how often it was asked
-  int nextHandle = 0;             ///< what drawing calls return
-  float xdpi = 0;                 ///< dots per inch, 0: unknown
-  float ydpi = 0;                 ///< the same
-  int inits = 0;                  ///< of the input service
-  int quits = 0;                  ///< the same
-  unsigned int initFlags = 0;     ///< of the last EventInit
-  unsigned int paused = 0;        ///< milliseconds that the test's thread spent in Delay
-  std::vector<Drawing> drawings;  ///< calls that nobody has taken
-  std::vector<LogLine> lines;     ///< the same of the log
-  std::deque<Event> fed;          ///< what PollEvent has not returned yet
+  bool records = true;         ///< false: drawings and log lines are dropped
+  int live = 1;                ///< what skia_live_widget_c() returns
+  int liveAsked = 0;           ///< how often it was asked
+  int nextHandle = 0;          ///< what drawing calls return
+  bool hasProperties = true;   ///< false: calls of properties fail, and leave alone what is given
+  float xdpi = 0;              ///< dots per inch, 0: unknown
+  float ydpi = 0;              ///< the same
+  int inits = 0;               ///< of the input service
+  int quits = 0;               ///< the same
+  unsigned int initFlags = 0;  ///< of the last EventInit
+  unsigned int paused = 0;     ///< milliseconds that the test's thread spent in Delay
+  std::vector<Drawing> drawings;                  ///< calls that nobody has taken
+  std::vector<LogLine> lines;                     ///< the same of the log
+  std::deque<Event> fed;                          ///< what PollEvent has not returned yet
   std::map<std::string, std::string> properties;  ///< the system properties
 
   // What brimol/host.h tells of.

@@ -2,6 +2,7 @@
 #include <MW/window.h>
 
 #include <algorithm>
+#include <cfloat>
 
 #include "core/bounded_text.h"
 #include "core/class_log.h"
@@ -42,6 +43,9 @@ constexpr int startOf(int a, int b, int initial) {
   if (initial >= b) return b;
   return initial <= a ? a : initial;
 }
+
+// What is cut off below tells wider numbers from those of the other machines.
+static_assert(FLT_EVAL_METHOD == 0, "build with -msse2 -mfpmath=sse");
 
 // Pixels for each step of the value; 0 where the knob cannot move.
 constexpr float pixelsPerStep(int travel, ValueRange range) {

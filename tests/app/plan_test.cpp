@@ -77,6 +77,17 @@ TEST(Plans, ThatArePrintedAreReadAgain) {
   EXPECT_NE(planHash(*read), planHash(plan));
 }
 
+TEST(Plans, TakeTheUsualLimitsWhereTheySayNone) {
+  Complaint complaint;
+  const auto plan = parsePlan(
+      R"({"version":1,"name":"x","steps":[{"test":"touch_grid"},{"test":"keys","limits":{}}]})",
+      kKnown, complaint);
+  ASSERT_TRUE(plan) << complaint.what;
+  EXPECT_EQ(plan->steps[0].limits.at("cells missed").most, 0);
+  EXPECT_EQ(plan->steps[0].timeout, usualStep("touch_grid").timeout);
+  EXPECT_TRUE(plan->steps[1].limits.empty());
+}
+
 TEST(Plans, HaveTheHashOfTheirText) {
   const std::string file = testing::TempDir() + "plan_hash.json";
   const Plan plan = {.name = "x", .steps = {{.test = "keys"}}};
@@ -120,7 +131,8 @@ TEST(Judge, FailsAPassByItsValues) {
   EXPECT_EQ(judged(Verdict::None, {lines, far}), Verdict::None);
   std::vector<Measure> values = {far};
   judge(Verdict::Fail, values, step);
-  EXPECT_EQ(wordsOf(values.front()), "worst distance 5.01 mm (at least 0, at most 5)");
+  EXPECT_EQ(values.front().least, 0);
+  EXPECT_EQ(values.front().most, 5);
 }
 
 struct RunCase {

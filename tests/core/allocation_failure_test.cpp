@@ -6,6 +6,8 @@
 #include <MW/primitives.h>
 #include <MW/static_text.h>
 
+#include <utils/AndroidThreads.h>
+
 #include <algorithm>
 
 #include "core/dispatch_thread.h"
@@ -122,6 +124,33 @@ TEST_F(WidgetTest, StartsOrSaysWhyNot) {
     EXPECT_EQ(platform().inits, platform().quits);
   }
   EXPECT_EQ(started, 1);
+}
+
+// The platform starts one thread of the two, or none.
+int startsLeft = 0;
+int startsOnly(android_thread_func_t entry, void* data, const char* name, int32_t priority,
+               std::size_t stackBytes, android_thread_id_t* id) {
+  if (startsLeft-- <= 0) return 0;
+  return androidCreateRawThreadEtc(entry, data, name, priority, stackBytes, id);
+}
+
+TEST_F(WidgetTest, AThreadThatDoesNotStartIsLoggedAndLeavesNothing) {
+  androidSetCreateThreadFunc(startsOnly);
+  for (const int starts : {0, 1}) {
+    platform().reset();
+    startsLeft = starts;
+    EXPECT_EQ(Window::init(), 0) << starts;
+    const auto lines = platform().takeLog();
+    const auto input = logLines(kError, {"[EVENTSERVICE] new func_eventLoop failed!!"});
+    EXPECT_EQ(std::ranges::count(lines, input[0]), starts == 0 ? 1 : 0);
+    const auto window = logLines(kError, {"[WINDOW] init->func_dispatchEvent failed!!"});
+    EXPECT_EQ(std::ranges::count(lines, window[0]), 1);
+    Window::destroy();
+    EXPECT_EQ(platform().inits, platform().quits);
+  }
+  androidSetCreateThreadFunc(androidCreateRawThreadEtc);
+  EXPECT_EQ(Window::init(), 1);
+  Window::destroy();
 }
 
 }  // namespace

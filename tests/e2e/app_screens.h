@@ -21,8 +21,8 @@ struct MenuRow {
   int entriesAbove;
 };
 inline constexpr MenuRow kColours = {1, 0};
-inline constexpr MenuRow kTouch = {2, 2};
-inline constexpr MenuRow kKeys = {2, 3};
+inline constexpr MenuRow kTouch = {2, 4};
+inline constexpr MenuRow kKeys = {2, 5};
 
 constexpr SKIA_Rect areaOf(const MenuRow& row) {
   constexpr int kListTop = MW::MainList::kTitleHeight;

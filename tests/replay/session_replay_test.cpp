@@ -17,6 +17,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
+constexpr int kQuietRounds = 2;
 constexpr int kNotAllPassed = 4;  // the exit code of a factory test that was left early
 
 class SessionReplay : public testing::Test {
@@ -58,11 +59,11 @@ class SessionReplay : public testing::Test {
 TEST_F(SessionReplay, IsTheSameTenMinutesEveryTime) {
   std::string first;
   std::string firstResults;
-  for (int round = 0; round < QUIET_ROUNDS + 1; ++round) {
+  for (int round = 0; round < kQuietRounds + 1; ++round) {
     std::optional<BusyCore> busy;
     std::optional<BusyCore> busier;
-    if (round >= QUIET_ROUNDS - 1) busy.emplace();
-    if (round == QUIET_ROUNDS) busier.emplace();
+    if (round >= kQuietRounds - 1) busy.emplace();
+    if (round == kQuietRounds) busier.emplace();
     ASSERT_EQ(play(TRACES "ten_minutes.trace",
                    {{"BRIMOL_REPORT_DIR", report}, {"BRIMOL_REPORT_PICTURES", "none"}}),
               kNotAllPassed)
@@ -136,7 +137,7 @@ TEST_F(SessionReplay, PlaysWhatAUserDidInAWindow) {
   EXPECT_NE(text.find("\nscreen 720x1280\ndensity 312.5\n"), std::string::npos);
   EXPECT_NE(text.find(" long 0 "), std::string::npos);
   EXPECT_NE(text.find(" end\n"), std::string::npos);
-  for (int round = 0; round < 5 * QUIET_ROUNDS; ++round) {
+  for (int round = 0; round < 5 * kQuietRounds; ++round) {
     ASSERT_EQ(play(trace), kNotAllPassed) << readAll(folder / "stderr");
     EXPECT_EQ(readAll(results), recorded);
   }

@@ -19,13 +19,13 @@ namespace fs = std::filesystem;
 class Program : public InFolder {
  protected:
   // Its exit code; what it says is in `said`. The word APP stands for the application.
-  int replay(const std::string& arguments) {
+  int replay(const std::string& arguments, const std::string& before = "") {
     std::string words = arguments;
     if (const auto place = words.find("APP"); place != std::string::npos) {
       words.replace(place, 3, kFakeApplication);
     }
     const std::string command =
-        "cd " + folder.native() + " && exec " + kReplayProgram + " " + words + " >said.txt 2>&1";
+        "cd " + folder.native() + " && " + before + " exec " + kReplayProgram + " " + words + " >said.txt 2>&1";
     const int status = std::system(command.c_str());
     said = bytesOf(folder / "said.txt");
     return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
@@ -143,10 +143,23 @@ TEST_F(Program, ComparesWithAnEarlierRun) {
   EXPECT_EQ(replay("--dir first --against first menu.trace -- APP pass"), 2);
 }
 
+TEST_F(Program, KeepsAnEarlierReportWhereTheDiskIsFull) {
+  EXPECT_EQ(replay("--dir d --report r.html menu.trace -- APP pass"), 0);
+  const std::string before = bytesOf(folder / "r.html");
+  const std::string full = "trap '' XFSZ; ulimit -f 8;";  // no file grows beyond 4 KiB
+  EXPECT_EQ(replay("--dir d --report r.html menu.trace -- APP pass", full), 2);
+  EXPECT_THAT(said, HasSubstr("r.html: cannot be written"));
+  EXPECT_EQ(bytesOf(folder / "r.html"), before);
+  EXPECT_FALSE(fs::exists(folder / "r.html.tmp"));
+}
+
 TEST_F(Program, RepeatsWhatItPacked) {
   EXPECT_EQ(replay("--bundle b.tgz --screen 480x800 menu.trace -- APP pass"), 0) << said;
   fs::remove(trace);
-  EXPECT_EQ(replay("--dir d --from-bundle b.tgz -- APP"), 0) << said;
+  EXPECT_EQ(replay("--dir d --from-bundle b.tgz -- APP"), 2) << "arguments that nobody saw";
+  EXPECT_THAT(said, HasSubstr("with the arguments pass: give"));
+  fs::remove_all(folder / "d");
+  EXPECT_EQ(replay("--dir d --packed-arguments --from-bundle b.tgz -- APP"), 0) << said;
   EXPECT_THAT(bytesOf(folder / "d/session.jsonl"), HasSubstr(R"("BRIMOL_SCREEN":"480x800")"));
   EXPECT_EQ(replay("--dir d --from-bundle b.tgz -- APP pass-otherwise"), 1);
   EXPECT_THAT(said, HasSubstr("1 frame differs"));

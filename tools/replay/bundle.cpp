@@ -100,7 +100,8 @@ bool isFit(archive_entry* entry) {
 
 // False: it cannot be written.
 bool copyData(archive* reader, const fs::path& file, int64_t& left) {
-  fs::create_directories(file.parent_path());
+  std::error_code failure;
+  fs::create_directories(file.parent_path(), failure);
   std::ofstream stream(file, std::ios::binary);
   std::array<char, 1 << 16> bytes{};
   for (;;) {

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "album.h"
 #include "picture.h"
 
 namespace brimol::replay {
@@ -90,8 +91,8 @@ std::vector<FramePair> pairsOf(const Frames& here, const Frames& there) {
 
 void comparePictures(const PlayedRun& here, const PlayedRun& there, bool isShown, FramePair& pair) {
   const auto bytes = [](const PlayedRun& run, std::size_t frame) {
-    const std::string& picture = run.session.frames[frame].picture;
-    return picture.empty() ? std::string() : bytesOf(run.folder / picture);
+    const auto file = fileOf(run.folder, run.session.frames[frame].picture);
+    return file ? bytesOf(*file) : std::string();
   };
   const std::string mine = bytes(here, pair.here);
   const std::string theirs = bytes(there, pair.there);

@@ -64,6 +64,11 @@ bool setDevice(Options& options, std::string_view value) {
   return !value.empty();
 }
 
+bool setTakesArguments(Options& options, std::string_view) {
+  options.takesArguments = true;
+  return true;
+}
+
 bool setLint(Options& options, std::string_view) {
   options.lints = true;
   return true;
@@ -86,6 +91,8 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      setFile<&Options::bundle>},
     {"--from-bundle", "FILE", "replay what was packed, and compare with what was packed",
      setFile<&Options::fromBundle>},
+    {"--packed-arguments", "", "give the application the arguments that the bundle says",
+     setTakesArguments},
     {"--against", "DIR", "compare with the run in DIR; a difference is a failure",
      setFile<&Options::against>},
     {"--screen", "WIDTHxHEIGHT", "the screen's size in pixels", setScreen},
@@ -146,6 +153,9 @@ std::string whatIsWrong(const Options& options) {
   if (!options.fromBundle.empty() && !options.against.empty()) {
     return "a bundle is compared with what was packed: --against does not go with --from-bundle";
   }
+  if (options.takesArguments && (options.fromBundle.empty() || options.command.size() > 1)) {
+    return "--packed-arguments goes with --from-bundle and an APP without arguments alone";
+  }
   if (options.command.empty() || options.command.front().empty()) {
     return "which application? Give -- APP ARGS behind the trace, see --help";
   }
@@ -200,8 +210,7 @@ std::string usage() {
       "Usage: brimol-replay [OPTION]... TRACE -- APP [ARGUMENT]...\n"
       "       brimol-replay [OPTION]... --from-bundle FILE -- APP [ARGUMENT]...\n"
       "Runs an application under a trace, without a window, and writes a report of the session.\n"
-      "With a bundle and no ARGUMENT, the application is given those of the run that was "
-      "packed.\n\n"
+      "An application that was packed with arguments wants its own, or --packed-arguments.\n\n"
       "Options:\n";
   for (const OptionRow& row : kOptions) {
     std::string name(row.name);

@@ -27,6 +27,7 @@ struct Options {
   std::string device = {};              // a name
   std::filesystem::path accepted = {};  // findings of the lint
   bool lints = false;
+  bool takesArguments = false;            // the bundle's
   std::chrono::seconds timeout{60};       // 0: none
   int exitCode = 0;                       // with which the application is to end
   std::vector<std::string> command = {};  // the application and its arguments

@@ -85,9 +85,15 @@ bool takeFromBundle(Plan& plan, std::string& error) {
   if (!unpacked) return false;
   options.trace = unpacked->record.trace;
   options.against = unpacked->run;
-  const auto& packed = unpacked->record.command;
-  if (options.command.size() == 1) {
-    options.command.insert(options.command.end(), packed.begin() + 1, packed.end());
+  const std::vector<std::string> packed(unpacked->record.command.begin() + 1,
+                                        unpacked->record.command.end());
+  if (options.takesArguments) {
+    options.command.insert(options.command.end(), packed.begin(), packed.end());
+  } else if (options.command.size() == 1 && !packed.empty()) {
+    // Arguments may make an application write files or run programs.
+    error = options.fromBundle.native() + ": was packed with the arguments " + commandText(packed) +
+            ": give them behind the application, or --packed-arguments";
+    return false;
   }
   plan.record.environment = unpacked->record.environment;
   return true;
@@ -142,10 +148,26 @@ Launch launchOf(const Plan& plan) {
   return launch;
 }
 
-bool writeFile(const fs::path& file, const std::string& text, std::string& error) {
+bool writeBytes(const fs::path& file, const std::string& text) {
   std::ofstream stream(file, std::ios::binary);
   stream << text;
-  if (stream.flush()) return true;
+  stream.close();
+  return stream.good();
+}
+
+// Whole, or what was there stays. A device does not give way to a file.
+bool writeFile(const fs::path& file, const std::string& text, std::string& error) {
+  std::error_code failure;
+  const fs::path target = fs::weakly_canonical(file, failure);
+  if (fs::is_regular_file(target, failure) || !fs::exists(target, failure)) {
+    const fs::path temporary = fs::path(target).concat(".tmp");
+    const bool isWhole = writeBytes(temporary, text);
+    if (isWhole) fs::rename(temporary, target, failure);
+    if (isWhole && !failure) return true;
+    fs::remove(temporary, failure);
+  } else if (writeBytes(target, text)) {
+    return true;
+  }
   error = file.native() + ": cannot be written";
   return false;
 }
@@ -174,8 +196,8 @@ Outcome runAndJudge(const Plan& plan) {
     outcome.comparison = compare(outcome.run, *outcome.other, kMostPairs);
   }
   const Session& session = outcome.run.session;
-  outcome.judgement = judge(session, outcome.end, outcome.comparison.differences,
-                            plan.options.exitCode);
+  outcome.judgement =
+      judge(session, outcome.end, outcome.comparison.differences, plan.options.exitCode);
   if (plan.options.lints) {
     outcome.judgement = judgeLayout(outcome.judgement, session, plan.accepted);
   }

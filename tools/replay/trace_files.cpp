@@ -65,7 +65,12 @@ std::optional<TraceFiles> traceFiles(const fs::path& trace, std::string& error) 
       error = file.native() + ": cannot be read";
       return {};
     }
-    for (std::string line; std::getline(stream, line);) {
+    std::string line;
+    if (!std::getline(stream, line) || !line.starts_with("brimol-trace")) {
+      error = file.native() + ": is not a trace";
+      return {};
+    }
+    while (std::getline(stream, line)) {
       const auto name = includedBy(line);
       if (!name) continue;
       const fs::path included = (file.parent_path() / *name).lexically_normal();

@@ -3,14 +3,17 @@
 #include <MW/screen.h>
 #include <MW/window.h>
 
+#include <algorithm>
 #include <atomic>
 #include <memory>
 #include <optional>
+#include <vector>
 
 #include "current.h"
 #include "on_top.h"
 #include "page_test.h"
 #include "pages/table.h"
+#include "plan/catalog.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -27,6 +30,10 @@ class ColourTest : public LookTest {
       : LookTest("Colours", "Say what you saw: pixels and places\nthat differ are a fault.") {}
 
   bool isComplete() const override { return shown >= kColours - 1; }
+
+  std::vector<Measure> values() const override {
+    return {measured("colours", "colours confirmed", std::min(shown + 1, kColours))};
+  }
 
  protected:
   void beginLook() override {

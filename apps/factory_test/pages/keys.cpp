@@ -8,11 +8,15 @@
 #include <atomic>
 #include <memory>
 #include <optional>
+#include <string>
+#include <vector>
 
 #include "current.h"
+#include "key_bounce.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
+#include "plan/catalog.h"
 #include "verdict_bar.h"
 
 namespace factory_test {
@@ -41,6 +45,7 @@ constexpr auto kAsked = std::to_array<KeyName>({
     {kTwice, "Twice"},
     {kThreeTimes, "Three times"},
 });
+constexpr auto kKeys = static_cast<std::ptrdiff_t>(kAsked.size()) - 2;
 
 /// All that was asked for passes by itself. The back key three times in a row fails.
 class KeyTest : public PageTest {
@@ -52,7 +57,12 @@ class KeyTest : public PageTest {
   void enter() override {
     page.ask(VerdictBar::Keys::Free);
     key.emplace();
-    key->keyPressCallback = [](MW::kbd_event* event) { Current<KeyTest>::get().mark(event->code); };
+    key->keyPressCallback = [](MW::kbd_event* event) {
+      Current<KeyTest>::get().press(event->code);
+    };
+    key->keyReleaseCallback = [](MW::kbd_event* event) {
+      Current<KeyTest>::get().bounce.release(event->code, GetTicks());
+    };
     key->doubleKeyCallback = [](MW::kbd_event*) { Current<KeyTest>::get().mark(kTwice); };
     key->tripleKeyCallback = [](MW::kbd_event* event) {
       if (event->code == kKeyBack) Current<KeyTest>::get().failed = true;
@@ -79,7 +89,22 @@ class KeyTest : public PageTest {
     for (std::size_t i = 0; i < kAsked.size(); ++i) drawKey(static_cast<int>(i), pressed.at(i));
   }
 
+  std::vector<Measure> values() const override {
+    const auto seen = std::count(pressed.begin(), pressed.begin() + kKeys, true);
+    return {measured("keys", "keys seen", static_cast<double>(seen)),
+            measured("keys", "bounces", bounce.count()),
+            measured("keys", "longest bounce", bounce.longestMs())};
+  }
+
  private:
+  void press(unsigned int code) {
+    const int before = bounce.count();
+    bounce.press(code, GetTicks());
+    mark(code);
+    if (bounce.count() == before) return;
+    page.say(("Bounce, " + std::to_string(bounce.longestMs()) + " ms at most").c_str());
+  }
+
   void mark(unsigned int code) {
     const auto* const row = std::ranges::find(kAsked, code, &KeyName::code);
     if (row == kAsked.end()) return;
@@ -90,14 +115,17 @@ class KeyTest : public PageTest {
   static void drawKey(int index, bool isPressed) {
     const ScreenSize screen = screenSize();
     const Grid grid = isLandscape(screen) ? Grid{3, 4} : Grid{4, 3};
+    const std::string words =
+        std::string(kAsked.at(static_cast<std::size_t>(index)).name) + (isPressed ? "\nOK" : "");
     const Ink ink = isPressed ? kPassInk : kButtonInk;
     skia_add_textbox_c(inColor(cellOf(contentArea(), gapOf(screen), grid, index), ink.ground),
-                       captionOf(kAsked.at(static_cast<std::size_t>(index)).name, ink.text));
+                       captionOf(words.c_str(), ink.text));
   }
 
   Current<KeyTest> current{this};
   std::atomic<bool> failed = false;
   std::array<std::atomic<bool>, kAsked.size()> pressed = {};
+  KeyBounce bounce;  // told on the dispatch thread
   std::optional<MW::Key> key;
 };
 

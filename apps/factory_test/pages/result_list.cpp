@@ -35,8 +35,8 @@ enum class Details { Shown, LeftOut };
 
 // The last column is the widest: names stand there.
 std::string wordsOf(const TestEntry& entry, const TestResult& result, Details details) {
-  const std::string words = lineOf(kTest, verdictName(result.verdict),
-                                   std::to_string(result.duration.count()) + " ms", entry.name);
+  std::string words = lineOf(kTest, verdictName(result.verdict),
+                             std::to_string(result.duration.count()) + " ms", entry.name);
   if (details == Details::LeftOut) return words;
   const std::string started = utcText(result.started);
   constexpr std::size_t kDateBytes = 10;

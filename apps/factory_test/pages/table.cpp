@@ -12,11 +12,19 @@ using enum DefaultPlan;
 
 constexpr auto kEntries = std::to_array<TestEntry>({
     {Display, "colours", "Display colours", makeColours, In},
-    {Display, "brightness", "Brightness", makeBrightness, In},
+    {Display, "dead_pixels", "Dead pixels", makeDeadPixels, In},
+    {Display, "backlight", "Backlight", makeBacklight, In},
+    {Display, "brightness", "Brightness", makeBrightness, Out},
 
-    {Input, "touch", "Touch panel", makeTouch, In},
+    {Input, "touch", "Touch panel", makeTouch, Out},
     {Input, "keys", "Keys", makeKeys, In},
-    {Input, "pad", "Multi-touch pad", makePad, In},
+    {Input, "stuck_touch", "Stuck touch", makeStuckTouch, In},
+    {Input, "touch_grid", "Touch grid", makeTouchGrid, In},
+    {Input, "touch_lines", "Touch accuracy", makeTouchLines, In},
+    {Input, "touch_trails", "Touch trails", makeTouchTrails, In},
+    {Input, "touch_rate", "Touch rate", makeTouchRate, In},
+    {Input, "pinch", "Pinch", makePinch, In},
+    {Input, "pad", "Multi-touch pad", makePad, Out},
 
     {Reports, "log", "Log", makeLogView, Out},
     {Reports, "result_list", "Results", makeResultList, Out},

@@ -35,9 +35,11 @@ std::span<const TestEntry> testEntries();
 std::size_t placeOf(std::string_view id);
 
 // Each in the file of its name.
+MakeTest makeBacklight;
 MakeTest makeBrightness;
 MakeTest makeButtons;
 MakeTest makeColours;
+MakeTest makeDeadPixels;
 MakeTest makeDescriptors;
 MakeTest makeExitSlides;
 MakeTest makeFreeForm;
@@ -46,14 +48,20 @@ MakeTest makeKeys;
 MakeTest makeListChoice;
 MakeTest makeLogView;
 MakeTest makePad;
+MakeTest makePinch;
 MakeTest makePrompts;
 MakeTest makeResultList;
 MakeTest makeShell;
 MakeTest makeSixChoice;
+MakeTest makeStuckTouch;
 MakeTest makeStyles;
 MakeTest makeSwitches;
 MakeTest makeTimed;
 MakeTest makeTouch;
+MakeTest makeTouchGrid;
+MakeTest makeTouchLines;
+MakeTest makeTouchRate;
+MakeTest makeTouchTrails;
 MakeTest makeWarnings;
 
 }  // namespace factory_test

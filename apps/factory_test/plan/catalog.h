@@ -39,7 +39,7 @@ struct TestKind {
 
 const TestKind& testKind(std::string_view test);
 
-/// A value of the catalogue as the test delivers it; what is not finite becomes 0.
+/// A value of the catalogue as the test delivers it, to a hundredth; what is not finite becomes 0.
 Measure measured(std::string_view test, std::string_view name, double value);
 
 }  // namespace factory_test

@@ -17,13 +17,13 @@ constexpr std::size_t kDeepest = 16;
 class LineCount {
  public:
   void pass(char passed) {
-    if (isAtEnd) ++line_;
+    if (isAtEnd) ++lastLine;
     isAtEnd = passed == '\n';
   }
-  int line() const { return line_; }
+  int line() const { return lastLine; }
 
  private:
-  int line_ = 1;
+  int lastLine = 1;
   bool isAtEnd = false;  // the last character ended its line
 };
 
@@ -75,7 +75,7 @@ class TreeBuilder {
   bool string(std::string& value) {
     return add({.kind = JsonNode::Kind::Text, .text = std::move(value)});
   }
-  bool binary(json::binary_t&) { return false; }  // JSON has none
+  static bool binary(json::binary_t&) { return false; }  // JSON has none
   bool start_object(std::size_t) { return open(JsonNode::Kind::Object); }
   bool start_array(std::size_t) { return open(JsonNode::Kind::List); }
   bool end_object() { return close(); }

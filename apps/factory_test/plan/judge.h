@@ -12,7 +12,4 @@ namespace factory_test {
 /// value outside its limits, or with one missing that has limits, is a FAIL. Other verdicts stay.
 Verdict judge(Verdict given, std::vector<Measure>& values, const PlanStep& step);
 
-/// The value as the operator reads it: "worst distance 3.2 mm (at most 5)".
-std::string wordsOf(const Measure& measure);
-
 }  // namespace factory_test

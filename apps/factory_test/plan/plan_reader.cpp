@@ -268,6 +268,9 @@ bool readSteps(const JsonNode& node, Plan& plan, const Reading& reading) {
     if (plan.find(step.test) != nullptr) {
       return reading.refuse(item, "the test " + inQuotes(step.test) + " is there twice");
     }
+    const PlanStep usual = usualStep(step.test);
+    if (memberOf(item, "limits") == nullptr) step.limits = usual.limits;
+    if (memberOf(item, "timeout_s") == nullptr) step.timeout = usual.timeout;
     plan.steps.push_back(std::move(step));
   }
   return true;

@@ -99,11 +99,21 @@ struct TraceStep {
   Action action;
 };
 
+struct ItemChange {
+  std::size_t number;
+  std::string item;
+  friend bool operator==(const ItemChange&, const ItemChange&) = default;
+};
+
+/// A frame as it differs from the one before: a trace that says "65536 items" a thousand times does
+/// not take up what these would.
 struct RecordedFrame {
   TraceLine line;
   uint64_t time = 0;
   uint64_t hash = 0;
-  std::vector<std::string> items;  // empty texts where they are not known
+  std::size_t count = 0;              // of its items
+  std::vector<ItemChange> changes{};  // of the items of the frame before
+  bool isForgotten = false;           // what its items are is not known
 };
 
 struct Trace {
@@ -116,5 +126,8 @@ struct Trace {
   std::vector<TraceStep> steps;
   std::vector<RecordedFrame> frames;
 };
+
+/// The items of a recorded frame; empty texts where they are not known.
+std::vector<std::string> itemsOf(const Trace& trace, std::size_t frame);
 
 }  // namespace brimol::pc

@@ -101,13 +101,16 @@ void TraceRunner::planTouch(const Touch& touch, ScreenPoint place, ScreenPoint t
   switch (touch.kind) {
     case Touch::Kind::Press: return plan(now, press);
     case Touch::Kind::Release: return plan(now, release);
-    case Touch::Kind::Move: return planMove(finger, from, place, now, touch.duration);
-    case Touch::Kind::MoveBy:
-      return planMove(finger, from, {from.x + place.x, from.y + place.y}, now, touch.duration);
+    case Touch::Kind::Move:
+      return planned.push_back(moveStep({finger, from, place, now, touch.duration}, 1));
+    case Touch::Kind::MoveBy: {
+      const ScreenPoint by = {from.x + place.x, from.y + place.y};
+      return planned.push_back(moveStep({finger, from, by, now, touch.duration}, 1));
+    }
     case Touch::Kind::Tap: break;
     case Touch::Kind::Drag: {
       plan(now, press);
-      planMove(finger, place, to, now, touch.duration);
+      planned.push_back(moveStep({finger, place, to, now, touch.duration}, 1));
       return plan(end, release);
     }
   }
@@ -115,17 +118,20 @@ void TraceRunner::planTouch(const Touch& touch, ScreenPoint place, ScreenPoint t
   plan(end, release);
 }
 
-void TraceRunner::planMove(int finger, ScreenPoint from, ScreenPoint to, uint64_t start,
-                           uint32_t duration) {
-  const int steps = static_cast<int>(std::max(duration / kMoveStepMs, 1U));
-  for (int i = 1; i <= steps; ++i) {
-    const auto between = [i, steps](int begin, int end) {
-      return begin + static_cast<int>(int64_t{end - begin} * i / steps);
-    };
-    const ScreenPoint place = {between(from.x, to.x), between(from.y, to.y)};
-    plan(start + uint64_t{duration} * static_cast<uint64_t>(i) / static_cast<uint64_t>(steps),
-         [this, finger, place](uint64_t) { fingers.move(finger, place); });
-  }
+// One step plans the next, since a move may take a day.
+TraceRunner::Planned TraceRunner::moveStep(const Motion& motion, int number) {
+  const int steps = static_cast<int>(std::max(motion.duration / kMoveStepMs, 1U));
+  const auto share = [number, steps](int64_t whole) { return whole * number / steps; };
+  const auto between = [&](int begin, int end) {
+    return begin + static_cast<int>(share(int64_t{end} - begin));
+  };
+  const ScreenPoint place = {between(motion.from.x, motion.to.x),
+                             between(motion.from.y, motion.to.y)};
+  return {motion.start + static_cast<uint64_t>(share(motion.duration)),
+          [this, motion, number, place, steps](uint64_t) {
+            fingers.move(motion.finger, place);
+            if (number < steps) planned.push_front(moveStep(motion, number + 1));
+          }};
 }
 
 TraceRunner::Outcome TraceRunner::attempt(const KeyStroke& stroke, uint64_t now) {

@@ -94,7 +94,7 @@ class TraceParser {
   const TraceFiles& files;
   std::vector<OpenFile> open;  // each is included by the one before
   int filesRead = 0;
-  bool hasItems = false;  // of the newest frame
+  std::vector<std::string> items;  // of the newest frame
   bool hasEnd = false;
   std::string lastLine;
 };
@@ -170,38 +170,36 @@ void TraceParser::readLine(const TraceLine& line) {
 void TraceParser::readItem(const TraceLine& line) {
   std::string_view rest = trimmed(std::string_view(line.text).substr(1));
   if (trace.frames.empty()) throw BadLine{"an item without a frame above"};
-  std::vector<std::string>& items = trace.frames.back().items;
   TraceWords number(rest.substr(0, rest.find(' ')));
   const uint64_t place = number.number("an item's number", kMostItems);
   if (place >= items.size()) throw BadLine{"the frame above has not so many items"};
   items[place] = trimmed(rest.substr(std::min(rest.find(' '), rest.size())));
-  hasItems = true;
+  trace.frames.back().changes.push_back({place, items[place]});
 }
 
 // Settled with the first line behind its items. A damaged recording shows here.
 void TraceParser::endFrame() {
   if (trace.frames.empty()) return;
   RecordedFrame& frame = trace.frames.back();
-  const bool isWhole = hashOf(frame.items) == frame.hash;
+  const bool isWhole = hashOf(items) == frame.hash;
   if (!isWhole && trace.isRecording) {
     throw BadLine{"the frame at line " + std::to_string(frame.line.number) +
                   " does not have the items that its hash says"};
   }
-  if (!isWhole && !hasItems) std::ranges::fill(frame.items, std::string());
+  frame.isForgotten = !isWhole && frame.changes.empty();
+  if (frame.isForgotten) std::ranges::fill(items, std::string());
 }
 
 void TraceParser::readFrame(const TraceLine& line, TraceWords& words, uint64_t time) {
-  RecordedFrame frame = {line, time, 0, {}};
+  RecordedFrame frame = {.line = line, .time = time};
   frame.hash = words.hexadecimal("a hash of 16 digits", kHashDigits);
-  const uint64_t count = words.number("a number of items", kMostItems);
+  frame.count = words.number("a number of items", kMostItems);
   words.expectEnd();
-  if (!trace.frames.empty()) {
-    if (time < trace.frames.back().time) throw BadLine{"a frame before the one above"};
-    frame.items = trace.frames.back().items;
+  if (!trace.frames.empty() && time < trace.frames.back().time) {
+    throw BadLine{"a frame before the one above"};
   }
-  frame.items.resize(count);
+  items.resize(frame.count);
   trace.frames.push_back(std::move(frame));
-  hasItems = false;
 }
 
 // What is about the trace, and no step.
@@ -286,6 +284,17 @@ std::string TraceParser::finish() {
 
 }  // namespace
 
+std::vector<std::string> itemsOf(const Trace& trace, std::size_t frame) {
+  std::vector<std::string> items;
+  for (std::size_t i = 0; i <= frame; ++i) {
+    const RecordedFrame& each = trace.frames.at(i);
+    items.resize(each.count);
+    for (const ItemChange& change : each.changes) items.at(change.number) = change.item;
+    if (each.isForgotten) std::ranges::fill(items, std::string());
+  }
+  return items;
+}
+
 ParsedTrace parseTrace(const std::string& path, const TraceFiles& files) {
   ParsedTrace parsed;
   TraceParser parser(parsed.trace, files);
@@ -294,9 +303,11 @@ ParsedTrace parseTrace(const std::string& path, const TraceFiles& files) {
 }
 
 ParsedTrace parseTrace(const std::string& path) {
-  return parseTrace(path, [](const std::string& file) -> std::optional<std::string> {
+  return parseTrace(path, [&path](const std::string& file) -> std::optional<std::string> {
     std::error_code failure;
     if (std::filesystem::is_directory(file, failure)) return std::nullopt;
+    // A device or a pipe may have no end: the user can name one, a trace cannot.
+    if (file != path && !std::filesystem::is_regular_file(file, failure)) return std::nullopt;
     std::ifstream in(file, std::ios::binary);
     std::ostringstream bytes;
     if (!in || (in.peek() != EOF && !(bytes << in.rdbuf()))) return std::nullopt;

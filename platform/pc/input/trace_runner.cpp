@@ -188,7 +188,7 @@ void TraceRunner::compareFrame(uint64_t now, const std::vector<std::string>& ite
   fail(recorded.line, "frame " + std::to_string(number + 1) +
                           (isSame ? " came at another time: " : " differs: ") + "recorded at " +
                           std::to_string(recorded.time) + " ms, played at " + std::to_string(now) +
-                          " ms\n" + differenceOf(recorded.items, items));
+                          " ms\n" + differenceOf(itemsOf(trace, number), items));
 }
 
 void TraceRunner::missFrames(uint64_t now) {
@@ -196,7 +196,7 @@ void TraceRunner::missFrames(uint64_t now) {
   const RecordedFrame& missed = trace.frames[frames];
   fail(missed.line, "frame " + std::to_string(frames + 1) + " did not come, recorded at " +
                         std::to_string(missed.time) + " ms\n" +
-                        differenceOf(missed.items, textOfFrame(newest)));
+                        differenceOf(itemsOf(trace, frames), textOfFrame(newest)));
 }
 
 std::string differenceOf(const std::vector<std::string>& recorded,

@@ -65,6 +65,13 @@ class TraceRunner {
     uint64_t time;
     std::function<void(uint64_t now)> action;
   };
+  struct Motion {
+    int finger;
+    ScreenPoint from;
+    ScreenPoint to;
+    uint64_t start;
+    uint32_t duration;
+  };
 
   const TraceStep& step() const { return trace.steps[next]; }
   std::optional<uint64_t> startOfStep() const;
@@ -90,7 +97,7 @@ class TraceRunner {
   Outcome lookAgainUntil(uint64_t deadline, uint64_t now, const std::string& why);
   std::optional<ScreenPoint> find(const Place& place, std::string& why) const;
   void planTouch(const Touch& touch, ScreenPoint place, ScreenPoint to, uint64_t now);
-  void planMove(int finger, ScreenPoint from, ScreenPoint to, uint64_t start, uint32_t duration);
+  Planned moveStep(const Motion& motion, int number);
   std::string whyNot(const Look& look);
   void compareFrame(uint64_t now, const std::vector<std::string>& items);
   void missFrames(uint64_t now);

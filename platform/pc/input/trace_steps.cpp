@@ -4,6 +4,7 @@
 #include <array>
 #include <chrono>
 #include <ctime>
+#include <filesystem>
 #include <limits>
 #include <string_view>
 #include <utility>
@@ -147,9 +148,16 @@ TraceStep::Action readWait(TraceWords& words) {
       static_cast<uint32_t>(words.number("'until', or a number of milliseconds", kMostMs))};
 }
 
+// A trace writes pictures below the session's folder, and nothing else.
 TraceStep::Action readShot(TraceWords& words) {
   Shot shot{words.isTextNext() ? words.text("a file") : words.word("a file")};
-  if (shot.file.empty()) throw BadLine{"a picture needs a file name"};
+  const std::filesystem::path path(shot.file);
+  if (path.extension() != ".png" || shot.file.find('\0') != std::string::npos) {
+    throw BadLine{"a picture needs a file name that ends in .png"};
+  }
+  if (path.is_absolute() || std::ranges::count(path, "..") != 0) {
+    throw BadLine{"'" + shot.file + "' does not lie below the session's folder"};
+  }
   return shot;
 }
 

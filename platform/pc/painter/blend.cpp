@@ -13,7 +13,7 @@ constexpr std::size_t kPixelBytes = sizeof(uint32_t);
 static_assert(overFull(kFull * kFull + kHalf) == kFull);
 static_assert(overFull(127 + kHalf) == 0 && overFull(128 + kHalf) == 1);
 
-inline uint8_t laidOver(uint8_t old, uint16_t keep, uint16_t add) {
+inline uint8_t byteOver(uint8_t old, uint16_t keep, uint16_t add) {
   return overFull(static_cast<uint16_t>(old * keep + add));
 }
 
@@ -38,11 +38,11 @@ void layOver(uint8_t* bytes, std::size_t count, const Overlay& overlay) {
   std::size_t at = 0;
   for (; at + Overlay::kBytes <= count; at += Overlay::kBytes) {
     for (std::size_t i = 0; i < Overlay::kBytes; ++i) {
-      bytes[at + i] = laidOver(bytes[at + i], constants.keep, constants.add[i]);
+      bytes[at + i] = byteOver(bytes[at + i], constants.keep, constants.add[i]);
     }
   }
   for (std::size_t i = 0; at < count; ++at, ++i) {
-    bytes[at] = laidOver(bytes[at], constants.keep, constants.add[i]);
+    bytes[at] = byteOver(bytes[at], constants.keep, constants.add[i]);
   }
 }
 

@@ -83,6 +83,9 @@ INSTANTIATE_TEST_SUITE_P(
         WrongLine{"wait until", "'text' is missing"}, WrongLine{"wait -5", "'-5' is not"},
         WrongLine{"+x tap 1 2", "'x' is not a time"},
         WrongLine{"99999999999999 tap 1 2", "a time, 0 to"},
+        WrongLine{"shot /tmp/a.png", "does not lie below"},
+        WrongLine{"shot a/../../b.png", "does not lie below"},
+        WrongLine{"shot \"Makefile\"", "ends in .png"},
         WrongLine{"world time yesterday", "is not a time as"},
         WrongLine{"world time 2026-02-30T10:00:00Z", "is not a time as"},
         WrongLine{"world figure load \"1\"", "the figure's name in quotes"},
@@ -193,7 +196,7 @@ TEST(Recording, IsReadAsItWasWritten) {
   EXPECT_EQ(trace.cutAt, "");
   ASSERT_EQ(trace.frames.size(), 3U);
   EXPECT_EQ(trace.frames[1].time, 7U);
-  EXPECT_EQ(trace.frames[1].items,
+  EXPECT_EQ(itemsOf(trace, 1),
             textOfFrame({itemAt(1, "one"), itemAt(3, "three"), itemAt(4, "")}));
   ASSERT_EQ(trace.steps.size(), 8U);
   const Event& motion = std::get<RawRecord>(trace.steps[3].action).record;
@@ -212,7 +215,7 @@ TEST(Recording, IsPlayedUpToWhereItWasCutOrRefusedWithItsLine) {
       continue;
     }
     const auto isSameFrame = [](const RecordedFrame& one, const RecordedFrame& other) {
-      return one.time == other.time && one.hash == other.hash && one.items == other.items;
+      return one.time == other.time && one.hash == other.hash && one.changes == other.changes;
     };
     const auto isSameStep = [](const TraceStep& one, const TraceStep& other) {
       return one.line.text == other.line.text;

@@ -2,7 +2,6 @@
 #include "remote/browser_display.h"
 
 #include <gmock/gmock.h>
-#include <malloc.h>
 
 #include <algorithm>
 #include <array>
@@ -17,15 +16,12 @@
 #include "pc/remote/vnc_viewer.h"
 #include "pc/support/record_text.h"
 #include "scene/cairo_handles.h"
-
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-// The sanitizers' own allocator does not count for mallinfo2(), and GCC has no header for this.
-extern "C" std::size_t __sanitizer_get_current_allocated_bytes();
-#endif
+#include "support/allocated_bytes.h"
 
 namespace brimol::pc {
 namespace {
 
+using test::allocatedBytes;
 using test::rawConnection;
 using test::readLine;
 using test::VncViewer;
@@ -35,14 +31,6 @@ using namespace std::string_literals;
 constexpr Size kScreen = {400, 400};
 constexpr uint32_t kBlue = 0x0000FF;
 constexpr uint32_t kOrange = 0xFF8000;
-
-std::size_t allocatedBytes() {
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-  return __sanitizer_get_current_allocated_bytes();
-#else
-  return mallinfo2().uordblks;
-#endif
-}
 
 class ServedScreen : public testing::Test {
  protected:
@@ -193,6 +181,19 @@ TEST_F(ServedScreen, BearsBrokenViewers) {
   broken.clear();
   while (readLine(rawConnection(vncPort, "")) != "RFB 003.008\n") {  // until there is room again
   }
+}
+
+// A connection has five seconds to make its request and to prove the password, whatever it has sent
+// of them. Each is ended, and this test with them.
+TEST_F(ServedScreen, DropsWhoIsSlow) {
+  VncViewer good(vncPort, password);
+  ASSERT_TRUE(good.isConnected());
+  const Socket silent = rawConnection(vncPort, "");
+  const Socket half = rawConnection(vncPort, "RFB 003.008\n\2");
+  const Socket asking = rawConnection(webPort, "GET / HTTP/1.1\r\nHost: localhost\r\nA: ");
+  for (const Socket* const slow : {&silent, &half, &asking}) EXPECT_TRUE(test::waitForEnd(*slow));
+  show(kOrange, {0, 0, 10, 10});
+  EXPECT_TRUE(good.waitForPixel(5, 5, kOrange)) << "another one was dropped";
 }
 
 }  // namespace

@@ -1,6 +1,7 @@
 #include "pc/remote/vnc_viewer.h"
 
 #include <arpa/inet.h>
+#include <poll.h>
 #include <sys/socket.h>
 #include <stdexcept>
 
@@ -12,6 +13,7 @@ namespace brimol::test {
 namespace {
 
 constexpr unsigned kPatienceUs = 30'000'000;
+constexpr int kEndPatienceMs = 60'000;
 char tag = 0;  // its address finds the viewer in LibVNCClient's record
 
 }  // namespace
@@ -76,6 +78,11 @@ std::string readLine(const pc::Socket& connection) {
   while (line.find('\n') == std::string::npos && recv(connection.get(), &next, 1, 0) == 1)
     line += next;
   return line;
+}
+
+bool waitForEnd(const pc::Socket& connection) {
+  pollfd end = {connection.get(), POLLRDHUP, 0};
+  return poll(&end, 1, kEndPatienceMs) == 1;
 }
 
 }  // namespace brimol::test

@@ -43,5 +43,7 @@ class VncViewer {
 pc::Socket rawConnection(int port, std::string_view bytes);
 /// Waits for the other side's bytes up to a line's end, or to its end.
 std::string readLine(const pc::Socket& connection);
+/// Waits until the other side ends the connection, and reads nothing. False: it does not.
+bool waitForEnd(const pc::Socket& connection);
 
 }  // namespace brimol::test

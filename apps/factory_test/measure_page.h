@@ -1,0 +1,79 @@
+/// What pages share that measure over the whole screen.
+#pragma once
+
+#include <optional>
+#include <set>
+#include <string>
+#include <vector>
+
+#include "context.h"
+#include "input_watch.h"
+#include "page_test.h"
+#include "plan/plan.h"
+
+namespace factory_test {
+
+/// A look that passes by itself once it has seen all that it must: its values are judged then. A
+/// finger that is held still for two seconds, or the back key, ends it before, and the verdict is
+/// asked for. Its kinds work on the main thread alone.
+class MeasurePage : public LookTest {
+ public:
+  Outcome verdict() const final { return hasPassed ? Outcome::Pass : page.outcome(); }
+  bool isComplete() const final { return hasPassed || isDone(); }
+  void draw() final;
+  void instruct(const std::string& words) final;
+
+ protected:
+  /// `usualWords`: what to do, unless the plan says it.
+  MeasurePage(const Context& program, const char* test, const char* title, const char* usualWords);
+
+  /// Tells of an input, at the moment that it names.
+  virtual void follow(const Input& input) = 0;
+  /// A round of the main loop, after the inputs.
+  virtual void updateAt(uint32_t now) { static_cast<void>(now); }
+  /// Whether it has seen all that it must.
+  virtual bool isDone() const = 0;
+  /// Draws the whole screen while it is looked at, but for the words in its middle.
+  virtual void drawLook() = 0;
+  /// Where the words stand, in per cent of the screen's height; whether they are there.
+  virtual int wordsAt() const;
+  virtual bool hasWords() const { return true; }
+  /// Whether it goes on while a finger is down, which would move the menu that comes next.
+  virtual bool waitsForLift() const { return true; }
+  /// Whether only the operator can say if what was seen is right: he is asked then.
+  virtual bool isForEyes() const { return false; }
+  std::string question() const override;
+
+  double parameter(std::string_view name) const { return step.parameter(name); }
+  Measure measure(std::string_view name, double value) const;
+  static double millimetres(double pixels);
+
+ private:
+  /// Where a finger came down, and has stayed since.
+  struct Still {
+    uint32_t finger;
+    int x;
+    int y;
+    uint32_t since;
+  };
+
+  void beginLook() final { watch.emplace(); }
+  void endLook() final { watch.reset(); }
+  void updateLook() final;
+  bool isOfAnOldTouch(const Input& input) const;
+  void followStill(const Input& input);
+  bool isWhereItWas(const Input& input) const;
+  std::vector<std::string> instructionLines() const;
+  std::vector<std::string> valueLines() const;  // with their limits
+  // From the area's top; returns where the next line begins.
+  static int drawLines(const std::vector<std::string>& words, SKIA_Rect area);
+
+  PlanStep step;
+  std::string instructions;
+  bool hasPassed = false;
+  std::set<uint32_t> fingers;  // that are down
+  std::optional<Still> still;  // the only one of them
+  std::optional<InputWatch> watch;
+};
+
+}  // namespace factory_test

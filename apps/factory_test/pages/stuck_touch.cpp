@@ -1,0 +1,67 @@
+// A while without a touch, in which the panel may report none.
+#include <MW/window.h>
+#include <brimol/input.h>
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "layout.h"
+#include "measure_page.h"
+#include "pages/table.h"
+
+namespace factory_test {
+
+namespace {
+
+/// Ends by itself; every touch that began is counted.
+class StuckTouchPage : public MeasurePage {
+ public:
+  explicit StuckTouchPage(const Context& program)
+      : MeasurePage(program, "stuck_touch", "Stuck touch",
+                    "Put the phone down\nand do not touch it.") {}
+
+  std::vector<Measure> values() const override { return {measure("touches seen", touches)}; }
+
+ protected:
+  void follow(const Input& input) override {
+    if (input.kind == Input::Kind::Press) touches += 1;
+  }
+
+  void updateAt(uint32_t now) override {
+    constexpr uint32_t kSecond = 1000;
+    if (!began) began = now;
+    const int rest =
+        static_cast<int>(parameter("seconds")) - static_cast<int>((now - *began) / kSecond);
+    if (rest == secondsLeft) return;
+    secondsLeft = rest;
+    MW::isDisplayUpdate(1);
+  }
+
+  bool isDone() const override { return began && secondsLeft <= 0; }
+
+  bool waitsForLift() const override { return false; }
+
+  void drawLook() override {
+    const ScreenSize screen = screenSize();
+    skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
+    const std::string words = std::to_string(secondsLeft) + " s";
+    const int size = 4 * textSize(screen);
+    skia_add_label_c({0, percentOf(screen.height, 15), screen.width, 2 * size, 0},
+                     textOf(words.c_str(), kPageInk.text, SKIA_ALIGN_CENTRE, size));
+  }
+
+ private:
+  std::optional<uint32_t> began;  // GetTicks() milliseconds
+  int secondsLeft = static_cast<int>(parameter("seconds"));
+  double touches = 0;
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makeStuckTouch(const Context& program) {
+  return std::make_unique<StuckTouchPage>(program);
+}
+
+}  // namespace factory_test

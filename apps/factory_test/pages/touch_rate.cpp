@@ -1,0 +1,81 @@
+// How often the panel reports, and how late its reports reach the screen.
+#include <algorithm>
+#include <memory>
+#include <optional>
+#include <vector>
+
+#include <brimol/input.h>
+
+#include "layout.h"
+#include "measure_page.h"
+#include "pages/table.h"
+
+namespace factory_test {
+
+namespace {
+
+constexpr double kSecond = 1000;  // ms
+constexpr uint32_t kDotColor = 0xFFE8C040;
+
+/// Counts the reports of one finger while it moves, until it has moved for long enough.
+class TouchRatePage : public MeasurePage {
+ public:
+  explicit TouchRatePage(const Context& program)
+      : MeasurePage(program, "touch_rate", "Touch rate",
+                    "Draw circles with one finger,\nquickly and without a stop.") {}
+
+  std::vector<Measure> values() const override {
+    return {measure("event rate", moved > 0 ? reports * kSecond / moved : 0),
+            measure("longest gap", longestGap), measure("latency", frames > 0 ? late / frames : 0)};
+  }
+
+ protected:
+  void follow(const Input& input) override {
+    using enum Input::Kind;
+    if (input.kind == Press && !last) last = input;
+    if (!last || input.finger != last->finger) return;
+    if (input.kind == Move) count(input);
+    if (input.kind == Lift) last.reset();
+  }
+
+  bool isDone() const override { return moved >= kSecond * parameter("seconds"); }
+
+  void drawLook() override {
+    const ScreenSize screen = screenSize();
+    skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
+    if (last) {
+      const int side = 2 * textSize(screen);
+      skia_add_roundbox_c({last->x - side / 2, last->y - side / 2, side, side, kDotColor});
+    }
+    if (!undrawn) return;
+    late += GetTicks() - *undrawn;
+    frames += 1;
+    undrawn.reset();
+  }
+
+ private:
+  void count(const Input& input) {
+    const double gap = input.ticks - last->ticks;
+    reports += 1;
+    moved += gap;
+    longestGap = std::max(longestGap, gap);
+    last = input;
+    if (!undrawn) undrawn = input.ticks;
+  }
+
+  std::optional<Input> last;        // of the finger that is down
+  std::optional<uint32_t> undrawn;  // when the oldest report came that no frame shows yet
+  double reports = 0;
+  double moved = 0;  // ms
+  double longestGap = 0;
+  double late = 0;  // ms, of all frames that showed a report
+  double frames = 0;
+};
+
+}  // namespace
+
+std::unique_ptr<Test> makeTouchRate(const Context& program) {
+  return std::make_unique<TouchRatePage>(program);
+}
+
+}  // namespace factory_test

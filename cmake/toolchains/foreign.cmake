@@ -1,0 +1,27 @@
+# Another architecture's build, by Clang, with the packages that scripts/foreign_root.sh unpacked.
+# Included by <architecture>.cmake, which sets BRIMOL_ARCHITECTURE, BRIMOL_TRIPLE, and either BRIMOL_EMULATOR or,
+# where this machine runs the programs itself, BRIMOL_LOADER.
+
+cmake_path(SET root NORMALIZE "${CMAKE_CURRENT_LIST_DIR}/../../build/roots/${BRIMOL_ARCHITECTURE}")
+set(CMAKE_SYSTEM_NAME Linux)
+set(CMAKE_SYSROOT "${root}")
+set(CMAKE_LIBRARY_ARCHITECTURE ${BRIMOL_TRIPLE})
+foreach(language IN ITEMS C CXX)
+  set(CMAKE_${language}_COMPILER_TARGET ${BRIMOL_TRIPLE})
+endforeach()
+set(CMAKE_C_COMPILER clang)
+set(CMAKE_CXX_COMPILER clang++)
+set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)
+set(CMAKE_FIND_ROOT_PATH_MODE_LIBRARY ONLY)
+set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
+set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
+set(CMAKE_EXE_LINKER_FLAGS_INIT "-fuse-ld=lld")
+set(CMAKE_SHARED_LINKER_FLAGS_INIT "-fuse-ld=lld")
+if(BRIMOL_EMULATOR)
+  set(CMAKE_CROSSCOMPILING_EMULATOR ${BRIMOL_EMULATOR} -L "${root}")
+else()
+  # The libraries of the folder, not those of this machine.
+  string(CONCAT libraries "${root}/lib/${BRIMOL_TRIPLE}:${root}/usr/lib/${BRIMOL_TRIPLE}:"
+                          "${root}/usr/lib/${BRIMOL_TRIPLE}/android:${root}/usr/lib/p7zip")
+  set(CMAKE_CROSSCOMPILING_EMULATOR "${root}${BRIMOL_LOADER}" --library-path "${libraries}")
+endif()

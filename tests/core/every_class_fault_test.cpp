@@ -1,0 +1,92 @@
+// What every class bears when the machine fails it: each allocation of a session in turn, drawing
+// and property calls that fail.
+
+#include <array>
+#include <memory_resource>
+#include <random>
+
+#include "support/failing_malloc.h"
+#include "support/widget_test.h"
+#include "widget_classes.h"
+
+namespace {
+
+using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+
+// The session of a class: a widget is made, drawn, set and offered events in all ways that it has,
+// and deleted. Its arguments need none of the memory that fails.
+class Session {
+ public:
+  explicit Session(const WidgetClass& played) : itsClass(played) {
+    std::minstd_rand random(7);
+    // Small numbers and short texts, so that all of it takes part.
+    for (uint8_t& each : bytes) each = static_cast<uint8_t>(random() % 14);
+  }
+
+  // Throws what the toolkit throws.
+  void play() {
+    Arguments from(bytes, arena);
+    std::unique_ptr<MW::Widget> widget;
+    try {
+      widget = itsClass.make(from);
+    } catch (const std::bad_alloc&) {
+      return;  // the application's own block
+    }
+    itsClass.listen(*widget);
+    widget->setActive(1);
+    for (const auto* const operations : {&baseOperations(), &itsClass.operations}) {
+      for (const Operation& each : *operations) {
+        each(*widget, from);
+        widget->onRecvEvent(from.take<MW::event_data*>(), 0);
+        widget->show(platform().ticks += 100);
+        widget->updateTimer(platform().ticks);
+      }
+    }
+  }
+
+ private:
+  const WidgetClass& itsClass;
+  std::array<uint8_t, 8192> bytes = {};
+  std::array<std::byte, std::size_t{1} << 18> block = {};
+  std::pmr::monotonic_buffer_resource arena{block.data(), block.size(),
+                                            std::pmr::null_memory_resource()};
+};
+
+class EveryClass : public WidgetTest, public testing::WithParamInterface<WidgetClass> {
+ protected:
+  void SetUp() override {
+    WidgetTest::SetUp();
+    platform().records = false;
+    MW::WidgetList::init();
+  }
+};
+const auto kClassName = [](const auto& info) { return std::string(info.param.name); };
+INSTANTIATE_TEST_SUITE_P(, EveryClass, testing::ValuesIn(widgetClasses()), kClassName);
+
+TEST_P(EveryClass, BearsThatAnyAllocationOfASessionFails) {
+  constexpr int kMost = 2000;
+  int nth = 0;
+  bool hasFailed = true;
+  while (hasFailed && ++nth < kMost) {
+    const auto session = std::make_unique<Session>(GetParam());
+    const FailingAllocation failure(nth);
+    EXPECT_NO_THROW(session->play()) << "allocation " << nth;
+    hasFailed = FailingAllocation::hasFailed();
+  }
+  EXPECT_LT(nth, kMost);
+  EXPECT_GT(nth, 1) << "not even the widget was allocated";
+}
+
+TEST_P(EveryClass, DrawsTheSameWhateverThePlatformAnswers) {
+  const auto drawingsOf = [](bool isWhole) {
+    platform().reset();
+    MW::WidgetList::destroy();
+    platform().nextHandle = isWhole ? 1 : -1;
+    platform().hasProperties = isWhole;
+    std::make_unique<Session>(GetParam())->play();
+    return platform().takeDrawings();
+  };
+  EXPECT_EQ(drawingsOf(false), drawingsOf(true));
+}
+
+}  // namespace

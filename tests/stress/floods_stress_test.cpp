@@ -1,0 +1,72 @@
+// More than any finger can do: a hundred thousand events at once, a thousand starts and ends.
+
+#include <MW/event_service.h>
+
+#include <filesystem>
+#include <iterator>
+
+#include "core/dispatch_thread.h"
+#include "support/allocated_bytes.h"
+#include "support/widget_test.h"
+
+namespace {
+
+using namespace brimol::test;  // NOLINT(google-build-using-namespace): a test's own words
+using MW::Window;
+
+constexpr unsigned int kEvents = 100'000;
+constexpr unsigned int kFingers = 10;
+
+// Ten fingers that report a thousand times a second each; the place is the event's number.
+Event numbered(unsigned int number) {
+  Event event = pointerInput(BRIMOL_POINTER_MOTION,
+                             {static_cast<int>(number & 0xFFFF), static_cast<int>(number >> 16)});
+  event.pointer.finger = static_cast<uint8_t>(number % kFingers);
+  return event;
+}
+
+// The input thread takes all of them in one turn; the test then dispatches them.
+TEST_F(LiveWindowTest, AFloodKeepsItsOrderAndGivesItsMemoryBack) {
+  const android::sp<MW::func_dispatchEvent> dispatcher = new MW::func_dispatchEvent;
+  unsigned int next = 0;
+  ProbeWidget widget;
+  widget.onEvent = [&next](MW::event_data* event, auto) {
+    const auto number = static_cast<unsigned int>(event->mouse.x | event->mouse.y << 16);
+    if (number == next && event->mouse.finger == number % kFingers) ++next;
+    return true;
+  };
+  widget.enter();
+  platform().records = false;
+  const std::size_t before = allocatedBytes();
+  for (unsigned int number = 0; number < kEvents; ++number) platform().feed(numbered(number));
+  platform().turns.give(platform().ticks);
+  EXPECT_GT(allocatedBytes(), before + kEvents * sizeof(MW::event_data));
+  for (unsigned int round = 0; round < kEvents; ++round) dispatcher->threadLoop();
+  EXPECT_EQ(next, kEvents);
+  EXPECT_EQ(Window::getEventService()->recvEvent(), nullptr);
+  EXPECT_LE(platform().paused, kEvents) << "more than a millisecond an event";
+  EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 16));
+}
+
+std::ptrdiff_t threads() {
+  const std::filesystem::directory_iterator all("/proc/self/task");
+  return std::distance(begin(all), end(all));
+}
+
+TEST_F(WidgetTest, AThousandStartsAndEndsLeaveNothing) {
+  platform().records = false;
+  const auto startAndEnd = [] {
+    EXPECT_EQ(Window::init(), 1);
+    Window::destroy();
+  };
+  const std::ptrdiff_t threadsBefore = threads();
+  startAndEnd();
+  const std::size_t before = allocatedBytes();
+  for (int i = 0; i < 1000; ++i) startAndEnd();
+  // The last ones have done their work; the system may still take them down.
+  while (threads() > threadsBefore) std::this_thread::yield();
+  EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 16));
+  EXPECT_EQ(platform().inits, platform().quits);
+}
+
+}  // namespace
