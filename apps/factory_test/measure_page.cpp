@@ -8,6 +8,7 @@
 #include <cmath>
 #include <sstream>
 
+#include "language/language.h"
 #include "layout.h"
 #include "results/measure_text.h"
 
@@ -26,7 +27,7 @@ MeasurePage::MeasurePage(const Context& program, const char* test, const char* t
     : LookTest(title, usualWords), step(stepOf(program, test)), instructions(usualWords) {}
 
 std::string MeasurePage::question() const {
-  return isDone() ? "Done. Is it right?" : "Not everything was seen.";
+  return isDone() ? tr("Done. Is it right?") : tr("Not everything was seen.");
 }
 
 int MeasurePage::wordsAt() const {
@@ -90,7 +91,7 @@ std::vector<std::string> MeasurePage::instructionLines() const {
   std::vector<std::string> words;
   std::istringstream text(instructions);
   for (std::string line; std::getline(text, line);) words.push_back(line);
-  words.emplace_back("Hold a finger still, or Back: end.");
+  words.emplace_back(tr("Hold a finger still, or Back: end."));
   return words;
 }
 
@@ -102,7 +103,7 @@ std::vector<std::string> MeasurePage::valueLines() const {
       each.least = limits->second.least;
       each.most = limits->second.most;
     }
-    words.push_back(each.name + ": " + measureText(each));
+    words.push_back(std::string(tr(each.name.c_str())) + ": " + measureText(each));
   }
   return words;
 }
