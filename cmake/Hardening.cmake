@@ -8,6 +8,7 @@ function(brimol_harden target)
   if(BRIMOL_SANITIZE)
     return()
   endif()
+  set(CMAKE_REQUIRED_FLAGS -Werror) # Clang only warns of what it does not have for a processor
   foreach(name IN ITEMS stack-protector-strong stack-clash-protection cf-protection)
     string(MAKE_C_IDENTIFIER "BRIMOL_HAS_${name}" known)
     check_cxx_compiler_flag(-f${name} ${known})

@@ -138,6 +138,21 @@ bool isSameFile(const std::string& one, const std::string& other) {
   return placeOfFile(one) == placeOfFile(other);
 }
 
+// What two options say that must not name one file; empty: they do not.
+std::string sameFiles(const Options& options) {
+  using Named = std::pair<const char*, std::string>;
+  const auto files = std::to_array<Named>({{"--results", options.results},
+                                           {"--junit", options.junit},
+                                           {"--database", options.database}});
+  for (const auto& [name, file] : files) {
+    for (const auto& [other, its] : files) {
+      if (name == other || file.empty() || its.empty() || !isSameFile(file, its)) continue;
+      return std::string(name) + " and " + other + " name the same file";
+    }
+  }
+  return "";
+}
+
 std::string wrongDevice(const std::string& name) {
   std::string error = "unknown device '" + name + "', known are:";
   for (const BrimolDevice& device : devices()) error.append(" ").append(device.name);
@@ -187,12 +202,8 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
     if (!rest) return {};
     arguments = *rest;
   }
-  if (!options.results.empty() && !options.junit.empty() &&
-      isSameFile(options.results, options.junit)) {
-    error = "--results and --junit name the same file";
-    return {};
-  }
-  error = wrongRecords(options);
+  error = sameFiles(options);
+  if (error.empty()) error = wrongRecords(options);
   if (!error.empty()) return {};
   if (!options.device.empty() && brimol_device_named(options.device.c_str()) == nullptr) {
     error = wrongDevice(options.device);

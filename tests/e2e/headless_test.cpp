@@ -47,6 +47,10 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
                               {{"file"}, "'file'"},
                               {{"--results", "a", "--junit", "a"}, "same file"},
                               {{"--results=a", "--junit", "./a"}, "same file"},
+                              {{"--results=a", "--database", "a"}, "same file"},
+                              {{"--line", "postgresql://a/b"}, "--line needs --database"},
+                              {{"--line", "a", "--database", "b"}, "--line needs an address"},
+                              {{"--serial", "A 1"}, "without spaces"},
                               {{"--headless=yes"}, "takes no value"}}) {
     std::string error;
     EXPECT_FALSE(parseOptions(arguments, error)) << word;

@@ -89,7 +89,7 @@ void Plot::addScale() {
     const double y = (first + i) * step;
     if (y > up.to) break;
     lines += to("M", kLeft, top(y)) + to("H", kWidth - kRight);
-    content.append("<text text-anchor=\"end\" x=\"").append(at(kLeft - 8)).append("\" y=\"");
+    content.append(R"(<text text-anchor="end" x=")").append(at(kLeft - 8)).append("\" y=\"");
     content.append(at(top(y) + 4)).append("\">").append(shortNumber(y)).append("</text>\n");
   }
   path(lines, "axis");
@@ -121,10 +121,8 @@ void Plot::spread(double x, Range range) {
 void Plot::bar(Range horizontal, double height, std::string_view tip) {
   const double x = left(horizontal.from);
   const double width = std::max(left(horizontal.to) - x - 1, 1.0);
-  content.append("<rect class=\"bar\" x=\"")
-      .append(at(x))
-      .append("\" y=\"")
-      .append(at(top(height)));
+  content.append(R"(<rect class="bar" x=")").append(at(x)).append("\" y=\"");
+  content.append(at(top(height)));
   content.append("\" width=\"").append(at(width)).append("\" height=\"");
   content.append(at(top(0) - top(height))).append("\"><title>").append(htmlText(tip));
   content.append("</title></rect>\n");
@@ -137,7 +135,7 @@ void Plot::limitAtX(double x) {
 void Plot::limitAtY(double y) { path(to("M", kLeft, top(y)) + to("H", kWidth - kRight), "limit"); }
 
 std::string Plot::svg() const {
-  std::string text = "<svg role=\"img\" viewBox=\"";
+  std::string text = R"(<svg role="img" viewBox=")";
   text.append(to("0 0 ", kWidth, kHeight)).append("\" aria-label=\"").append(htmlText(title));
   return text.append("\">\n").append(content).append("</svg>\n");
 }

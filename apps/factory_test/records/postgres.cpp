@@ -2,6 +2,7 @@
 
 #include <poll.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <utility>
@@ -99,8 +100,8 @@ Postgres::Result Postgres::answer() {
 
 void Postgres::run(const std::string& sql, const std::vector<std::string>& parameters,
                    const RowReader& reader) {
-  std::vector<const char*> values;
-  for (const std::string& each : parameters) values.push_back(each.c_str());
+  std::vector<const char*> values(parameters.size());
+  std::ranges::transform(parameters, values.begin(), &std::string::c_str);
   check(PQsendQueryParams(handle.get(), sql.c_str(), static_cast<int>(values.size()), nullptr,
                           values.data(), nullptr, nullptr, 0) == 1);
   flush();

@@ -72,17 +72,21 @@ void countTests(std::span<const RunRecord> runs, Statistics& all) {
   std::ranges::stable_sort(all.tests, std::greater(), &TestCount::fails);
 }
 
+using SeriesByName = std::map<std::pair<std::string, std::string>, ValueSeries>;
+
+void addValues(const TestResult& result, SeriesByName& series) {
+  for (const Measure& each : result.values) {
+    ValueSeries& one = series[{result.test, each.name}];
+    one.test = result.test;
+    one.newest = each;
+    one.points.push_back({result.started, each.value, each.isWithin()});
+  }
+}
+
 void collectValues(std::span<const RunRecord> runs, Statistics& all) {
-  std::map<std::pair<std::string, std::string>, ValueSeries> series;
+  SeriesByName series;
   for (const RunRecord& run : runs) {
-    for (const auto& [id, result] : run.verdicts) {
-      for (const Measure& each : result.values) {
-        ValueSeries& one = series[{result.test, each.name}];
-        one.test = result.test;
-        one.newest = each;
-        one.points.push_back({result.started, each.value, each.isWithin()});
-      }
-    }
+    for (const auto& [id, result] : run.verdicts) addValues(result, series);
   }
   for (auto& [key, one] : series) {
     std::ranges::stable_sort(one.points, {}, &ValuePoint::time);
