@@ -20,6 +20,17 @@ constexpr uint32_t kStillMs = 2000;
 constexpr double kStillMm = 2;
 constexpr int kLinePercent = 3;  // of the screen's longer side, from one line to the next
 
+// As measureText(), in the operator's language.
+std::string valueLine(const Measure& measure) {
+  std::string line = std::string(tr(measure.name.c_str())) + ": " + numberText(measure.value);
+  if (!measure.unit.empty()) line += " " + measure.unit;
+  if (measure.least && measure.most) {
+    return line + " (" + numberText(*measure.least) + tr(" to ") + numberText(*measure.most) + ")";
+  }
+  if (measure.least) return line + " (" + tr("at least ") + numberText(*measure.least) + ")";
+  return measure.most ? line + " (" + tr("at most ") + numberText(*measure.most) + ")" : line;
+}
+
 }  // namespace
 
 MeasurePage::MeasurePage(const Context& program, const char* test, const char* title,
@@ -103,7 +114,7 @@ std::vector<std::string> MeasurePage::valueLines() const {
       each.least = limits->second.least;
       each.most = limits->second.most;
     }
-    words.push_back(std::string(tr(each.name.c_str())) + ": " + measureText(each));
+    words.push_back(valueLine(each));
   }
   return words;
 }

@@ -117,8 +117,8 @@ class KeyTest : public PageTest {
   static void drawKey(int index, bool isPressed) {
     const ScreenSize screen = screenSize();
     const Grid grid = isLandscape(screen) ? Grid{3, 4} : Grid{4, 3};
-    const std::string words =
-        std::string(tr(kAsked.at(static_cast<std::size_t>(index)).name)) + (isPressed ? "\nOK" : "");
+    const std::string words = std::string(tr(kAsked.at(static_cast<std::size_t>(index)).name)) +
+                              (isPressed ? "\nOK" : "");
     const Ink ink = isPressed ? kPassInk : kButtonInk;
     skia_add_textbox_c(inColor(cellOf(contentArea(), gapOf(screen), grid, index), ink.ground),
                        captionOf(words.c_str(), ink.text));
