@@ -3,6 +3,7 @@
 #include <memory>
 #include <vector>
 
+#include "language/language.h"
 #include "layout.h"
 #include "measure_page.h"
 #include "pages/table.h"
@@ -18,8 +19,8 @@ constexpr int kGap = 1;  // pixels between cells
 class TouchGridPage : public MeasurePage {
  public:
   explicit TouchGridPage(const Context& program)
-      : MeasurePage(program, "touch_grid", "Touch grid",
-                    "Paint every cell,\nedges and corners too."),
+      : MeasurePage(program, "touch_grid", tr("Touch grid"),
+                    tr("Paint every cell,\nedges and corners too.")),
         grid(gridOf(pixelsOf(parameter("cell mm"), 1, kMostPixels))),
         painted(placeOf(grid.rows, 0)) {}
 
