@@ -6,6 +6,7 @@
 #include <utility>
 
 #include "complain.h"
+#include "language/language.h"
 #include "layout.h"
 #include "plan/judge.h"
 #include "results/measure_text.h"
@@ -44,7 +45,7 @@ void FactoryTest::update(uint32_t now) {
 void FactoryTest::updateMenu(uint32_t now) {
   menu.update(now);
   if (menu.takeLeave()) {
-    ask(Asked::Leave, {"Leave", "End the factory test?", "OK", "CANCEL"});
+    ask(Asked::Leave, {tr("Leave"), tr("End the factory test?"), tr("OK"), tr("CANCEL")});
   } else if (const auto chosen = menu.takeChosen()) {
     menu.hide();
     start(*chosen, now);
@@ -62,8 +63,9 @@ void FactoryTest::updateTest(uint32_t now) {
   if (outcome == Outcome::Running) return;
   if (outcome == Outcome::Pass && !running->test->isComplete() && isWithinLimits()) {
     ask(Asked::IncompletePass,
-        {"Not all was tested", "The test has not shown or asked all that it must. Pass anyway?",
-         "PASS", "GO ON"});
+        {tr("Not all was tested"),
+         tr("The test has not shown or asked all that it must. Pass anyway?"), tr("PASS"),
+         tr("GO ON")});
     return;
   }
   finish(outcome, now);
@@ -82,7 +84,8 @@ void FactoryTest::updateRun(uint32_t now) {
   switch (run->state()) {
     case PlanRun::State::Performing: start(placeOf(step.test), now); break;
     case PlanRun::State::Asking:
-      ask(Asked::Repeat, {name, "The test has not passed. Repeat it?", "REPEAT", "NO"});
+      ask(Asked::Repeat,
+          {tr(name), tr("The test has not passed. Repeat it?"), tr("REPEAT"), tr("NO")});
       break;
     default: endRun();
   }
@@ -93,7 +96,7 @@ void FactoryTest::endRun() {
   if (!book.finish(error)) complain(error);
   const RunProgress progress = progressOf(book);
   const bool isPassed = progress.passed == progress.tests;
-  ask(Asked::RunEnd, {isPassed ? "PASS" : "FAIL", progress.words(), "END", "MENU"});
+  ask(Asked::RunEnd, {isPassed ? tr("PASS") : tr("FAIL"), progress.words(), tr("END"), tr("MENU")});
 }
 
 void FactoryTest::ask(Asked what, const Question& question) {
@@ -129,7 +132,8 @@ void FactoryTest::follow(bool isYes, uint32_t now) {
       if (isYes) {
         run->answer(Answer::Again);
       } else {
-        ask(Asked::GoOn, {"Go on?", "The plan's other tests can still be done.", "GO ON", "STOP"});
+        ask(Asked::GoOn, {tr("Go on?"), tr("The plan's other tests can still be done."),
+                          tr("GO ON"), tr("STOP")});
       }
       break;
     case Asked::GoOn: run->answer(isYes ? Answer::GoOn : Answer::Stop); break;
@@ -196,7 +200,7 @@ void FactoryTest::showKept(bool isKept, const std::string& error) {
   menu.showVerdicts();
   if (isKept) return;
   complain(error);
-  ask(Asked::SaveAgain, {"Not saved", error, "TRY AGAIN", "LATER"});
+  ask(Asked::SaveAgain, {tr("Not saved"), error, tr("TRY AGAIN"), tr("LATER")});
 }
 
 void FactoryTest::draw() {

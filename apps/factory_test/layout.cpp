@@ -5,8 +5,9 @@
 
 #include <algorithm>
 #include <cmath>
-#include <cstdio>
+#include <cstddef>
 #include <cstring>
+#include <string_view>
 
 namespace factory_test {
 
@@ -54,10 +55,27 @@ int groupHeight(ScreenSize screen) {
 
 SKIA_Rect contentArea() { return layOutPage(screenSize()).content; }
 
+namespace {
+
+// So much of the text as ends with a whole character, at most `most` bytes.
+std::size_t wholeBytes(std::string_view words, std::size_t most) {
+  if (words.size() <= most) return words.size();
+  const auto isInside = [&](std::size_t at) {
+    constexpr unsigned kKind = 0xC0;
+    constexpr unsigned kFollows = 0x80;
+    return (static_cast<unsigned char>(words[at]) & kKind) == kFollows;
+  };
+  while (most > 0 && isInside(most)) --most;
+  return most;
+}
+
+}  // namespace
+
 SKIA_Text textOf(const char* words, uint32_t color, int align, int size) {
   SKIA_Text text = {};
-  std::snprintf(text.text, sizeof text.text, "%s", words);
-  text.string_len = static_cast<int32_t>(std::strlen(text.text));
+  const std::size_t bytes = wholeBytes(words, sizeof text.text - 1);
+  std::memcpy(text.text, words, bytes);
+  text.string_len = static_cast<int32_t>(bytes);
   text.color = color;
   text.align = align;
   text.size = size;

@@ -8,6 +8,7 @@
 #include <cmath>
 #include <sstream>
 
+#include "language/language.h"
 #include "layout.h"
 #include "results/measure_text.h"
 
@@ -19,6 +20,17 @@ constexpr uint32_t kStillMs = 2000;
 constexpr double kStillMm = 2;
 constexpr int kLinePercent = 3;  // of the screen's longer side, from one line to the next
 
+// As measureText(), in the operator's language.
+std::string valueLine(const Measure& measure) {
+  std::string line = std::string(tr(measure.name.c_str())) + ": " + numberText(measure.value);
+  if (!measure.unit.empty()) line += " " + measure.unit;
+  if (measure.least && measure.most) {
+    return line + " (" + numberText(*measure.least) + tr(" to ") + numberText(*measure.most) + ")";
+  }
+  if (measure.least) return line + " (" + tr("at least ") + numberText(*measure.least) + ")";
+  return measure.most ? line + " (" + tr("at most ") + numberText(*measure.most) + ")" : line;
+}
+
 }  // namespace
 
 MeasurePage::MeasurePage(const Context& program, const char* test, const char* title,
@@ -26,7 +38,7 @@ MeasurePage::MeasurePage(const Context& program, const char* test, const char* t
     : LookTest(title, usualWords), step(stepOf(program, test)), instructions(usualWords) {}
 
 std::string MeasurePage::question() const {
-  return isDone() ? "Done. Is it right?" : "Not everything was seen.";
+  return isDone() ? tr("Done. Is it right?") : tr("Not everything was seen.");
 }
 
 int MeasurePage::wordsAt() const {
@@ -90,7 +102,7 @@ std::vector<std::string> MeasurePage::instructionLines() const {
   std::vector<std::string> words;
   std::istringstream text(instructions);
   for (std::string line; std::getline(text, line);) words.push_back(line);
-  words.emplace_back("Hold a finger still, or Back: end.");
+  words.emplace_back(tr("Hold a finger still, or Back: end."));
   return words;
 }
 
@@ -102,7 +114,7 @@ std::vector<std::string> MeasurePage::valueLines() const {
       each.least = limits->second.least;
       each.most = limits->second.most;
     }
-    words.push_back(each.name + ": " + measureText(each));
+    words.push_back(valueLine(each));
   }
   return words;
 }

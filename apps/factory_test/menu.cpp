@@ -7,6 +7,7 @@
 #include <array>
 #include <string>
 
+#include "language/language.h"
 #include "layout.h"
 #include "pages/table.h"
 #include "verdict_bar.h"
@@ -32,10 +33,10 @@ constexpr auto kLooks = std::to_array<VerdictLook>({
 std::string rowWords(const char* name) { return std::string("   ") + name; }
 
 std::string rowWords(const TestEntry& entry, const TestResult* result, bool isSaved) {
-  std::string words = rowWords(entry.name);
+  std::string words = rowWords(tr(entry.name));
   if (result == nullptr || result->verdict == Verdict::None) return words;
-  words.append(": ").append(verdictName(result->verdict));
-  return isSaved ? words : words.append(", not saved");
+  words.append(": ").append(tr(verdictName(result->verdict)));
+  return isSaved ? words : words.append(tr(", not saved"));
 }
 
 }  // namespace
@@ -54,11 +55,11 @@ Menu::Menu(const ResultBook& results)
       ++row;
     }
     group = entry.group;
-    addRow(entry.name);
+    addRow(tr(entry.name));
     rowOfEntry.push_back(row++);
   }
   addGroup("");
-  addRow("Leave");
+  addRow(tr("Leave"));
   leaveRow = row + 1;
   faces.at(static_cast<std::size_t>(leaveRow)) = kRowInk.ground;
   list.initFinish();

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 
+#include "language/language.h"
 #include "layout.h"
 
 namespace factory_test {
@@ -60,11 +61,11 @@ int MenuHead::show(unsigned int) {
   skia_add_box_c(rect);
   skia_add_textbox_c(
       inColor(place.title, kHeadInk.ground),
-      textOf("Factory test", kHeadInk.text, SKIA_ALIGN_CENTRE, percentOf(size, 120)));
+      textOf(tr("Factory test"), kHeadInk.text, SKIA_ALIGN_CENTRE, percentOf(size, 120)));
   const auto put = [&](const SKIA_Rect& row, const std::string& words) {
     skia_add_label_c(row, textOf(words.c_str(), kPageInk.text, SKIA_ALIGN_LEFT, size));
   };
-  put(place.hint, "Choose a test, or Leave at the end.");
+  put(place.hint, tr("Choose a test, or Leave at the end."));
   put(place.count, progress.words());
   drawProgress(progress, place.bar);
   drawFigures(place.figures, place.grid);

@@ -1,14 +1,21 @@
 #include "run_progress.h"
 
 #include <algorithm>
+#include <array>
+#include <cstdio>
 
+#include "language/language.h"
 #include "layout.h"
 
 namespace factory_test {
 
 std::string RunProgress::words() const {
-  return std::to_string(done()) + " of " + std::to_string(tests) +
-         " done: " + std::to_string(passed) + " PASS, " + std::to_string(failed) + " FAIL";
+  constexpr std::size_t kMost = 200;
+  std::array<char, kMost> words = {};
+  std::snprintf(words.data(), words.size(), tr("%d of %d done: %d PASS, %d FAIL"),
+                static_cast<int>(done()), static_cast<int>(tests), static_cast<int>(passed),
+                static_cast<int>(failed));
+  return words.data();
 }
 
 RunProgress progressOf(const ResultBook& book) {

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 
+#include "language/language.h"
 #include "layout.h"
 
 namespace factory_test {
@@ -19,10 +20,10 @@ struct ButtonLook {
 
 // The verdicts as keys move over them.
 constexpr auto kLooks = std::to_array<ButtonLook>({
-    {"PASS", kPassInk, 150, Outcome::Pass},
-    {"RETRY", kRowInk, 150, Outcome::Retry},
-    {"FAIL", kFailInk, 150, Outcome::Fail},
-    {"Leave", kButtonInk, 100, Outcome::Left},
+    {msg("PASS"), kPassInk, 150, Outcome::Pass},
+    {msg("RETRY"), kRowInk, 150, Outcome::Retry},
+    {msg("FAIL"), kFailInk, 150, Outcome::Fail},
+    {msg("Leave"), kButtonInk, 100, Outcome::Left},
 });
 
 SKIA_Rect around(const SKIA_Rect& first, const SKIA_Rect& last) {
@@ -53,7 +54,7 @@ void VerdictBar::place(const SKIA_Rect& area) {
   const ButtonLook& look = kLooks.at(index);
   const int size = percentOf(textSize(screenSize()), look.textPercent);
   const SKIA_Rect face = inColor(area, look.ink.ground);
-  const SKIA_Text caption = textOf(look.caption, look.ink.text, SKIA_ALIGN_CENTRE, size);
+  const SKIA_Text caption = textOf(tr(look.caption), look.ink.text, SKIA_ALIGN_CENTRE, size);
   MW::Button& button = buttons.at(index).emplace(&face, &caption);
   button.pressCallback = [](int) { Bar::get().guards.at(index).press(GetTicks()); };
   button.clickCallback = [](int) { Bar::get().click(index); };

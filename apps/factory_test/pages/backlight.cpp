@@ -6,6 +6,7 @@
 #include <memory>
 #include <string>
 
+#include "language/language.h"
 #include "layout.h"
 #include "pages/table.h"
 #include "step_page.h"
@@ -22,11 +23,11 @@ class BacklightPage : public StepPage {
  public:
   explicit BacklightPage(const Context& program)
       : StepPage(program, {.test = "backlight",
-                           .title = "Backlight",
-                           .words = "Each of five steps is darker\nthan the one before.\n"
-                                    "Tap: the next one.",
+                           .title = tr("Backlight"),
+                           .words = tr("Each of five steps is darker\nthan the one before.\n"
+                                       "Tap: the next one."),
                            .value = "steps confirmed",
-                           .question = "Was every step darker, and even?",
+                           .question = tr("Was every step darker, and even?"),
                            .count = kSteps.size()}) {}
   ~BacklightPage() override { brimol_host_set_brightness(kFull); }
 
@@ -38,7 +39,7 @@ class BacklightPage : public StepPage {
   void drawStep(int picture) override {
     const ScreenSize screen = screenSize();
     const std::string words =
-        "Light " + std::to_string(kSteps.at(static_cast<std::size_t>(picture))) + " %";
+        tr("Light ") + std::to_string(kSteps.at(static_cast<std::size_t>(picture))) + " %";
     const int size = 4 * textSize(screen);
     skia_add_textbox_c({0, 0, screen.width, screen.height, MW::kColorWhite},
                        textOf(words.c_str(), MW::kColorBlack, SKIA_ALIGN_CENTRE, size));

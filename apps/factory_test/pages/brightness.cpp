@@ -9,6 +9,7 @@
 #include <string>
 
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -26,8 +27,8 @@ constexpr int kStep = 10;
 class BrightnessTest : public PageTest {
  public:
   BrightnessTest()
-      : PageTest("Brightness",
-                 "Drag the knob: the screen follows.\nKeys up and down do the same.") {}
+      : PageTest(tr("Brightness"),
+                 tr("Drag the knob: the screen follows.\nKeys up and down do the same.")) {}
 
   void enter() override {
     page.ask().otherKey = [](unsigned int code) {
@@ -57,7 +58,7 @@ class BrightnessTest : public PageTest {
     shown = value;
     wasDark = wasDark || value <= kDark;
     brimol_host_set_brightness(value);
-    page.say(("Light " + std::to_string(value) + " %").c_str());
+    page.say((tr("Light ") + std::to_string(value) + " %").c_str());
   }
 
  private:

@@ -11,6 +11,7 @@
 #include <optional>
 
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -30,7 +31,7 @@ constexpr Grid kGrid = {2, 3};
 /// Press, click, long press, double click and delayed show, each counted on the line.
 class ButtonTest : public PageTest {
  public:
-  ButtonTest() : PageTest("Buttons", "Use every button as it says.") {}
+  ButtonTest() : PageTest(tr("Buttons"), tr("Use every button as it says.")) {}
 
   void enter() override {
     page.ask();
@@ -77,7 +78,7 @@ class ButtonTest : public PageTest {
     const SKIA_Point ruler = {under.x, under.y,          under.x + under.w,
                               under.y, kPanelInk.ground, kRulerWidth};
     const SKIA_Text caption =
-        textOf("Label,\npicture,\nbox, line", kPageInk.text, SKIA_ALIGN_LEFT, textSize(screen));
+        textOf(tr("Label,\npicture,\nbox, line"), kPageInk.text, SKIA_ALIGN_LEFT, textSize(screen));
     const SKIA_Text name =
         textOf(picturePath("test_card.png").c_str(), MW::kUnused, MW::kUnused, MW::kUnused);
     MW::WidgetList::init();
@@ -97,7 +98,7 @@ class ButtonTest : public PageTest {
     const SKIA_Rect area =
         inColor(cellOf(areas().back(), gapOf(screenSize()), kGrid, static_cast<int>(number)),
                 kButtonInk.ground);
-    const SKIA_Text caption = captionOf(look.caption, kButtonInk.text);
+    const SKIA_Text caption = captionOf(tr(look.caption), kButtonInk.text);
     Button& button = buttons.at(number).emplace(&area, &caption);
     button.*look.callback = look.handler;
     if (number != kLate) button.setActive(1);
@@ -105,7 +106,7 @@ class ButtonTest : public PageTest {
 
   void report(Place place) {
     std::array<char, SKIA_TEXT_BYTES> words{};
-    std::snprintf(words.data(), words.size(), "%s: %u", kButtons.at(place).caption,
+    std::snprintf(words.data(), words.size(), "%s: %u", tr(kButtons.at(place).caption),
                   ++counts.at(place));
     page.say(words.data());
   }
@@ -126,12 +127,12 @@ class ButtonTest : public PageTest {
 };
 
 const std::array<ButtonTest::ButtonRow, ButtonTest::kButtonCount> ButtonTest::kButtons = {{
-    {"Press", &Widget::pressCallback, [](int) { self().report(kPress); }},
-    {"Click", &Widget::clickCallback, [](int) { self().report(kClick); }},
-    {"Long press", &Widget::longPressCallback, [](int) { self().report(kLongPress); }},
-    {"Double click", &Widget::doubleClickCallback, [](int) { self().report(kDoubleClick); }},
-    {"Delayed show", &Widget::clickCallback, [](int) { self().showLate(); }},
-    {"Hide me", &Widget::clickCallback, [](int) { self().hideLate(); }},
+    {msg("Press"), &Widget::pressCallback, [](int) { self().report(kPress); }},
+    {msg("Click"), &Widget::clickCallback, [](int) { self().report(kClick); }},
+    {msg("Long press"), &Widget::longPressCallback, [](int) { self().report(kLongPress); }},
+    {msg("Double click"), &Widget::doubleClickCallback, [](int) { self().report(kDoubleClick); }},
+    {msg("Delayed show"), &Widget::clickCallback, [](int) { self().showLate(); }},
+    {msg("Hide me"), &Widget::clickCallback, [](int) { self().hideLate(); }},
 }};
 
 }  // namespace

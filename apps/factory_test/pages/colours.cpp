@@ -10,6 +10,7 @@
 #include <vector>
 
 #include "current.h"
+#include "language/language.h"
 #include "on_top.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -27,7 +28,8 @@ constexpr int kColours = MW::FullScreen::kGrey + 1;
 class ColourTest : public LookTest {
  public:
   ColourTest()
-      : LookTest("Colours", "Say what you saw: pixels and places\nthat differ are a fault.") {}
+      : LookTest(tr("Colours"),
+                 tr("Say what you saw: pixels and places\nthat differ are a fault.")) {}
 
   bool isComplete() const override { return shown >= kColours - 1; }
 
@@ -48,7 +50,7 @@ class ColourTest : public LookTest {
     };
   }
 
-  std::string question() const override { return "Was every colour even?"; }
+  std::string question() const override { return tr("Was every colour even?"); }
 
   void endLook() override {
     key.reset();

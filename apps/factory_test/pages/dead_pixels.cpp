@@ -4,6 +4,7 @@
 #include <array>
 #include <memory>
 
+#include "language/language.h"
 #include "layout.h"
 #include "pages/table.h"
 #include "step_page.h"
@@ -98,11 +99,11 @@ class DeadPixelsPage : public StepPage {
  public:
   explicit DeadPixelsPage(const Context& program)
       : StepPage(program, {.test = "dead_pixels",
-                           .title = "Dead pixels",
-                           .words = "Look for pixels that differ,\nin each of twelve pictures.\n"
-                                    "Tap: the next one.",
+                           .title = tr("Dead pixels"),
+                           .words = tr("Look for pixels that differ,\nin each of twelve pictures.\n"
+                                       "Tap: the next one."),
                            .value = "patterns confirmed",
-                           .question = "Was every picture even?",
+                           .question = tr("Was every picture even?"),
                            .count = kPatterns.size()}) {}
 
  protected:

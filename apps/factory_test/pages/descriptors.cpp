@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "pages/table.h"
 #include "test.h"
@@ -111,7 +112,7 @@ class DescriptorTest : public Test {
     constexpr int kColumnPercent = 10;
     std::array<SKIA_Text, kTexts> texts;
     std::ranges::transform(entry.texts, texts.begin(), [](const char* words) {
-      return captionOf(words != nullptr ? words : "", MW::kColorWhite);
+      return captionOf(words != nullptr ? tr(words) : "", MW::kColorWhite);
     });
     MW::ref_t ref;
     ref.kind = entry.kind;
@@ -125,7 +126,7 @@ class DescriptorTest : public Test {
                 percentOf(screen.width, columns * kColumnPercent), percentOf(screen.height, height),
                 color};
     ref.lineWidth = kLineWidth;
-    ref.text = captionOf(entry.words, color == kBarColor ? MW::kColorBlack : MW::kColorWhite);
+    ref.text = captionOf(tr(entry.words), color == kBarColor ? MW::kColorBlack : MW::kColorWhite);
     ref.desc = entry.texts.front() != nullptr ? texts.data() : nullptr;
     built.push_back(std::make_unique<MW::WidgetRcui>(&ref, &entry.callbacks, MW::kUnused));
     if (ref.index > 0) MW::WidgetList::show(ref.index);
@@ -141,46 +142,51 @@ class DescriptorTest : public Test {
 const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
     {kRcuiTextbox, true, {0, 0, 10, 100, kPageInk.ground}, ""},
     {kRcuiBox, true, {0, 2, 10, 7, kHeadInk.ground}, ""},
-    {kRcuiLabel, true, {0, 2, 10, 7, 0}, "Built from descriptors"},
+    {kRcuiLabel, true, {0, 2, 10, 7, 0}, msg("Built from descriptors")},
     {kRcuiLine, true, {1, 10, 9, 10, kBarColor}, ""},
-    {kRcuiFirstInColumn, true, {1, 11, 8, 4, kBarColor}, "A column of text boxes:"},
-    {kRcuiNextInColumn, true, kNoPlace, "each stands below the one before,"},
-    {kRcuiNextInColumn, true, kNoPlace, "wherever its own rectangle is."},
-    {kRcuiButton, true, {1, 25, 3, 9, kBarColor}, "Toast", {.cbClick = showTimed}},
-    {kRcuiButton, true, {6, 25, 3, 9, kBarColor}, "White", {.cbClick = whiten}},
+    {kRcuiFirstInColumn, true, {1, 11, 8, 4, kBarColor}, msg("A column of text boxes:")},
+    {kRcuiNextInColumn, true, kNoPlace, msg("each stands below the one before,")},
+    {kRcuiNextInColumn, true, kNoPlace, msg("wherever its own rectangle is.")},
+    {kRcuiButton, true, {1, 25, 3, 9, kBarColor}, msg("Toast"), {.cbClick = showTimed}},
+    {kRcuiButton, true, {6, 25, 3, 9, kBarColor}, msg("White"), {.cbClick = whiten}},
     {kRcuiButton,
      true,
      {1, 35, 3, 9, kBarColor},
-     "Dialog",
+     msg("Dialog"),
      {.cbClick = [](int) { open(kRcuiDialog); }}},
     {kRcuiButton,
      true,
      {6, 35, 3, 9, kBarColor},
-     "Words",
+     msg("Words"),
      {.cbClick = [](int) { open(kRcuiDialogNew); }}},
     {kRcuiSlideFromLeft,
      true,
      {1, 46, 8, 6, kBarColor},
-     "Slide to pass",
+     msg("Slide to pass"),
      {.cbTouchRelease = choose<Outcome::Pass>}},
     {kRcuiSlideFromRight,
      true,
      {1, 53, 8, 6, kBarColor},
-     "Slide to leave",
+     msg("Slide to leave"),
      {.cbTouchRelease = choose<Outcome::Left>}},
-    {kRcuiButton3Left, true, kNoPlace, "PASS", {.cbClick = choose<Outcome::Pass>}},
-    {kRcuiButton3Centre, true, kNoPlace, "RETRY", {.cbClick = choose<Outcome::Retry>}},
-    {kRcuiButton3Right, true, kNoPlace, "FAIL", {.cbClick = choose<Outcome::Fail>}},
-    {kRcuiToastbox, false, {1, 60, 8, 8, kHeadInk.ground}, "A toast", {}, {"with a second line"}},
-    {kRcuiProgressbar, false, {1, 70, 8, 5, kHeadInk.ground}, "Two seconds"},
+    {kRcuiButton3Left, true, kNoPlace, msg("PASS"), {.cbClick = choose<Outcome::Pass>}},
+    {kRcuiButton3Centre, true, kNoPlace, msg("RETRY"), {.cbClick = choose<Outcome::Retry>}},
+    {kRcuiButton3Right, true, kNoPlace, msg("FAIL"), {.cbClick = choose<Outcome::Fail>}},
+    {kRcuiToastbox,
+     false,
+     {1, 60, 8, 8, kHeadInk.ground},
+     msg("A toast"),
+     {},
+     {msg("with a second line")}},
+    {kRcuiProgressbar, false, {1, 70, 8, 5, kHeadInk.ground}, msg("Two seconds")},
     {kRcuiKey, true, {}, "", {.cbKeyPress = followKey}},
     {kRcuiDialog, false, {}, "", {.cbTouchRelease = closeDialogs}},
     {kRcuiDialogNew,
      false,
      {},
-     "Words of its own",
+     msg("Words of its own"),
      {.cbTouchRelease = closeDialogs},
-     {"from a descriptor", "in two lines", "", "OK", ""}},
+     {msg("from a descriptor"), msg("in two lines"), "", msg("OK"), ""}},
     {kRcuiFullScreen, false, {}, ""},
 };
 

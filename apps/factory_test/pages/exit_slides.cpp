@@ -5,6 +5,7 @@
 #include <optional>
 
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -17,14 +18,14 @@ namespace {
 class ExitSlideTest : public PageTest {
  public:
   ExitSlideTest()
-      : PageTest("Exit slides",
-                 "Drag a knob to the other end:\nthe upper one passes, the lower leaves.") {}
+      : PageTest(tr("Exit slides"),
+                 tr("Drag a knob to the other end:\nthe upper one passes, the lower leaves.")) {}
 
   void enter() override {
     page.ask();
     const auto rows = rowsOf<5>(inColor(contentArea(), kButtonInk.ground), 0, {1, 2, 1, 2, 1});
-    place(passing, rows[1], MW::SlideE::kFromLeft, "Slide to pass");
-    place(leaving, rows[3], MW::SlideE::kFromRight, "Slide to leave");
+    place(passing, rows[1], MW::SlideE::kFromLeft, tr("Slide to pass"));
+    place(leaving, rows[3], MW::SlideE::kFromRight, tr("Slide to leave"));
     passing->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Pass; };
     leaving->exitCallback = [](int) { Current<ExitSlideTest>::get().ended = Outcome::Left; };
   }

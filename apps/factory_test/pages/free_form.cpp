@@ -7,6 +7,7 @@
 #include <string>
 
 #include "current.h"
+#include "language/language.h"
 #include "page_test.h"
 #include "pages/table.h"
 
@@ -17,17 +18,18 @@ namespace {
 /// A touch, too, shows the next dialog; the slide of the last one ends the look.
 class FreeFormTest : public StepTest {
  public:
-  FreeFormTest() : StepTest("Free-form dialogs", "Say whether every dialog looked right.") {}
+  FreeFormTest()
+      : StepTest(tr("Free-form dialogs"), tr("Say whether every dialog looked right.")) {}
 
  protected:
-  std::string question() const override { return "Did all dialogs look right?"; }
+  std::string question() const override { return tr("Did all dialogs look right?"); }
   int lastStep() const override { return static_cast<int>(kSteps.size()) - 1; }
 
   void showStep(int step) override {
     dialog.reset();
     (this->*kSteps.at(static_cast<std::size_t>(step)))();
     dialog->setActive(1);
-    page.say(("Dialog " + std::to_string(step + 1)).c_str());
+    page.say((tr("Dialog ") + std::to_string(step + 1)).c_str());
   }
 
   void endSteps() override { dialog.reset(); }
@@ -47,23 +49,23 @@ class FreeFormTest : public StepTest {
     return kept;
   }
 
-  void putWords() { put("Words alone").setDesc("One line", nullptr, nullptr); }
+  void putWords() { put(tr("Words alone")).setDesc(tr("One line"), nullptr, nullptr); }
 
   void putOneButton() {
-    MW::DialogNew& made = put("One button");
-    made.setDesc("Two lines,", "one above the other", nullptr);
-    made.setbutton("OK", nullptr);
+    MW::DialogNew& made = put(tr("One button"));
+    made.setDesc(tr("Two lines,"), tr("one above the other"), nullptr);
+    made.setbutton(tr("OK"), nullptr);
   }
 
   void putTwoButtons() {
-    MW::DialogNew& made = put("Two buttons");
-    made.setDesc("Three lines", "in the middle", "of the dialog", SKIA_ALIGN_CENTRE);
-    made.setbutton("YES", "NO");
+    MW::DialogNew& made = put(tr("Two buttons"));
+    made.setDesc(tr("Three lines"), tr("in the middle"), tr("of the dialog"), SKIA_ALIGN_CENTRE);
+    made.setbutton(tr("YES"), tr("NO"));
   }
 
   void putProgress() {
-    MW::DialogNew& made = put("Progress");
-    made.setDesc("Something goes on", nullptr, nullptr);
+    MW::DialogNew& made = put(tr("Progress"));
+    made.setDesc(tr("Something goes on"), nullptr, nullptr);
     made.setProgress(MW::kUnused);
   }
 

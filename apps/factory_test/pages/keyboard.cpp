@@ -9,6 +9,7 @@
 
 #include "button_row.h"
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -21,8 +22,9 @@ namespace {
 class KeyboardTest : public PageTest {
  public:
   KeyboardTest()
-      : PageTest("Keyboard",
-                 "Type and enter. The buttons below, or key up,\nchange the layout; fold ends.") {}
+      : PageTest(
+            tr("Keyboard"),
+            tr("Type and enter. The buttons below, or key up,\nchange the layout; fold ends.")) {}
 
   void enter() override {
     page.ask().otherKey = [](unsigned int code) {
@@ -66,7 +68,7 @@ class KeyboardTest : public PageTest {
     const std::string entered = from.getResultString();
     if (entered.empty()) return;
     from.setResultString("");
-    page.say(("Entered: " + entered).c_str());
+    page.say((tr("Entered: ") + entered).c_str());
   }
 
   Current<KeyboardTest> current{this};

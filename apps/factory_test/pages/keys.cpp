@@ -13,6 +13,7 @@
 
 #include "current.h"
 #include "key_bounce.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -32,18 +33,18 @@ struct KeyName {
 constexpr unsigned int kTwice = 1;
 constexpr unsigned int kThreeTimes = 2;
 constexpr auto kAsked = std::to_array<KeyName>({
-    {MW::kKeyUp, "Up"},
-    {MW::kKeyDown, "Down"},
-    {MW::kKeyLeft, "Left"},
-    {MW::kKeyRight, "Right"},
-    {MW::kKeySelect, "Select"},
-    {MW::kKeyHook, "Hook"},
-    {BRIMOL_CODE_VOLUME_UP, "Volume up"},
-    {BRIMOL_CODE_VOLUME_DOWN, "Volume down"},
-    {BRIMOL_CODE_POWER, "Power"},
-    {BRIMOL_CODE_HOME, "Home"},
-    {kTwice, "Twice"},
-    {kThreeTimes, "Three times"},
+    {MW::kKeyUp, msg("Up")},
+    {MW::kKeyDown, msg("Down")},
+    {MW::kKeyLeft, msg("Left")},
+    {MW::kKeyRight, msg("Right")},
+    {MW::kKeySelect, msg("Select")},
+    {MW::kKeyHook, msg("Hook")},
+    {BRIMOL_CODE_VOLUME_UP, msg("Volume up")},
+    {BRIMOL_CODE_VOLUME_DOWN, msg("Volume down")},
+    {BRIMOL_CODE_POWER, msg("Power")},
+    {BRIMOL_CODE_HOME, msg("Home")},
+    {kTwice, msg("Twice")},
+    {kThreeTimes, msg("Three times")},
 });
 constexpr auto kKeys = static_cast<std::ptrdiff_t>(kAsked.size()) - 2;
 
@@ -51,8 +52,9 @@ constexpr auto kKeys = static_cast<std::ptrdiff_t>(kAsked.size()) - 2;
 class KeyTest : public PageTest {
  public:
   KeyTest()
-      : PageTest("Keys",
-                 "Press every key once, one twice and one\nthree times. Back three times: FAIL.") {}
+      : PageTest(
+            tr("Keys"),
+            tr("Press every key once, one twice and one\nthree times. Back three times: FAIL.")) {}
 
   void enter() override {
     page.ask(VerdictBar::Keys::Free);
@@ -109,14 +111,14 @@ class KeyTest : public PageTest {
     const auto* const row = std::ranges::find(kAsked, code, &KeyName::code);
     if (row == kAsked.end()) return;
     pressed.at(static_cast<std::size_t>(row - kAsked.begin())) = true;
-    page.say(row->name);
+    page.say(tr(row->name));
   }
 
   static void drawKey(int index, bool isPressed) {
     const ScreenSize screen = screenSize();
     const Grid grid = isLandscape(screen) ? Grid{3, 4} : Grid{4, 3};
-    const std::string words =
-        std::string(kAsked.at(static_cast<std::size_t>(index)).name) + (isPressed ? "\nOK" : "");
+    const std::string words = std::string(tr(kAsked.at(static_cast<std::size_t>(index)).name)) +
+                              (isPressed ? "\nOK" : "");
     const Ink ink = isPressed ? kPassInk : kButtonInk;
     skia_add_textbox_c(inColor(cellOf(contentArea(), gapOf(screen), grid, index), ink.ground),
                        captionOf(words.c_str(), ink.text));

@@ -8,6 +8,7 @@
 #include <string>
 
 #include "current.h"
+#include "language/language.h"
 #include "page_test.h"
 #include "pages/table.h"
 
@@ -15,18 +16,19 @@ namespace factory_test {
 
 namespace {
 
-constexpr auto kRows = std::to_array<const char*>({"Main board", "Display", "Camera", "Antenna"});
+constexpr auto kRows =
+    std::to_array<const char*>({msg("Main board"), msg("Display"), msg("Camera"), msg("Antenna")});
 constexpr int kFirstChoice = 1;
 
 /// OK, CANCEL and the keys select and back end the look.
 class ListTest : public LookTest {
  public:
-  ListTest() : LookTest("List choice", "Choose a row, then OK.") {}
+  ListTest() : LookTest(tr("List choice"), tr("Choose a row, then OK.")) {}
 
  protected:
   void beginLook() override {
-    list.emplace("Which part?");
-    for (const char* const row : kRows) list->addIndex(row);
+    list.emplace(tr("Which part?"));
+    for (const char* const row : kRows) list->addIndex(tr(row));
     list->initFinish(chosen);
     // NOLINTBEGIN(readability-non-const-parameter): the callbacks' type
     list->rowPressCallback = [](int* row) { self().mark(*row); };
@@ -39,11 +41,11 @@ class ListTest : public LookTest {
 
   void endLook() override { list.reset(); }
 
-  std::string question() const override { return nameOf(chosen) + ". Was that your choice?"; }
+  std::string question() const override { return nameOf(chosen) + tr(". Was that your choice?"); }
 
  private:
   static ListTest& self() { return Current<ListTest>::get(); }
-  static std::string nameOf(int row) { return kRows.at(static_cast<std::size_t>(row)); }
+  static std::string nameOf(int row) { return tr(kRows.at(static_cast<std::size_t>(row))); }
 
   void mark(int row) { page.say(nameOf(row).c_str()); }
 

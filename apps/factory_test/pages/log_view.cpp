@@ -12,6 +12,7 @@
 
 #include "button_row.h"
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -66,8 +67,8 @@ class Viewer : public MW::StaticText {
 class LogTest : public PageTest {
  public:
   explicit LogTest(const Context& program)
-      : PageTest("Log",
-                 "Drag to scroll. Search, then Previous\nand Next, or the keys up and down."),
+      : PageTest(tr("Log"),
+                 tr("Drag to scroll. Search, then Previous\nand Next, or the keys up and down.")),
         text(newestLines(program.logText ? *program.logText : program.log.text(), leftOut)) {}
 
   void enter() override {
@@ -78,7 +79,7 @@ class LogTest : public PageTest {
     placeViewer();
     placeKeyboard();
     buttons.emplace(layOutLog().buttons, kFaces);
-    if (leftOut > 0) page.say((std::to_string(leftOut) + " older lines are left out").c_str());
+    if (leftOut > 0) page.say((std::to_string(leftOut) + tr(" older lines are left out")).c_str());
   }
 
   void leave() override {
@@ -170,9 +171,9 @@ class LogTest : public PageTest {
 };
 
 const std::array<ButtonRow::Face, 3> LogTest::kFaces = {{
-    {"Search", [](int) { self().openKeyboard(); }},
-    {"Previous", [](int) { self().jump(Viewer::kPrevious); }},
-    {"Next", [](int) { self().jump(Viewer::kNext); }},
+    {msg("Search"), [](int) { self().openKeyboard(); }},
+    {msg("Previous"), [](int) { self().jump(Viewer::kPrevious); }},
+    {msg("Next"), [](int) { self().jump(Viewer::kNext); }},
 }};
 
 }  // namespace

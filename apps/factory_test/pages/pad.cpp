@@ -11,6 +11,7 @@
 
 #include "button_row.h"
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -26,9 +27,8 @@ constexpr int kLayouts = MW::Button8::kTwoByFour + 1;
 class PadTest : public PageTest {
  public:
   PadTest()
-      : PageTest("Multi-touch pad",
-                 "Hold the cells with several fingers at once.\n"
-                 "The button, or key up: the next layout.") {}
+      : PageTest(tr("Multi-touch pad"), tr("Hold the cells with several fingers at once.\n"
+                                           "The button, or key up: the next layout.")) {}
 
   void enter() override {
     page.ask().otherKey = [](unsigned int code) {
@@ -80,7 +80,7 @@ class PadTest : public PageTest {
     const std::bitset<MW::Button8::kCells> held(mask);
     heldAtOnce = std::max(heldAtOnce.load(), held.count());
     const std::string cells = held.to_string();
-    page.say(("Layout " + std::to_string(layout) + ", held " + cells).c_str());
+    page.say((tr("Layout ") + std::to_string(layout) + tr(", held ") + cells).c_str());
   }
 
   Current<PadTest> current{this};
@@ -91,7 +91,7 @@ class PadTest : public PageTest {
 };
 
 const std::array<ButtonRow::Face, 1> PadTest::kFaces = {{
-    {"Next layout", [](int) { self().nextLayout(); }},
+    {msg("Next layout"), [](int) { self().nextLayout(); }},
 }};
 
 }  // namespace

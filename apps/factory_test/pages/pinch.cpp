@@ -5,6 +5,7 @@
 #include <memory>
 #include <vector>
 
+#include "language/language.h"
 #include "layout.h"
 #include "measure_page.h"
 #include "pages/table.h"
@@ -21,8 +22,8 @@ constexpr uint32_t kSpokeColor = 0xFFE8C040;
 class PinchPage : public MeasurePage {
  public:
   explicit PinchPage(const Context& program)
-      : MeasurePage(program, "pinch", "Pinch",
-                    "Put the fingers down together,\nthen spread them.") {}
+      : MeasurePage(program, "pinch", tr("Pinch"),
+                    tr("Put the fingers down together,\nthen spread them.")) {}
 
   std::vector<Measure> values() const override {
     return {measure("fingers counted", most), measure("narrowest", millimetres(narrowest)),

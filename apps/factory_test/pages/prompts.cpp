@@ -6,6 +6,7 @@
 #include <string>
 
 #include "current.h"
+#include "language/language.h"
 #include "page_test.h"
 #include "pages/table.h"
 
@@ -16,10 +17,10 @@ namespace {
 /// A touch, too, shows the next kind.
 class PromptTest : public StepTest {
  public:
-  PromptTest() : StepTest("Prompts", "Say whether every dialog looked right.") {}
+  PromptTest() : StepTest(tr("Prompts"), tr("Say whether every dialog looked right.")) {}
 
  protected:
-  std::string question() const override { return "Did all dialogs look right?"; }
+  std::string question() const override { return tr("Did all dialogs look right?"); }
   int lastStep() const override { return MW::Dialog::kLeaveLightSensor; }
 
   void showStep(int kind) override {
@@ -31,7 +32,7 @@ class PromptTest : public StepTest {
       Current<PromptTest>::get().followKey(event->code);
     };
     made.setActive(1);
-    page.say(("Dialog of kind " + std::to_string(kind)).c_str());
+    page.say((tr("Dialog of kind ") + std::to_string(kind)).c_str());
   }
 
   void endSteps() override { dialog.reset(); }

@@ -10,6 +10,7 @@
 
 #include "button_row.h"
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -35,8 +36,8 @@ enum class Details { Shown, LeftOut };
 
 // The last column is the widest: names stand there.
 std::string wordsOf(const TestEntry& entry, const TestResult& result, Details details) {
-  std::string words = lineOf(kTest, verdictName(result.verdict),
-                             std::to_string(result.duration.count()) + " ms", entry.name);
+  std::string words = lineOf(kTest, tr(verdictName(result.verdict)),
+                             std::to_string(result.duration.count()) + " ms", tr(entry.name));
   if (details == Details::LeftOut) return words;
   const std::string started = utcText(result.started);
   constexpr std::size_t kDateBytes = 10;
@@ -59,8 +60,8 @@ std::string wordsOf(Group group, const ResultBook& book, Details details) {
     if (result->verdict != Verdict::None) ++done;
     words += wordsOf(entry, *result, details);
   }
-  const std::string count = std::to_string(done) + " of " + std::to_string(tests);
-  return lineOf(kGroup, count, "done", nameOf(group)) + words;
+  const std::string count = std::to_string(done) + tr(" of ") + std::to_string(tests);
+  return lineOf(kGroup, count, tr("done"), nameOf(group)) + words;
 }
 
 // The list never hides its last line, nor does that one open: it closes the list.
@@ -71,7 +72,7 @@ std::string wordsOf(const ResultBook& book, Details details) {
   }
   const auto done = std::ranges::count_if(
       book.results(), [](const TestResult& result) { return result.verdict != Verdict::None; });
-  return words + lineOf(kGroup, std::to_string(done), "verdicts", "All");
+  return words + lineOf(kGroup, std::to_string(done), tr("verdicts"), tr("All"));
 }
 
 // What the list has room for.
@@ -86,7 +87,7 @@ std::string wordsOf(const ResultBook& book) {
 class ResultListTest : public LookTest {
  public:
   explicit ResultListTest(const Context& program)
-      : LookTest("Results", "Say whether all results were there."),
+      : LookTest(tr("Results"), tr("Say whether all results were there.")),
         words(wordsOf(program.results)) {}
 
   void draw() override {
@@ -99,12 +100,12 @@ class ResultListTest : public LookTest {
 
  protected:
   void beginLook() override {
-    list.emplace("Results").cal_line(words.c_str(), static_cast<int>(words.size()));
+    list.emplace(tr("Results")).cal_line(words.c_str(), static_cast<int>(words.size()));
     list->key_press_cb = [](MW::kbd_event* event, MW::MpdWid*) {
       self().finishLookOn(event->code);
     };
     const auto [left, right] = header();
-    const SKIA_Text hint = captionOf("Tap a line twice");
+    const SKIA_Text hint = captionOf(tr("Tap a line twice"));
     heading.emplace(MW::ButtonS::kTextBox, &left, &hint).setActive(1);
     done.emplace(right, kFaces);
   }
@@ -115,7 +116,7 @@ class ResultListTest : public LookTest {
     list.reset();
   }
 
-  std::string question() const override { return "Were all results there?"; }
+  std::string question() const override { return tr("Were all results there?"); }
 
  private:
   static const std::array<ButtonRow::Face, 1> kFaces;
@@ -141,7 +142,7 @@ class ResultListTest : public LookTest {
 };
 
 const std::array<ButtonRow::Face, 1> ResultListTest::kFaces = {{
-    {"Done", [](int) { self().finishLook(); }},
+    {msg("Done"), [](int) { self().finishLook(); }},
 }};
 
 }  // namespace

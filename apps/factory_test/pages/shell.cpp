@@ -9,6 +9,7 @@
 
 #include "command.h"
 #include "current.h"
+#include "language/language.h"
 #include "page_test.h"
 #include "pages/table.h"
 
@@ -23,7 +24,7 @@ constexpr std::size_t kCharacterRest = 3;  // bytes of a character behind its fi
 class ShellTest : public LookTest {
  public:
   explicit ShellTest(const Context& program)
-      : LookTest("Shell", "A command and what it writes."), line(program.shellCommand) {}
+      : LookTest(tr("Shell"), tr("A command and what it writes.")), line(program.shellCommand) {}
 
  protected:
   void beginLook() override {
@@ -54,7 +55,7 @@ class ShellTest : public LookTest {
     if (!bytes.empty() || !command) MW::isDisplayUpdate(1);
   }
 
-  std::string question() const override { return "Did the command do its work?"; }
+  std::string question() const override { return tr("Did the command do its work?"); }
 
  private:
   void take(char byte) {

@@ -8,6 +8,7 @@
 #include <string>
 
 #include "current.h"
+#include "language/language.h"
 #include "page_test.h"
 #include "pages/table.h"
 
@@ -20,11 +21,11 @@ constexpr auto kChoices = std::to_array<const char*>({"2G", "3G", "4G", "5G", "B
 /// A choice, and the keys select and back, end the look.
 class SixChoiceTest : public LookTest {
  public:
-  SixChoiceTest() : LookTest("Six-way choice", "Choose one.") {}
+  SixChoiceTest() : LookTest(tr("Six-way choice"), tr("Choose one.")) {}
 
  protected:
   void beginLook() override {
-    dialog.emplace(MW::kUnused).setTitle("Which radio?");
+    dialog.emplace(MW::kUnused).setTitle(tr("Which radio?"));
     for (std::size_t i = 0; i < kChoices.size(); ++i) {
       dialog->setText_str(static_cast<unsigned int>(i), kChoices.at(i));
     }
@@ -37,8 +38,8 @@ class SixChoiceTest : public LookTest {
 
   std::string question() const override {
     const unsigned int number = chosen;
-    if (number == 0) return "Did all choices look right?";
-    return std::string(kChoices.at(number - 1)) + ". Was that your choice?";
+    if (number == 0) return tr("Did all choices look right?");
+    return std::string(kChoices.at(number - 1)) + tr(". Was that your choice?");
   }
 
  private:

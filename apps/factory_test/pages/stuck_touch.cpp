@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include "language/language.h"
 #include "layout.h"
 #include "measure_page.h"
 #include "pages/table.h"
@@ -19,8 +20,8 @@ namespace {
 class StuckTouchPage : public MeasurePage {
  public:
   explicit StuckTouchPage(const Context& program)
-      : MeasurePage(program, "stuck_touch", "Stuck touch",
-                    "Put the phone down\nand do not touch it.") {}
+      : MeasurePage(program, "stuck_touch", tr("Stuck touch"),
+                    tr("Put the phone down\nand do not touch it.")) {}
 
   std::vector<Measure> values() const override { return {measure("touches seen", touches)}; }
 

@@ -11,6 +11,7 @@
 #include <utility>
 
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -47,21 +48,21 @@ struct StyleRow {
 
 // Events come to the last but one first, and it lets the last one have them, too.
 constexpr auto kStyles = std::to_array<StyleRow>({
-    {"Button box", kButtonInk.ground, makeStyled<MW::ButtonS, MW::ButtonS::kButtonBox>},
-    {"Text box", kButtonInk.ground, makeStyled<MW::ButtonS, MW::ButtonS::kTextBox>},
-    {"Box", kButtonInk.ground, makeStyled<MW::ButtonNew, MW::ButtonNew::kButtonBox>},
-    {"Text", kButtonInk.ground, makeStyled<MW::ButtonNew, MW::ButtonNew::kTextBox>},
-    {"Framed", kButtonInk.ground, makeStyled<MW::ButtonNew, MW::ButtonNew::kFramed>},
-    {"Both", kButtonInk.ground, makeStyled<MW::ButtonS, MW::ButtonS::kPassOn>},
-    {"One", MW::kColorWhite, makePlain},
+    {msg("Button box"), kButtonInk.ground, makeStyled<MW::ButtonS, MW::ButtonS::kButtonBox>},
+    {msg("Text box"), kButtonInk.ground, makeStyled<MW::ButtonS, MW::ButtonS::kTextBox>},
+    {msg("Box"), kButtonInk.ground, makeStyled<MW::ButtonNew, MW::ButtonNew::kButtonBox>},
+    {msg("Text"), kButtonInk.ground, makeStyled<MW::ButtonNew, MW::ButtonNew::kTextBox>},
+    {msg("Framed"), kButtonInk.ground, makeStyled<MW::ButtonNew, MW::ButtonNew::kFramed>},
+    {msg("Both"), kButtonInk.ground, makeStyled<MW::ButtonS, MW::ButtonS::kPassOn>},
+    {msg("One"), MW::kColorWhite, makePlain},
 });
 
 /// Counts the clicks of each.
 class StyleTest : public PageTest {
  public:
   StyleTest()
-      : PageTest("Button styles",
-                 "Every button counts its clicks;\na click on the lowest counts twice.") {}
+      : PageTest(tr("Button styles"),
+                 tr("Every button counts its clicks;\na click on the lowest counts twice.")) {}
 
   void enter() override {
     page.ask();
@@ -87,7 +88,7 @@ class StyleTest : public PageTest {
     const StyleRow& row = kStyles.at(index);
     const auto places = placesOf(contentArea(), gapOf(screenSize()));
     buttons.at(index) =
-        row.make(inColor(places.at(index), row.color), captionOf(row.name, kButtonInk.text));
+        row.make(inColor(places.at(index), row.color), captionOf(tr(row.name), kButtonInk.text));
     buttons.at(index)->setBdColor(MW::kColorBlack);  // of the framed one
     buttons.at(index)->clickCallback = clicked;
     buttons.at(index)->setActive(1);
@@ -95,8 +96,8 @@ class StyleTest : public PageTest {
 
   void count(std::size_t index) {
     ++counts.at(index);
-    std::string words(kStyles.at(index).name);
-    words.append(" ").append(std::to_string(counts.at(index))).append(", all:");
+    std::string words(tr(kStyles.at(index).name));
+    words.append(" ").append(std::to_string(counts.at(index))).append(tr(", all:"));
     for (const auto& each : counts) words.append(" ").append(std::to_string(each));
     page.say(words.c_str());
   }

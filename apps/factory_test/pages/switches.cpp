@@ -6,6 +6,7 @@
 #include <optional>
 
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -20,17 +21,17 @@ constexpr int kRightBit = MW::Slide::kFullLeft ^ MW::Slide::kFullRight;
 class SwitchTest : public PageTest {
  public:
   SwitchTest()
-      : PageTest("Switches",
-                 "Drag the switches to and fro.\nTap the locked one twice to unlock it.\n"
-                 "Key up moves the first two.") {}
+      : PageTest(tr("Switches"),
+                 tr("Drag the switches to and fro.\nTap the locked one twice to unlock it.\n"
+                    "Key up moves the first two.")) {}
 
   void enter() override {
     page.ask().otherKey = [](unsigned int code) {
       if (code == MW::kKeyUp) Current<SwitchTest>::get().moveAll();
     };
-    place(full, 0, MW::Slide::kFullLeft, "Full way");
-    place(half, 1, MW::Slide::kHalfLeft, "Half way");
-    place(locked, 2, MW::Slide::kFullLeft, "Locked");
+    place(full, 0, MW::Slide::kFullLeft, tr("Full way"));
+    place(half, 1, MW::Slide::kHalfLeft, tr("Half way"));
+    place(locked, 2, MW::Slide::kFullLeft, tr("Locked"));
     locked->Lock();
     locked->doubleClickCallback = [](MW::mouse_event*) { Current<SwitchTest>::get().unlock(); };
   }
@@ -50,20 +51,20 @@ class SwitchTest : public PageTest {
     const SKIA_Rect& area = rows.at(static_cast<std::size_t>(row) + 1);
     const SKIA_Text caption = captionOf(words);
     slide.emplace(state, &area, &caption, nullptr);
-    slide->leftCallback = [](int) { Current<SwitchTest>::get().page.say("Left"); };
-    slide->rightCallback = [](int) { Current<SwitchTest>::get().page.say("Right"); };
+    slide->leftCallback = [](int) { Current<SwitchTest>::get().page.say(tr("Left")); };
+    slide->rightCallback = [](int) { Current<SwitchTest>::get().page.say(tr("Right")); };
     slide->setActive(1);
   }
 
   void moveAll() {
     std::atomic_ref(full->state).fetch_xor(kRightBit);
     std::atomic_ref(half->state).fetch_xor(kRightBit);
-    page.say((full->state & kRightBit) != 0 ? "Right" : "Left");
+    page.say((full->state & kRightBit) != 0 ? tr("Right") : tr("Left"));
   }
 
   void unlock() {
     locked->unLock();
-    page.say("Unlocked");
+    page.say(tr("Unlocked"));
   }
 
   Current<SwitchTest> current{this};

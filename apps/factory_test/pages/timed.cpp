@@ -8,6 +8,7 @@
 #include <optional>
 
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -23,8 +24,9 @@ constexpr int kProgressMs = 3000;
 class TimedTest : public PageTest {
  public:
   TimedTest()
-      : PageTest("Toast and progress",
-                 "Each button shows something for a while.\nKey up: toast. Key down: progress.") {}
+      : PageTest(
+            tr("Toast and progress"),
+            tr("Each button shows something for a while.\nKey up: toast. Key down: progress.")) {}
 
   void enter() override {
     page.ask().otherKey = [](unsigned int code) { Current<TimedTest>::get().followKey(code); };
@@ -32,8 +34,8 @@ class TimedTest : public PageTest {
     // A progress bar is twice as high as its area.
     const auto [row, above, lower, under] = rowsOf<4>(contentArea(), 2 * gap, {3, 3, 2, 3});
     const auto [left, right] = columnsOf<2>(inColor(row, kButtonInk.ground), gap, {1, 1});
-    placeButton(toastButton, left, "Toast");
-    placeButton(progressButton, right, "Progress");
+    placeButton(toastButton, left, tr("Toast"));
+    placeButton(progressButton, right, tr("Progress"));
     toastButton->clickCallback = [](int) { Current<TimedTest>::get().startToast(); };
     progressButton->clickCallback = [](int) { Current<TimedTest>::get().startProgress(); };
     placeToast(inColor(above, kRowInk.ground));
@@ -58,26 +60,26 @@ class TimedTest : public PageTest {
   }
 
   void placeToast(const SKIA_Rect& area) {
-    const SKIA_Text first = captionOf("A toast", kRowInk.text);
-    const SKIA_Text second = captionOf("goes in two seconds", kRowInk.text);
+    const SKIA_Text first = captionOf(tr("A toast"), kRowInk.text);
+    const SKIA_Text second = captionOf(tr("goes in two seconds"), kRowInk.text);
     toast.emplace(&area, &first, &second);
   }
 
   void placeProgress(const SKIA_Rect& area) {
-    const SKIA_Text caption = captionOf("Three seconds of work", kHeadInk.text);
+    const SKIA_Text caption = captionOf(tr("Three seconds of work"), kHeadInk.text);
     progress.emplace(MW::kUnused, &area, &caption);
   }
 
   void startToast() {
     toasted = true;
     toast->onHideTimer(kToastMs);
-    page.say("Toast for two seconds");
+    page.say(tr("Toast for two seconds"));
   }
 
   void startProgress() {
     progressed = true;
     progress->onProgressbar(kProgressMs);
-    page.say("Progress for three seconds");
+    page.say(tr("Progress for three seconds"));
   }
 
   void followKey(unsigned int code) {

@@ -9,6 +9,7 @@
 #include <optional>
 
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -25,7 +26,8 @@ constexpr int kCrossWidth = 3;  // pixels
 /// select key, ends the look, and the verdict is asked for.
 class TouchTest : public LookTest {
  public:
-  TouchTest() : LookTest("Touch", "Touch and drag everywhere.\nHold a finger still to end.") {}
+  TouchTest()
+      : LookTest(tr("Touch"), tr("Touch and drag everywhere.\nHold a finger still to end.")) {}
 
   bool isComplete() const override { return x >= 0; }
 
@@ -38,15 +40,15 @@ class TouchTest : public LookTest {
  protected:
   void beginLook() override {
     touch.emplace();
-    touch->pressCallback = [](MW::mouse_event* mouse) { self().tell("Press", *mouse); };
-    touch->hoverCallback = [](MW::mouse_event* mouse) { self().tell("Move", *mouse); };
-    touch->clickCallback = [](MW::mouse_event* mouse) { self().tell("Lift", *mouse); };
+    touch->pressCallback = [](MW::mouse_event* mouse) { self().tell(tr("Press"), *mouse); };
+    touch->hoverCallback = [](MW::mouse_event* mouse) { self().tell(tr("Move"), *mouse); };
+    touch->clickCallback = [](MW::mouse_event* mouse) { self().tell(tr("Lift"), *mouse); };
     touch->longPressCallback = [](MW::mouse_event*) { self().finishLook(); };
     touch->setActive(1);
     key.emplace().keyPressCallback = [](MW::kbd_event* event) { self().finishLookOn(event->code); };
   }
 
-  std::string question() const override { return "Long press. Was every touch met?"; }
+  std::string question() const override { return tr("Long press. Was every touch met?"); }
 
   void endLook() override {
     key.reset();
@@ -68,7 +70,7 @@ class TouchTest : public LookTest {
     x = mouse.x;
     y = mouse.y;
     std::array<char, SKIA_TEXT_BYTES> words{};
-    std::snprintf(words.data(), words.size(), "%s: finger %u at %d, %d", what, mouse.finger,
+    std::snprintf(words.data(), words.size(), tr("%s: finger %u at %d, %d"), what, mouse.finger,
                   mouse.x, mouse.y);
     page.say(words.data());
   }

@@ -3,6 +3,7 @@
 #include <memory>
 #include <vector>
 
+#include "language/language.h"
 #include "layout.h"
 #include "measure_page.h"
 #include "pages/table.h"
@@ -18,10 +19,10 @@ constexpr int kGap = 1;  // pixels between cells
 class TouchGridPage : public MeasurePage {
  public:
   explicit TouchGridPage(const Context& program)
-      : MeasurePage(program, "touch_grid", "Touch grid",
-                    "Paint every cell,\nedges and corners too."),
+      : MeasurePage(program, "touch_grid", tr("Touch grid"),
+                    tr("Paint every cell,\nedges and corners too.")),
         grid(gridOf(pixelsOf(parameter("cell mm"), 1, kMostPixels))),
-        painted(static_cast<std::size_t>(grid.rows * grid.columns)) {}
+        painted(placeOf(grid.rows, 0)) {}
 
   std::vector<Measure> values() const override {
     return {measure("cells", static_cast<double>(painted.size())),
@@ -34,7 +35,7 @@ class TouchGridPage : public MeasurePage {
     if (input.kind == Input::Kind::KeyPress || input.kind == Input::Kind::KeyRelease) return;
     const int column = std::clamp(input.x * grid.columns / screen.width, 0, grid.columns - 1);
     const int row = std::clamp(input.y * grid.rows / screen.height, 0, grid.rows - 1);
-    painted.at(static_cast<std::size_t>(row * grid.columns + column)) = true;
+    painted.at(placeOf(row, column)) = true;
   }
 
   bool isDone() const override { return std::ranges::count(painted, false) == 0; }
@@ -65,6 +66,11 @@ class TouchGridPage : public MeasurePage {
   static Cells gridOf(int side) {
     const ScreenSize screen = screenSize();
     return {std::max(screen.height / side, 1), std::max(screen.width / side, 1)};
+  }
+
+  std::size_t placeOf(int row, int column) const {
+    return static_cast<std::size_t>(row) * static_cast<std::size_t>(grid.columns) +
+           static_cast<std::size_t>(column);
   }
 
   Cells grid;

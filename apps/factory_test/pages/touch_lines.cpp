@@ -7,6 +7,7 @@
 #include <utility>
 #include <vector>
 
+#include "language/language.h"
 #include "layout.h"
 #include "measure_page.h"
 #include "pages/table.h"
@@ -47,8 +48,8 @@ double distance(Point point, const Line& line) {
 class TouchLinesPage : public MeasurePage {
  public:
   explicit TouchLinesPage(const Context& program)
-      : MeasurePage(program, "touch_lines", "Touch accuracy",
-                    "Follow each line slowly with a finger,\nfrom corner to corner.") {
+      : MeasurePage(program, "touch_lines", tr("Touch accuracy"),
+                    tr("Follow each line slowly with a finger,\nfrom corner to corner.")) {
     const ScreenSize screen = screenSize();
     const int right = screen.width - 1;
     const int foot = screen.height - 1;

@@ -6,6 +6,7 @@
 
 #include <brimol/input.h>
 
+#include "language/language.h"
 #include "layout.h"
 #include "measure_page.h"
 #include "pages/table.h"
@@ -21,8 +22,8 @@ constexpr uint32_t kDotColor = 0xFFE8C040;
 class TouchRatePage : public MeasurePage {
  public:
   explicit TouchRatePage(const Context& program)
-      : MeasurePage(program, "touch_rate", "Touch rate",
-                    "Draw circles with one finger,\nquickly and without a stop.") {}
+      : MeasurePage(program, "touch_rate", tr("Touch rate"),
+                    tr("Draw circles with one finger,\nquickly and without a stop.")) {}
 
   std::vector<Measure> values() const override {
     return {measure("event rate", moved > 0 ? reports * kSecond / moved : 0),

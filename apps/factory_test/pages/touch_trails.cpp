@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include "language/language.h"
 #include "layout.h"
 #include "measure_page.h"
 #include "pages/table.h"
@@ -34,8 +35,8 @@ struct Trail {
 class TouchTrailsPage : public MeasurePage {
  public:
   explicit TouchTrailsPage(const Context& program)
-      : MeasurePage(program, "touch_trails", "Touch trails",
-                    "Draw with several fingers at once:\nthe numbers stay with the fingers.") {}
+      : MeasurePage(program, "touch_trails", tr("Touch trails"),
+                    tr("Draw with several fingers at once:\nthe numbers stay with the fingers.")) {}
 
   std::vector<Measure> values() const override {
     return {measure("fingers counted", mostDrawing),

@@ -6,6 +6,7 @@
 #include <string>
 
 #include "current.h"
+#include "language/language.h"
 #include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -20,20 +21,20 @@ constexpr uint32_t kCalm = 0xFF205080;
 /// A touch, too, shows the next page. Two releases of one key end the look.
 class WarningTest : public StepTest {
  public:
-  WarningTest() : StepTest("Warning pages", "Say whether both pages looked right.") {}
+  WarningTest() : StepTest(tr("Warning pages"), tr("Say whether both pages looked right.")) {}
 
  protected:
-  std::string question() const override { return "Did both pages look right?"; }
+  std::string question() const override { return tr("Did both pages look right?"); }
   int lastStep() const override { return 1; }
 
   void showStep(int step) override {
     warning.reset();
     if (step == 0) {
-      put(std::make_unique<MW::DialogWarn>(kAlarm), "Warning", "Do not switch off");
+      put(std::make_unique<MW::DialogWarn>(kAlarm), tr("Warning"), tr("Do not switch off"));
     } else {
       auto calm = std::make_unique<MW::AutoCapScreen>(kCalm);
       calm->setBgColor(kCalm);
-      put(std::move(calm), "Automatic test", "Do not touch");
+      put(std::move(calm), tr("Automatic test"), tr("Do not touch"));
     }
   }
 

@@ -5,6 +5,8 @@
 #include <cassert>
 #include <cmath>
 
+#include "language/language.h"
+
 namespace factory_test {
 
 namespace {
@@ -14,40 +16,40 @@ constexpr Limits least(double value) { return {.least = value, .most = {}}; }
 constexpr Limits most(double value) { return {.least = {}, .most = value}; }
 
 // The pages say what each value is; docs/plans.md says it to those who write plans.
-constexpr auto kColours = std::to_array<ValueKind>({{"colours confirmed", "", none()}});
-constexpr auto kDeadPixels = std::to_array<ValueKind>({{"patterns confirmed", "", none()}});
-constexpr auto kBacklight = std::to_array<ValueKind>({{"steps confirmed", "", none()}});
+constexpr auto kColours = std::to_array<ValueKind>({{msg("colours confirmed"), "", none()}});
+constexpr auto kDeadPixels = std::to_array<ValueKind>({{msg("patterns confirmed"), "", none()}});
+constexpr auto kBacklight = std::to_array<ValueKind>({{msg("steps confirmed"), "", none()}});
 constexpr auto kGrid = std::to_array<ValueKind>({
-    {"cells", "", least(1)},
-    {"cells missed", "", most(0)},
+    {msg("cells"), "", least(1)},
+    {msg("cells missed"), "", most(0)},
 });
 constexpr auto kGridParameters = std::to_array<ParameterKind>({{"cell mm", 3, 30, 8}});
 constexpr auto kLines = std::to_array<ValueKind>({
-    {"lines followed", "", least(2)},
-    {"worst distance", "mm", most(5)},
+    {msg("lines followed"), "", least(2)},
+    {msg("worst distance"), "mm", most(5)},
 });
 constexpr auto kTrails = std::to_array<ValueKind>({
-    {"fingers counted", "", least(2)},
-    {"longest trail", "mm", none()},
+    {msg("fingers counted"), "", least(2)},
+    {msg("longest trail"), "mm", none()},
 });
 constexpr auto kFingers = std::to_array<ParameterKind>({{"fingers", 2, 10, 2}});
 constexpr auto kRate = std::to_array<ValueKind>({
-    {"event rate", "1/s", least(20)},
-    {"longest gap", "ms", none()},
-    {"latency", "ms", most(100)},
+    {msg("event rate"), "1/s", least(20)},
+    {msg("longest gap"), "ms", none()},
+    {msg("latency"), "ms", most(100)},
 });
 constexpr auto kRateParameters = std::to_array<ParameterKind>({{"seconds", 1, 30, 3}});
 constexpr auto kPinch = std::to_array<ValueKind>({
-    {"fingers counted", "", least(2)},
-    {"narrowest", "mm", none()},
-    {"widest", "mm", none()},
+    {msg("fingers counted"), "", least(2)},
+    {msg("narrowest"), "mm", none()},
+    {msg("widest"), "mm", none()},
 });
-constexpr auto kStuck = std::to_array<ValueKind>({{"touches seen", "", most(0)}});
+constexpr auto kStuck = std::to_array<ValueKind>({{msg("touches seen"), "", most(0)}});
 constexpr auto kStuckParameters = std::to_array<ParameterKind>({{"seconds", 1, 600, 60}});
 constexpr auto kKeys = std::to_array<ValueKind>({
-    {"keys seen", "", none()},
-    {"bounces", "", most(0)},
-    {"longest bounce", "ms", none()},
+    {msg("keys seen"), "", none()},
+    {msg("bounces"), "", most(0)},
+    {msg("longest bounce"), "ms", none()},
 });
 
 constexpr auto kTests = std::to_array<TestKind>({

@@ -6,13 +6,12 @@ namespace factory_test {
 
 void PlanRun::finish(Verdict verdict) {
   assert(now == State::Performing);
-  if (verdict == Verdict::Pass) {
-    goOn();
-  } else if (verdict == Verdict::Fail && tries <= step().retries) {
+  const bool hasFailed = verdict == Verdict::Fail;
+  if (hasFailed && tries <= step().retries) {
     ++tries;
-  } else if (verdict == Verdict::None || step().onFailure == OnFailure::Ask) {
+  } else if (verdict == Verdict::None || (hasFailed && step().onFailure == OnFailure::Ask)) {
     now = State::Asking;
-  } else if (step().onFailure == OnFailure::Stop) {
+  } else if (hasFailed && step().onFailure == OnFailure::Stop) {
     now = State::Stopped;
   } else {
     goOn();
