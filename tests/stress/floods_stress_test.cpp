@@ -2,6 +2,7 @@
 
 #include <MW/event_service.h>
 
+#include <deque>
 #include <filesystem>
 #include <iterator>
 
@@ -45,6 +46,7 @@ TEST_F(LiveWindowTest, AFloodKeepsItsOrderAndGivesItsMemoryBack) {
   EXPECT_EQ(next, kEvents);
   EXPECT_EQ(Window::getEventService()->recvEvent(), nullptr);
   EXPECT_LE(platform().paused, kEvents) << "more than a millisecond an event";
+  std::deque<Event>().swap(platform().fed);  // what it keeps for itself is not the toolkit's
   EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 16));
 }
 

@@ -75,18 +75,23 @@ struct Line::Shared {
     changed.notify_all();
   }
 
-  // Sends until there is nothing more; then waits for news, and so on until it is stopped.
+  // Sends until there is nothing more, or it is stopped.
+  void sendAll(LineTransfer& transfer, milliseconds& pause) {
+    while (wait(milliseconds(0), nullptr) && transfer.sendSome()) {
+      const std::int64_t left = transfer.waiting();
+      set([this, left] { status.waiting = left; });
+      pause = pace.first;
+    }
+  }
+
+  // Sends; then waits for news, and so on until it is stopped.
   void serve(milliseconds& pause) {
     set([this] { ++status.attempts; });
     LineTransfer transfer(station, url, stop.id());
     do {
       int serving = 0;
       set([&] { news.clear(), serving = asked; });
-      while (wait(milliseconds(0), nullptr) && transfer.sendSome()) {
-        const std::int64_t left = transfer.waiting();
-        set([this, left] { status.waiting = left; });
-        pause = pace.first;
-      }
+      sendAll(transfer, pause);
       set([&] { served = serving, status.waiting = 0, status.error.clear(); });
     } while (wait(kForever, &news));
   }
