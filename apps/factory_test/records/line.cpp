@@ -56,7 +56,7 @@ struct Line::Shared {
   mutable std::mutex mutex;  // guards what follows
   std::condition_variable changed;
   LineStatus status;
-  int asked = 0;   // how often there was news
+  int asked = 1;   // how often there was news; what stands there at the start is some
   int served = 0;  // the news whose verdicts are sent
   bool hasEnded = false;
 
@@ -92,6 +92,7 @@ struct Line::Shared {
       int serving = 0;
       set([&] { news.clear(), serving = asked; });
       sendAll(transfer, pause);
+      if (!wait(milliseconds(0), nullptr)) return;
       set([&] { served = serving, status.waiting = 0, status.error.clear(); });
     } while (wait(kForever, &news));
   }
@@ -151,7 +152,9 @@ void Line::wake() {
 
 LineStatus Line::status() const {
   const std::lock_guard guard(shared->mutex);
-  return shared->status;
+  LineStatus status = shared->status;
+  status.isUpToDate = shared->served == shared->asked;
+  return status;
 }
 
 }  // namespace factory_test
