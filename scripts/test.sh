@@ -34,6 +34,8 @@ fail_usage() {
   exit 2
 }
 
+export LC_ALL=C.UTF-8 # the factory test's texts are English in its traces
+
 if command -v ccache >/dev/null; then
   export CMAKE_C_COMPILER_LAUNCHER=ccache CMAKE_CXX_COMPILER_LAUNCHER=ccache
 fi

@@ -195,7 +195,8 @@ TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
            {"is damaged: put it aside, then begin a new one",
             [&] {
               run("pragma application_id = 1179927618; pragma user_version = 2");
-              for (int page = 1; page < 30; ++page) damage(page * 4096, std::string(64, '\x7f'));
+              for (std::streamoff page = 1; page < 30; ++page)
+                damage(page * 4096, std::string(64, '\x7f'));
             }},
            {"is not a database", [&] { damage(0, "no database at all"); }},
            {"cannot be opened: Is a directory",

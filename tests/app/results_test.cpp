@@ -127,7 +127,7 @@ TEST_F(Results, ThatAreDamagedAreNamedAndLeftAsTheyAre) {
            {"height", "depth", "result 1 has no valid \"screen\""},
            {"\"attempt\":1", "\"attempt\":0", "result 1 has no valid \"attempt\""},
            {"[]}", R"([{"name":"a","unit":"","value":"1"}]})", "result 1 has no valid \"values\""},
-           {"{\"v", "{\"unit\":7,\"v", "has no valid \"unit\""},
+           {R"({"v)", R"({"unit":7,"v)", "has no valid \"unit\""},
            {":2,", ":3,", "is of version 3, newer than this program's 2"},
            {":2,", ":-2,", "has no valid \"version\""},
        })) {

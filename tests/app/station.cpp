@@ -35,10 +35,9 @@ TestResult resultOf(int unit, int test, const RunStart& run) {
   return result;
 }
 
-// Nothing is waiting, and the server has said so.
 bool isSent(const ResultBook& book) {
   const auto status = book.lineStatus();
-  return !status || (status->attempts > 0 && status->waiting == 0 && status->error.empty());
+  return !status || status->isUpToDate;
 }
 
 }  // namespace

@@ -103,7 +103,7 @@ std::string takeOption(std::span<const char* const>& arguments, Command& command
 // What is wrong; empty: nothing.
 std::string parse(std::span<const char* const> arguments, Command& command) {
   while (!arguments.empty()) {
-    const std::string fault = takeOption(arguments, command);
+    std::string fault = takeOption(arguments, command);
     if (!fault.empty()) return fault;
   }
   return faultOf(command);

@@ -67,6 +67,18 @@ std::string limitText(const std::optional<double>& limit) {
   return limit ? numberText(*limit) : "";
 }
 
+std::string csvLines(const RunRecord& run, const VerdictRecord& verdict) {
+  const std::string before = csvVerdict(run, verdict);
+  if (verdict.result.values.empty()) return before + ",,,,\r\n";
+  std::string lines;
+  for (const Measure& each : verdict.result.values) {
+    lines += before + csvField(each.name) + "," + csvField(each.unit) + "," +
+             numberText(each.value) + "," + limitText(each.least) + "," + limitText(each.most) +
+             "\r\n";
+  }
+  return lines;
+}
+
 }  // namespace
 
 std::string historyJson(std::span<const RunRecord> runs) {
@@ -96,15 +108,7 @@ std::string historyCsv(std::span<const RunRecord> runs) {
       "run,unit,station,operator,software,plan,plan_hash,state,verdict_id,test,verdict,started,"
       "attempt,duration_ms,value_name,value_unit,value,least,most\r\n";
   for (const RunRecord& run : runs) {
-    for (const VerdictRecord& verdict : run.verdicts) {
-      const std::string before = csvVerdict(run, verdict);
-      if (verdict.result.values.empty()) text += before + ",,,,\r\n";
-      for (const Measure& each : verdict.result.values) {
-        text += before + csvField(each.name) + "," + csvField(each.unit) + "," +
-                numberText(each.value) + "," + limitText(each.least) + "," + limitText(each.most) +
-                "\r\n";
-      }
-    }
+    for (const VerdictRecord& verdict : run.verdicts) text += csvLines(run, verdict);
   }
   return text;
 }

@@ -56,7 +56,7 @@ struct Line::Shared {
   mutable std::mutex mutex;  // guards what follows
   std::condition_variable changed;
   LineStatus status;
-  int asked = 0;   // how often there was news
+  int asked = 1;   // how often there was news; what stands there at the start is some
   int served = 0;  // the news whose verdicts are sent
   bool hasEnded = false;
 
@@ -75,18 +75,24 @@ struct Line::Shared {
     changed.notify_all();
   }
 
-  // Sends until there is nothing more; then waits for news, and so on until it is stopped.
+  // Sends until there is nothing more, or it is stopped.
+  void sendAll(LineTransfer& transfer, milliseconds& pause) {
+    while (wait(milliseconds(0), nullptr) && transfer.sendSome()) {
+      const std::int64_t left = transfer.waiting();
+      set([this, left] { status.waiting = left; });
+      pause = pace.first;
+    }
+  }
+
+  // Sends; then waits for news, and so on until it is stopped.
   void serve(milliseconds& pause) {
     set([this] { ++status.attempts; });
     LineTransfer transfer(station, url, stop.id());
     do {
       int serving = 0;
       set([&] { news.clear(), serving = asked; });
-      while (wait(milliseconds(0), nullptr) && transfer.sendSome()) {
-        const std::int64_t left = transfer.waiting();
-        set([this, left] { status.waiting = left; });
-        pause = pace.first;
-      }
+      sendAll(transfer, pause);
+      if (!wait(milliseconds(0), nullptr)) return;
       set([&] { served = serving, status.waiting = 0, status.error.clear(); });
     } while (wait(kForever, &news));
   }
@@ -146,7 +152,9 @@ void Line::wake() {
 
 LineStatus Line::status() const {
   const std::lock_guard guard(shared->mutex);
-  return shared->status;
+  LineStatus status = shared->status;
+  status.isUpToDate = shared->served == shared->asked;
+  return status;
 }
 
 }  // namespace factory_test

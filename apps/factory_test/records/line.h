@@ -13,6 +13,7 @@ struct LineStatus {
   std::int64_t waiting = 0;  // verdicts that the line's database does not hold, when it last looked
   std::string error = {};    // why not; empty: it sends, or has nothing to send
   int attempts = 0;          // connections that were tried
+  bool isUpToDate = false;   // all is sent that was there at the last wake()
 };
 
 /// How long it waits after a failure: each time twice as long.

@@ -36,7 +36,9 @@ std::string holderOf(int descriptor) {
 void writeHolder(int descriptor) {
   const std::string text = std::to_string(::getpid());
   // Only a message loses by it where the disk is full.
-  if (::ftruncate(descriptor, 0) == 0) (void)!::pwrite(descriptor, text.data(), text.size(), 0);
+  const bool isCut = ::ftruncate(descriptor, 0) == 0;
+  const ssize_t written = isCut ? ::pwrite(descriptor, text.data(), text.size(), 0) : 0;
+  static_cast<void>(written);
 }
 
 // The open, locked file; negative, with why in `reason`.

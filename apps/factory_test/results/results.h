@@ -6,6 +6,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "records/database.h"
@@ -71,7 +72,7 @@ class ResultBook {
   const std::vector<TestResult>& results() const { return kept; }
 
  private:
-  explicit ResultBook(const Keeping& places) : files(places) {}
+  explicit ResultBook(Keeping places) : files(std::move(places)) {}
 
   bool lockFiles(std::string& error);
   bool resumeFile(std::string& error);
