@@ -97,6 +97,9 @@ void letMonkeyPlay(const Options& options) {
 ExitCode showScreens(const Options& options, ResultBook& book, const Context& context,
                      const Task& task) {
   FactoryTest test(book, context, task);
+  if (!options.database.empty() && options.test.empty() && book.run().unit.empty()) {
+    test.askForUnits();
+  }
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {

@@ -9,6 +9,7 @@
 #include "language/language.h"
 #include "layout.h"
 #include "plan/judge.h"
+#include "records/run.h"
 #include "results/measure_text.h"
 #include "run_progress.h"
 #include "world.h"
@@ -30,9 +31,39 @@ void FactoryTest::open(std::size_t entry, uint32_t now) {
   start(entry, now);
 }
 
+void FactoryTest::askForUnits() {
+  asksForUnits = true;
+  askForUnit();
+}
+
+void FactoryTest::askForUnit() {
+  menu.hide();
+  unitPage.emplace();
+  MW::isDisplayUpdate(1);
+}
+
+void FactoryTest::updateUnit() {
+  const auto serial = unitPage->takeAnswer();
+  if (!serial) return;
+  std::string error;
+  RunStart next = book.run();
+  next.unit = *serial;
+  next.started = presentTime();
+  if ((!serial->empty() && !isSerial(*serial, error)) || !book.startUnit(next, error)) {
+    unitPage->refuse(error);
+    return;
+  }
+  unitPage.reset();
+  menu.showVerdicts();
+  if (!run) menu.show();
+  MW::isDisplayUpdate(1);
+}
+
 void FactoryTest::update(uint32_t now) {
   if (prompt) {
     updatePrompt(now);
+  } else if (unitPage) {
+    updateUnit();
   } else if (running) {
     updateTest(now);
   } else if (run) {
@@ -140,7 +171,11 @@ void FactoryTest::follow(bool isYes, uint32_t now) {
     case Asked::RunEnd:
       ended = isYes;
       run.reset();
-      menu.show();
+      if (asksForUnits && !ended) {
+        askForUnit();
+      } else {
+        menu.show();
+      }
       break;
   }
 }
@@ -207,6 +242,8 @@ void FactoryTest::draw() {
   skia_begin_frame_c();
   if (running) {
     running->test->draw();
+  } else if (unitPage) {
+    unitPage->draw();
   } else {
     const ScreenSize screen = screenSize();
     skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});

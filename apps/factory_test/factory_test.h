@@ -13,6 +13,7 @@
 #include "prompt.h"
 #include "results/results.h"
 #include "task.h"
+#include "unit_page.h"
 
 namespace factory_test {
 
@@ -23,6 +24,8 @@ class FactoryTest {
   /// a run begins with the plan's first step.
   FactoryTest(ResultBook& results, const Context& program, const Task& task);
 
+  /// Asks for the unit's serial number first, and again for the next unit after a plan's run.
+  void askForUnits();
   /// Shows a page of testEntries() in the place of the menu.
   void open(std::size_t entry, uint32_t now);
   /// One round of the main loop, at GetTicks() milliseconds.
@@ -42,6 +45,8 @@ class FactoryTest {
 
   enum class Asked { Leave, IncompletePass, SaveAgain, Repeat, GoOn, RunEnd };
 
+  void askForUnit();
+  void updateUnit();
   void updateMenu(uint32_t now);
   void updateTest(uint32_t now);
   bool isWithinLimits() const;
@@ -59,7 +64,9 @@ class FactoryTest {
   const Context& context;
   const Simulation& simulation;
   bool ended = false;
+  bool asksForUnits = false;
   Menu menu;
+  std::optional<UnitPage> unitPage;
   std::optional<Running> running;
   std::optional<PlanRun> run;  // while a plan is performed without the menu
   Asked asked = Asked::Leave;
