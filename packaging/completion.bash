@@ -4,7 +4,7 @@ _brimol_options() {
   local word=${COMP_WORDS[COMP_CWORD]} before=${COMP_WORDS[COMP_CWORD - 1]} help
   help=$("$1" --help 2>/dev/null)
   if [[ $word == -* ]]; then
-    mapfile -t COMPREPLY < <(compgen -W "$(grep -oE -- '--[a-z][a-z-]*' <<<"$help")" -- "$word")
+    mapfile -t COMPREPLY < <(compgen -W "$(grep -oE -- '^  --[a-z][a-z-]*' <<<"$help")" -- "$word")
   elif [[ $before == -* ]] && ! grep -qE -- "$before (FILE|DIR)" <<<"$help"; then
     COMPREPLY=()
   else

@@ -200,7 +200,7 @@ TEST_F(WindowApplication, IsUsedByMouseAndByKeyboard) {
   keys("Return");
   EXPECT_TRUE(comesToSee(areaOf(kColours), kMarkInk.ground));
 
-  keys("Down Down Down Return");  // the keys
+  keys("Down Down Down Down Down Return");  // the keys
   EXPECT_TRUE(comesToSee(cellOf(kPage.content, kGap, {4, 3}, 0), kButtonInk.ground));
   keys("Escape Escape Escape");
   EXPECT_TRUE(comesToSee(areaOf(kKeys), kMarkInk.ground));
