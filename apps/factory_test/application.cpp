@@ -140,8 +140,10 @@ ExitCode runApplication(const Options& options) {
                                   : fail("no memory for the dispatch thread");
   MW::Window::destroy();
   const auto line = book->lineStatus();
-  if (line && !line->error.empty()) {
-    complain(std::to_string(line->waiting) + " verdicts wait for the line: " + line->error);
+  if (line && line->waiting > 0 && !line->error.empty()) {
+    complain(std::to_string(line->waiting) +
+             (line->waiting == 1 ? " verdict waits" : " verdicts wait") +
+             " for the line: " + line->error);
   }
   return result;
 }

@@ -3,6 +3,7 @@
 #include <MW/window.h>
 #include <brimol/frame.h>
 
+#include <algorithm>
 #include <utility>
 
 #include "complain.h"
@@ -16,10 +17,10 @@
 
 namespace factory_test {
 
-FactoryTest::FactoryTest(ResultBook& results, const Context& program, const Task& task)
-    : book(results), context(program), simulation(task.simulation), menu(book) {
+FactoryTest::FactoryTest(ResultBook& results, const Context& program, const Task& chosen)
+    : book(results), context(program), task(chosen), menu(book) {
   if (task.isRun) {
-    run.emplace(task.plan);
+    beginRun();
   } else {
     menu.show();
   }
@@ -29,6 +30,16 @@ void FactoryTest::open(std::size_t entry, uint32_t now) {
   menu.markEntry(entry);
   menu.hide();
   start(entry, now);
+}
+
+// At the first step that has no verdict yet: a run that was aborted goes on.
+void FactoryTest::beginRun() {
+  const auto isOpen = [this](const PlanStep& step) {
+    const TestResult* const result = book.find(step.test);
+    return result == nullptr || result->verdict == Verdict::None;
+  };
+  const auto first = std::ranges::find_if(task.plan.steps, isOpen);
+  run.emplace(task.plan, static_cast<std::size_t>(first - task.plan.steps.begin()));
 }
 
 void FactoryTest::askForUnits() {
@@ -55,7 +66,11 @@ void FactoryTest::updateUnit() {
   }
   unitPage.reset();
   menu.showVerdicts();
-  if (!run) menu.show();
+  if (task.isRun) {
+    beginRun();
+  } else {
+    menu.show();
+  }
   MW::isDisplayUpdate(1);
 }
 
@@ -212,11 +227,17 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
   }
 }
 
+int FactoryTest::attemptAt(const std::string& test) const {
+  if (run) return run->attempt();
+  const TestResult* const earlier = book.find(test);
+  return earlier == nullptr ? 1 : earlier->attempt + 1;
+}
+
 Verdict FactoryTest::keep(const Running& done, Verdict given, uint32_t now) {
   std::vector<Measure> values = done.test->values();
   const PlanStep& step = done.step;
   const Verdict verdict =
-      simulation.rehearsed(judge(given, values, step), step.test, run ? run->attempt() : 1);
+      task.simulation.rehearsed(judge(given, values, step), step.test, attemptAt(step.test));
   for (const Measure& each : values) context.log.add(each.name + ": " + measureText(each));
   context.log.add(std::string("Verdict ") + verdictName(verdict));
   std::string error;

@@ -45,6 +45,7 @@ class FactoryTest {
 
   enum class Asked { Leave, IncompletePass, SaveAgain, Repeat, GoOn, RunEnd };
 
+  void beginRun();
   void askForUnit();
   void updateUnit();
   void updateMenu(uint32_t now);
@@ -56,13 +57,14 @@ class FactoryTest {
   void ask(Asked what, const Question& question);
   void start(std::size_t entry, uint32_t now);
   void finish(Outcome outcome, uint32_t now);
+  int attemptAt(const std::string& test) const;
   Verdict keep(const Running& done, Verdict given, uint32_t now);
   void endRun();
   void showKept(bool isKept, const std::string& error);
 
   ResultBook& book;
   const Context& context;
-  const Simulation& simulation;
+  const Task& task;
   bool ended = false;
   bool asksForUnits = false;
   Menu menu;

@@ -16,8 +16,10 @@
 
 namespace {
 
-void printHelp() {
-  std::printf("%s\nOn a PC:\n%s", factory_test::usage().c_str(), brimol_host_help());
+int print(const std::string& text) {
+  if (std::fputs(text.c_str(), stdout) != EOF && std::fflush(stdout) == 0) return EXIT_SUCCESS;
+  factory_test::complain("stdout cannot be written");
+  return EXIT_FAILURE;
 }
 
 int printPlan(const factory_test::Options& options) {
@@ -27,8 +29,7 @@ int printPlan(const factory_test::Options& options) {
     factory_test::complain(error);
     return static_cast<int>(factory_test::ExitCode::WrongUse);
   }
-  std::fputs(factory_test::planJson(task->plan).c_str(), stdout);
-  return EXIT_SUCCESS;
+  return print(factory_test::planJson(task->plan));
 }
 
 }  // namespace
@@ -44,12 +45,10 @@ int main(int count, char** arguments) {
     return static_cast<int>(factory_test::ExitCode::WrongUse);
   }
   if (options->action == factory_test::Options::Action::Help) {
-    printHelp();
-    return EXIT_SUCCESS;
+    return print(factory_test::usage() + "\nOn a PC:\n" + brimol_host_help());
   }
   if (options->action == factory_test::Options::Action::Version) {
-    std::printf("factory_test %s\n", factory_test::kVersion);
-    return EXIT_SUCCESS;
+    return print(std::string("factory_test ") + factory_test::kVersion + "\n");
   }
   if (options->action == factory_test::Options::Action::PrintPlan) return printPlan(*options);
   return static_cast<int>(factory_test::runApplication(*options));

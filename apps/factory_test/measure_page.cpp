@@ -62,7 +62,7 @@ void MeasurePage::updateLook() {
   const uint32_t now = GetTicks();
   for (const Input& input : watch->take()) {
     if (input.kind == Input::Kind::KeyPress && input.key == kKeyBack) finishLook();
-    if (isOfAnOldTouch(input)) continue;
+    if (isOfAnOldTouch(input) && !followsOldTouches()) continue;
     followStill(input);
     follow(input);
     MW::isDisplayUpdate(1);

@@ -40,6 +40,9 @@ class MeasurePage : public LookTest {
   virtual bool hasWords() const { return true; }
   /// Whether it goes on while a finger is down, which would move the menu that comes next.
   virtual bool waitsForLift() const { return true; }
+  /// Whether follow() is told of fingers that came down before the page, such as the one that chose
+  /// it.
+  virtual bool followsOldTouches() const { return false; }
   /// Whether only the operator can say if what was seen is right: he is asked then.
   virtual bool isForEyes() const { return false; }
   std::string question() const override;
@@ -47,6 +50,8 @@ class MeasurePage : public LookTest {
   double parameter(std::string_view name) const { return step.parameter(name); }
   Measure measure(std::string_view name, double value) const;
   static double millimetres(double pixels);
+  /// Of a finger that came down before the page.
+  bool isOfAnOldTouch(const Input& input) const;
 
  private:
   /// Where a finger came down, and has stayed since.
@@ -60,7 +65,6 @@ class MeasurePage : public LookTest {
   void beginLook() final { watch.emplace(); }
   void endLook() final { watch.reset(); }
   void updateLook() final;
-  bool isOfAnOldTouch(const Input& input) const;
   void followStill(const Input& input);
   bool isWhereItWas(const Input& input) const;
   std::vector<std::string> instructionLines() const;

@@ -15,6 +15,7 @@
 #include "language/language.h"
 #include "pages/table.h"
 #include "records/commands.h"
+#include "results/whole_file.h"
 #include "run_start.h"
 
 namespace factory_test {
@@ -127,23 +128,17 @@ std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::st
   return arguments;
 }
 
-// Whatever they are called: by what they are if both are there, else by where they would be.
-bool isSameFile(const std::string& one, const std::string& other) {
-  namespace fs = std::filesystem;
-  std::error_code failure;
-  if (fs::equivalent(one, other, failure)) return true;
-  const auto placeOfFile = [&](const std::string& name) {
-    return fs::weakly_canonical(fs::absolute(name, failure), failure);
-  };
-  return placeOfFile(one) == placeOfFile(other);
-}
-
-// What two options say that must not name one file; empty: they do not.
+// What two options say that must not name one file, as one of the two is written; empty: they do
+// not.
 std::string sameFiles(const Options& options) {
   using Named = std::pair<const char*, std::string>;
   const auto files = std::to_array<Named>({{"--results", options.results},
                                            {"--junit", options.junit},
-                                           {"--database", options.database}});
+                                           {"--database", options.database},
+                                           {"--shot", options.shot},
+                                           {"--monkey-trace", options.monkeyTrace},
+                                           {"--plan", options.plan},
+                                           {"--log", options.log}});
   for (const auto& [name, file] : files) {
     for (const auto& [other, its] : files) {
       if (name == other || file.empty() || its.empty() || !isSameFile(file, its)) continue;
@@ -218,6 +213,10 @@ std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
   }
   if (!options.language.empty() && std::ranges::count(languages(), options.language) == 0) {
     error = wrongLanguage(options.language);
+    return {};
+  }
+  if (options.run && !options.test.empty()) {
+    error = "--run performs the plan, --test one test: not both";
     return {};
   }
   if (!options.test.empty() && placeOf(options.test) == testEntries().size()) {

@@ -104,7 +104,7 @@ class KeyTest : public PageTest {
     bounce.press(code, GetTicks());
     mark(code);
     if (bounce.count() == before) return;
-    page.say(("Bounce, " + std::to_string(bounce.longestMs()) + " ms at most").c_str());
+    page.say((tr("Bounce, at most ") + std::to_string(bounce.longestMs()) + " ms").c_str());
   }
 
   void mark(unsigned int code) {

@@ -1,6 +1,7 @@
 // A while without a touch, in which the panel may report none.
 #include <MW/window.h>
 #include <brimol/input.h>
+#include <algorithm>
 
 #include <memory>
 #include <optional>
@@ -27,7 +28,13 @@ class StuckTouchPage : public MeasurePage {
 
  protected:
   void follow(const Input& input) override {
-    if (input.kind == Input::Kind::Press) touches += 1;
+    if (input.kind != Input::Kind::Move) {
+      if (input.kind == Input::Kind::Press) touches += 1;
+      return;
+    }
+    // One that was there before the page: the finger that chose it has been lifted by now.
+    if (isOfAnOldTouch(input) && began && input.ticks - *began >= kLiftMs)
+      touches = std::max(touches, 1.0);
   }
 
   void updateAt(uint32_t now) override {
@@ -43,6 +50,7 @@ class StuckTouchPage : public MeasurePage {
   bool isDone() const override { return began && secondsLeft <= 0; }
 
   bool waitsForLift() const override { return false; }
+  bool followsOldTouches() const override { return true; }
 
   void drawLook() override {
     const ScreenSize screen = screenSize();
@@ -54,6 +62,8 @@ class StuckTouchPage : public MeasurePage {
   }
 
  private:
+  static constexpr uint32_t kLiftMs = 2000;
+
   std::optional<uint32_t> began;  // GetTicks() milliseconds
   int secondsLeft = static_cast<int>(parameter("seconds"));
   double touches = 0;

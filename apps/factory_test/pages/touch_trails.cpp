@@ -73,7 +73,7 @@ class TouchTrailsPage : public MeasurePage {
     skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
     for (std::size_t i = 0; i < kFingers; ++i) drawTrail(i);
     const int height = 2 * textSize(screen);
-    const std::string rate = std::to_string(recent.size()) + " reports in the last second";
+    const std::string rate = std::to_string(recent.size()) + tr(" reports in the last second");
     skia_add_label_c({0, height, screen.width, height, 0},
                      textOf(rate.c_str(), kPageInk.text, SKIA_ALIGN_CENTRE, textSize(screen)));
   }

@@ -16,8 +16,12 @@ class PlanRun {
   /// What the operator answers while it is Asking.
   enum class Answer { GoOn, Again, Stop };
 
-  /// `performed` has a step and outlives the run.
-  explicit PlanRun(const Plan& performed) : plan(performed) {}
+  /// `performed` has a step and outlives the run, which begins at step `first`, from 0; behind the
+  /// last one it is Done.
+  explicit PlanRun(const Plan& performed, std::size_t first = 0)
+      : plan(performed),
+        now(first < performed.steps.size() ? State::Performing : State::Done),
+        index(first < performed.steps.size() ? first : performed.steps.size() - 1) {}
 
   State state() const { return now; }
   /// The step to perform, or the one that was performed last.
@@ -35,8 +39,8 @@ class PlanRun {
   void goOn();
 
   const Plan& plan;
-  State now = State::Performing;
-  std::size_t index = 0;
+  State now;
+  std::size_t index;
   int tries = 1;
 };
 

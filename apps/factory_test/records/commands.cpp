@@ -64,6 +64,10 @@ std::string faultOf(const Command& command) {
   if (command.database.empty() == command.line.empty()) {
     return "needs one of --database FILE and --line postgresql://...";
   }
+  for (const char* const its : {"", "-wal", "-shm", ".lock"}) {
+    if (command.output.empty() || command.database.empty()) break;
+    if (isSameFile(command.output, command.database + its)) return "--output names the database";
+  }
   if (!command.isReport && command.format == nullptr) {
     return "needs one of --json, --junit, --csv and --html";
   }
@@ -147,8 +151,14 @@ std::optional<int> runRecordsCommand(std::span<const char* const> arguments) {
   if (arguments.empty()) return {};
   const std::string_view word = arguments.front();
   if (word != "export" && word != "report") return {};
+  const auto rest = arguments.subspan(1);
+  const auto isHelp = [](std::string_view each) { return each == "--help" || each == "-h"; };
+  if (std::ranges::any_of(rest, isHelp)) {
+    std::fputs(recordsUsage().c_str() + 1, stdout);
+    return EXIT_SUCCESS;
+  }
   Command command = {.isReport = word == "report"};
-  std::string error = parse(arguments.subspan(1), command);
+  std::string error = parse(rest, command);
   if (!error.empty()) {
     complain(std::string(word) + ": " + error);
     return kUsageError;

@@ -93,7 +93,9 @@ void Database::addPlan(const RunStart& start) {
             {start.unit, utcText(start.started)});
 }
 
+// Runs of units without a number are of different ones.
 bool Database::takeAborted(const RunStart& start) {
+  if (start.unit.empty()) return false;
   store.run(
       "select number, id, state = 'aborted' and plan = ? and software = ? from runs "
       "where unit is ? order by number desc limit 1",

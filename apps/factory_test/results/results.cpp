@@ -1,6 +1,7 @@
 #include "results/results.h"
 
 #include <algorithm>
+#include <climits>
 #include <system_error>
 #include <utility>
 
@@ -105,7 +106,8 @@ bool ResultBook::saveDatabase(std::string& error) {
 bool ResultBook::record(TestResult result, std::string& error) {
   result = clamped(std::move(result));
   if (const TestResult* const earlier = find(result.test)) {
-    result.attempt = std::max(result.attempt, earlier->attempt + 1);
+    result.attempt =
+        std::max(result.attempt, earlier->attempt + (earlier->attempt < INT_MAX ? 1 : 0));
   }
   if (database) unsavedVerdicts.push_back(result);
   unsavedTests.push_back(result.test);

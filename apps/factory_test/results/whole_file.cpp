@@ -68,4 +68,14 @@ bool replaceFile(const fs::path& file, std::string_view bytes, std::string& erro
   return false;
 }
 
+bool isSameFile(const std::filesystem::path& one, const std::filesystem::path& other) {
+  namespace fs = std::filesystem;
+  std::error_code failure;
+  if (fs::equivalent(one, other, failure)) return true;
+  const auto placeOf = [&failure](const fs::path& name) {
+    return fs::weakly_canonical(fs::absolute(name, failure), failure);
+  };
+  return placeOf(one) == placeOf(other);
+}
+
 }  // namespace factory_test

@@ -12,6 +12,9 @@ namespace factory_test {
 /// `error` then says why in one line that begins with the file's name.
 std::optional<std::string> readFile(const std::filesystem::path& file, std::string& error);
 
+/// Whatever they are called: by what they are if both are there, else by where they would be.
+bool isSameFile(const std::filesystem::path& one, const std::filesystem::path& other);
+
 /// Puts `bytes` in the place of what the file holds, if there is one, on the disk too: at every
 /// moment the old or the new bytes stand there whole. A symbolic link to a file is followed. False:
 /// the file is as it was, and `error` says why as above. One program at a time may write a file;
