@@ -44,7 +44,8 @@ double finish(pid_t process) {
   int status = 0;
   rusage used = {};
   ::wait4(process, &status, 0, &used);
-  if (!WIFEXITED(status) || WEXITSTATUS(status) != kNotAllPassed) throw std::runtime_error("a session failed");
+  if (!WIFEXITED(status) || WEXITSTATUS(status) != kNotAllPassed)
+    throw std::runtime_error("a session failed");
   const auto ms = [](const timeval& time) {
     constexpr double kMs = 1000;
     return static_cast<double>(time.tv_sec) * kMs + static_cast<double>(time.tv_usec) / kMs;

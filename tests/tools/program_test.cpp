@@ -24,8 +24,8 @@ class Program : public InFolder {
     if (const auto place = words.find("APP"); place != std::string::npos) {
       words.replace(place, 3, kFakeApplication);
     }
-    const std::string command =
-        "cd " + folder.native() + " && " + before + " exec " + kReplayProgram + " " + words + " >said.txt 2>&1";
+    const std::string command = "cd " + folder.native() + " && " + before + " exec " +
+                                kReplayProgram + " " + words + " >said.txt 2>&1";
     const int status = std::system(command.c_str());
     said = bytesOf(folder / "said.txt");
     return WIFEXITED(status) ? WEXITSTATUS(status) : -1;

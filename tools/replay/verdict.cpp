@@ -105,8 +105,8 @@ Judgement judgeFailure(const Session& session, const SessionEnd& sessionEnd, int
 
 Judgement judgeExit(const Session& session, int code, int wantedCode) {
   if (!session.end) return judgeEarlyExit(session, code);
-  const bool hasFailed = code != wantedCode || session.end->exit != 0 || session.end->reason != "closed" ||
-                         firstFailed(session) != nullptr;
+  const bool hasFailed = code != wantedCode || session.end->exit != 0 ||
+                         session.end->reason != "closed" || firstFailed(session) != nullptr;
   if (hasFailed) return judgeFailure(session, *session.end, code);
   return {Verdict::Passed, "The trace was played to its end, and all that it expects was met."};
 }

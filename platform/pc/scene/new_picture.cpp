@@ -10,8 +10,8 @@ namespace brimol::pc {
 
 namespace {
 
-// A phone's picture has thousands of pages, each of which costs a page fault when it is first written.
-// In large pages, where the system has some left, they are a few.
+// A phone's picture has thousands of pages, each of which costs a page fault when it is first
+// written. In large pages, where the system has some left, they are a few.
 void wantLargePages(cairo_surface_t* picture) {
   constexpr std::size_t kLargePage = std::size_t{2} << 20;
   const auto page = static_cast<std::size_t>(sysconf(_SC_PAGESIZE));

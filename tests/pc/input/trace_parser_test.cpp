@@ -196,8 +196,7 @@ TEST(Recording, IsReadAsItWasWritten) {
   EXPECT_EQ(trace.cutAt, "");
   ASSERT_EQ(trace.frames.size(), 3U);
   EXPECT_EQ(trace.frames[1].time, 7U);
-  EXPECT_EQ(itemsOf(trace, 1),
-            textOfFrame({itemAt(1, "one"), itemAt(3, "three"), itemAt(4, "")}));
+  EXPECT_EQ(itemsOf(trace, 1), textOfFrame({itemAt(1, "one"), itemAt(3, "three"), itemAt(4, "")}));
   ASSERT_EQ(trace.steps.size(), 8U);
   const Event& motion = std::get<RawRecord>(trace.steps[3].action).record;
   EXPECT_EQ(motion.pointer.xrel, -2);
