@@ -22,7 +22,7 @@ class FactoryTest {
  public:
   /// Keeps verdicts in `results`, which outlives it, as do the context and the task. A task that is
   /// a run begins with the plan's first step.
-  FactoryTest(ResultBook& results, const Context& program, const Task& task);
+  FactoryTest(ResultBook& results, const Context& program, const Task& chosen);
 
   /// Asks for the unit's serial number first, and again for the next unit after a plan's run.
   void askForUnits();

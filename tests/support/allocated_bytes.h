@@ -5,19 +5,16 @@
 
 #include <cstddef>
 
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-// The sanitizers' own allocator does not count for mallinfo2(), and GCC has no header for this.
-extern "C" std::size_t __sanitizer_get_current_allocated_bytes();
-#endif
+// Weak: only there where a sanitizer brings an allocator of its own, which mallinfo2() does not count.
+// GCC has no header for it.
+extern "C" std::size_t __sanitizer_get_current_allocated_bytes() __attribute__((weak));
 
 namespace brimol::test {
 
 inline std::size_t allocatedBytes() {
-#if defined(__SANITIZE_ADDRESS__) || defined(__SANITIZE_THREAD__)
-  return __sanitizer_get_current_allocated_bytes();
-#else
-  return mallinfo2().uordblks;
-#endif
+  return __sanitizer_get_current_allocated_bytes != nullptr
+             ? __sanitizer_get_current_allocated_bytes()
+             : mallinfo2().uordblks;
 }
 
 }  // namespace brimol::test
