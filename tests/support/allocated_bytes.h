@@ -5,8 +5,8 @@
 
 #include <cstddef>
 
-// Weak: only there where a sanitizer brings an allocator of its own, which mallinfo2() does not count.
-// GCC has no header for it.
+// Weak: only there where a sanitizer brings an allocator of its own, which mallinfo2() does not
+// count. GCC has no header for it.
 extern "C" std::size_t __sanitizer_get_current_allocated_bytes() __attribute__((weak));
 
 namespace brimol::test {
