@@ -5,6 +5,7 @@
 #include <deque>
 #include <filesystem>
 #include <iterator>
+#include <thread>
 
 #include "core/dispatch_thread.h"
 #include "support/allocated_bytes.h"
