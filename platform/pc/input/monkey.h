@@ -21,7 +21,7 @@ class Monkey {
   using Post = ScriptFingers::Post;
 
   /// It has posted at least `events` records when it is over; no finger is down then.
-  Monkey(uint64_t seed, uint64_t events, Size screenSize, Post target);
+  Monkey(uint64_t seed, uint64_t events, Size screenSize, Post receiver);
 
   /// When act() is to be called next; none: not before a frame was seen, or not any more.
   std::optional<uint64_t> due(uint64_t soonest) const;
