@@ -128,6 +128,7 @@ TEST_F(WidgetTest, StartsOrSaysWhyNot) {
 
 // The platform starts one thread of the two, or none.
 int startsLeft = 0;
+// NOLINTNEXTLINE(readability-function-size): the thread library's own parameters
 int startsOnly(android_thread_func_t entry, void* data, const char* name, int32_t priority,
                std::size_t stackBytes, android_thread_id_t* id) {
   if (startsLeft-- <= 0) return 0;

@@ -75,42 +75,52 @@ void post(int events) {
   }
 }
 
+// Two threads post, and the calling one draws, while widgets come and go on all of them.
+void postFromTwoThreads(int events) {
+  const std::jthread one(post, events);
+  const std::jthread other(post, events);
+  for (int i = 0; i < events / 8; ++i) {
+    const auto passing = makeButton();
+    Window::show(GetTicks());
+    Window::updateTimer(GetTicks());
+  }
+}
+
+// Until the last event has gone through: events that are left in the queue are nobody's.
+void drain(const std::atomic<bool>& isDrained) {
+  while (!isDrained) {
+    delete prompt.exchange(nullptr);
+    Window::getEventService()->AppEvent(kLast);
+    for (int i = 0; i < 64 && !isDrained; ++i) std::this_thread::yield();
+  }
+}
+
+void runWindowOnce(int events) {
+  std::atomic<bool> isDrained = false;
+  std::atomic<bool> isOver = false;
+  ProbeWidget last;
+  last.onEvent = [&](const MW::event_data* event, unsigned int) {
+    if (event->type == MW::kEventApplication && event->value == kLast) isDrained = true;
+    return false;
+  };
+  last.enter();
+  const auto button = makeButton();
+  ASSERT_EQ(Window::init(), 1);
+  std::jthread secondDrawing([&] {
+    while (!isOver) Window::show(GetTicks());
+  });
+  postFromTwoThreads(events);
+  drain(isDrained);
+  Window::destroy();
+  isOver = true;
+  delete prompt.exchange(nullptr);
+}
+
 TEST_F(WidgetTest, EverythingAtOnce) {
   platform().records = false;
   const int events = eventsOfAPoster();
   answers = 0;
-  for (int start = 0; start < kStarts; ++start) {
-    std::atomic<bool> isDrained = false;
-    std::atomic<bool> isOver = false;
-    ProbeWidget last;
-    last.onEvent = [&](const MW::event_data* event, unsigned int) {
-      if (event->type == MW::kEventApplication && event->value == kLast) isDrained = true;
-      return false;
-    };
-    last.enter();
-    const auto button = makeButton();
-    ASSERT_EQ(Window::init(), 1);
-    std::jthread secondDrawing([&] {
-      while (!isOver) Window::show(GetTicks());
-    });
-    {
-      const std::jthread one(post, events);
-      const std::jthread other(post, events);
-      for (int i = 0; i < events / 8; ++i) {
-        const auto passing = makeButton();
-        Window::show(GetTicks());
-        Window::updateTimer(GetTicks());
-      }
-    }
-    while (!isDrained) {
-      delete prompt.exchange(nullptr);
-      Window::getEventService()->AppEvent(kLast);
-      for (int i = 0; i < 64 && !isDrained; ++i) std::this_thread::yield();
-    }
-    Window::destroy();
-    isOver = true;
-    delete prompt.exchange(nullptr);
-  }
+  for (int start = 0; start < kStarts; ++start) runWindowOnce(events);
   EXPECT_GT(answers, 0);
 }
 

@@ -7,6 +7,7 @@
 
 // Weak: only there where a sanitizer brings an allocator of its own, which mallinfo2() does not
 // count. GCC has no header for it.
+// NOLINTNEXTLINE(bugprone-reserved-identifier): the name is the sanitizers'
 extern "C" std::size_t __sanitizer_get_current_allocated_bytes() __attribute__((weak));
 
 namespace brimol::test {
