@@ -61,9 +61,7 @@ TEST_F(SessionReplay, IsTheSameTenMinutesEveryTime) {
   std::string firstResults;
   for (int round = 0; round < kQuietRounds + 1; ++round) {
     std::optional<BusyCore> busy;
-    std::optional<BusyCore> busier;
     if (round >= kQuietRounds - 1) busy.emplace();
-    if (round == kQuietRounds) busier.emplace();
     ASSERT_EQ(play(TRACES "ten_minutes.trace",
                    {{"BRIMOL_REPORT_DIR", report}, {"BRIMOL_REPORT_PICTURES", "none"}}),
               kNotAllPassed)
