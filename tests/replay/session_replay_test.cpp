@@ -124,8 +124,8 @@ TEST_F(SessionReplay, PlaysWhatAUserDidInAWindow) {
     }
     act("search --sync --onlyvisible --name brimol");
     useTheMenu();
-    // A question may have been shown later than its answer came. Three steps back lead from a page to
-    // the question whether to leave, and from any other screen to a page or out.
+    // A question may have been shown later than its answer came. Three steps back lead from a page
+    // to the question whether to leave, and from any other screen to a page or out.
     while (program.isRunning()) {
       act("key Escape sleep 1 key Escape sleep 1 key Escape sleep 1 key Return sleep 1");
     }
