@@ -23,6 +23,10 @@ std::string serialOfSystem() {
   return isSerial(value.data(), unused) ? value.data() : "";
 }
 
+std::string unitOf(const Options& options) {
+  return options.serial.empty() ? serialOfSystem() : options.serial;
+}
+
 std::string stationName() {
   std::array<char, kHostNameBytes + 1> name = {};  // a name that fills it is not ended
   return ::gethostname(name.data(), kHostNameBytes) == 0 ? name.data() : "";
@@ -35,11 +39,16 @@ Keeping keepingOf(const Options& options) {
           .junit = options.junit,
           .database = options.database,
           .resume = options.newRun ? Database::Resume::No : Database::Resume::Yes,
+          .first = asksForUnit(options) ? FirstRun::WithUnit : FirstRun::AtOnce,
           .line = options.line};
 }
 
+bool asksForUnit(const Options& options) {
+  return !options.database.empty() && options.test.empty() && unitOf(options).empty();
+}
+
 RunStart runStartOf(const Options& options, const Plan& plan) {
-  RunStart start = {.unit = options.serial.empty() ? serialOfSystem() : options.serial,
+  RunStart start = {.unit = unitOf(options),
                     .operatorName = options.operatorName,
                     .planName = plan.name,
                     .planHash = planHash(plan),

@@ -227,8 +227,9 @@ TEST_F(Records, SayWhereTheyCannotBeWritten) {
 }
 
 TEST_F(Records, SurviveAFullDiskAndALock) {
-  auto book =
-      ResultBook::open({.json = folder / "all.json", .database = file}, startOf("A1"), error);
+  RunStart longer = startOf("A1");
+  longer.tests.emplace_back("pinch");
+  auto book = ResultBook::open({.json = folder / "all.json", .database = file}, longer, error);
   ASSERT_TRUE(book && book->record(kKeys, error)) << error;
   // Files of this process end after some bytes, as on a full disk.
   (void)std::signal(SIGXFSZ, SIG_IGN);
@@ -246,12 +247,16 @@ TEST_F(Records, SurviveAFullDiskAndALock) {
   {
     Sqlite other(file, Sqlite::Mode::Write);
     const Transaction lock(other);
+    book->setPatience(std::chrono::milliseconds(1));
     EXPECT_FALSE(book->saveAgain(error));
     EXPECT_EQ(error, file.native() + ": is locked by another program");
+    EXPECT_FALSE(book->finish(error));
+    EXPECT_TRUE(book->isBusy());
   }
   EXPECT_TRUE(book->saveAgain(error) && book->saveAgain(error)) << error;
-  EXPECT_TRUE(book->isSaved("touch"));
+  EXPECT_TRUE(book->isAllSaved() && book->isSaved("touch"));
   EXPECT_EQ(history().at(0).verdicts.size(), 2U) << "once each";
+  EXPECT_THAT(states(), ElementsAre("finished"));
 }
 
 // A server that takes connections and says nothing. Its address.
