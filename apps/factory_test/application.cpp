@@ -139,6 +139,7 @@ ExitCode runApplication(const Options& options) {
   const ExitCode result = started ? showScreens(options, *book, context, *task)
                                   : fail("no memory for the dispatch thread");
   MW::Window::destroy();
+  if (!book->close(error)) complain(error);
   const auto line = book->lineStatus();
   if (line && line->waiting > 0 && !line->error.empty()) {
     complain(std::to_string(line->waiting) +

@@ -55,8 +55,8 @@ std::string wrongRecords(const Options& options) {
   if (!options.serial.empty() && !isSerial(options.serial, why)) return "--serial: " + why;
   if (options.line.empty()) return "";
   if (options.database.empty()) return "--line needs --database, which always comes first";
-  return isPostgresUrl(options.line) ? ""
-                                     : "--line needs an address like postgresql://host/database";
+  const std::string wrong = wrongPostgresUrl(options.line);
+  return wrong.empty() ? "" : "--line " + wrong;
 }
 
 }  // namespace factory_test

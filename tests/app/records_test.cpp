@@ -1,6 +1,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <netinet/in.h>
 #include <sys/resource.h>
+#include <sys/socket.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -166,7 +168,7 @@ TEST_F(Records, OfAnOlderVersionAreMigratedWithABackup) {
   Sqlite(file, Sqlite::Mode::Write).runAll(sql.c_str());
   fs::create_directory(file.native() + ".v1.bak");  // in the way
   ASSERT_TRUE(open(startOf("C1"))) << error;
-  for (const auto& [path, version] : {std::pair(file, 2), {file.native() + ".v1.bak.2", 1}}) {
+  for (const auto& [path, version] : {std::pair(file, 3), {file.native() + ".v1.bak.2", 1}}) {
     Sqlite store(path, Sqlite::Mode::Read);
     EXPECT_EQ(store.number("pragma user_version"), version);
     const auto runs = readHistory(queryOf(store), {.unit = "OLD 1"});
@@ -189,12 +191,12 @@ TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
     std::function<void()> prepare;
   };
   for (const auto& [says, prepare] : std::vector<Case>{
-           {"is of version 3, newer than this program's 2",
-            [&] { run("pragma user_version = 3"); }},
+           {"is of version 4, newer than this program's 3",
+            [&] { run("pragma user_version = 4"); }},
            {"is another program's database", [&] { run("pragma application_id = 7"); }},
            {"is damaged: put it aside, then begin a new one",
             [&] {
-              run("pragma application_id = 1179927618; pragma user_version = 2");
+              run("pragma application_id = 1179927618; pragma user_version = 3");
               for (std::streamoff page = 1; page < 30; ++page)
                 damage(page * 4096, std::string(64, '\x7f'));
             }},
@@ -250,6 +252,43 @@ TEST_F(Records, SurviveAFullDiskAndALock) {
   EXPECT_TRUE(book->saveAgain(error) && book->saveAgain(error)) << error;
   EXPECT_TRUE(book->isSaved("touch"));
   EXPECT_EQ(history().at(0).verdicts.size(), 2U) << "once each";
+}
+
+// A server that takes connections and says nothing. Its address.
+class SilentServer {
+ public:
+  SilentServer() {
+    ::bind(socket, reinterpret_cast<const sockaddr*>(&address), sizeof address);
+    ::listen(socket, 1);
+    socklen_t length = sizeof address;
+    ::getsockname(socket, reinterpret_cast<sockaddr*>(&address), &length);
+  }
+  ~SilentServer() { ::close(socket); }
+  SilentServer(const SilentServer&) = delete;
+  SilentServer& operator=(const SilentServer&) = delete;
+
+  std::string url() const {
+    return "postgresql://127.0.0.1:" + std::to_string(ntohs(address.sin_port)) + "/line";
+  }
+
+ private:
+  int socket = ::socket(AF_INET, SOCK_STREAM, 0);
+  sockaddr_in address = {AF_INET, 0, {htonl(INADDR_LOOPBACK)}, {}};
+};
+
+TEST_F(Records, SayWhatASilentLineDoesNotTake) {
+  ASSERT_TRUE(open(startOf("A1"))->record(kKeys, error));
+  {
+    Sqlite store(file, Sqlite::Mode::Write);  // all went to another line
+    store.runAll("insert into lines values ('other', 1000, 'host=other ')");
+  }
+  const SilentServer server;
+  auto book = ResultBook::open({.database = file, .line = server.url()}, startOf("A2"), error);
+  ASSERT_TRUE(book && book->record(kKeys, error)) << error;
+  EXPECT_TRUE(book->close(error)) << error;
+  EXPECT_EQ(book->lineStatus()->waiting, 2);
+  EXPECT_EQ(book->lineStatus()->error, "the line's database: has not answered in time");
+  EXPECT_THAT(states(), ElementsAre("aborted", "aborted"));
 }
 
 RunRecord runOf(const char* unit, RunState state, std::vector<TestResult> results) {

@@ -72,8 +72,9 @@ std::string faultOf(const Command& command) {
     return "needs one of --json, --junit, --csv and --html";
   }
   if (!command.isReport && !command.value.empty()) return "takes no --value";
-  if (!command.line.empty() && !isPostgresUrl(command.line)) {
-    return "--line needs an address like postgresql://host/database";
+  if (!command.line.empty()) {
+    const std::string wrong = wrongPostgresUrl(command.line);
+    if (!wrong.empty()) return "--line " + wrong;
   }
   if (command.filter.since.empty() || isDay(command.filter.since)) return "";
   return "--since needs a day like 2026-11-21";

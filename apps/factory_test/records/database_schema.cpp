@@ -94,6 +94,10 @@ create trigger verdict_is_given after insert on verdicts begin
   insert into changes (run, verdict) values (new.run, new.id);
 end;
 )sql",
+    // Where each line was met last, so that its verdicts can be counted while it is away.
+    R"sql(
+alter table lines add column place text;
+)sql",
 });
 
 std::string named(const fs::path& path, const std::string& what) {

@@ -98,8 +98,8 @@ bool ResultBook::saveFiles(std::string& error) {
 bool ResultBook::saveDatabase(std::string& error) {
   if (!database || unsavedVerdicts.empty()) return true;
   if (!database->keep(unsavedVerdicts, error)) return false;
+  if (line) line->wake(unsavedVerdicts.size());
   unsavedVerdicts.clear();
-  if (line) line->wake();
   return true;
 }
 
@@ -127,6 +127,13 @@ bool ResultBook::saveAgain(std::string& error) {
 
 bool ResultBook::finish(std::string& error) {
   return saveAgain(error) && (!database || database->finishRun(error));
+}
+
+bool ResultBook::close(std::string& error) {
+  const bool isKept = saveAgain(error);
+  database.reset();
+  if (line) line->end();
+  return isKept;
 }
 
 std::optional<LineStatus> ResultBook::lineStatus() const {

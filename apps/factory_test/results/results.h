@@ -63,7 +63,12 @@ class ResultBook {
   /// finished once all tests of its plan have a verdict, and aborted when the program ends before.
   bool finish(std::string& error);
 
-  /// How the line's database is kept up to date; nothing without one.
+  /// Tries a last time, as saveAgain() does, and leaves the run and the database. The line has a
+  /// moment to take the rest.
+  bool close(std::string& error);
+
+  /// How the line's database is kept up to date: how many verdicts were not sent, and what went
+  /// wrong last. Nothing without one. Any thread; also after close().
   std::optional<LineStatus> lineStatus() const;
 
   /// The test's result, or null. Valid until the next record() or startUnit().
