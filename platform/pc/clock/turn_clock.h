@@ -109,12 +109,13 @@ class TurnClock {
   void actAsAgent(Lock& lock, uint64_t due);
   void settle(Lock& lock);
   static bool isUnsettled(Participant& away);
+  bool mayStillLetGo();
   static bool isStillToPoll(Participant& away);
   bool seemsToPoll(Participant& watched);
   void dropGone();
   void keep();
   void watchHolder(Lock& lock);
-  bool othersRun();
+  static bool othersRun();
   void sendAway(Lock& lock, Participant& blocked);
   void callOutside(Lock& lock, Participant& blocked);
   void takeBack(Participant& me);

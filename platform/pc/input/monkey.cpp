@@ -128,7 +128,11 @@ void Monkey::planMoves(int finger, int steps) {
   }
 }
 
-void Monkey::tap(const Frame& shown) { planPress(0, somewhere(shown), 5 + below(60)); }
+// Each number is drawn in a statement of its own: compilers differ in the order of arguments.
+void Monkey::tap(const Frame& shown) {
+  const ScreenPoint place = somewhere(shown);
+  planPress(0, place, 5 + below(60));
+}
 
 void Monkey::tapTwice(const Frame& shown) {
   const ScreenPoint place = somewhere(shown);
@@ -137,7 +141,10 @@ void Monkey::tapTwice(const Frame& shown) {
   planPress(0, place, 20 + below(60));
 }
 
-void Monkey::hold(const Frame& shown) { planPress(0, somewhere(shown), kLongMs + below(kLongMs)); }
+void Monkey::hold(const Frame& shown) {
+  const ScreenPoint place = somewhere(shown);
+  planPress(0, place, kLongMs + below(kLongMs));
+}
 
 void Monkey::drag(const Frame& shown) {
   const ScreenPoint from = somewhere(shown);
