@@ -2,6 +2,9 @@
 # Included by <architecture>.cmake, which sets BRIMOL_ARCHITECTURE, BRIMOL_TRIPLE, and either BRIMOL_EMULATOR or,
 # where this machine runs the programs itself, BRIMOL_LOADER.
 
+# CMake reads from the compiler which folders it searches by itself. With a base_dir ccache would make their
+# names relative.
+set(ENV{CCACHE_DISABLE} 1)
 cmake_path(SET root NORMALIZE "${CMAKE_CURRENT_LIST_DIR}/../../build/roots/${BRIMOL_ARCHITECTURE}")
 set(CMAKE_SYSTEM_NAME Linux)
 set(CMAKE_SYSROOT "${root}")

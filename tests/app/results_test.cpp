@@ -208,7 +208,7 @@ TEST_F(Results, MakeAWellFormedReport) {
 }
 
 bool isShort(const std::string& text) {
-  return !text.empty() && text.size() <= kFigureBytes &&
+  return !text.empty() && text.size() <= kFigureLetters &&
          std::ranges::all_of(text, [](char letter) { return letter >= ' ' && letter <= '~'; });
 }
 

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <string_view>
 
+#include "language/language.h"
 #include "xml/xml_text.h"
 
 namespace factory_test {
@@ -53,7 +54,7 @@ bool isSerial(const std::string& text, std::string& error) {
       std::ranges::all_of(text, [](char letter) { return letter > ' ' && letter <= '~'; })) {
     return true;
   }
-  error = "a serial number has 1 to 64 letters, digits and marks, without spaces";
+  error = msg("a serial number has 1 to 64 letters, digits and marks, without spaces");
   return false;
 }
 
