@@ -182,6 +182,45 @@ TEST_F(Records, OfAnOlderVersionAreMigratedWithABackup) {
   EXPECT_EQ(store.number("select revision from runs where unit = 'OLD 1'"), 1);
 }
 
+TEST_F(Records, AreReadWithoutLeavingAFile) {
+  const fs::path odd = folder / "100%?#.db";
+  ASSERT_TRUE(ResultBook::open({.database = odd}, startOf("A1"), error)->record(kKeys, error));
+  const auto expectVerdicts = [&](std::size_t count) {
+    const auto files = [this] {
+      return std::distance(fs::directory_iterator(folder), fs::directory_iterator());
+    };
+    const auto before = files();
+    readUndisturbed(odd, [&] {
+      Sqlite store(odd, Sqlite::Mode::Read);
+      EXPECT_EQ(readHistory(queryOf(store), {}).at(0).verdicts.size(), count);
+    });
+    EXPECT_EQ(files(), before);
+  };
+  expectVerdicts(1);
+  inChild([&] {
+    auto book = ResultBook::open({.database = odd}, startOf("A1"), error);
+    book->record(kKeys, error);
+    ::raise(SIGKILL);
+  });
+  expectVerdicts(2);  // from the log that was left
+  fs::remove(odd.native() + "-shm");
+  expectVerdicts(2);
+  const int end = inChild([&] {
+    fs::permissions(folder, fs::perms::owner_read | fs::perms::owner_exec | fs::perms::others_exec |
+                                fs::perms::others_read);
+    if (::setuid(65'534) != 0 && ::getuid() == 0) ::_exit(2);
+    expectVerdicts(2);
+    ::_exit(HasFailure() ? 1 : 0);
+  });
+  EXPECT_EQ(end, 0) << "a folder that cannot be written";
+  fs::permissions(folder, fs::perms::owner_all);
+  int reads = 0;
+  readUndisturbed(odd, [&] {
+    if (++reads == 1) (void)ResultBook::open({.database = odd}, startOf("A2"), error);
+  });
+  EXPECT_EQ(reads, 2) << "somebody wrote meanwhile";
+}
+
 TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
   ASSERT_TRUE(open(startOf("A1"))->record(kKeys, error));
   const auto damage = [this](std::streamoff at, const std::string& bytes) {
@@ -195,6 +234,8 @@ TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
   for (const auto& [says, prepare] : std::vector<Case>{
            {"is of version 4, newer than this program's 3",
             [&] { run("pragma user_version = 4"); }},
+           {"has lost its version: put it aside, then begin a new one",
+            [&] { run("pragma user_version = 0"); }},
            {"is another program's database", [&] { run("pragma application_id = 7"); }},
            {"is damaged: put it aside, then begin a new one",
             [&] {
@@ -290,11 +331,16 @@ TEST_F(Records, SayWhatASilentLineDoesNotTake) {
     store.runAll("insert into lines values ('other', 1000, 'host=other ')");
   }
   const SilentServer server;
-  auto book = ResultBook::open({.database = file, .line = server.url()}, startOf("A2"), error);
-  ASSERT_TRUE(book && book->record(kKeys, error)) << error;
-  EXPECT_TRUE(book->close(error)) << error;
-  EXPECT_EQ(book->lineStatus()->waiting, 2);
-  EXPECT_EQ(book->lineStatus()->error, "the line's database: has not answered in time");
+  int waiting = 1;
+  for (const auto& [url, why] :
+       {std::pair(server.url(), "has not answered in time"),
+        std::pair<std::string, const char*>("postgresql://127.0.0.1:1/line", "refused")}) {
+    auto book = ResultBook::open({.database = file, .line = url}, startOf("A2"), error);
+    ASSERT_TRUE(book && book->record(kKeys, error)) << error;
+    EXPECT_TRUE(book->close(error)) << error;
+    EXPECT_EQ(book->lineStatus()->waiting, ++waiting);
+    EXPECT_THAT(book->lineStatus()->error, testing::HasSubstr(why));
+  }
   EXPECT_THAT(states(), ElementsAre("aborted", "aborted"));
 }
 

@@ -115,6 +115,7 @@ TEST_F(Results, ThatAreDamagedAreNamedAndLeftAsTheyAre) {
            {kDocumented, "{", "is not JSON"},
            {"1440,", "1440", "is not JSON"},
            {"1440", "1e999", "is not JSON"},
+           {"]}", std::string("]}\n\0{", 5), "is not JSON: holds a NUL byte in line 2"},
            {"colours", "\xff", "is not JSON"},
            {kDocumented, std::string(2 << 20, ' '), "is longer than a MiB"},
            {kDocumented, "[1]", "has no list of \"results\""},

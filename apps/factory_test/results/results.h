@@ -29,6 +29,7 @@ struct Keeping {
   Database::Resume resume = Database::Resume::Yes;
   FirstRun first = FirstRun::AtOnce;
   std::string line = {};  // the address of the line's database, see records/line.h; empty: none
+  bool isOnlyShown = false;  // the JSON file is read, and nothing is written
 };
 
 /// The newest result of each test of one unit, and what keeps them. One thread at a time uses a

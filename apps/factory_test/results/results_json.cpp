@@ -8,6 +8,7 @@
 
 #include "results/result_entry.h"
 #include "results/utc_time.h"
+#include "utf8.h"
 
 namespace factory_test {
 
@@ -181,6 +182,10 @@ std::string resultsJson(const RunStart& run, std::span<const TestResult> results
 }
 
 std::optional<ResultFile> parseResults(std::string_view text, std::string& reason) {
+  if (const int line = lineOfNul(text); line > 0) {
+    reason = "is not JSON: holds a NUL byte in line " + std::to_string(line);
+    return {};
+  }
   const json root = json::parse(text, nullptr, false);  // without exceptions
   const json& list = memberOf(root, "results");
   if (!list.is_array()) {
