@@ -97,8 +97,8 @@ class Build:
         listed = subprocess.run(['ctest', '--show-only=json-v1'], cwd=self.build, stdout=subprocess.PIPE, check=True)
         found = {}
         for test in json.loads(listed.stdout)['tests']:
-            program = pathlib.Path(test['command'][0])
-            if not program.is_relative_to(self.build) or not program.exists() or program.name in self.without:
+            program = pathlib.Path(test.get('command', ['not built'])[0])
+            if not program.is_relative_to(self.build) or program.name in self.without:
                 continue
             words = next((p['value'] for p in test['properties'] if p['name'] == 'ENVIRONMENT'), [])
             found[program, tuple(words)] = {'program': program, 'words': words}
@@ -112,7 +112,7 @@ class Build:
         environment = {**os.environ, 'GTEST_FAIL_FAST': '1', 'GTEST_BRIEF': '1',
                        **dict(word.split('=', 1) for word in run['words'])}
         command = ['prlimit', f'--as={MEMORY}', '--core=0', run['program']]
-        with subprocess.Popen(command, cwd=self.build, env=environment, stdin=subprocess.DEVNULL, stdout=subprocess.PIPE,
+        with subprocess.Popen(command, cwd=run['program'].parent, env=environment, stdin=subprocess.DEVNULL, stdout=subprocess.PIPE,
                               stderr=subprocess.STDOUT, start_new_session=True) as program:
             try:
                 output = program.communicate(timeout=seconds)[0].decode(errors='replace')
