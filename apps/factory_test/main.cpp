@@ -38,7 +38,7 @@ int main(int count, char** arguments) {
   std::string error;
   const std::span<const char* const> all(arguments, static_cast<std::size_t>(count));
   const auto words = all.subspan(all.empty() ? 0 : 1);
-  if (const auto done = factory_test::runRecordsCommand(words)) return *done;
+  if (const auto done = factory_test::runRecordsCommand(words)) return static_cast<int>(*done);
   const auto options = factory_test::parseOptions(words, error);
   if (!options) {
     factory_test::complain(error);

@@ -39,11 +39,11 @@ std::string rowWords(const char* name) {
   return std::string(static_cast<std::size_t>((margin + blank - 1) / blank), ' ') + name;
 }
 
-std::string rowWords(const TestEntry& entry, const TestResult* result, bool isSaved) {
+std::string rowWords(const TestEntry& entry, const TestResult* result, const char* behind) {
   std::string words = rowWords(tr(entry.name));
   if (result == nullptr || result->verdict == Verdict::None) return words;
   words.append(": ").append(tr(verdictName(result->verdict)));
-  return isSaved ? words : words.append(tr(", not saved"));
+  return words.append(behind);
 }
 
 // In which it has room in a row.
@@ -150,7 +150,7 @@ void Menu::refreshFigures() {
   MW::isDisplayUpdate(1);
 }
 
-void Menu::showVerdicts() {
+void Menu::showVerdicts(const char* unsaved) {
   head.tell(progressOf(book));
   for (std::size_t i = 0; i < rowOfEntry.size(); ++i) {
     const TestEntry& entry = testEntries()[i];
@@ -158,7 +158,7 @@ void Menu::showVerdicts() {
     const Verdict verdict = result == nullptr ? Verdict::None : result->verdict;
     const auto* const look = std::ranges::find(kLooks, verdict, &VerdictLook::verdict);
     const int row = rowOfEntry.at(i);
-    const std::string words = rowWords(entry, result, book.isSaved(entry.id));
+    const std::string words = rowWords(entry, result, book.isSaved(entry.id) ? "" : unsaved);
     list.setText(row, words.c_str(), static_cast<unsigned int>(words.size()));
     list.setFontSize(row, sizeInRow(words));
     faces.at(static_cast<std::size_t>(row)) = look->ink.ground;

@@ -111,6 +111,8 @@ TEST(ExitCodeTest, TellsTheWorst) {
   book->record({.test = "one", .verdict = Verdict::Fail}, error);
   book->record({.test = "two", .verdict = Verdict::None}, error);
   EXPECT_EQ(judgeRun(*book, tests), ExitCode::Failed);
+  EXPECT_EQ(worse(ExitCode::Failed, ExitCode::Incomplete), ExitCode::Failed);
+  EXPECT_EQ(worse(ExitCode::Passed, ExitCode::Incomplete), ExitCode::Incomplete);
 }
 
 }  // namespace

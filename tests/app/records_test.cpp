@@ -130,7 +130,8 @@ TEST_F(Records, KnowARunThatADeadProgramLeft) {
   });
   ASSERT_TRUE(WIFSIGNALED(end));
   EXPECT_THAT(states(), ElementsAre("running", "running"));
-  const auto next = open(startOf("A3"));
+  fs::create_symlink(file, folder / "link.db");
+  const auto next = ResultBook::open({.database = folder / "link.db"}, startOf("A3"), error);
   ASSERT_TRUE(next) << error;
   EXPECT_THAT(states(), testing::UnorderedElementsAre("running", "aborted", "running"));
   const auto resumed = open(startOf("A2"));
@@ -166,8 +167,9 @@ TEST_F(Records, OfAnOlderVersionAreMigratedWithABackup) {
   std::ifstream dump(RECORDS_V1);
   const std::string sql((std::istreambuf_iterator<char>(dump)), {});
   Sqlite(file, Sqlite::Mode::Write).runAll(sql.c_str());
-  fs::create_directory(file.native() + ".v1.bak");  // in the way
-  ASSERT_TRUE(open(startOf("C1"))) << error;
+  fs::create_symlink("station.db.v1.bak", file.native() + ".v1.bak");  // in the way, and a loop
+  fs::create_symlink(file, folder / "link.db");
+  ASSERT_TRUE(ResultBook::open({.database = folder / "link.db"}, startOf("C1"), error)) << error;
   for (const auto& [path, version] : {std::pair(file, 3), {file.native() + ".v1.bak.2", 1}}) {
     Sqlite store(path, Sqlite::Mode::Read);
     EXPECT_EQ(store.number("pragma user_version"), version);
@@ -227,8 +229,9 @@ TEST_F(Records, SayWhereTheyCannotBeWritten) {
 }
 
 TEST_F(Records, SurviveAFullDiskAndALock) {
-  auto book =
-      ResultBook::open({.json = folder / "all.json", .database = file}, startOf("A1"), error);
+  RunStart longer = startOf("A1");
+  longer.tests.emplace_back("pinch");
+  auto book = ResultBook::open({.json = folder / "all.json", .database = file}, longer, error);
   ASSERT_TRUE(book && book->record(kKeys, error)) << error;
   // Files of this process end after some bytes, as on a full disk.
   (void)std::signal(SIGXFSZ, SIG_IGN);
@@ -246,12 +249,16 @@ TEST_F(Records, SurviveAFullDiskAndALock) {
   {
     Sqlite other(file, Sqlite::Mode::Write);
     const Transaction lock(other);
+    book->setPatience(std::chrono::milliseconds(1));
     EXPECT_FALSE(book->saveAgain(error));
     EXPECT_EQ(error, file.native() + ": is locked by another program");
+    EXPECT_FALSE(book->finish(error));
+    EXPECT_TRUE(book->isBusy());
   }
   EXPECT_TRUE(book->saveAgain(error) && book->saveAgain(error)) << error;
-  EXPECT_TRUE(book->isSaved("touch"));
+  EXPECT_TRUE(book->isAllSaved() && book->isSaved("touch"));
   EXPECT_EQ(history().at(0).verdicts.size(), 2U) << "once each";
+  EXPECT_THAT(states(), ElementsAre("finished"));
 }
 
 // A server that takes connections and says nothing. Its address.

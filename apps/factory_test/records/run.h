@@ -44,7 +44,7 @@ struct RunRecord {
   std::vector<VerdictRecord> verdicts = {};  // all of them, in the order in which they were given
 };
 
-/// `text` in UTF-8 without control characters, which become U+FFFD, cut to 200 bytes at most:
+/// `text` in UTF-8 without control characters, which become U+FFFD, cut to 400 bytes at most:
 /// what every database and every export can hold.
 std::string storable(const std::string& text);
 /// The same for all of its texts.

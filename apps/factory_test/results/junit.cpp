@@ -111,4 +111,21 @@ std::string junitXml(std::span<const JunitSuite> suites) {
   return xml.str();
 }
 
+bool isJunitHead(std::string_view head) {
+  constexpr std::string_view kBlanks = " \t\r\n";
+  constexpr std::string_view kByteOrderMark = "\xef\xbb\xbf";
+  if (head.starts_with(kByteOrderMark)) head.remove_prefix(kByteOrderMark.size());
+  for (;;) {
+    head.remove_prefix(std::min(head.find_first_not_of(kBlanks), head.size()));
+    const std::string_view end = head.starts_with("<?")     ? "?>"
+                                 : head.starts_with("<!--") ? "-->"
+                                                            : "";
+    const std::size_t at = end.empty() ? std::string_view::npos : head.find(end);
+    if (at == std::string_view::npos) break;
+    head.remove_prefix(at + end.size());
+  }
+  const std::string_view root = head.substr(0, head.find_first_of(" \t\r\n/>"));
+  return head.empty() || root == "<testsuites" || root == "<testsuite";
+}
+
 }  // namespace factory_test

@@ -3,6 +3,7 @@
 
 #include <span>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "results/test_result.h"
@@ -21,5 +22,9 @@ struct JunitSuite {
 /// screen size, attempt and values are its properties. Characters that XML cannot hold become
 /// U+FFFD.
 std::string junitXml(std::span<const JunitSuite> suites);
+
+/// Whether a file that begins so is a report like these, whoever wrote it, or blank: one that may
+/// be written over.
+bool isJunitHead(std::string_view head);
 
 }  // namespace factory_test

@@ -28,8 +28,10 @@ std::optional<ResultBook> ResultBook::open(const Keeping& places, const RunStart
     if (!book.database) return {};
     if (!places.line.empty()) book.line = std::make_unique<Line>(places.database, places.line);
   }
-  if (!book.begin(start, error)) return {};
-  return book;
+  if (places.first == FirstRun::AtOnce)
+    return book.begin(start, error) ? std::optional(std::move(book)) : std::nullopt;
+  book.begun = storable(start);
+  return book.saveFiles(error) ? std::optional(std::move(book)) : std::nullopt;
 }
 
 bool ResultBook::lockFiles(std::string& error) {
@@ -78,6 +80,7 @@ bool ResultBook::begin(const RunStart& start, std::string& error) {
     wanted.unit = begun.unit;
   }
   begun = std::move(wanted);
+  isBegun = true;
   return saveFiles(error);
 }
 
@@ -96,11 +99,16 @@ bool ResultBook::saveFiles(std::string& error) {
 }
 
 bool ResultBook::saveDatabase(std::string& error) {
-  if (!database || unsavedVerdicts.empty()) return true;
-  if (!database->keep(unsavedVerdicts, error)) return false;
-  if (line) line->wake(unsavedVerdicts.size());
-  unsavedVerdicts.clear();
-  return true;
+  if (!database) return true;
+  if (!unsavedVerdicts.empty()) {
+    if (!database->keep(unsavedVerdicts, error)) return false;
+    if (line) line->wake(unsavedVerdicts.size());
+    unsavedVerdicts.clear();
+  }
+  if (!isFinishing) return true;
+  isFinishing = !database->finishRun(error);
+  if (line) line->wake(0);
+  return !isFinishing;
 }
 
 bool ResultBook::record(TestResult result, std::string& error) {
@@ -126,10 +134,16 @@ bool ResultBook::saveAgain(std::string& error) {
 }
 
 bool ResultBook::finish(std::string& error) {
-  return saveAgain(error) && (!database || database->finishRun(error));
+  isFinishing = database != nullptr;
+  return saveAgain(error);
+}
+
+void ResultBook::setPatience(std::chrono::milliseconds patience) {
+  if (database) database->setPatience(patience);
 }
 
 bool ResultBook::close(std::string& error) {
+  setPatience(Sqlite::kPatience);
   const bool isKept = saveAgain(error);
   database.reset();
   if (line) line->end();
