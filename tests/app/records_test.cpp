@@ -317,12 +317,15 @@ TEST_F(Records, TellYieldFailsAndValues) {
   };
   runs[0].verdicts[0].result.values[0].value = 9.5;
   runs[5].start.started += std::chrono::days(1);
+  runs.push_back(runOf("rehearsed", RunState::Finished, {kKeys, kTouch}));
+  runs.back().start.planName += kRehearsal;
   const Statistics all = statisticsOf(runs);
   EXPECT_EQ(all.total.units, 5);
   EXPECT_EQ(all.total.passed, 3);
   EXPECT_EQ(all.total.passedAtFirst, 1);
   EXPECT_EQ(all.days.size(), 2U);
   EXPECT_EQ(all.aborted, 2);
+  EXPECT_EQ(all.rehearsals, 1);
   ASSERT_EQ(all.tests.size(), 2U);
   EXPECT_EQ(all.tests[0].test, "touch");
   EXPECT_EQ(all.tests[0].fails, 3);

@@ -201,7 +201,8 @@ TEST_F(Results, MakeAWellFormedReport) {
       results.push_back({before + std::string(1, static_cast<char>(byte))});
     }
   }
-  const JunitSuite suite = {.planned = {"later", "a.b", results[1].test}, .results = results};
+  const JunitSuite suite = {.run = {.tests = {"later", "a.b", results[1].test}},
+                            .results = results};
   const std::string xml = junitXml({&suite, 1});
   for (
       const char* const part :

@@ -134,9 +134,10 @@ bool write(const Request& request, const std::string& text, std::string& error) 
 
 bool perform(const Request& request, std::string& error) {
   try {
-    const std::vector<RunRecord> runs = read(request);
-    const std::string text =
-        request.isReport ? reportHtml(statisticsOf(runs), request.value) : request.format(runs);
+    std::vector<RunRecord> runs = read(request);
+    const std::string text = request.isReport
+                                 ? reportHtml(statisticsOf(std::move(runs)), request.value)
+                                 : request.format(runs);
     return write(request, text, error);
   } catch (const StoreError& failure) {
     error = failure.what();

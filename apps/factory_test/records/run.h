@@ -4,6 +4,7 @@
 #include <chrono>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "results/test_result.h"
@@ -28,6 +29,10 @@ struct RunStart {
   std::string station = {};             // the host's name
   std::chrono::sys_seconds started = {};
 };
+
+/// What the name of a plan ends with whose failures were rehearsed, so that nobody takes its
+/// results for others.
+inline constexpr std::string_view kRehearsal = " (rehearsal)";
 
 struct VerdictRecord {
   std::string id = {};  // UUID
