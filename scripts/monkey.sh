@@ -9,9 +9,10 @@ Usage: scripts/monkey.sh [--preset NAME] [--events N] [--days N] SEED...
 
 Each seed plays in a process of its own, in simulated time, on a screen of 480x800. The session's memory, threads and
 open files are printed after each million events and each simulated day. A seed fails if the application crashes,
-leaks (with a sanitizer's preset), does not close, shows the same for 5,000 events, or if from the first of those
-lines to the last its memory grows by more than 1 % or a thread or an open file is left, or if a verdict has a wrong
-time. Its trace stays in build/monkey/SEED.trace, for scripts/shrink_trace.py.
+leaks (with a sanitizer's preset), does not close, shows the same for 5,000 events, or gives a verdict a wrong time.
+From the first of those lines after half a million events to the last, memory may not grow by more than 1 %, and no
+thread and no open file may be left. The trace of a seed that fails stays in build/monkey/SEED.trace, for
+scripts/shrink_trace.py.
 
   --preset NAME   the build, `release` when not said
   --events N      so many events each, 1000000 when not said
@@ -65,9 +66,10 @@ program=$PWD/build/$preset/apps/factory_test/factory_test
 mkdir -p build/monkey
 cd build/monkey
 
-# Compares the first line that tells of memory (KiB), threads and open files with the last one.
+# Compares the first line that tells of memory (KiB), threads and open files with the last one. Before half a million
+# events the painter's bounded store of texts still fills.
 judge() {
-  awk '/ KiB resident/ {
+  awk -v few=$((events < 500000)) '/ KiB resident/ && ($4 >= 500000 || few) {
          memory = $(NF - 7); threads = $(NF - 4); files = $(NF - 2)
          if (!lines++) { memory1 = memory; threads1 = threads; files1 = files }
        }
