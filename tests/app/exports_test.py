@@ -90,6 +90,7 @@ class ExportsTest(unittest.TestCase):
         text = file.read_text()
         self.assertEqual(UNITS, text.count("<testsuite "))
         self.assertIn("worst distance", text)
+        self.assertIn('<failure message="time-out"/>', text)
         self.assertEqual(UNITS, text.count('<property name="plan_hash" value="h3"/>'))
 
     def test_csv_has_a_line_for_each_value(self):
@@ -98,6 +99,7 @@ class ExportsTest(unittest.TestCase):
         self.assertEqual({"'=s-0"}, {row["unit"] for row in rows[:TESTS * 2]}, "no formula for a spreadsheet")
         self.assertEqual({"7"}, {row["value"] for row in rows if row["value_name"] == "<i>hits</i>"})
         self.assertNotIn(None, rows[0].values())
+        self.assertEqual({("PASS", ""), ("FAIL", "time-out")}, {(row["verdict"], row["reason"]) for row in rows})
 
     def test_pages_stand_alone_in_a_browser(self):
         for name, options in (("runs", ["export", "--html"]), ("report", ["report"])):

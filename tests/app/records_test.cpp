@@ -120,6 +120,25 @@ TEST_F(Records, AreFinishedWithTheirPlan) {
   EXPECT_EQ(run.verdicts[1].result, resultOf("keys", Verdict::Pass, 2));
 }
 
+TEST_F(Records, NameWhoGaveEachVerdictAndWhy) {
+  RunStart start = startOf("B1");
+  ASSERT_TRUE(open(start)->record(kTouch, error));
+  for (const auto& [name, reason] :
+       {std::pair("Bob", Reason::TimeOut), {"", Reason::Limit}, {"Cem", Reason::Rehearsal}}) {
+    start.operatorName = name;
+    TestResult result = kTouch;
+    result.reason = reason;
+    ASSERT_TRUE(open(start)->record(result, error)) << error;
+  }
+  const RunRecord run = history().at(0);
+  EXPECT_EQ(run.start.operatorName, "Ann");
+  std::vector<std::string> said;
+  for (const VerdictRecord& each : run.verdicts) {
+    said.push_back(each.result.operatorName + " " + reasonName(each.result.reason));
+  }
+  EXPECT_THAT(said, ElementsAre("Ann ", "Bob time-out", " limit", "Cem rehearsal"));
+}
+
 TEST_F(Records, KnowARunThatADeadProgramLeft) {
   auto living = open(startOf("A1"));
   ASSERT_TRUE(living) << error;
@@ -170,11 +189,12 @@ TEST_F(Records, OfAnOlderVersionAreMigratedWithABackup) {
   fs::create_symlink("station.db.v1.bak", file.native() + ".v1.bak");  // in the way, and a loop
   fs::create_symlink(file, folder / "link.db");
   ASSERT_TRUE(ResultBook::open({.database = folder / "link.db"}, startOf("C1"), error)) << error;
-  for (const auto& [path, version] : {std::pair(file, 3), {file.native() + ".v1.bak.2", 1}}) {
+  for (const auto& [path, version] : {std::pair(file, 4), {file.native() + ".v1.bak.2", 1}}) {
     Sqlite store(path, Sqlite::Mode::Read);
     EXPECT_EQ(store.number("pragma user_version"), version);
     const auto runs = readHistory(queryOf(store), {.unit = "OLD 1"});
     ASSERT_EQ(runs.size(), 1U);
+    EXPECT_EQ(runs[0].verdicts.at(1).result.operatorName, version == 1 ? "" : "Eve");
     EXPECT_EQ(runs[0].verdicts.at(1).result.values.at(0), (Measure{"gap", "mm", 0.25, {}, 1.5}));
   }
   Sqlite store(file, Sqlite::Mode::Read);
@@ -232,14 +252,14 @@ TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
     std::function<void()> prepare;
   };
   for (const auto& [says, prepare] : std::vector<Case>{
-           {"is of version 4, newer than this program's 3",
-            [&] { run("pragma user_version = 4"); }},
+           {"is of version 5, newer than this program's 4",
+            [&] { run("pragma user_version = 5"); }},
            {"has lost its version: put it aside, then begin a new one",
             [&] { run("pragma user_version = 0"); }},
            {"is another program's database", [&] { run("pragma application_id = 7"); }},
            {"is damaged: put it aside, then begin a new one",
             [&] {
-              run("pragma application_id = 1179927618; pragma user_version = 3");
+              run("pragma application_id = 1179927618; pragma user_version = 4");
               for (std::streamoff page = 1; page < 30; ++page)
                 damage(page * 4096, std::string(64, '\x7f'));
             }},
@@ -262,7 +282,8 @@ TEST_F(Records, SayWhereTheyCannotBeWritten) {
     fs::permissions(folder, fs::perms::owner_read | fs::perms::owner_exec);
     if (::setuid(65'534) != 0 && ::getuid() == 0) ::_exit(2);
     const bool isRefused =
-        !open(startOf("A1")) && error.starts_with(file.native() + ": cannot be ");
+        !open(startOf("A1")) &&
+        error == file.native() + ": cannot be made in its folder: Permission denied";
     ::_exit(isRefused ? 0 : 1);
   });
   EXPECT_EQ(end, 0) << "a folder that cannot be written";

@@ -105,6 +105,12 @@ end;
     R"sql(
 alter table lines add column place text;
 )sql",
+    // A run may be gone on with by another operator.
+    R"sql(
+alter table verdicts add column operator text;
+alter table verdicts add column reason text;
+update verdicts set operator = (select operator from runs where id = run);
+)sql",
 });
 
 std::string named(const fs::path& path, const std::string& what) {

@@ -35,7 +35,7 @@ std::string explain(sqlite3* handle, int code) {
   if (isBusy(code)) return "is locked by another program";
   switch (code & kPrimary) {
     case SQLITE_FULL: return "cannot be written: the disk is full";
-    case SQLITE_READONLY: return "cannot be written: it is read-only";
+    case SQLITE_READONLY: return "cannot be used: it or its folder is read-only";
     case SQLITE_CANTOPEN: return "cannot be opened" + systemText(handle);
     case SQLITE_IOERR: return "cannot be read or written" + systemText(handle);
     case SQLITE_NOTADB: return "is not a database";
@@ -67,6 +67,10 @@ std::optional<std::string> cellOf(sqlite3_stmt* statement, int column) {
   const auto bytes = static_cast<std::size_t>(sqlite3_column_bytes(statement, column));
   const unsigned char* const text = sqlite3_column_text(statement, column);
   return text == nullptr ? std::string() : std::string(text, text + bytes);
+}
+
+std::filesystem::path folderOf(const std::filesystem::path& file) {
+  return file.has_parent_path() ? file.parent_path() : ".";
 }
 
 Cells rowOf(sqlite3_stmt* statement) {
@@ -144,7 +148,12 @@ Sqlite::Sqlite(const std::filesystem::path& path, Mode mode) : file(path) {
   const std::string name = writes ? path.native() : uriOf(path, way.settings);
   const int code = sqlite3_open_v2(name.c_str(), &opened, flags, nullptr);
   handle.reset(opened);  // also of one that failed
-  if (writes) refuseUnwritable(code);
+  // SQLite then says that there is no such file.
+  if (code == SQLITE_CANTOPEN && writes &&
+      ::access(folderOf(path).c_str(), W_OK) != 0 && errno != ENOENT) {
+    throw StoreError(path.native() +
+                     ": cannot be made in its folder: " + std::generic_category().message(errno));
+  }
   check(code);
   sqlite3_extended_result_codes(opened, 1);
   setPatience(kPatience);
@@ -152,18 +161,6 @@ Sqlite::Sqlite(const std::filesystem::path& path, Mode mode) : file(path) {
   // The log's index stands in memory then, and the log is left where it is.
   runAll("pragma locking_mode = exclusive");
   check(sqlite3_db_config(opened, SQLITE_DBCONFIG_NO_CKPT_ON_CLOSE, 1, nullptr));
-}
-
-// SQLite says that a file is missing which it was not allowed to make.
-void Sqlite::refuseUnwritable(int code) const {
-  const fs::path folder = placeOfFile(file).parent_path();
-  std::error_code failure;
-  if ((code & kPrimary) != SQLITE_CANTOPEN || fs::exists(file, failure) ||
-      !fs::exists(folder, failure) || ::access(folder.c_str(), W_OK) == 0) {
-    return;
-  }
-  throw StoreError(file.native() +
-                   ": cannot be written: " + std::generic_category().message(errno));
 }
 
 void readUndisturbed(const fs::path& path, const std::function<void()>& task) {

@@ -79,7 +79,6 @@ class Sqlite {
   Statement prepare(const char* sql) const;
   void bind(sqlite3_stmt* statement, Values values) const;
   void check(int code) const;
-  void refuseUnwritable(int code) const;
 
   std::filesystem::path file;
   std::unique_ptr<sqlite3, Closer> handle;

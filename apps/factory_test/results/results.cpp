@@ -119,6 +119,7 @@ bool ResultBook::record(TestResult result, std::string& error) {
     result.attempt =
         std::max(result.attempt, earlier->attempt + (earlier->attempt < INT_MAX ? 1 : 0));
   }
+  if (result.operatorName.empty()) result.operatorName = begun.operatorName;
   if (database) unsavedVerdicts.push_back(result);
   unsavedTests.push_back(result.test);
   put(std::move(result));

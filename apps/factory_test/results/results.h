@@ -58,7 +58,7 @@ class ResultBook {
   bool hasBegun() const { return isBegun; }
 
   /// Puts `result`, clamped(), in the place of the test's earlier one, whose attempts it goes on to
-  /// count, or at the end; then writes. False: it goes out with the next record() or saveAgain().
+  /// count, or at the end, with the run's operator; then writes. False: it goes out with the next record() or saveAgain().
   /// Waits for the disk, often some milliseconds.
   bool record(TestResult result, std::string& error);
 
