@@ -143,7 +143,8 @@ std::string sameFiles(const Options& options) {
     }
   }
   for (const auto& [name, file] : files) {
-    if (options.database.empty() || file.empty() || name == std::string_view("--database")) continue;
+    if (options.database.empty() || file.empty() || name == std::string_view("--database"))
+      continue;
     if (isOfDatabase(file, options.database)) return std::string(name) + " names the database";
   }
   return "";

@@ -54,8 +54,7 @@ INSTANTIATE_TEST_SUITE_P(
         WrongCase{"bytes", "{\"version\":1,\n\"name\":\"\xff\"}", 2, "is not JSON: "},
         WrongCase{"nul", std::string("{\"version\":1,\n\0 \"name\"", 24), 2, "holds a NUL byte"},
         WrongCase{"control", "{\"name\":\"a\\u0007\"}", 1, "'name' has a control character"},
-        WrongCase{"long_name", "{\"" + std::string(900'000, 'k') + "\":1}", 1,
-                  "kkk...'"},
+        WrongCase{"long_name", "{\"" + std::string(900'000, 'k') + "\":1}", 1, "kkk...'"},
         WrongCase{"twice",
                   "{\"version\":1,\"name\":\"x\",\"steps\":[{\"test\":\"keys\"},\n"
                   "{\"test\":\n\"keys\"}]}",

@@ -30,7 +30,8 @@ RunStart startOf(const std::string& unit) {
 TestResult resultOf(const std::string& test, Verdict verdict, int attempt = 1) {
   const Measure distance = {"worst distance", "mm", 0.1, {}, 2.5};
   return {test,       verdict,    kMorning, std::chrono::milliseconds(4200),
-          {480, 800}, {distance}, attempt};
+          {480, 800}, {distance}, attempt,  Reason::Unknown,
+          "Ann"};
 }
 const TestResult kKeys = resultOf("keys", Verdict::Pass);
 const TestResult kTouch = resultOf("touch", Verdict::Fail);
@@ -128,6 +129,7 @@ TEST_F(Records, NameWhoGaveEachVerdictAndWhy) {
     start.operatorName = name;
     TestResult result = kTouch;
     result.reason = reason;
+    result.operatorName = "";
     ASSERT_TRUE(open(start)->record(result, error)) << error;
   }
   const RunRecord run = history().at(0);
@@ -226,8 +228,7 @@ TEST_F(Records, AreReadWithoutLeavingAFile) {
   fs::remove(odd.native() + "-shm");
   expectVerdicts(2);
   const int end = inChild([&] {
-    fs::permissions(folder, fs::perms::owner_read | fs::perms::owner_exec | fs::perms::others_exec |
-                                fs::perms::others_read);
+    fs::permissions(folder, fs::perms(0555));
     if (::setuid(65'534) != 0 && ::getuid() == 0) ::_exit(2);
     expectVerdicts(2);
     ::_exit(HasFailure() ? 1 : 0);

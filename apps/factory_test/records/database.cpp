@@ -113,8 +113,7 @@ bool Database::takeAborted(const RunStart& start) {
         run = row[1].value_or("");
       });
   if (number == 0) return false;
-  store.run(
-      "update runs set state = 'running', ended = null where number = ?", {number});
+  store.run("update runs set state = 'running', ended = null where number = ?", {number});
   return true;
 }
 

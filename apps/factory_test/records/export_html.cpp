@@ -36,7 +36,8 @@ void addRun(std::string& body, const RunRecord& run) {
   body.append("; plan ").append(
       htmlText(start.planName + " " + start.planHash.substr(0, kHashDigits)));
   body.append("; software ").append(htmlText(start.software)).append("</p>\n<table>\n");
-  body.append(htmlHead({"Test", "Verdict", "Why", "Operator", "Attempt", "Began", "Seconds", "Values"}));
+  body.append(
+      htmlHead({"Test", "Verdict", "Why", "Operator", "Attempt", "Began", "Seconds", "Values"}));
   for (const auto& [id, result] : run.verdicts) {
     const std::chrono::duration<double> seconds = result.duration;
     body.append(htmlRow({htmlText(result.test), htmlVerdict(verdictName(result.verdict)),

@@ -138,7 +138,8 @@ void readVerdicts(const Query& ask, const Choice& choice, std::vector<RunRecord>
   std::unordered_map<std::string, RunRecord*> byId;
   for (RunRecord& run : runs) byId[run.id] = &run;
   // In the order of the tables, which only ever grow at their end.
-  ask("select v.* from verdicts v join runs r on r.id = v.run" + choice.where + " order by v.run, v.number",
+  ask("select v.* from verdicts v join runs r on r.id = v.run" + choice.where +
+          " order by v.run, v.number",
       choice.parameters, [&](const Cells& row) {
         const auto run = byId.find(row.at(kRunColumn).value_or(""));
         if (run != byId.end()) run->second->verdicts.push_back(verdictOf(row));

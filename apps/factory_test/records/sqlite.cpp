@@ -107,7 +107,7 @@ struct ReadWay {
   bool hasLog = true;  // what was written last stands in it
 };
 constexpr ReadWay kOpenElsewhere = {"mode=ro&readonly_shm=1", true};
-constexpr ReadWay kLeftWithItsLog = {"mode=ro&nolock=1"};
+constexpr ReadWay kLeftWithItsLog = {"mode=ro&vfs=unix-none"};
 constexpr ReadWay kClosed = {"immutable=1", false, false};
 
 ReadWay wayToRead(const fs::path& path) {
@@ -149,8 +149,8 @@ Sqlite::Sqlite(const std::filesystem::path& path, Mode mode) : file(path) {
   const int code = sqlite3_open_v2(name.c_str(), &opened, flags, nullptr);
   handle.reset(opened);  // also of one that failed
   // SQLite then says that there is no such file.
-  if (code == SQLITE_CANTOPEN && writes &&
-      ::access(folderOf(path).c_str(), W_OK) != 0 && errno != ENOENT) {
+  if (code == SQLITE_CANTOPEN && writes && ::access(folderOf(path).c_str(), W_OK) != 0 &&
+      errno != ENOENT) {
     throw StoreError(path.native() +
                      ": cannot be made in its folder: " + std::generic_category().message(errno));
   }
