@@ -45,7 +45,7 @@ TEST_F(LiveWindowTest, AFloodKeepsItsOrderAndGivesItsMemoryBack) {
   EXPECT_GT(allocatedBytes(), before + kEvents * sizeof(MW::event_data));
   for (unsigned int round = 0; round < kEvents; ++round) dispatcher->threadLoop();
   EXPECT_EQ(next, kEvents);
-  EXPECT_EQ(Window::getEventService()->recvEvent(), nullptr);
+  EXPECT_EQ(MW::EventService::recvEvent(), nullptr);
   EXPECT_LE(platform().paused, kEvents) << "more than a millisecond an event";
   std::deque<Event>().swap(platform().fed);  // what it keeps for itself is not the toolkit's
   EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 16));
