@@ -6,6 +6,8 @@
 #include <array>
 #include <memory_resource>
 #include <random>
+#include <set>
+#include <string>
 
 #include "core/dispatch_thread.h"
 #include "support/failing_malloc.h"
@@ -107,6 +109,22 @@ TEST_P(EveryClass, DrawsTheSameWhicheverCallFails) {
     ASSERT_EQ(drawingsOf(++nth), whole) << "call " << nth << " failed";
   } while (platform().failingCall == 0);
   EXPECT_GE(nth, std::ssize(whole));
+}
+
+// What a menu or a dialog is made of stands in no layer of its own, and answers 0 when it draws.
+TEST_P(EveryClass, StandsInItsLayerAndAnswersThatItDrew) {
+  const std::set<std::string> parts = {"Box", "Image", "Label", "Line", "Textbox", "WidgetRcui"};
+  const std::set<std::string> covers = {"AutoCapScreen", "FullScreen"};
+  const std::string name = GetParam().name;
+  Arguments from({});
+  const auto widget = GetParam().make(from);
+  if (!parts.contains(name)) {
+    const bool isOnTop = covers.contains(name) || name.starts_with("Dialog");
+    EXPECT_EQ(widget->type(), isOnTop ? MW::kTopLayer : MW::kBaseLayer);
+  }
+  for (const unsigned int ticks : {1U, 2U}) {
+    EXPECT_EQ(widget->show(ticks), parts.contains(name) ? 0 : 1);
+  }
 }
 
 TEST_P(EveryClass, DrawsTheSameWhateverThePlatformAnswers) {
