@@ -49,13 +49,29 @@ struct Painter::Parts {
   void paintPiece(const Frame& frame, const Pixels& piece) {
     covers.collect(frame, piece);
     const auto [color, next] = backdropOf(frame, piece);
-    for (const Pixels& part : covers.partsInSight(piece, next)) canvas.fill(part, color);
-    for (std::size_t i = next; i < frame.size(); ++i) items.draw(frame, i, piece, covers);
+    const Covers::Sight sight = covers.sightOf(piece, next);
+    for (const Pixels& part : sight.parts) canvas.fill(part, color);
+    late = sight.rows;
+    for (std::size_t i = next; i < frame.size(); ++i) {
+      if (!late.empty()) fillBelow(boundsOf(frame[i], piece), color);
+      items.draw(frame, i, piece, covers);
+    }
+  }
+
+  // Fills the rows that the area touches, unless they were filled before.
+  void fillBelow(const Pixels& area, uint32_t color) {
+    if (isEmpty(area)) return;
+    std::erase_if(late, [&](const Pixels& row) {
+      if (isEmpty(within(area, row))) return false;
+      canvas.fill(row, color);
+      return true;
+    });
   }
 
   Canvas canvas;
   ItemPainter items;
   Covers covers;
+  Region late;  // rows of the backdrop that are filled when something is first drawn over them
   Changes changes;
   Frame shown;
 };
