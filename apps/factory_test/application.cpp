@@ -42,8 +42,9 @@ ExitCode fail(const std::string& why) {
   return ExitCode::Trouble;
 }
 
-// What the exit code tells of.
-ExitCode judge(const Options& options, const ResultBook& book) {
+// What became of the last unit, where the exit code tells of tests.
+ExitCode judgeLast(const Options& options, const ResultBook& book) {
+  if (!options.shot.empty() || !options.monkey.empty()) return ExitCode::Passed;
   if (options.test.empty()) return judgeRun(book, book.run().tests);
   return judgeRun(book, std::array{options.test});
 }
@@ -62,7 +63,9 @@ std::string wrongScreen() {
 }
 
 void loop(FactoryTest& test, bool stays) {
-  while ((stays || !test.isEnded()) && brimol_host_close_requested() == 0 && interrupted == 0) {
+  while (brimol_host_close_requested() == 0 && interrupted == 0) {
+    if (test.isEnded() && !stays) return;
+    if (test.isEnded()) test.stay();
     test.update(GetTicks());
     if (MW::isDisplayUpdate(0) == 1) test.draw();
     MW::Window::updateTimer(MW::kUnused);
@@ -94,20 +97,27 @@ void letMonkeyPlay(const Options& options) {
   setenv("BRIMOL_DISPLAY", "headless", 1);
 }
 
+// What became of all units but the last one.
 ExitCode showScreens(const Options& options, ResultBook& book, const Context& context,
                      const Task& task) {
   FactoryTest test(book, context, task);
-  if (!options.database.empty() && options.test.empty() && book.run().unit.empty()) {
-    test.askForUnits();
-  }
+  if (!book.hasBegun()) test.askForUnits();
   if (!options.test.empty()) test.open(placeOf(options.test), GetTicks());
   test.draw();
   if (options.shot.empty()) {
     loop(test, options.stays);
-    return options.monkey.empty() ? judge(options, book) : ExitCode::Passed;
+    return options.monkey.empty() ? test.earlier() : ExitCode::Passed;
   }
   if (brimol_host_screenshot(options.shot.c_str()) == 0) return fail(brimol_host_error());
   return ExitCode::Passed;
+}
+
+void tellWaiting(const ResultBook& book) {
+  const auto line = book.lineStatus();
+  if (!line || line->waiting == 0 || line->error.empty()) return;
+  complain(std::to_string(line->waiting) +
+           (line->waiting == 1 ? " verdict waits" : " verdicts wait") +
+           " for the line: " + line->error);
 }
 
 }  // namespace
@@ -139,13 +149,9 @@ ExitCode runApplication(const Options& options) {
   const ExitCode result = started ? showScreens(options, *book, context, *task)
                                   : fail("no memory for the dispatch thread");
   MW::Window::destroy();
-  const auto line = book->lineStatus();
-  if (line && line->waiting > 0 && !line->error.empty()) {
-    complain(std::to_string(line->waiting) +
-             (line->waiting == 1 ? " verdict waits" : " verdicts wait") +
-             " for the line: " + line->error);
-  }
-  return result;
+  if (!book->close(error)) complain(error);
+  tellWaiting(*book);
+  return result == ExitCode::Trouble ? result : worse(result, judgeLast(options, *book));
 }
 
 }  // namespace factory_test

@@ -10,7 +10,7 @@ ButtonRow::ButtonRow(const SKIA_Rect& area, std::span<const Face> faces) {
     const Grid row = {1, static_cast<int>(faces.size())};
     const SKIA_Rect cell =
         inColor(cellOf(area, gapOf(screenSize()), row, static_cast<int>(i)), kButtonInk.ground);
-    const SKIA_Text caption = captionOf(tr(faces[i].caption), kButtonInk.text);
+    const SKIA_Text caption = captionIn(cell, tr(faces[i].caption), kButtonInk.text);
     buttons.push_back(std::make_unique<MW::ButtonNew>(MW::ButtonNew::kFramed, &cell, &caption));
     buttons.back()->clickCallback = faces[i].clicked;
     buttons.back()->setBdColor(MW::kColorBlack);

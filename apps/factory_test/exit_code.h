@@ -22,4 +22,7 @@ std::span<const ExitRow> exitRows();
 /// then a FAIL, then a test without a verdict.
 ExitCode judgeRun(const ResultBook& book, std::span<const std::string> tests);
 
+/// The one of two that judgeRun() returned that is worse for a line.
+ExitCode worse(ExitCode one, ExitCode other);
+
 }  // namespace factory_test

@@ -19,6 +19,7 @@ namespace factory_test {
 
 FactoryTest::FactoryTest(ResultBook& results, const Context& program, const Task& chosen)
     : book(results), context(program), task(chosen), menu(book) {
+  book.setPatience(Patience::kTry);
   if (task.isRun) {
     beginRun();
   } else {
@@ -40,6 +41,7 @@ void FactoryTest::beginRun() {
   };
   const auto first = std::ranges::find_if(task.plan.steps, isOpen);
   run.emplace(task.plan, static_cast<std::size_t>(first - task.plan.steps.begin()));
+  isThrough = false;
 }
 
 void FactoryTest::askForUnits() {
@@ -53,17 +55,31 @@ void FactoryTest::askForUnit() {
   MW::isDisplayUpdate(1);
 }
 
-void FactoryTest::updateUnit() {
-  const auto serial = unitPage->takeAnswer();
-  if (!serial) return;
+void FactoryTest::updateUnit(uint32_t now) {
+  if (auto entered = unitPage->takeAnswer()) {
+    serial = *std::move(entered);
+    beginning.start(now);
+    startUnit(now);
+  } else if (beginning.takeTry(now)) {
+    startUnit(now);
+  }
+}
+
+void FactoryTest::startUnit(uint32_t now) {
   std::string error;
   RunStart next = book.run();
-  next.unit = *serial;
+  next.unit = serial;
   next.started = presentTime();
-  if ((!serial->empty() && !isSerial(*serial, error)) || !book.startUnit(next, error)) {
-    unitPage->refuse(error);
+  const ExitCode last = book.hasBegun() ? judgeRun(book, next.tests) : ExitCode::Passed;
+  const bool isFit = serial.empty() || isSerial(serial, error);
+  if (!isFit || !book.startUnit(next, error)) {
+    const bool waits = isFit && book.isBusy() && !beginning.isOver(now);
+    if (!waits) beginning.end();
+    unitPage->refuse(waits ? tr("Saving...") : error);
     return;
   }
+  beginning.end();
+  earlierUnits = worse(earlierUnits, last);
   unitPage.reset();
   menu.showVerdicts();
   if (task.isRun) {
@@ -74,15 +90,25 @@ void FactoryTest::updateUnit() {
   MW::isDisplayUpdate(1);
 }
 
+void FactoryTest::stay() {
+  ended = false;
+  if (asksForUnits) askForUnit();
+}
+
 void FactoryTest::update(uint32_t now) {
+  if (saving.takeTry(now)) {
+    std::string error;
+    const bool isKept = book.saveAgain(error);
+    showKept(isKept, error, now);
+  }
   if (prompt) {
     updatePrompt(now);
   } else if (unitPage) {
-    updateUnit();
+    updateUnit(now);
   } else if (running) {
     updateTest(now);
   } else if (run) {
-    updateRun(now);
+    if (!saving.isWaiting()) updateRun(now);
   } else {
     updateMenu(now);
   }
@@ -133,16 +159,22 @@ void FactoryTest::updateRun(uint32_t now) {
       ask(Asked::Repeat,
           {tr(name), tr("The test has not passed. Repeat it?"), tr("REPEAT"), tr("NO")});
       break;
-    default: endRun();
+    default: endRun(now);
   }
 }
 
-void FactoryTest::endRun() {
-  std::string error;
-  if (!book.finish(error)) complain(error);
+void FactoryTest::endRun(uint32_t now) {
+  if (!std::exchange(isThrough, true)) {
+    std::string error;
+    const bool isKept = book.finish(error);
+    showKept(isKept, error, now);
+    if (!isKept) return;  // comes back once that is settled
+  }
   const RunProgress progress = progressOf(book);
   const bool isPassed = progress.passed == progress.tests;
-  ask(Asked::RunEnd, {isPassed ? tr("PASS") : tr("FAIL"), progress.words(), tr("END"), tr("MENU")});
+  const std::string words = progress.words() + (book.isAllSaved() ? "" : tr(", not saved"));
+  ask(Asked::RunEnd, {isPassed ? tr("PASS") : tr("FAIL"), words, tr("END"),
+                      asksForUnits ? tr("NEXT UNIT") : tr("MENU")});
 }
 
 void FactoryTest::ask(Asked what, const Question& question) {
@@ -172,7 +204,11 @@ void FactoryTest::follow(bool isYes, uint32_t now) {
       }
       break;
     case Asked::SaveAgain:
-      if (std::string error; isYes) showKept(book.saveAgain(error), error);
+      if (isYes) {
+        std::string error;
+        const bool isKept = book.saveAgain(error);
+        showKept(isKept, error, now);
+      }
       break;
     case Asked::Repeat:
       if (isYes) {
@@ -248,13 +284,18 @@ Verdict FactoryTest::keep(const Running& done, Verdict given, uint32_t now) {
                                    .screen = screenSize(),
                                    .values = std::move(values)},
                                   error);
-  showKept(isKept, error);
+  showKept(isKept, error, now);
   return verdict;
 }
 
-void FactoryTest::showKept(bool isKept, const std::string& error) {
-  menu.showVerdicts();
-  if (isKept) return;
+// Another program that writes into the database is waited for, while the screen goes on.
+void FactoryTest::showKept(bool isKept, const std::string& error, uint32_t now) {
+  const bool waits = !isKept && book.isBusy();
+  if (waits && !saving.isWaiting()) saving.start(now);
+  if (!waits || saving.isOver(now)) saving.end();
+  menu.showVerdicts(saving.isWaiting() ? tr(", saving...") : tr(", not saved"));
+  MW::isDisplayUpdate(1);
+  if (isKept || saving.isWaiting()) return;
   complain(error);
   ask(Asked::SaveAgain, {tr("Not saved"), error, tr("TRY AGAIN"), tr("LATER")});
 }
@@ -268,6 +309,11 @@ void FactoryTest::draw() {
   } else {
     const ScreenSize screen = screenSize();
     skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
+    if (run && saving.isWaiting()) {
+      skia_add_textbox_c(
+          {0, 0, screen.width, screen.height, kPageInk.ground},
+          textOf(tr("Saving..."), kPageInk.text, SKIA_ALIGN_CENTRE, textSize(screen)));
+    }
   }
   MW::Window::show();
   if (running && !prompt) running->test->drawOver();

@@ -7,8 +7,10 @@
 #include <optional>
 #include <string>
 
+#include "exit_code.h"
 #include "menu.h"
 #include "pages/table.h"
+#include "patience.h"
 #include "plan/plan_run.h"
 #include "prompt.h"
 #include "results/results.h"
@@ -26,6 +28,8 @@ class FactoryTest {
 
   /// Asks for the unit's serial number first, and again for the next unit after a plan's run.
   void askForUnits();
+  /// What became of the units before the present one.
+  ExitCode earlier() const { return earlierUnits; }
   /// Shows a page of testEntries() in the place of the menu.
   void open(std::size_t entry, uint32_t now);
   /// One round of the main loop, at GetTicks() milliseconds.
@@ -33,6 +37,8 @@ class FactoryTest {
   /// Draws one frame.
   void draw();
   bool isEnded() const { return ended; }
+  /// Goes on after the end: with the next unit, or with the menu.
+  void stay();
 
  private:
   struct Running {
@@ -47,7 +53,8 @@ class FactoryTest {
 
   void beginRun();
   void askForUnit();
-  void updateUnit();
+  void updateUnit(uint32_t now);
+  void startUnit(uint32_t now);
   void updateMenu(uint32_t now);
   void updateTest(uint32_t now);
   bool isWithinLimits() const;
@@ -59,8 +66,8 @@ class FactoryTest {
   void finish(Outcome outcome, uint32_t now);
   int attemptAt(const std::string& test) const;
   Verdict keep(const Running& done, Verdict given, uint32_t now);
-  void endRun();
-  void showKept(bool isKept, const std::string& error);
+  void endRun(uint32_t now);
+  void showKept(bool isKept, const std::string& error, uint32_t now);
 
   ResultBook& book;
   const Context& context;
@@ -69,8 +76,13 @@ class FactoryTest {
   bool asksForUnits = false;
   Menu menu;
   std::optional<UnitPage> unitPage;
+  std::string serial;  // that was entered last
+  Patience beginning;  // of its run
+  Patience saving;     // of what is not saved yet
+  ExitCode earlierUnits = ExitCode::Passed;
   std::optional<Running> running;
   std::optional<PlanRun> run;  // while a plan is performed without the menu
+  bool isThrough = false;      // the book was told that it is
   Asked asked = Asked::Leave;
   std::optional<Prompt> prompt;
 };

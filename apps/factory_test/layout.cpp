@@ -7,7 +7,13 @@
 #include <cmath>
 #include <cstddef>
 #include <cstring>
+#include <string>
 #include <string_view>
+
+#include "utf8.h"
+
+#include "language/language.h"
+#include "text_fit.h"
 
 namespace factory_test {
 
@@ -55,22 +61,6 @@ int groupHeight(ScreenSize screen) {
 
 SKIA_Rect contentArea() { return layOutPage(screenSize()).content; }
 
-namespace {
-
-// So much of the text as ends with a whole character, at most `most` bytes.
-std::size_t wholeBytes(std::string_view words, std::size_t most) {
-  if (words.size() <= most) return words.size();
-  const auto isInside = [&](std::size_t at) {
-    constexpr unsigned kKind = 0xC0;
-    constexpr unsigned kFollows = 0x80;
-    return (static_cast<unsigned char>(words[at]) & kKind) == kFollows;
-  };
-  while (most > 0 && isInside(most)) --most;
-  return most;
-}
-
-}  // namespace
-
 SKIA_Text textOf(const char* words, uint32_t color, int align, int size) {
   SKIA_Text text = {};
   const std::size_t bytes = wholeBytes(words, sizeof text.text - 1);
@@ -84,6 +74,31 @@ SKIA_Text textOf(const char* words, uint32_t color, int align, int size) {
 
 SKIA_Text captionOf(const char* words, uint32_t color) {
   return textOf(words, color, SKIA_ALIGN_CENTRE, textSize(screenSize()));
+}
+
+SKIA_Text captionIn(const SKIA_Rect& area, const char* words, uint32_t color) {
+  return captionIn(area, words, color, textSize(screenSize()));
+}
+
+SKIA_Text captionIn(const SKIA_Rect& area, const char* words, uint32_t color, int size) {
+  const int margin = std::min(gapOf(screenSize()) / 2, area.w / 10);
+  const FittedText fit = fitted(words, size, area.w - 2 * margin, area.h);
+  std::string lines;
+  for (const std::string& line : fit.lines) lines.append(lines.empty() ? "" : "\n").append(line);
+  return textOf(lines.c_str(), color, SKIA_ALIGN_CENTRE, fit.size);
+}
+
+int leadingAlign() { return isRightToLeft() ? SKIA_ALIGN_RIGHT : SKIA_ALIGN_LEFT; }
+
+void drawWords(const SKIA_Rect& area, std::string_view words, uint32_t color, int align, int size) {
+  const FittedText fit = fitted(words, size, area.w, area.h);
+  const int height = lineHeight(fit.size);
+  const int all = height * static_cast<int>(fit.lines.size());
+  SKIA_Rect row = {area.x, area.y + std::max((area.h - all) / 2, 0), area.w, height, area.color};
+  for (const std::string& line : fit.lines) {
+    skia_add_label_c(row, textOf(line.c_str(), color, align, fit.size));
+    row.y += height;
+  }
 }
 
 }  // namespace factory_test

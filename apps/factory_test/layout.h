@@ -8,6 +8,7 @@
 #include <array>
 #include <numeric>
 #include <span>
+#include <string_view>
 
 #include "look.h"
 #include "screen_size.h"
@@ -173,5 +174,15 @@ SKIA_Text textOf(const char* words, uint32_t color, int align, int size);
 
 /// The same as what stands on a button or a line: black, centred, in the screen's text size.
 SKIA_Text captionOf(const char* words, uint32_t color = kDark);
+/// The same in the lines and the size in which it has room in the area.
+SKIA_Text captionIn(const SKIA_Rect& area, const char* words, uint32_t color = kDark);
+SKIA_Text captionIn(const SKIA_Rect& area, const char* words, uint32_t color, int size);
+
+/// Where lines begin in the present language.
+int leadingAlign();
+
+/// Draws the words in lines that have room in the area, in its middle's height, in letters of at
+/// most `size`. On the thread that draws.
+void drawWords(const SKIA_Rect& area, std::string_view words, uint32_t color, int align, int size);
 
 }  // namespace factory_test

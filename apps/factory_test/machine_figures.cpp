@@ -19,6 +19,7 @@
 #include <system_error>
 #include <utility>
 
+#include "language/language.h"
 #include "results/whole_file.h"
 
 namespace factory_test {
@@ -33,11 +34,16 @@ constexpr int kWhole = 100;  // percent
 constexpr int kLoadDecimals = 2;
 constexpr std::string_view kCut = "..";
 
-std::string figure(std::string shown) {
+// What others have chosen, as it can be shown.
+std::string shown(std::string name) {
   std::ranges::replace_if(
-      shown, [](char letter) { return letter < ' ' || letter > '~'; }, '?');
-  if (shown.size() <= kFigureBytes) return shown;
-  return shown.substr(0, kFigureBytes - kCut.size()).append(kCut);
+      name, [](char letter) { return letter < ' ' || letter > '~'; }, '?');
+  if (name.size() <= kFigureLetters) return name;
+  return name.substr(0, kFigureLetters - kCut.size()).append(kCut);
+}
+
+std::string percentText(const char* name, int64_t percent) {
+  return name + std::to_string(percent) + "%";
 }
 
 // The first line of a device's attribute; empty: it has none.
@@ -68,13 +74,13 @@ std::set<fs::path> devices(const fs::path& directory) {
 }
 
 std::string chargerText(std::string_view status) {
-  if (status == "Discharging") return "On battery";
-  return status == "Charging" ? "Charging" : "Mains";
+  if (status == "Discharging") return tr("On battery");
+  return status == "Charging" ? tr("Charging") : tr("Mains");
 }
 
 struct Power {
-  std::string battery = "No battery";
-  std::string charger = "Mains";
+  std::string battery = tr("No battery");
+  std::string charger = tr("Mains");
 };
 
 Power readPower(const fs::path& sysRoot) {
@@ -82,7 +88,7 @@ Power readPower(const fs::path& sysRoot) {
     const int percent = numberAttribute(device, "capacity");
     // Mice and headsets have batteries too, and say that these feed a device only.
     if (percent < 0 || attribute(device, "scope") == "Device") continue;
-    return {"Battery " + std::to_string(percent) + "%", chargerText(attribute(device, "status"))};
+    return {percentText(tr("Battery "), percent), chargerText(attribute(device, "status"))};
   }
   return {};
 }
@@ -92,14 +98,14 @@ std::string brightnessText(const fs::path& sysRoot) {
     const int level = numberAttribute(device, "brightness");
     const int most = numberAttribute(device, "max_brightness");
     if (level < 0 || most <= 0) continue;
-    return "Light " + std::to_string(int64_t{level} * kWhole / most) + "%";
+    return percentText(tr("Light "), int64_t{level} * kWhole / most);
   }
-  return "Light n/a";
+  return tr("Light n/a");
 }
 
 std::string hostNameText() {
   std::array<char, kHostNameBytes + 1> name = {};  // a name that fills it is not ended
-  return ::gethostname(name.data(), kHostNameBytes) == 0 ? name.data() : "Host n/a";
+  return ::gethostname(name.data(), kHostNameBytes) == 0 ? shown(name.data()) : tr("Host n/a");
 }
 
 bool leadsOutside(const ifaddrs& interface) {
@@ -109,21 +115,21 @@ bool leadsOutside(const ifaddrs& interface) {
 
 std::string addressText() {
   ifaddrs* first = nullptr;
-  if (::getifaddrs(&first) != 0) return "No network";
+  if (::getifaddrs(&first) != 0) return tr("No network");
   const std::unique_ptr<ifaddrs, decltype(&::freeifaddrs)> owner(first, &::freeifaddrs);
   while (first != nullptr && !leadsOutside(*first)) first = first->ifa_next;
   std::array<char, kAddressBytes> text = {};
   const bool isKnown =
       first != nullptr && ::getnameinfo(first->ifa_addr, sizeof(sockaddr_in), text.data(),
                                         text.size(), nullptr, 0, NI_NUMERICHOST) == 0;
-  return isKnown ? text.data() : "No network";
+  return isKnown ? text.data() : tr("No network");
 }
 
 std::string loadText() {
   std::array<double, 3> loads = {};
-  if (std::cmp_less(::getloadavg(loads.data(), loads.size()), loads.size())) return "Load n/a";
+  if (std::cmp_less(::getloadavg(loads.data(), loads.size()), loads.size())) return tr("Load n/a");
   std::ostringstream text;
-  text << std::fixed << std::setprecision(kLoadDecimals) << "Load";
+  text << std::fixed << std::setprecision(kLoadDecimals) << tr("Load");
   for (const double load : loads) text << ' ' << load;
   return text.str();
 }
@@ -132,8 +138,7 @@ std::string loadText() {
 
 MachineFigures readMachineFigures(const fs::path& sysRoot) {
   const auto [battery, charger] = readPower(sysRoot);
-  return {figure(battery),        figure(charger),       figure(brightnessText(sysRoot)),
-          figure(hostNameText()), figure(addressText()), figure(loadText())};
+  return {battery, charger, brightnessText(sysRoot), hostNameText(), addressText(), loadText()};
 }
 
 }  // namespace factory_test

@@ -7,9 +7,10 @@
 
 namespace factory_test {
 
-constexpr std::size_t kFigureBytes = 24;  // the longest text
+constexpr std::size_t kFigureLetters = 24;  // of the longest name
 
-/// Each text has 1 to kFigureBytes printable ASCII characters; what is longer ends in "..".
+/// Texts in the chosen language. Names that others have chosen are 1 to kFigureLetters printable
+/// ASCII characters; what is longer ends in "..".
 struct MachineFigures {
   std::string battery;     // "Battery 57%", "No battery"
   std::string charger;     // "Charging", "Mains", "On battery"; "Mains" without a battery

@@ -10,6 +10,7 @@
 #include "language/language.h"
 #include "layout.h"
 #include "pages/table.h"
+#include "text_fit.h"
 #include "verdict_bar.h"
 #include "world.h"
 
@@ -18,6 +19,7 @@ namespace factory_test {
 namespace {
 
 constexpr uint32_t kFigureMs = 1000;
+constexpr int kBlankPercent = 25;  // of the text's size
 
 struct VerdictLook {
   Verdict verdict;
@@ -29,14 +31,26 @@ constexpr auto kLooks = std::to_array<VerdictLook>({
     {Verdict::Fail, kFailInk},
 });
 
-// What stands in a row.
-std::string rowWords(const char* name) { return std::string("   ") + name; }
+// What stands in a row: below the head's words, as blanks are the only margin that a list knows.
+std::string rowWords(const char* name) {
+  const ScreenSize screen = screenSize();
+  const int margin = 2 * gapOf(screen);
+  const int blank = percentOf(textSize(screen), kBlankPercent);
+  return std::string(static_cast<std::size_t>((margin + blank - 1) / blank), ' ') + name;
+}
 
-std::string rowWords(const TestEntry& entry, const TestResult* result, bool isSaved) {
+std::string rowWords(const TestEntry& entry, const TestResult* result, const char* behind) {
   std::string words = rowWords(tr(entry.name));
   if (result == nullptr || result->verdict == Verdict::None) return words;
   words.append(": ").append(tr(verdictName(result->verdict)));
-  return isSaved ? words : words.append(tr(", not saved"));
+  return words.append(behind);
+}
+
+// In which it has room in a row.
+int sizeInRow(const std::string& words) {
+  const ScreenSize screen = screenSize();
+  const int size = textSize(screen);
+  return fitted(words, size, screen.width - 2 * gapOf(screen), lineHeight(size)).size;
 }
 
 }  // namespace
@@ -76,14 +90,14 @@ Menu::Menu(const ResultBook& results)
 void Menu::addGroup(const char* name) {
   const ScreenSize screen = screenSize();
   const std::string words = rowWords(name);
-  const SKIA_Text text = textOf(words.c_str(), 0, SKIA_ALIGN_LEFT, textSize(screen));
+  const SKIA_Text text = textOf(words.c_str(), 0, leadingAlign(), textSize(screen));
   list.addIndex(MW::MainList::kDark, &text, groupHeight(screen));
 }
 
 void Menu::addRow(const char* name) {
   const ScreenSize screen = screenSize();
   const std::string words = rowWords(name);
-  const SKIA_Text text = textOf(words.c_str(), 0, SKIA_ALIGN_LEFT, textSize(screen));
+  const SKIA_Text text = textOf(words.c_str(), 0, leadingAlign(), textSize(screen));
   list.setBGColor(list.addIndex(MW::MainList::kSelectable, &text, entryHeight(screen)),
                   kRowInk.ground);
 }
@@ -110,7 +124,7 @@ void Menu::refreshFigures() {
   MW::isDisplayUpdate(1);
 }
 
-void Menu::showVerdicts() {
+void Menu::showVerdicts(const char* unsaved) {
   head.tell(progressOf(book));
   for (std::size_t i = 0; i < rowOfEntry.size(); ++i) {
     const TestEntry& entry = testEntries()[i];
@@ -118,8 +132,9 @@ void Menu::showVerdicts() {
     const Verdict verdict = result == nullptr ? Verdict::None : result->verdict;
     const auto* const look = std::ranges::find(kLooks, verdict, &VerdictLook::verdict);
     const int row = rowOfEntry.at(i);
-    const std::string words = rowWords(entry, result, book.isSaved(entry.id));
+    const std::string words = rowWords(entry, result, book.isSaved(entry.id) ? "" : unsaved);
     list.setText(row, words.c_str(), static_cast<unsigned int>(words.size()));
+    list.setFontSize(row, sizeInRow(words));
     faces.at(static_cast<std::size_t>(row)) = look->ink.ground;
     colourRow(row);
   }

@@ -27,8 +27,8 @@ class Menu {
   void hide();
   /// Reads the machine's figures anew when a second has passed.
   void update(uint32_t now);
-  /// Shows the book's verdicts anew.
-  void showVerdicts();
+  /// Shows the book's verdicts anew, with `unsaved` behind those that are not kept.
+  void showVerdicts(const char* unsaved = "");
   /// Marks an entry as keys do, before the menu is shown first.
   void markEntry(std::size_t entry);
 

@@ -3,9 +3,11 @@
 #include <MW/window.h>
 
 #include <algorithm>
+#include <string_view>
 
 #include "language/language.h"
 #include "layout.h"
+#include "text_fit.h"
 
 namespace factory_test {
 
@@ -63,7 +65,7 @@ int MenuHead::show(unsigned int) {
       inColor(place.title, kHeadInk.ground),
       textOf(tr("Factory test"), kHeadInk.text, SKIA_ALIGN_CENTRE, percentOf(size, 120)));
   const auto put = [&](const SKIA_Rect& row, const std::string& words) {
-    skia_add_label_c(row, textOf(words.c_str(), kPageInk.text, SKIA_ALIGN_LEFT, size));
+    drawWords(row, words, kPageInk.text, leadingAlign(), size);
   };
   put(place.hint, tr("Choose a test, or Leave at the end."));
   put(place.count, progress.words());
@@ -72,19 +74,22 @@ int MenuHead::show(unsigned int) {
   return 1;
 }
 
-// In letters of which the longest figure has room.
+// All in letters of one size, in which the longest has room, and the load whatever it is.
 void MenuHead::drawFigures(const SKIA_Rect& area, const Grid& grid) const {
-  constexpr int kLetterPercent = 54;  // of the text's size: what a letter takes
-  const ScreenSize screen = screenSize();
+  constexpr std::string_view kLongestLoad = "Load 100.00 100.00 100.00";
   const std::array<const std::string*, 6> all = {&figures.battery,    &figures.charger,
                                                  &figures.brightness, &figures.address,
                                                  &figures.hostName,   &figures.load};
-  const int width = cellOf(area, 0, grid, 0).w;
-  const int most = 100 * width / (static_cast<int>(kFigureBytes) * kLetterPercent);
-  const int size = std::min(textSize(screen), most);
+  const SKIA_Rect cell = cellOf(area, 0, grid, 0);
+  const auto sizeOf = [&](std::string_view words) {
+    const int size = textSize(screenSize());
+    return fitted(words, size, cell.w, lineHeight(size)).size;
+  };
+  int size = sizeOf(kLongestLoad);
+  for (const std::string* const each : all) size = std::min(size, sizeOf(*each));
   for (std::size_t i = 0; i < all.size(); ++i) {
-    skia_add_label_c(cellOf(area, 0, grid, static_cast<int>(i)),
-                     textOf(all.at(i)->c_str(), kPageInk.text, SKIA_ALIGN_LEFT, size));
+    drawWords(cellOf(area, 0, grid, static_cast<int>(i)), *all.at(i), kPageInk.text, leadingAlign(),
+              size);
   }
 }
 

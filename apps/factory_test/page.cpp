@@ -20,12 +20,6 @@ Record titleRecord(const char* title) {
   return {layOutPage(screen).title, textOf(title, kHeadInk.text, SKIA_ALIGN_CENTRE, size)};
 }
 
-Record hintRecord(const char* instructions) {
-  const ScreenSize screen = screenSize();
-  return {layOutPage(screen).hint,
-          textOf(instructions, kPageInk.text, SKIA_ALIGN_LEFT, textSize(screen))};
-}
-
 Record lineRecord() { return {layOutPage(screenSize()).line, captionOf("", kPanelInk.text)}; }
 
 template <typename Primitive>
@@ -44,7 +38,7 @@ Page::Page(const char* title, const char* instructions)
     : ground(makeBox(&PageLayout::ground)),
       head(makeBox(&PageLayout::head)),
       titleText(make<MW::Label>(titleRecord(title))),
-      hint(make<MW::Label>(hintRecord(instructions))),
+      hint(instructions),
       line(make<MW::Textbox>(lineRecord())) {}
 
 void Page::draw() {
@@ -58,13 +52,20 @@ void Page::drawFront() {
   head.show();
   drawProgress(progress, layOutPage(screenSize()).progress);
   titleText.show();
-  hint.show();
+  drawHint();
   line.show();
   if (bar) bar->draw();
 }
 
+void Page::drawHint() const {
+  const ScreenSize screen = screenSize();
+  drawWords(layOutPage(screen).hint, hint, kPageInk.text, leadingAlign(), textSize(screen));
+}
+
 void Page::say(const char* words) {
-  line.setText(words);
+  const SKIA_Text text = captionIn(layOutPage(screenSize()).line, words, kPanelInk.text);
+  line.setFontSize(text.size);
+  line.setText(text.text);
   MW::isDisplayUpdate(1);
 }
 

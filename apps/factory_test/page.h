@@ -4,6 +4,7 @@
 #include <MW/primitives.h>
 
 #include <optional>
+#include <string>
 
 #include "run_progress.h"
 #include "verdict_bar.h"
@@ -14,7 +15,7 @@ namespace factory_test {
 /// the verdicts. Hold it before the test's own widgets: the verdicts then go after them.
 class Page {
  public:
-  /// Instructions begin with what to do, and may have two lines.
+  /// Instructions begin with what to do. They are wrapped to the page.
   Page(const char* title, const char* instructions);
 
   /// On the main thread, before the window's widgets are drawn: all of it, or in two steps.
@@ -24,7 +25,8 @@ class Page {
   /// How much of the title's bar is full.
   void showProgress(const RunProgress& newProgress) { progress = newProgress; }
   /// Changes the instructions.
-  void instruct(const char* words) { hint.setText(words); }
+  void instruct(const std::string& words) { hint = words; }
+  void drawHint() const;
   /// Changes the line; the next frame shows it. Any thread.
   void say(const char* words);
 
@@ -45,7 +47,7 @@ class Page {
   MW::Box ground;
   MW::Box head;
   MW::Label titleText;
-  MW::Label hint;
+  std::string hint;
   MW::Textbox line;
   std::optional<VerdictBar> bar;
 };

@@ -35,7 +35,7 @@ void StepTest::beginLook() {
   const ScreenSize screen = screenSize();
   const int height = entryHeight(screen);
   const SKIA_Rect foot = {0, screen.height - height, screen.width, height, kButtonInk.ground};
-  const SKIA_Text caption = captionOf(tr("Hold here to end"), kButtonInk.text);
+  const SKIA_Text caption = captionIn(foot, tr("Hold here to end"), kButtonInk.text);
   end.emplace(&foot, &caption);
   end->longPressCallback = [](int) { Current<StepTest>::get().finishLook(); };
   end->setActive(1);

@@ -20,7 +20,7 @@ class PageTest : public Test {
  public:
   Outcome verdict() const override { return page.outcome(); }
   void takeBack() override { page.takeBack(); }
-  void instruct(const std::string& words) override { page.instruct(words.c_str()); }
+  void instruct(const std::string& words) override { page.instruct(words); }
   void showProgress(const RunProgress& progress) override { page.showProgress(progress); }
   void draw() override { page.draw(); }
 

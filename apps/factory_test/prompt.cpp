@@ -10,41 +10,15 @@
 
 namespace factory_test {
 
-namespace {
-
-// Lines of so many characters, cut between words where that is possible.
-std::string wrapped(const std::string& words, std::size_t columns) {
-  std::string lines;
-  std::size_t from = 0;
-  while (words.size() - from > columns) {
-    const std::size_t blank = words.rfind(' ', from + columns);
-    const bool isCut = blank == std::string::npos || blank <= from;
-    const std::size_t end = isCut ? from + columns : blank;
-    lines.append(words, from, end - from).append("\n");
-    from = isCut ? end : end + 1;
-  }
-  return lines.append(words, from);
-}
-
-std::size_t columnsIn(int width, int size) {
-  constexpr int kLetterPercent = 60;  // of the text's size: what a wide letter takes
-  return static_cast<std::size_t>(
-      std::max(width / std::max(percentOf(size, kLetterPercent), 1), 1));
-}
-
-}  // namespace
-
 /// What stands behind the buttons.
 class Prompt::Panel : public MW::Widget {
  public:
-  explicit Panel(const Question& question) {
+  explicit Panel(const Question& question) : words(question.words) {
     const ScreenSize screen = screenSize();
-    const int size = textSize(screen);
+    size = textSize(screen);
     place = layOutPrompt(screen);
     ground = {0, 0, screen.width, screen.height, MW::kColorShadow};
-    title = textOf(question.title.c_str(), kHeadInk.text, SKIA_ALIGN_CENTRE, percentOf(size, 120));
-    const std::string lines = wrapped(question.words, columnsIn(place.words.w, size));
-    words = textOf(lines.c_str(), kPanelInk.text, SKIA_ALIGN_LEFT, size);
+    title = captionIn(place.title, question.title.c_str(), kHeadInk.text, percentOf(size, 120));
     setType(MW::kTopLayer);
     setActive(1);
     MW::Window::registerWidget(this);
@@ -56,7 +30,7 @@ class Prompt::Panel : public MW::Widget {
     skia_add_box_c(ground);
     skia_add_box_c(place.frame);
     skia_add_textbox_c(place.title, title);
-    skia_add_label_c(place.words, words);
+    drawWords(place.words, words, kPanelInk.text, leadingAlign(), size);
     return 1;
   }
 
@@ -64,7 +38,8 @@ class Prompt::Panel : public MW::Widget {
   PromptLayout place = {};
   SKIA_Rect ground = {};
   SKIA_Text title = {};
-  SKIA_Text words = {};
+  std::string words;
+  int size = 0;  // of their letters, pixels
 };
 
 Prompt::Prompt(const Question& question)
@@ -86,7 +61,7 @@ Prompt::~Prompt() = default;
 
 template <std::size_t index>
 void Prompt::place(const SKIA_Rect& area, const char* words) {
-  const SKIA_Text caption = captionOf(words, kButtonInk.text);
+  const SKIA_Text caption = captionIn(area, words, kButtonInk.text);
   MW::Button& button = buttons.at(index).emplace(&area, &caption);
   button.pressCallback = [](int) { Current<Prompt>::get().guards.at(index).press(GetTicks()); };
   button.clickCallback = [](int) { Current<Prompt>::get().click(index); };

@@ -7,6 +7,8 @@
 
 #include "plan/plan_json.h"
 #include "records/postgres.h"
+#include "results/junit.h"
+#include "results/whole_file.h"
 #include "version.h"
 #include "world.h"
 
@@ -23,6 +25,10 @@ std::string serialOfSystem() {
   return isSerial(value.data(), unused) ? value.data() : "";
 }
 
+std::string unitOf(const Options& options) {
+  return options.serial.empty() ? serialOfSystem() : options.serial;
+}
+
 std::string stationName() {
   std::array<char, kHostNameBytes + 1> name = {};  // a name that fills it is not ended
   return ::gethostname(name.data(), kHostNameBytes) == 0 ? name.data() : "";
@@ -35,11 +41,16 @@ Keeping keepingOf(const Options& options) {
           .junit = options.junit,
           .database = options.database,
           .resume = options.newRun ? Database::Resume::No : Database::Resume::Yes,
+          .first = asksForUnit(options) ? FirstRun::WithUnit : FirstRun::AtOnce,
           .line = options.line};
 }
 
+bool asksForUnit(const Options& options) {
+  return !options.database.empty() && options.test.empty() && unitOf(options).empty();
+}
+
 RunStart runStartOf(const Options& options, const Plan& plan) {
-  RunStart start = {.unit = options.serial.empty() ? serialOfSystem() : options.serial,
+  RunStart start = {.unit = unitOf(options),
                     .operatorName = options.operatorName,
                     .planName = plan.name,
                     .planHash = planHash(plan),
@@ -51,12 +62,16 @@ RunStart runStartOf(const Options& options, const Plan& plan) {
 }
 
 std::string wrongRecords(const Options& options) {
+  constexpr std::size_t kHeadBytes = 4096;
   std::string why;
+  if (!isJunitHead(readHead(options.junit, kHeadBytes))) {
+    return "--junit: " + options.junit + " holds something else than a report, and stays as it is";
+  }
   if (!options.serial.empty() && !isSerial(options.serial, why)) return "--serial: " + why;
   if (options.line.empty()) return "";
   if (options.database.empty()) return "--line needs --database, which always comes first";
-  return isPostgresUrl(options.line) ? ""
-                                     : "--line needs an address like postgresql://host/database";
+  const std::string wrong = wrongPostgresUrl(options.line);
+  return wrong.empty() ? "" : "--line " + wrong;
 }
 
 }  // namespace factory_test

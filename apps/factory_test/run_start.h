@@ -13,6 +13,10 @@ namespace factory_test {
 /// The places that the options name.
 Keeping keepingOf(const Options& options);
 
+/// Whether the operator has to say which unit is tested before its run begins: the database is to
+/// know, and nothing else says it. A single test (--test) is nobody's question.
+bool asksForUnit(const Options& options);
+
 /// Who tests what by which plan, now. The unit is the one that the options name, else the one that
 /// the system property ro.serialno names, else unknown: ResultBook::startUnit() tells it later.
 RunStart runStartOf(const Options& options, const Plan& plan);

@@ -11,6 +11,7 @@
 
 #include "button_row.h"
 #include "current.h"
+#include "language/language.h"
 #include "page.h"
 
 namespace factory_test {
@@ -25,7 +26,7 @@ class UnitPage {
   /// What was entered since the last call; an empty text: the unit has no number. Nothing: not yet.
   std::optional<std::string> takeAnswer();
   /// Why another one is needed.
-  void refuse(const std::string& why) { page.say(why.c_str()); }
+  void refuse(const std::string& why) { page.say(tr(why.c_str())); }
 
  private:
   void answer(std::string serial);

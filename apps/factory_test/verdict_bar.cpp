@@ -54,7 +54,7 @@ void VerdictBar::place(const SKIA_Rect& area) {
   const ButtonLook& look = kLooks.at(index);
   const int size = percentOf(textSize(screenSize()), look.textPercent);
   const SKIA_Rect face = inColor(area, look.ink.ground);
-  const SKIA_Text caption = textOf(tr(look.caption), look.ink.text, SKIA_ALIGN_CENTRE, size);
+  const SKIA_Text caption = captionIn(area, tr(look.caption), look.ink.text, size);
   MW::Button& button = buttons.at(index).emplace(&face, &caption);
   button.pressCallback = [](int) { Bar::get().guards.at(index).press(GetTicks()); };
   button.clickCallback = [](int) { Bar::get().click(index); };

@@ -5,14 +5,17 @@
 #include <array>
 #include <string>
 
+#include "language/language.h"
+
 namespace factory_test {
 
 namespace {
 
 void ask(const char* name, std::string& figure) {
-  std::array<char, kFigureBytes + 1> told = {};
+  constexpr std::size_t kMostBytes = 200;
+  std::array<char, kMostBytes> told = {};
   brimol_host_figure(name, figure.c_str(), told.data(), static_cast<int>(told.size()));
-  figure = told.front() == '\0' ? "n/a" : told.data();
+  figure = told.front() == '\0' ? tr("n/a") : told.data();
 }
 
 }  // namespace

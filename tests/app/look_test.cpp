@@ -87,6 +87,17 @@ TEST(TextFitTest, CutsRowsOfWideLettersShorter) {
   EXPECT_EQ(bytesThatFit("", 10, 190, 40), 40);
 }
 
+TEST(TextFitTest, CutsLinesBetweenWordsAndNeverInsideACharacter) {
+  using Lines = std::vector<std::string>;
+  EXPECT_EQ(wrapped("one two three", 10, 50), (Lines{"one two", "three"}));
+  EXPECT_EQ(wrapped("one\n\ntwo ", 10, 50), (Lines{"one", "", "two "}));
+  EXPECT_EQ(wrapped("모두 검사하지 않음", 10, 40), (Lines{"모두", "검사하지", "않음"}));
+  EXPECT_EQ(wrapped("모두검사", 10, 20), (Lines{"모두", "검사"})) << "a word that has no room";
+  EXPECT_EQ(wrapped("é\xFF", 10, 1), (Lines{"é", "\xFF"})) << "a letter always has room";
+  EXPECT_EQ(fitted("one two", 10, 50, 14).lines, Lines{"one two"});
+  EXPECT_LT(fitted("disproportionate", 10, 60, 100).size, 10) << "rather than a cut word";
+}
+
 TEST(ExitCodeTest, TellsTheWorst) {
   std::string error;
   auto book = ResultBook::open(std::filesystem::path(), error);
@@ -100,6 +111,8 @@ TEST(ExitCodeTest, TellsTheWorst) {
   book->record({.test = "one", .verdict = Verdict::Fail}, error);
   book->record({.test = "two", .verdict = Verdict::None}, error);
   EXPECT_EQ(judgeRun(*book, tests), ExitCode::Failed);
+  EXPECT_EQ(worse(ExitCode::Failed, ExitCode::Incomplete), ExitCode::Failed);
+  EXPECT_EQ(worse(ExitCode::Passed, ExitCode::Incomplete), ExitCode::Incomplete);
 }
 
 }  // namespace

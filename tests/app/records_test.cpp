@@ -1,6 +1,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <netinet/in.h>
 #include <sys/resource.h>
+#include <sys/socket.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -128,7 +130,8 @@ TEST_F(Records, KnowARunThatADeadProgramLeft) {
   });
   ASSERT_TRUE(WIFSIGNALED(end));
   EXPECT_THAT(states(), ElementsAre("running", "running"));
-  const auto next = open(startOf("A3"));
+  fs::create_symlink(file, folder / "link.db");
+  const auto next = ResultBook::open({.database = folder / "link.db"}, startOf("A3"), error);
   ASSERT_TRUE(next) << error;
   EXPECT_THAT(states(), testing::UnorderedElementsAre("running", "aborted", "running"));
   const auto resumed = open(startOf("A2"));
@@ -164,9 +167,10 @@ TEST_F(Records, OfAnOlderVersionAreMigratedWithABackup) {
   std::ifstream dump(RECORDS_V1);
   const std::string sql((std::istreambuf_iterator<char>(dump)), {});
   Sqlite(file, Sqlite::Mode::Write).runAll(sql.c_str());
-  fs::create_directory(file.native() + ".v1.bak");  // in the way
-  ASSERT_TRUE(open(startOf("C1"))) << error;
-  for (const auto& [path, version] : {std::pair(file, 2), {file.native() + ".v1.bak.2", 1}}) {
+  fs::create_symlink("station.db.v1.bak", file.native() + ".v1.bak");  // in the way, and a loop
+  fs::create_symlink(file, folder / "link.db");
+  ASSERT_TRUE(ResultBook::open({.database = folder / "link.db"}, startOf("C1"), error)) << error;
+  for (const auto& [path, version] : {std::pair(file, 3), {file.native() + ".v1.bak.2", 1}}) {
     Sqlite store(path, Sqlite::Mode::Read);
     EXPECT_EQ(store.number("pragma user_version"), version);
     const auto runs = readHistory(queryOf(store), {.unit = "OLD 1"});
@@ -189,12 +193,12 @@ TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
     std::function<void()> prepare;
   };
   for (const auto& [says, prepare] : std::vector<Case>{
-           {"is of version 3, newer than this program's 2",
-            [&] { run("pragma user_version = 3"); }},
+           {"is of version 4, newer than this program's 3",
+            [&] { run("pragma user_version = 4"); }},
            {"is another program's database", [&] { run("pragma application_id = 7"); }},
            {"is damaged: put it aside, then begin a new one",
             [&] {
-              run("pragma application_id = 1179927618; pragma user_version = 2");
+              run("pragma application_id = 1179927618; pragma user_version = 3");
               for (std::streamoff page = 1; page < 30; ++page)
                 damage(page * 4096, std::string(64, '\x7f'));
             }},
@@ -225,8 +229,9 @@ TEST_F(Records, SayWhereTheyCannotBeWritten) {
 }
 
 TEST_F(Records, SurviveAFullDiskAndALock) {
-  auto book =
-      ResultBook::open({.json = folder / "all.json", .database = file}, startOf("A1"), error);
+  RunStart longer = startOf("A1");
+  longer.tests.emplace_back("pinch");
+  auto book = ResultBook::open({.json = folder / "all.json", .database = file}, longer, error);
   ASSERT_TRUE(book && book->record(kKeys, error)) << error;
   // Files of this process end after some bytes, as on a full disk.
   (void)std::signal(SIGXFSZ, SIG_IGN);
@@ -244,12 +249,53 @@ TEST_F(Records, SurviveAFullDiskAndALock) {
   {
     Sqlite other(file, Sqlite::Mode::Write);
     const Transaction lock(other);
+    book->setPatience(std::chrono::milliseconds(1));
     EXPECT_FALSE(book->saveAgain(error));
     EXPECT_EQ(error, file.native() + ": is locked by another program");
+    EXPECT_FALSE(book->finish(error));
+    EXPECT_TRUE(book->isBusy());
   }
   EXPECT_TRUE(book->saveAgain(error) && book->saveAgain(error)) << error;
-  EXPECT_TRUE(book->isSaved("touch"));
+  EXPECT_TRUE(book->isAllSaved() && book->isSaved("touch"));
   EXPECT_EQ(history().at(0).verdicts.size(), 2U) << "once each";
+  EXPECT_THAT(states(), ElementsAre("finished"));
+}
+
+// A server that takes connections and says nothing. Its address.
+class SilentServer {
+ public:
+  SilentServer() {
+    ::bind(socket, reinterpret_cast<const sockaddr*>(&address), sizeof address);
+    ::listen(socket, 1);
+    socklen_t length = sizeof address;
+    ::getsockname(socket, reinterpret_cast<sockaddr*>(&address), &length);
+  }
+  ~SilentServer() { ::close(socket); }
+  SilentServer(const SilentServer&) = delete;
+  SilentServer& operator=(const SilentServer&) = delete;
+
+  std::string url() const {
+    return "postgresql://127.0.0.1:" + std::to_string(ntohs(address.sin_port)) + "/line";
+  }
+
+ private:
+  int socket = ::socket(AF_INET, SOCK_STREAM, 0);
+  sockaddr_in address = {AF_INET, 0, {htonl(INADDR_LOOPBACK)}, {}};
+};
+
+TEST_F(Records, SayWhatASilentLineDoesNotTake) {
+  ASSERT_TRUE(open(startOf("A1"))->record(kKeys, error));
+  {
+    Sqlite store(file, Sqlite::Mode::Write);  // all went to another line
+    store.runAll("insert into lines values ('other', 1000, 'host=other ')");
+  }
+  const SilentServer server;
+  auto book = ResultBook::open({.database = file, .line = server.url()}, startOf("A2"), error);
+  ASSERT_TRUE(book && book->record(kKeys, error)) << error;
+  EXPECT_TRUE(book->close(error)) << error;
+  EXPECT_EQ(book->lineStatus()->waiting, 2);
+  EXPECT_EQ(book->lineStatus()->error, "the line's database: has not answered in time");
+  EXPECT_THAT(states(), ElementsAre("aborted", "aborted"));
 }
 
 RunRecord runOf(const char* unit, RunState state, std::vector<TestResult> results) {
@@ -271,12 +317,15 @@ TEST_F(Records, TellYieldFailsAndValues) {
   };
   runs[0].verdicts[0].result.values[0].value = 9.5;
   runs[5].start.started += std::chrono::days(1);
+  runs.push_back(runOf("rehearsed", RunState::Finished, {kKeys, kTouch}));
+  runs.back().start.planName += kRehearsal;
   const Statistics all = statisticsOf(runs);
   EXPECT_EQ(all.total.units, 5);
   EXPECT_EQ(all.total.passed, 3);
   EXPECT_EQ(all.total.passedAtFirst, 1);
   EXPECT_EQ(all.days.size(), 2U);
   EXPECT_EQ(all.aborted, 2);
+  EXPECT_EQ(all.rehearsals, 1);
   ASSERT_EQ(all.tests.size(), 2U);
   EXPECT_EQ(all.tests[0].test, "touch");
   EXPECT_EQ(all.tests[0].fails, 3);

@@ -4,6 +4,8 @@
 #include <array>
 #include <memory_resource>
 #include <random>
+#include <set>
+#include <string>
 
 #include "support/failing_malloc.h"
 #include "support/widget_test.h"
@@ -75,6 +77,16 @@ TEST_P(EveryClass, BearsThatAnyAllocationOfASessionFails) {
   }
   EXPECT_LT(nth, kMost);
   EXPECT_GT(nth, 1) << "not even the widget was allocated";
+}
+
+// What a menu or a dialog is made of answers 0.
+TEST_P(EveryClass, AnswersThatItDrew) {
+  const std::set<std::string> parts = {"Box", "Image", "Label", "Line", "Textbox", "WidgetRcui"};
+  Arguments from({});
+  const auto widget = GetParam().make(from);
+  for (const unsigned int ticks : {1U, 2U}) {
+    EXPECT_EQ(widget->show(ticks), parts.contains(GetParam().name) ? 0 : 1);
+  }
 }
 
 TEST_P(EveryClass, DrawsTheSameWhateverThePlatformAnswers) {

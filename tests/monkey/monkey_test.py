@@ -47,6 +47,11 @@ class MonkeyTest(unittest.TestCase):
         self.assertGreater(traces[0].count("\n"), 3000)
         self.assertEqual(traces[0], traces[1])
 
+    def test_a_full_disk_ends_the_trace_and_not_the_session(self):
+        ended = self.run_program(FACTORY_TEST, "--monkey", "7", "--events", "200", "--monkey-trace", "/dev/full")
+        self.assertEqual(ended.returncode, 0, ended.stderr)
+        self.assertEqual(ended.stderr.count("/dev/full: No space left on device"), 1, ended.stderr)
+
     def test_a_program_that_ignores_everything_is_told_of(self):
         deaf = "8:20000"
         ended = self.run_program(PLANTED, BRIMOL_MONKEY=deaf, BRIMOL_SCREEN="30x30")
@@ -54,10 +59,10 @@ class MonkeyTest(unittest.TestCase):
         self.assertIn("nothing has changed on the screen for 5000 events", ended.stderr)
 
     def test_wrong_wishes_are_refused(self):
-        for wish in "x", "1:", "1:2:3", "-1":
+        for wish in "x", "1:", "1:2:3:4", "-1":
             ended = self.run_program(PLANTED, BRIMOL_MONKEY=wish)
             self.assertEqual(ended.returncode, 1, wish)
-            self.assertIn(f"BRIMOL_MONKEY={wish}: wanted SEED or SEED:EVENTS", ended.stderr)
+            self.assertIn(f"BRIMOL_MONKEY={wish}: wanted SEED, SEED:EVENTS or SEED:EVENTS:REST", ended.stderr)
 
 
 if __name__ == "__main__":

@@ -57,6 +57,9 @@ const char* tr(const char* english) {
   return *english == '\0' ? english : dgettext(kDomain, english);
 }
 
+// The catalogues of languages that are written so translate the word.
+bool isRightToLeft() { return std::string_view(tr("left-to-right")) == "right-to-left"; }
+
 const char* trn(const char* one, const char* many, unsigned long count) {
   return dngettext(kDomain, one, many, count);
 }

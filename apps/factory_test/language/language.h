@@ -22,6 +22,9 @@ const char* tr(const char* english);
 /// The text of a number of things, in the form that the language has for so many.
 const char* trn(const char* one, const char* many, unsigned long count);
 
+/// Whether the language is written from right to left, as its catalogue says.
+bool isRightToLeft();
+
 /// Marks a text that stands in a table and goes through tr() where it is shown.
 constexpr const char* msg(const char* english) { return english; }
 

@@ -98,7 +98,7 @@ class ButtonTest : public PageTest {
     const SKIA_Rect area =
         inColor(cellOf(areas().back(), gapOf(screenSize()), kGrid, static_cast<int>(number)),
                 kButtonInk.ground);
-    const SKIA_Text caption = captionOf(tr(look.caption), kButtonInk.text);
+    const SKIA_Text caption = captionIn(area, tr(look.caption), kButtonInk.text);
     Button& button = buttons.at(number).emplace(&area, &caption);
     button.*look.callback = look.handler;
     if (number != kLate) button.setActive(1);

@@ -120,8 +120,8 @@ class KeyTest : public PageTest {
     const std::string words = std::string(tr(kAsked.at(static_cast<std::size_t>(index)).name)) +
                               (isPressed ? "\nOK" : "");
     const Ink ink = isPressed ? kPassInk : kButtonInk;
-    skia_add_textbox_c(inColor(cellOf(contentArea(), gapOf(screen), grid, index), ink.ground),
-                       captionOf(words.c_str(), ink.text));
+    const SKIA_Rect cell = inColor(cellOf(contentArea(), gapOf(screen), grid, index), ink.ground);
+    skia_add_textbox_c(cell, captionIn(cell, words.c_str(), ink.text));
   }
 
   Current<KeyTest> current{this};

@@ -105,7 +105,7 @@ class ResultListTest : public LookTest {
       self().finishLookOn(event->code);
     };
     const auto [left, right] = header();
-    const SKIA_Text hint = captionOf(tr("Tap a line twice"));
+    const SKIA_Text hint = captionIn(left, tr("Tap a line twice"));
     heading.emplace(MW::ButtonS::kTextBox, &left, &hint).setActive(1);
     done.emplace(right, kFaces);
   }

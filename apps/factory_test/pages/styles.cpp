@@ -87,8 +87,8 @@ class StyleTest : public PageTest {
   void place(std::size_t index, void (*clicked)(int)) {
     const StyleRow& row = kStyles.at(index);
     const auto places = placesOf(contentArea(), gapOf(screenSize()));
-    buttons.at(index) =
-        row.make(inColor(places.at(index), row.color), captionOf(tr(row.name), kButtonInk.text));
+    const SKIA_Rect area = inColor(places.at(index), row.color);
+    buttons.at(index) = row.make(area, captionIn(area, tr(row.name), kButtonInk.text));
     buttons.at(index)->setBdColor(MW::kColorBlack);  // of the framed one
     buttons.at(index)->clickCallback = clicked;
     buttons.at(index)->setActive(1);

@@ -55,18 +55,18 @@ class TimedTest : public PageTest {
  private:
   static void placeButton(std::optional<MW::Button>& button, const SKIA_Rect& area,
                           const char* words) {
-    const SKIA_Text caption = captionOf(words, kButtonInk.text);
+    const SKIA_Text caption = captionIn(area, words, kButtonInk.text);
     button.emplace(&area, &caption).setActive(1);
   }
 
   void placeToast(const SKIA_Rect& area) {
-    const SKIA_Text first = captionOf(tr("A toast"), kRowInk.text);
-    const SKIA_Text second = captionOf(tr("goes in two seconds"), kRowInk.text);
+    const SKIA_Text first = captionIn(area, tr("A toast"), kRowInk.text);
+    const SKIA_Text second = captionIn(area, tr("goes in two seconds"), kRowInk.text);
     toast.emplace(&area, &first, &second);
   }
 
   void placeProgress(const SKIA_Rect& area) {
-    const SKIA_Text caption = captionOf(tr("Three seconds of work"), kHeadInk.text);
+    const SKIA_Text caption = captionIn(area, tr("Three seconds of work"), kHeadInk.text);
     progress.emplace(MW::kUnused, &area, &caption);
   }
 

@@ -47,8 +47,9 @@ class WarningTest : public StepTest {
     const uint32_t ground = made->getBgColor();
     const SKIA_Rect whole = {0, 0, screen.width, screen.height, ground};
     const auto rows = rowsOf<5>(within(whole, gapOf(screen)), 0, {4, 1, 1, 1, 6});
-    made->setText(0, rows[1], captionOf(title, MW::kColorWhite));
-    made->setText(1, inColor(rows[3], kButtonInk.ground), captionOf(words, kButtonInk.text));
+    made->setText(0, rows[1], captionIn(rows[1], title, MW::kColorWhite));
+    made->setText(1, inColor(rows[3], kButtonInk.ground),
+                  captionIn(rows[3], words, kButtonInk.text));
     made->touchReleaseCallback = [](MW::mouse_event*) { self().moveOn(); };
     made->keyPressCallback = [](MW::kbd_event* event) { self().followKey(event->code); };
     made->doubleKeyCallback = [](MW::kbd_event*) { self().finishLook(); };

@@ -20,19 +20,23 @@ constexpr auto kIsComplete =
     "(select 1 from plan_tests t where t.plan = runs.plan and not exists (select 1 from verdicts v "
     "where v.run = runs.id and v.test = t.test and v.verdict <> 'none'))";
 
+}  // namespace
+
 // Whether `task` ran through; else `error` says why not.
 template <typename Task>
-bool succeeds(const Task& task, std::string& error) {
+bool Database::succeeds(const Task& task, std::string& error) {
+  hasMetWriter = false;
   try {
     task();
     return true;
+  } catch (const StoreBusy& failure) {
+    hasMetWriter = true;
+    error = failure.what();
   } catch (const StoreError& failure) {
     error = failure.what();
-    return false;
   }
+  return false;
 }
-
-}  // namespace
 
 Database::Database(const std::filesystem::path& path)
     : store(path, Sqlite::Mode::Write), locks(path) {
@@ -40,9 +44,12 @@ Database::Database(const std::filesystem::path& path)
 }
 
 std::unique_ptr<Database> Database::open(const std::filesystem::path& path, std::string& error) {
-  std::unique_ptr<Database> opened;
-  succeeds([&] { opened.reset(new Database(path)); }, error);
-  return opened;
+  try {
+    return std::unique_ptr<Database>(new Database(path));
+  } catch (const StoreError& failure) {
+    error = failure.what();
+    return {};
+  }
 }
 
 Database::~Database() {

@@ -14,9 +14,9 @@
 namespace factory_test {
 
 /// What one program keeps in the database, a run at a time; several programs may share a file. One
-/// thread uses it. Each operation is one transaction, on the disk when it returns; it waits some
-/// seconds for another writer. False: the database is as it was, and `error` says why in one line
-/// that begins with the file's name. Nothing here throws.
+/// thread uses it. Each operation is one transaction, on the disk when it returns; it waits for
+/// another writer, for setPatience() at most. False: the database is as it was, and `error` says
+/// why in one line that begins with the file's name. Nothing here throws.
 class Database {
  public:
   enum class Resume { Yes, No };
@@ -38,9 +38,16 @@ class Database {
   /// The program leaves the run: it is aborted unless it is finished.
   bool endRun(std::string& error);
 
+  /// Sqlite::kPatience at first.
+  void setPatience(std::chrono::milliseconds patience) { store.setPatience(patience); }
+  /// Whether the last operation failed for another writer only.
+  bool isBusy() const { return hasMetWriter; }
+
  private:
   explicit Database(const std::filesystem::path& path);
 
+  template <typename Task>
+  bool succeeds(const Task& task, std::string& error);
   void abortDeadRuns();
   void addPlan(const RunStart& start);
   bool takeAborted(const RunStart& start);
@@ -52,6 +59,7 @@ class Database {
   RunLocks locks;
   std::int64_t number = 0;  // of the run; 0: none
   std::string run = {};     // its UUID
+  bool hasMetWriter = false;
 };
 
 }  // namespace factory_test

@@ -58,6 +58,7 @@ struct Line::Shared {
   LineStatus status;
   int asked = 1;   // how often there was news; what stands there at the start is some
   int served = 0;  // the news whose verdicts are sent
+  bool isEnding = false;
   bool hasEnded = false;
 
   // Whether to go on: stop has not rung. Returns on news, too, where they are waited for.
@@ -86,6 +87,7 @@ struct Line::Shared {
 
   // Sends; then waits for news, and so on until it is stopped.
   void serve(milliseconds& pause) {
+    count();
     set([this] { ++status.attempts; });
     LineTransfer transfer(station, url, stop.id());
     do {
@@ -97,18 +99,26 @@ struct Line::Shared {
     } while (wait(kForever, &news));
   }
 
-  void fail(const std::string& why) {
+  // What is known without the server.
+  void count() {
     std::int64_t left = 0;
     try {
       Sqlite store(station, Sqlite::Mode::Read);
-      left = store.number(
-          "select count(*) from changes where verdict is not null and number > "
-          "coalesce((select max(sent) from lines), 0)");
+      left = waitingFor(store, url);
     } catch (const StoreError&) {
-      left = 0;  // unknown
+      return;  // unknown: it stays at what was counted last
     }
-    set([&] { status.waiting = left, status.error = why; });
+    set([&] { status.waiting = left; });
   }
+
+  void fail(const std::string& why) {
+    count();
+    set([&] {
+      if (!isEnding) status.error = why;
+    });
+  }
+
+  bool isServed() const { return served == asked; }
 };
 
 Line::Line(std::filesystem::path station, std::string url, LinePace pace)
@@ -134,26 +144,35 @@ void Line::work(const std::shared_ptr<Shared>& shared) {
   shared->set([&] { shared->hasEnded = true; });
 }
 
-Line::~Line() {
-  wake();
-  const auto isDone = [this] {
-    return shared->served == shared->asked || !shared->status.error.empty();
-  };
-  std::unique_lock lock(shared->mutex);
-  shared->changed.wait_for(lock, kGrace, isDone);
-  shared->stop.ring();
-  shared->changed.wait_for(lock, kGrace, [this] { return shared->hasEnded; });
+Line::~Line() { end(); }
+
+void Line::end() {
+  wake(0);
+  Shared& now = *shared;
+  std::unique_lock lock(now.mutex);
+  if (now.isEnding) return;
+  now.changed.wait_for(lock, kGrace,
+                       [&now] { return now.isServed() || !now.status.error.empty(); });
+  now.isEnding = true;
+  if (!now.isServed() && now.status.error.empty()) {
+    now.status.error = "the line's database: has not answered in time";
+  }
+  now.stop.ring();
+  now.changed.wait_for(lock, kGrace, [&now] { return now.hasEnded; });
 }
 
-void Line::wake() {
-  shared->set([this] { ++shared->asked; });
+void Line::wake(std::size_t newVerdicts) {
+  shared->set([&] {
+    ++shared->asked;
+    shared->status.waiting += static_cast<std::int64_t>(newVerdicts);
+  });
   shared->news.ring();
 }
 
 LineStatus Line::status() const {
   const std::lock_guard guard(shared->mutex);
   LineStatus status = shared->status;
-  status.isUpToDate = shared->served == shared->asked;
+  status.isUpToDate = shared->isServed();
   return status;
 }
 

@@ -10,7 +10,7 @@
 namespace factory_test {
 
 struct LineStatus {
-  std::int64_t waiting = 0;  // verdicts that the line's database does not hold, when it last looked
+  std::int64_t waiting = 0;  // verdicts that the line's database does not hold yet
   std::string error = {};    // why not; empty: it sends, or has nothing to send
   int attempts = 0;          // connections that were tried
   bool isUpToDate = false;   // all is sent that was there at the last wake()
@@ -29,14 +29,17 @@ class Line {
  public:
   /// `station` is a database that Database has opened before; `url` is as libpq reads it.
   Line(std::filesystem::path station, std::string url, LinePace pace = {});
-  /// Gives a server that answers kGrace for the rest. What is left goes out at the next start.
   ~Line();
   Line(const Line&) = delete;
   Line& operator=(const Line&) = delete;
 
-  /// There are new verdicts. Any thread.
-  void wake();
+  /// There are so many new verdicts, or other changes. Any thread.
+  void wake(std::size_t newVerdicts);
+  /// Any thread; also after end().
   LineStatus status() const;
+  /// Sends no more, once a server that answers had kGrace for the rest: the status says what is
+  /// left, which goes out at the next start. The destructor does this, too.
+  void end();
 
  private:
   struct Shared;

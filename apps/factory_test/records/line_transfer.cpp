@@ -158,6 +158,16 @@ void checkLine(Postgres& server) {
                    std::to_string(kLineVersion));
 }
 
+// A line that was told by an older program has no place yet.
+std::int64_t waitingFor(Sqlite& station, const std::string& url) {
+  return station.number(
+      "select count(*) from changes where verdict is not null and number > coalesce("
+      "(select sent from lines where place = ?), (select max(sent) from lines where place is "
+      "null), "
+      "0)",
+      {postgresPlace(url)});
+}
+
 LineTransfer::LineTransfer(const std::filesystem::path& station, const std::string& url,
                            int stopDescriptor)
     : store(station, Sqlite::Mode::Write), server(url, stopDescriptor) {
@@ -169,6 +179,17 @@ LineTransfer::LineTransfer(const std::filesystem::path& station, const std::stri
   }
   checkLine(server);
   line = server.cell("select id from line");
+  nameLine(postgresPlace(url));
+}
+
+// The database that was at that place before, if it was another, is gone.
+void LineTransfer::nameLine(const std::string& place) {
+  Transaction transaction(store);
+  store.run("update lines set place = null where place = ? and id <> ?", {place, line});
+  store.run(
+      "insert into lines values (?, 0, ?) on conflict (id) do update set place = excluded.place",
+      {line, place});
+  transaction.commit();
 }
 
 std::int64_t LineTransfer::sent() {
@@ -188,10 +209,7 @@ bool LineTransfer::sendSome() {
     server.run(write, rows);
   }
   server.runAll("commit");
-  store.run(
-      "insert into lines values (?, ?) on conflict (id) do update set sent = max(sent, "
-      "excluded.sent)",
-      {line, to});
+  store.run("update lines set sent = max(sent, ?) where id = ?", {to, line});
   return true;
 }
 

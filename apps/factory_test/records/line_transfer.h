@@ -23,12 +23,17 @@ class LineTransfer {
   std::int64_t waiting();
 
  private:
+  void nameLine(const std::string& place);
   std::int64_t sent();
 
   Sqlite store;
   Postgres server;
   std::string line = {};  // the line's own name: a database that is made anew gets everything
 };
+
+/// How many verdicts a station has not sent to the line at that address, as far as the station
+/// knows without asking there. Throws StoreError.
+std::int64_t waitingFor(Sqlite& station, const std::string& url);
 
 /// Refuses a line's database that is none, or of a newer version.
 void checkLine(Postgres& server);

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <array>
 #include <cerrno>
+#include <string_view>
 #include <utility>
 
 namespace factory_test {
@@ -20,6 +21,24 @@ std::string oneLine(std::string text) {
     text.replace(at, 1, "; ");
   }
   return text;
+}
+
+// What says which database is meant.
+constexpr auto kPlaceNames =
+    std::to_array<std::string_view>({"service", "host", "hostaddr", "port", "dbname"});
+
+struct SettingsFreer {
+  void operator()(PQconninfoOption* settings) const { PQconninfoFree(settings); }
+};
+using Settings = std::unique_ptr<PQconninfoOption, SettingsFreer>;
+
+// Null, with the reason: `url` cannot be read.
+Settings parsed(const std::string& url, std::string& error) {
+  char* message = nullptr;
+  Settings settings(PQconninfoParse(url.c_str(), &message));
+  if (message != nullptr) error = oneLine(message);
+  PQfreemem(message);
+  return settings;
 }
 
 bool isGood(const PGresult* result) {
@@ -41,8 +60,23 @@ Cells rowOf(const PGresult* result, int row) {
 
 }  // namespace
 
-bool isPostgresUrl(const std::string& text) {
-  return text.starts_with("postgresql://") || text.starts_with("postgres://");
+std::string wrongPostgresUrl(const std::string& text) {
+  if (!text.starts_with("postgresql://") && !text.starts_with("postgres://")) {
+    return "needs an address like postgresql://host/database";
+  }
+  std::string error;
+  return parsed(text, error) ? "" : "is no address: " + error;
+}
+
+std::string postgresPlace(const std::string& url) {
+  std::string unused;
+  const auto settings = parsed(url, unused);
+  std::string place;
+  for (const auto* each = settings.get(); each != nullptr && each->keyword != nullptr; ++each) {
+    if (each->val == nullptr || std::ranges::count(kPlaceNames, each->keyword) == 0) continue;
+    place.append(each->keyword).append("=").append(each->val).append(" ");
+  }
+  return place;
 }
 
 Postgres::Postgres(const std::string& url, int stopDescriptor)

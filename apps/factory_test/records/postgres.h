@@ -13,8 +13,12 @@
 
 namespace factory_test {
 
-/// Whether `text` is an address of a PostgreSQL database: postgresql:// or postgres://.
-bool isPostgresUrl(const std::string& text);
+/// Why `text` is no address of a PostgreSQL database, postgresql://... or postgres://..., in a
+/// line; empty: it is one.
+std::string wrongPostgresUrl(const std::string& text);
+
+/// What an address names, without users, passwords and settings: two of one database read the same.
+std::string postgresPlace(const std::string& url);
 
 /// One thread at a time uses a connection. Every operation throws StoreError when the server
 /// refuses, is away, does not answer in kAnswerTime, or when `stopDescriptor` becomes readable.

@@ -15,12 +15,16 @@ std::string systemText(sqlite3* handle) {
   return number == 0 ? "" : ": " + std::generic_category().message(number);
 }
 
+constexpr int kPrimary = 0xff;  // of a code, the part without details
+
+bool isBusy(int code) {
+  return (code & kPrimary) == SQLITE_BUSY || (code & kPrimary) == SQLITE_LOCKED;
+}
+
 // What the last call on `handle` failed with, in the words of who uses the program.
 std::string explain(sqlite3* handle, int code) {
-  constexpr int kPrimary = 0xff;
+  if (isBusy(code)) return "is locked by another program";
   switch (code & kPrimary) {
-    case SQLITE_BUSY:
-    case SQLITE_LOCKED: return "is locked by another program";
     case SQLITE_FULL: return "cannot be written: the disk is full";
     case SQLITE_READONLY: return "cannot be written: it is read-only";
     case SQLITE_CANTOPEN: return "cannot be opened" + systemText(handle);
@@ -74,12 +78,18 @@ Sqlite::Sqlite(const std::filesystem::path& path, Mode mode) : file(path) {
   handle.reset(opened);  // also of one that failed
   check(code);
   sqlite3_extended_result_codes(opened, 1);
-  check(sqlite3_busy_timeout(opened, kBusyMs));
+  setPatience(kPatience);
+}
+
+void Sqlite::setPatience(std::chrono::milliseconds patience) const {
+  check(sqlite3_busy_timeout(handle.get(), static_cast<int>(patience.count())));
 }
 
 void Sqlite::check(int code) const {
   if (code == SQLITE_OK || code == SQLITE_DONE || code == SQLITE_ROW) return;
-  throw StoreError(file.native() + ": " + explain(handle.get(), code));
+  const std::string why = file.native() + ": " + explain(handle.get(), code);
+  if (isBusy(code)) throw StoreBusy(why);
+  throw StoreError(why);
 }
 
 Sqlite::Statement Sqlite::prepare(const char* sql) const {

@@ -3,6 +3,7 @@
 
 #include <sqlite3.h>
 
+#include <chrono>
 #include <cstdint>
 #include <filesystem>
 #include <functional>
@@ -25,6 +26,12 @@ class StoreError : public std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
+/// Another program's lock was in the way: it may go soon.
+class StoreBusy : public StoreError {
+ public:
+  using StoreError::StoreError;
+};
+
 /// A row as texts; nothing for null. Numbers read as the same number again.
 using Cells = std::vector<std::optional<std::string>>;
 using RowReader = std::function<void(const Cells& row)>;
@@ -39,9 +46,12 @@ class Sqlite {
   using Values = std::span<const Value>;
   using List = std::initializer_list<Value>;
 
-  /// Opens the database; Mode::Write makes one that is missing. Waits up to kBusyMs for others
-  /// that write.
+  /// How long it waits for others that write, unless it is told otherwise.
+  static constexpr std::chrono::milliseconds kPatience{3000};
+
+  /// Opens the database; Mode::Write makes one that is missing.
   Sqlite(const std::filesystem::path& path, Mode mode);
+  void setPatience(std::chrono::milliseconds patience) const;
 
   /// One statement; its rows go to `reader`.
   void run(const char* sql, Values values, const RowReader& reader = {});
@@ -68,8 +78,6 @@ class Sqlite {
   Statement prepare(const char* sql) const;
   void bind(sqlite3_stmt* statement, Values values) const;
   void check(int code) const;
-
-  static constexpr int kBusyMs = 3000;
 
   std::filesystem::path file;
   std::unique_ptr<sqlite3, Closer> handle;

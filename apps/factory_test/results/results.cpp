@@ -28,8 +28,10 @@ std::optional<ResultBook> ResultBook::open(const Keeping& places, const RunStart
     if (!book.database) return {};
     if (!places.line.empty()) book.line = std::make_unique<Line>(places.database, places.line);
   }
-  if (!book.begin(start, error)) return {};
-  return book;
+  if (places.first == FirstRun::AtOnce)
+    return book.begin(start, error) ? std::optional(std::move(book)) : std::nullopt;
+  book.begun = storable(start);
+  return book.saveFiles(error) ? std::optional(std::move(book)) : std::nullopt;
 }
 
 bool ResultBook::lockFiles(std::string& error) {
@@ -78,6 +80,7 @@ bool ResultBook::begin(const RunStart& start, std::string& error) {
     wanted.unit = begun.unit;
   }
   begun = std::move(wanted);
+  isBegun = true;
   return saveFiles(error);
 }
 
@@ -87,8 +90,8 @@ bool ResultBook::startUnit(const RunStart& start, std::string& error) {
 
 bool ResultBook::saveFiles(std::string& error) {
   const bool isKept =
-      files.json.empty() || replaceFile(files.json, resultsJson(begun.unit, kept), error);
-  const JunitSuite suite = {.planned = begun.tests, .results = kept};
+      files.json.empty() || replaceFile(files.json, resultsJson(begun, kept), error);
+  const JunitSuite suite = {.run = begun, .results = kept};
   const bool isReported =
       files.junit.empty() || replaceFile(files.junit, junitXml({&suite, 1}), error);
   if (isKept && isReported) unsavedTests.clear();
@@ -96,11 +99,16 @@ bool ResultBook::saveFiles(std::string& error) {
 }
 
 bool ResultBook::saveDatabase(std::string& error) {
-  if (!database || unsavedVerdicts.empty()) return true;
-  if (!database->keep(unsavedVerdicts, error)) return false;
-  unsavedVerdicts.clear();
-  if (line) line->wake();
-  return true;
+  if (!database) return true;
+  if (!unsavedVerdicts.empty()) {
+    if (!database->keep(unsavedVerdicts, error)) return false;
+    if (line) line->wake(unsavedVerdicts.size());
+    unsavedVerdicts.clear();
+  }
+  if (!isFinishing) return true;
+  isFinishing = !database->finishRun(error);
+  if (line) line->wake(0);
+  return !isFinishing;
 }
 
 bool ResultBook::record(TestResult result, std::string& error) {
@@ -126,7 +134,20 @@ bool ResultBook::saveAgain(std::string& error) {
 }
 
 bool ResultBook::finish(std::string& error) {
-  return saveAgain(error) && (!database || database->finishRun(error));
+  isFinishing = database != nullptr;
+  return saveAgain(error);
+}
+
+void ResultBook::setPatience(std::chrono::milliseconds patience) {
+  if (database) database->setPatience(patience);
+}
+
+bool ResultBook::close(std::string& error) {
+  setPatience(Sqlite::kPatience);
+  const bool isKept = saveAgain(error);
+  database.reset();
+  if (line) line->end();
+  return isKept;
 }
 
 std::optional<LineStatus> ResultBook::lineStatus() const {

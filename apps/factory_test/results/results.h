@@ -17,12 +17,17 @@
 
 namespace factory_test {
 
+/// When a book begins its first run in the database: as it is opened, or with the first
+/// startUnit(), as the unit is still to be asked for.
+enum class FirstRun { AtOnce, WithUnit };
+
 /// Where results are kept; an empty path: not there.
 struct Keeping {
   std::filesystem::path json = {};      // the newest results, see results_json.h
   std::filesystem::path junit = {};     // a report for a CI system, see junit.h
   std::filesystem::path database = {};  // all verdicts of all units, see records/database.h
   Database::Resume resume = Database::Resume::Yes;
+  FirstRun first = FirstRun::AtOnce;
   std::string line = {};  // the address of the line's database, see records/line.h; empty: none
 };
 
@@ -32,11 +37,11 @@ struct Keeping {
 /// name.
 class ResultBook {
  public:
-  /// Begins a run: with a database as Database::startRun() does, else with what the file at
-  /// `places.json` holds, which must be of the same unit or of none. All files are written at once,
-  /// so that one that cannot be is found before the first test. Nothing is returned for that, for a
-  /// file that another program keeps its results in, and for one that cannot be read; `error` then
-  /// says why, and what is there stays as it is.
+  /// Begins a run, unless the unit is to be told first: with a database as Database::startRun()
+  /// does, else with what the file at `places.json` holds, which must be of the same unit or of
+  /// none. All files are written at once, so that one that cannot be is found before the first
+  /// test. Nothing is returned for that, for a file that another program keeps its results in, and
+  /// for one that cannot be read; `error` then says why, and what is there stays as it is.
   static std::optional<ResultBook> open(const Keeping& places, const RunStart& start,
                                         std::string& error);
   /// A file alone, or none: the results stay in memory.
@@ -48,6 +53,8 @@ class ResultBook {
   /// database that works as long as there is no result, since a file holds those of one unit.
   bool startUnit(const RunStart& start, std::string& error);
   const RunStart& run() const { return begun; }
+  /// False while the first unit is still to be told.
+  bool hasBegun() const { return isBegun; }
 
   /// Puts `result`, clamped(), in the place of the test's earlier one, whose attempts it goes on to
   /// count, or at the end; then writes. False: it goes out with the next record() or saveAgain().
@@ -56,14 +63,28 @@ class ResultBook {
 
   /// Whether the test has a result, and all that it is kept in holds it.
   bool isSaved(std::string_view test) const;
-  /// Tries again to write what record() could not. True: nothing is left unsaved, or was.
+  bool isAllSaved() const {
+    return unsavedTests.empty() && unsavedVerdicts.empty() && !isFinishing;
+  }
+  /// Tries again to write what could not be written. True: nothing is left unsaved, or was.
   bool saveAgain(std::string& error);
 
   /// The plan is through, though tests may be left: a failure ended it. Without this a run is
   /// finished once all tests of its plan have a verdict, and aborted when the program ends before.
+  /// False: saveAgain() tries this again, too.
   bool finish(std::string& error);
 
-  /// How the line's database is kept up to date; nothing without one.
+  /// How long an operation may wait for another program that writes into the database.
+  void setPatience(std::chrono::milliseconds patience);
+  /// Whether what failed last failed for such a program: it works once that is done.
+  bool isBusy() const { return database && database->isBusy(); }
+
+  /// Tries a last time, as saveAgain() does, and leaves the run and the database. The line has a
+  /// moment to take the rest.
+  bool close(std::string& error);
+
+  /// How the line's database is kept up to date: how many verdicts were not sent, and what went
+  /// wrong last. Nothing without one. Any thread; also after close().
   std::optional<LineStatus> lineStatus() const;
 
   /// The test's result, or null. Valid until the next record() or startUnit().
@@ -86,6 +107,8 @@ class ResultBook {
   std::unique_ptr<Line> line = {};
   std::unique_ptr<Database> database = {};  // ends its run before the line does
   RunStart begun = {};
+  bool isBegun = false;
+  bool isFinishing = false;  // the database has yet to take that the plan is through
   std::vector<TestResult> kept = {};
   std::vector<TestResult> unsavedVerdicts = {};  // the database has yet to take them, oldest first
   std::vector<std::string> unsavedTests = {};    // the files do not hold their newest result

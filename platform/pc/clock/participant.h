@@ -18,8 +18,9 @@ struct TurnClock::Participant {
   bool isOutside = false;     // away, and named as one that blocks outside
   int calls = 0;              // since its pause; the thread's own
   std::atomic<bool> waitsInside = false;
-  std::atomic<bool> arrives = false;                // waits for the clock's lock, or is about to
-  std::chrono::steady_clock::time_point runsSince;  // away, and seen running
+  std::atomic<bool> arrives = false;                   // waits for the clock's lock, or is about to
+  std::optional<std::chrono::milliseconds> cpuBefore;  // away, and seen running: when first seen
+  std::chrono::steady_clock::time_point pollsSince;    // away, and polls: the same
 
   // Has the turn, and is to hear of it. A word of its own, so that who hears needs no lock.
   std::atomic<int> granted = 0;

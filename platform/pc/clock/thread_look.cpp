@@ -1,10 +1,14 @@
 #include "clock/thread_look.h"
 
 #include <sys/syscall.h>
+#include <unistd.h>
 
+#include <algorithm>
 #include <charconv>
 #include <filesystem>
 #include <fstream>
+#include <iterator>
+#include <sstream>
 #include <string>
 #include <system_error>
 
@@ -18,14 +22,13 @@ constexpr const char* kThreads = "/proc/self/task";
 
 fs::path folderOf(pid_t thread) { return fs::path(kThreads) / std::to_string(thread); }
 
-// For kernels that do not show system calls: the letter behind the name, which may hold anything.
-ThreadState stateByLetter(pid_t thread) {
+// The words behind the thread's name, which may hold anything, from its state's letter on.
+std::vector<std::string> statWords(pid_t thread) {
   std::ifstream file(folderOf(thread) / "stat");
   std::string text;
-  if (!std::getline(file, text)) return ThreadState::Gone;
-  const std::size_t end = text.rfind(") ");
-  const bool sleeps = end != std::string::npos && text.compare(end + 2, 1, "S") == 0;
-  return sleeps ? ThreadState::OnThread : ThreadState::Running;
+  if (!std::getline(file, text)) return {};
+  std::istringstream rest(text.substr(std::min(text.rfind(')') + 1, text.size())));
+  return {std::istream_iterator<std::string>(rest), {}};
 }
 
 }  // namespace
@@ -39,11 +42,22 @@ ThreadState stateOf(std::string_view syscallText) {
 }
 
 ThreadState lookAt(pid_t thread) {
+  const std::vector<std::string> words = statWords(thread);
+  if (words.empty() || words.front() == "Z" || words.front() == "X") return ThreadState::Gone;
+  if (words.front() != "S") return ThreadState::Running;
   std::ifstream file(folderOf(thread) / "syscall");
   std::string text;
-  if (std::getline(file, text)) return stateOf(text);
-  std::error_code failure;
-  return fs::exists(folderOf(thread), failure) ? stateByLetter(thread) : ThreadState::Gone;
+  // Some kernels do not show system calls.
+  return std::getline(file, text) ? stateOf(text) : ThreadState::OnThread;
+}
+
+std::chrono::milliseconds cpuTimeOf(pid_t thread) {
+  constexpr std::size_t kUserTicks = 11;  // the next word: what the kernel did for it
+  constexpr int64_t kMsPerSecond = 1000;
+  const std::vector<std::string> words = statWords(thread);
+  if (words.size() < kUserTicks + 2) return {};
+  const int64_t ticks = std::stoll(words[kUserTicks]) + std::stoll(words[kUserTicks + 1]);
+  return std::chrono::milliseconds(ticks * kMsPerSecond / ::sysconf(_SC_CLK_TCK));
 }
 
 uint64_t sleepsOf(pid_t thread) {

@@ -3,6 +3,7 @@
 
 #include <sys/types.h>
 
+#include <chrono>
 #include <cstdint>
 #include <string_view>
 #include <vector>
@@ -10,7 +11,7 @@
 namespace brimol::pc {
 
 enum class ThreadState {
-  Running,   ///< or ready to
+  Running,   ///< or ready to, or waiting for a disk or for memory, which end by themselves
   OnThread,  ///< waits for what another thread of the process does: a lock, a condition, an end
   Outside,   ///< waits for anything else: a pipe, a child process, a pause
   Gone,
@@ -20,6 +21,10 @@ enum class ThreadState {
 ThreadState stateOf(std::string_view syscallText);
 
 ThreadState lookAt(pid_t thread);
+
+/// What the processors have spent on the thread so far, to 10 ms; 0 where it is gone. Other than
+/// real time, this does not pass for a thread that a busy machine keeps waiting.
+std::chrono::milliseconds cpuTimeOf(pid_t thread);
 
 /// How often the thread has gone to sleep by itself so far; 0 where that cannot be told.
 uint64_t sleepsOf(pid_t thread);

@@ -156,7 +156,7 @@ void TurnClock::leave() {
 void TurnClock::pause(Participant& me, uint32_t ms) {
   Lock lock = lockFor(me);
   me.calls = 0;
-  me.wake = time + ms;
+  me.wake = endOfPause(ms);
   me.isAtWork = false;
   me.state = Participant::State::Waiting;
   me.polls = false;
@@ -165,6 +165,10 @@ void TurnClock::pause(Participant& me, uint32_t ms) {
   if (holder == nullptr) passOn(lock);
   lock.unlock();
   hearOfTurn(me);
+}
+
+uint64_t TurnClock::endOfPause(uint32_t ms) const {
+  return ms == 0 ? time.load() : (time + ms + step - 1) / step * step;
 }
 
 void TurnClock::hearOfTurn(Participant& me) {

@@ -55,6 +55,9 @@ class TurnClock {
 
   /// To be set by the first thread, before there are others.
   void setAgent(Agent wanted) { agent = std::move(wanted); }
+  /// Pauses end at whole multiples of so many milliseconds since the start, 1 before this is
+  /// called: where days are to pass, a longer step saves turns.
+  void setStep(uint32_t milliseconds) { step = milliseconds; }
   void setBlockedWatcher(BlockedWatcher watcher) { tellBlocked = std::move(watcher); }
 
   // By threads that take part.
@@ -100,6 +103,7 @@ class TurnClock {
   Participant& add(const std::string& name);
   void sitDown(Participant& me);
   void pause(Participant& me, uint32_t ms);
+  uint64_t endOfPause(uint32_t ms) const;
   static void hearOfTurn(Participant& me);
   void passOn(Lock& lock);
   Participant* choose(Lock& lock);
@@ -109,12 +113,13 @@ class TurnClock {
   void actAsAgent(Lock& lock, uint64_t due);
   void settle(Lock& lock);
   static bool isUnsettled(Participant& away);
+  bool mayStillLetGo();
   static bool isStillToPoll(Participant& away);
   bool seemsToPoll(Participant& watched);
   void dropGone();
   void keep();
   void watchHolder(Lock& lock);
-  bool othersRun();
+  static bool othersRun();
   void sendAway(Lock& lock, Participant& blocked);
   void callOutside(Lock& lock, Participant& blocked);
   void takeBack(Participant& me);
@@ -123,6 +128,7 @@ class TurnClock {
   const uint32_t firstTick;
   const Speed speed;
   const CpuShare cpus;
+  uint32_t step = 1;
   Agent agent;
   BlockedWatcher tellBlocked;
 

@@ -31,39 +31,51 @@ void TurnClock::settle(Lock& lock) {
   }
   while (!isOver) {
     dropGone();
-    if (std::ranges::none_of(participants, isUnsettled)) return;
+    if (std::ranges::none_of(participants, isUnsettled) && !mayStillLetGo()) return;
     lock.unlock();
     std::this_thread::sleep_for(kSettlePause);
     lock.lock();
   }
 }
 
-// Not one that has run for long without a call: it does something else.
+// Not one that has worked for long without a call: it does something else.
 bool TurnClock::isUnsettled(Participant& away) {
   if (away.state == Participant::State::Left) return true;
   if (away.state != Participant::State::Away) return false;
   if (away.polls) return isStillToPoll(away);
   if (lookAt(away.thread) != ThreadState::Running) {
     if (away.arrives) return true;
-    away.runsSince = {};
+    away.cpuBefore.reset();
     return false;
   }
-  const auto now = steady_clock::now();
-  if (away.runsSince == steady_clock::time_point()) away.runsSince = now;
-  return now - away.runsSince < kBlockedBound;
+  const auto spent = cpuTimeOf(away.thread);
+  if (!away.cpuBefore) away.cpuBefore = spent;
+  return spent - *away.cpuBefore < kBlockedBound;
+}
+
+// A thread that has given up its turn and does not sleep yet may hold what the runtime guards
+// within itself, and what is away may wait for that. The calling thread holds nothing.
+bool TurnClock::mayStillLetGo() {
+  using State = Participant::State;
+  const auto isAway = [](const Participant& each) { return each.state == State::Away; };
+  if (std::ranges::none_of(participants, isAway)) return false;
+  return std::ranges::any_of(participants, [me = ::gettid()](const Participant& each) {
+    return each.state == State::Waiting && each.thread != 0 && each.thread != me &&
+           lookAt(each.thread) == ThreadState::Running;
+  });
 }
 
 // It sleeps for real time, and sees what the last turn did only when it wakes up.
 bool TurnClock::isStillToPoll(Participant& away) {
   if (away.arrives) return true;
   if (sleepsOf(away.thread) >= away.sleepsBefore + kSureSleeps) {
-    away.runsSince = {};
+    away.pollsSince = {};
     return false;
   }
   const auto now = steady_clock::now();
-  if (away.runsSince == steady_clock::time_point()) away.runsSince = now;
+  if (away.pollsSince == steady_clock::time_point()) away.pollsSince = now;
   const bool waitsForThread = lookAt(away.thread) == ThreadState::OnThread;
-  away.polls = !waitsForThread && now - away.runsSince < kBlockedBound;
+  away.polls = !waitsForThread && now - away.pollsSince < kBlockedBound;
   return true;  // judged anew, as any other one if it does not poll any more
 }
 
@@ -122,20 +134,18 @@ bool TurnClock::seemsToPoll(Participant& watched) {
   return looksPolling >= kLooksPolling;
 }
 
-// While a thread runs that takes no part, it may be about to let go of what is waited for.
+// While any other thread runs, it may be about to let go of what is waited for: one that takes no
+// part, or one that has given up its turn and does not sleep yet.
 bool TurnClock::othersRun() {
-  const pid_t self = ::gettid();
-  return std::ranges::any_of(threadsOfProcess(), [&](pid_t thread) {
-    const bool isOurs = thread == self || std::ranges::any_of(participants, [&](const auto& each) {
-                          return each.thread == thread && each.state == Participant::State::Waiting;
-                        });
-    return !isOurs && lookAt(thread) == ThreadState::Running;
+  return std::ranges::any_of(threadsOfProcess(), [me = ::gettid()](pid_t thread) {
+    return thread != me && lookAt(thread) == ThreadState::Running;
   });
 }
 
 void TurnClock::sendAway(Lock& lock, Participant& blocked) {
   blocked.state = Participant::State::Away;
-  blocked.runsSince = {};
+  blocked.cpuBefore.reset();
+  blocked.pollsSince = {};
   holder = nullptr;
   passOn(lock);
 }

@@ -111,6 +111,7 @@ void Session::startReport() {
 void Session::startClock() {
   const uint32_t start = parsed.trace.clockStart.value_or(settings.clockStart.value_or(0));
   turns.emplace(start, settings.clock == ClockChoice::Paced ? Speed::Real : Speed::Free);
+  turns->setStep(settings.clockStep.value_or(1));
   turns->setAgent({[this](uint64_t soonest) { return due(soonest); },
                    [this](uint64_t moment) { act(moment); }});
   turns->setBlockedWatcher(

@@ -1,7 +1,5 @@
 // A session that a monkey plays.
-#include <unistd.h>
-
-#include <fstream>
+#include <filesystem>
 #include <iostream>
 
 #include "host/session.h"
@@ -13,37 +11,44 @@ namespace {
 constexpr uint64_t kMostWithoutChange = 5'000;  // records
 constexpr uint64_t kCloseMs = 10'000;
 constexpr uint64_t kToldEach = 1'000'000;  // records
+constexpr uint64_t kToldEachMs = 86'400'000;
+constexpr uint64_t kLookEach = 10'000;  // records
 
-// In KiB; 0 where the system does not tell.
-long residentMemory() {
-  constexpr long kKibi = 1024;
-  std::ifstream file("/proc/self/statm");
-  long all = 0;
-  long resident = 0;
-  file >> all >> resident;
-  return resident * (sysconf(_SC_PAGESIZE) / kKibi);
+// How many entries a folder has; 0 where the system has no such folder.
+std::ptrdiff_t entriesOf(const char* folder) {
+  std::error_code none;
+  const std::filesystem::directory_iterator all(folder, none);
+  return std::distance(begin(all), end(all));
 }
 
 }  // namespace
 
 void Session::startMonkey() {
-  monkey.emplace(settings.monkey->seed, settings.monkey->events, screenSize,
-                 [this](const Event& record) {
-                   if (recorder) recorder->input(now(), record);
-                   deliver(record);
-                   if (monkey->posted() % kToldEach == 0) tellOfMonkey();
-                 });
+  nextTold = kToldEach;
+  nextToldMs = kToldEachMs;
+  monkey.emplace(*settings.monkey, screenSize, [this](const Event& record) {
+    if (recorder) recorder->input(now(), record);
+    deliver(record);
+  });
 }
 
-void Session::tellOfMonkey() const {
+void Session::tellOfMonkey() {
+  nextTold = (monkey->posted() / kToldEach + 1) * kToldEach;
+  nextToldMs = (now() / kToldEachMs + 1) * kToldEachMs;
   std::cerr << "brimol: monkey " << settings.monkey->seed << ": " << monkey->posted()
-            << " events in " << now() << " ms, " << frames << " frames, " << residentMemory()
-            << " KiB resident\n";
+            << " events in " << now() << " ms, " << frames << " frames, " << memory.least()
+            << " KiB resident, " << entriesOf("/proc/self/task") << " threads, "
+            << entriesOf("/proc/self/fd") - 1 << " open files\n";  // without the look itself
 }
 
 void Session::followMonkey(uint64_t moment) {
   if (closedBy) endMonkey("the application still runs 10 seconds after it was asked to close");
   monkey->act(moment, lastFrame);
+  if (monkey->posted() >= nextLook) {
+    memory.look();
+    nextLook = monkey->posted() + kLookEach;
+  }
+  if (monkey->posted() >= nextTold || moment >= nextToldMs) tellOfMonkey();
   if (monkey->sinceChange() > kMostWithoutChange) {
     endMonkey("nothing has changed on the screen for " + std::to_string(kMostWithoutChange) +
               " events");

@@ -4,6 +4,7 @@
 
 #include <array>
 #include <cstdio>
+#include <fstream>
 #include <nlohmann/json.hpp>
 #include <sstream>
 #include <string_view>
@@ -25,8 +26,14 @@ using nlohmann::ordered_json;
 
 constexpr int kFormat = 1;
 
-void put(std::ofstream& file, const ordered_json& line) {
-  file << line.dump(-1, ' ', false, ordered_json::error_handler_t::replace) << '\n' << std::flush;
+void put(LineFile& file, const ordered_json& line) {
+  file.write(line.dump(-1, ' ', false, ordered_json::error_handler_t::replace));
+}
+
+std::filesystem::path fileIn(const std::filesystem::path& folder) {
+  std::error_code failure;  // that the file cannot be written says it
+  std::filesystem::create_directories(folder, failure);
+  return folder / "session.jsonl";
 }
 
 ordered_json lineOf(const char* kind, uint64_t time) { return {{"kind", kind}, {"time", time}}; }
@@ -96,11 +103,8 @@ ordered_json wordsOf(const SKIA_Item& item) {
 }  // namespace
 
 SessionReport::SessionReport(std::filesystem::path where, std::string& error)
-    : folder(std::move(where)) {
-  std::error_code failure;
-  std::filesystem::create_directories(folder, failure);
-  file.open(folder / "session.jsonl", std::ios::binary | std::ios::trunc);
-  if (!file) error = "BRIMOL_REPORT_DIR=" + folder.native() + ": cannot be written";
+    : folder(std::move(where)), file(fileIn(folder), error) {
+  if (!error.empty()) error = "BRIMOL_REPORT_DIR=" + folder.native() + ": cannot be written";
 }
 
 void SessionReport::start(const SessionSettings& settings, const SessionScreen& screen,

@@ -5,11 +5,11 @@
 
 #include <cstdint>
 #include <filesystem>
-#include <fstream>
 #include <string>
 #include <vector>
 
 #include "host/session_settings.h"
+#include "input/line_file.h"
 #include "input/trace.h"
 #include "scene/scene.h"
 
@@ -55,7 +55,7 @@ class SessionReport {
 
  private:
   std::filesystem::path folder;
-  std::ofstream file;
+  LineFile file;
   bool listsItems = false;
 };
 

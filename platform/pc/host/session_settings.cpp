@@ -5,13 +5,13 @@
 #include <charconv>
 #include <string_view>
 #include <system_error>
+#include <vector>
 
 namespace brimol::pc {
 
 namespace {
 
 constexpr const char* kClockVariable = "BRIMOL_CLOCK";
-constexpr const char* kStartVariable = "BRIMOL_CLOCK_START";
 constexpr const char* kMonkeyVariable = "BRIMOL_MONKEY";
 constexpr const char* kPicturesVariable = "BRIMOL_REPORT_PICTURES";
 constexpr const char* kItemsVariable = "BRIMOL_REPORT_ITEMS";
@@ -52,31 +52,46 @@ std::string readClock(const VariableLookup& lookup, SessionSettings& settings) {
   return {};
 }
 
-std::string readStart(const VariableLookup& lookup, SessionSettings& settings) {
-  const std::string value = valueOf(lookup, kStartVariable);
+struct MillisecondsRow {
+  const char* variable;
+  uint32_t least, most;
+  std::optional<uint32_t> SessionSettings::*value;
+};
+constexpr auto kMilliseconds = std::to_array<MillisecondsRow>(
+    {{"BRIMOL_CLOCK_START", 0, UINT32_MAX, &SessionSettings::clockStart},
+     {"BRIMOL_CLOCK_STEP", 1, 1000, &SessionSettings::clockStep}});
+
+std::string readMilliseconds(const VariableLookup& lookup, const MillisecondsRow& row,
+                             SessionSettings& settings) {
+  const std::string value = valueOf(lookup, row.variable);
   if (value.empty()) return {};
-  uint32_t start = 0;
+  uint32_t read = 0;
   const char* const end = value.data() + value.size();
-  const auto [stop, failure] = std::from_chars(value.data(), end, start);
-  if (failure != std::errc() || stop != end) {
-    return std::string(kStartVariable) + "=" + value + ": wanted milliseconds, 0 to 4294967295";
+  const auto [stop, failure] = std::from_chars(value.data(), end, read);
+  if (failure != std::errc() || stop != end || read < row.least || read > row.most) {
+    return std::string(row.variable) + "=" + value + ": wanted milliseconds, " +
+           std::to_string(row.least) + " to " + std::to_string(row.most);
   }
-  settings.clockStart = start;
+  settings.*row.value = read;
   return {};
 }
 
-// "SEED" or "SEED:EVENTS".
+// "SEED", "SEED:EVENTS" or "SEED:EVENTS:REST".
 std::string readMonkey(const VariableLookup& lookup, SessionSettings& settings) {
   const std::string value = valueOf(lookup, kMonkeyVariable);
   if (value.empty()) return {};
   MonkeyWish& wish = settings.monkey.emplace();
-  const char* const end = value.data() + value.size();
-  std::from_chars_result read = std::from_chars(value.data(), end, wish.seed);
-  if (read.ec == std::errc() && read.ptr != end && *read.ptr == ':') {
-    read = std::from_chars(read.ptr + 1, end, wish.events);
+  const char* next = value.data();
+  const char* const end = next + value.size();
+  for (uint64_t* const number : {&wish.seed, &wish.events, &wish.restMs}) {
+    const auto [stop, failure] = std::from_chars(next, end, *number);
+    if (failure != std::errc()) break;
+    if (stop == end) return {};
+    if (*stop != ':') break;
+    next = stop + 1;
   }
-  if (read.ec == std::errc() && read.ptr == end) return {};
-  return std::string(kMonkeyVariable) + "=" + value + ": wanted SEED or SEED:EVENTS";
+  return std::string(kMonkeyVariable) + "=" + value +
+         ": wanted SEED, SEED:EVENTS or SEED:EVENTS:REST";
 }
 
 std::string readPictures(const VariableLookup& lookup, SessionSettings& settings) {
@@ -100,12 +115,14 @@ SessionSettings readSessionSettings(const VariableLookup& lookup) {
   settings.trace = valueOf(lookup, "BRIMOL_TRACE");
   settings.recording = valueOf(lookup, "BRIMOL_RECORD");
   settings.reportFolder = valueOf(lookup, "BRIMOL_REPORT_DIR");
-  const std::string monkeyError = readMonkey(lookup, settings);
-  const std::string clockError = readClock(lookup, settings);
-  for (const std::string& error : {monkeyError, clockError, readStart(lookup, settings),
-                                   readPictures(lookup, settings), readItems(lookup, settings)}) {
-    if (settings.error.empty()) settings.error = error;
+  std::vector<std::string> errors = {readMonkey(lookup, settings), readClock(lookup, settings)};
+  for (const MillisecondsRow& row : kMilliseconds) {
+    errors.push_back(readMilliseconds(lookup, row, settings));
   }
+  errors.push_back(readPictures(lookup, settings));
+  errors.push_back(readItems(lookup, settings));
+  const auto first = std::ranges::find_if_not(errors, &std::string::empty);
+  if (first != errors.end()) settings.error = *first;
   if (!settings.trace.empty() && !settings.recording.empty()) {
     settings.error = "BRIMOL_TRACE and BRIMOL_RECORD: a session is played or recorded, not both";
   }

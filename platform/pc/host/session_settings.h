@@ -6,20 +6,16 @@
 #include <string>
 
 #include "host/settings.h"
+#include "input/monkey.h"
 
 namespace brimol::pc {
 
 enum class ClockChoice { Real, Simulated, Paced };
 
-/// Random input: the seed, and how many records at least.
-struct MonkeyWish {
-  uint64_t seed = 0;
-  uint64_t events = 10'000;
-};
-
 struct SessionSettings {
   ClockChoice clock = ClockChoice::Real;
   std::optional<uint32_t> clockStart;
+  std::optional<uint32_t> clockStep;
   std::string trace;                 // what is played; empty: nothing
   std::string recording;             // what is recorded into; empty: nothing
   std::optional<MonkeyWish> monkey;  // who plays instead of a trace or a user
@@ -29,8 +25,9 @@ struct SessionSettings {
   std::string error;                 // one line about the first wrong value; empty: none is wrong
 };
 
-/// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_TRACE, BRIMOL_RECORD, BRIMOL_MONKEY,
-/// BRIMOL_REPORT_DIR, BRIMOL_REPORT_PICTURES and BRIMOL_REPORT_ITEMS; an empty value is no value.
+/// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_CLOCK_STEP, BRIMOL_TRACE, BRIMOL_RECORD,
+/// BRIMOL_MONKEY, BRIMOL_REPORT_DIR, BRIMOL_REPORT_PICTURES and BRIMOL_REPORT_ITEMS; an empty value
+/// is no value.
 SessionSettings readSessionSettings(const VariableLookup& lookup);
 
 }  // namespace brimol::pc

@@ -11,9 +11,12 @@
 /// | BRIMOL_RECORD | the file that the session is recorded into | it is not |
 /// | BRIMOL_CLOCK | real, simulated or paced | what the session asks for, else real |
 /// | BRIMOL_CLOCK_START | GetTicks() at the start, in milliseconds | 0 |
+/// | BRIMOL_CLOCK_STEP | pauses end at multiples of so many milliseconds | 1 |
+/// | BRIMOL_MONKEY | SEED, SEED:EVENTS or SEED:EVENTS:REST: who plays random input | nobody does |
 /// | BRIMOL_REPORT_DIR | the folder of a session's report and pictures | none is written |
 ///
-/// The last five are read by host/session_settings.h; docs/traces.md tells what they do.
+/// Those from BRIMOL_TRACE on are read by host/session_settings.h; docs/traces.md tells what they
+/// do.
 #pragma once
 
 #include <functional>

@@ -16,6 +16,7 @@ constexpr uint64_t kFirstMs = 100;  // after the first frame
 constexpr uint32_t kMostPauseMs = 40;
 constexpr uint32_t kMostRestMs = 3000;
 constexpr uint32_t kMoveMs = 10;
+constexpr uint64_t kTiringEvents = 100;
 constexpr uint32_t kLongMs = 700;  // more than a long press
 
 constexpr auto kKeys = std::to_array<uint32_t>(
@@ -48,12 +49,13 @@ const Monkey::Habit& Monkey::habitFor(uint32_t share) {
   return *habit;
 }
 
-Monkey::Monkey(uint64_t seed, uint64_t events, Size screenSize, Post receiver)
+Monkey::Monkey(const MonkeyWish& wish, Size screenSize, Post receiver)
     : screen(screenSize),
       target(std::move(receiver)),
       fingers(screenSize, [this](const Event& record) { post(record); }),
-      random(seed),
-      wanted(events) {}
+      random(wish.seed),
+      wanted(wish),
+      nextRest(kTiringEvents) {}
 
 void Monkey::post(const Event& record) {
   ++count;
@@ -81,14 +83,22 @@ void Monkey::act(uint64_t now, const Frame& shown) {
     next.action(now);
   }
   if (!planned.empty() || now < *nextHabit) return;
-  over = count >= wanted;
+  over = count >= wanted.events;
   if (!over) decide(now, shown);
 }
 
 void Monkey::decide(uint64_t now, const Frame& shown) {
   planTime = now;
   (this->*habitFor(below(100)).act)(shown);
+  restIfTired();
   nextHabit = planTime + below(kMostPauseMs);
+}
+
+// What is planned comes before the rest.
+void Monkey::restIfTired() {
+  if (count < nextRest) return;
+  nextRest = count + kTiringEvents;
+  planTime += wanted.restMs;
 }
 
 void Monkey::plan(uint32_t laterMs, std::function<void(uint64_t now)> action) {
@@ -128,7 +138,11 @@ void Monkey::planMoves(int finger, int steps) {
   }
 }
 
-void Monkey::tap(const Frame& shown) { planPress(0, somewhere(shown), 5 + below(60)); }
+// Each number is drawn in a statement of its own: compilers differ in the order of arguments.
+void Monkey::tap(const Frame& shown) {
+  const ScreenPoint place = somewhere(shown);
+  planPress(0, place, 5 + below(60));
+}
 
 void Monkey::tapTwice(const Frame& shown) {
   const ScreenPoint place = somewhere(shown);
@@ -137,7 +151,10 @@ void Monkey::tapTwice(const Frame& shown) {
   planPress(0, place, 20 + below(60));
 }
 
-void Monkey::hold(const Frame& shown) { planPress(0, somewhere(shown), kLongMs + below(kLongMs)); }
+void Monkey::hold(const Frame& shown) {
+  const ScreenPoint place = somewhere(shown);
+  planPress(0, place, kLongMs + below(kLongMs));
+}
 
 void Monkey::drag(const Frame& shown) {
   const ScreenPoint from = somewhere(shown);

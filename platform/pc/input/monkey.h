@@ -12,6 +12,12 @@
 
 namespace brimol::pc {
 
+struct MonkeyWish {
+  uint64_t seed = 0;
+  uint64_t events = 10'000;  // records, at least
+  uint64_t restMs = 0;       // after each hundred of them
+};
+
 /// Makes up taps, drags, long presses, up to ten fingers, keys and plugs, at random places and on
 /// what the screen shows. The same seed on the same screen does the same. It reads no clock and
 /// knows no thread: one call at a time. Times are milliseconds since the session's start and do not
@@ -20,8 +26,8 @@ class Monkey {
  public:
   using Post = ScriptFingers::Post;
 
-  /// It has posted at least `events` records when it is over; no finger is down then.
-  Monkey(uint64_t seed, uint64_t events, Size screenSize, Post receiver);
+  /// It has posted at least the wished records when it is over; no finger is down then.
+  Monkey(const MonkeyWish& wish, Size screenSize, Post receiver);
 
   /// When act() is to be called next; none: not before a frame was seen, or not any more.
   std::optional<uint64_t> due(uint64_t soonest) const;
@@ -53,6 +59,7 @@ class Monkey {
   void planKey(uint32_t code);
   void post(const Event& record);
   void decide(uint64_t now, const Frame& shown);
+  void restIfTired();
 
   void tap(const Frame& shown);
   void tapTwice(const Frame& shown);
@@ -67,8 +74,9 @@ class Monkey {
   Post target;
   ScriptFingers fingers;
   std::mt19937_64 random;
-  uint64_t wanted;
+  MonkeyWish wanted;
   uint64_t count = 0;
+  uint64_t nextRest;  // so many records have come then
   uint64_t countAtChange = 0;
   std::deque<Planned> planned;        // in the order of their times
   std::optional<uint64_t> nextHabit;  // none: no frame was seen yet

@@ -1,9 +1,7 @@
 #include "input/trace_recorder.h"
 
 #include <array>
-#include <cerrno>
 #include <charconv>
-#include <system_error>
 
 #include "input/trace_steps.h"
 #include "scene/item_text.h"
@@ -47,45 +45,37 @@ std::string textOfRecord(const Event& record) {
   return {};
 }
 
-TraceRecorder::TraceRecorder(const std::string& path, std::string& error)
-    : file(path, std::ios::binary | std::ios::trunc) {
-  if (!file) error = path + ": " + std::generic_category().message(errno);
-}
-
-// A full disk ends the recording, not the session.
-void TraceRecorder::write(const std::string& line) { file << line << '\n' << std::flush; }
-
 void TraceRecorder::startScript(uint32_t clockStart) {
-  write("brimol-trace 1");
-  write("clock start " + std::to_string(clockStart));
+  file.write("brimol-trace 1");
+  file.write("clock start " + std::to_string(clockStart));
 }
 
 void TraceRecorder::start(uint32_t clockStart, uint64_t utcMs, uint64_t seed) {
-  write("brimol-trace 1 recording");
-  write("clock start " + std::to_string(clockStart));
-  write("world time " + utcText(utcMs));
-  write("world random " + std::to_string(seed));
+  file.write("brimol-trace 1 recording");
+  file.write("clock start " + std::to_string(clockStart));
+  file.write("world time " + utcText(utcMs));
+  file.write("world random " + std::to_string(seed));
 }
 
 void TraceRecorder::screen(Size size) {
-  write("screen " + std::to_string(size.w) + 'x' + std::to_string(size.h));
+  file.write("screen " + std::to_string(size.w) + 'x' + std::to_string(size.h));
 }
 
 void TraceRecorder::density(float dotsPerInch) {
   std::array<char, 32> digits = {};
   const auto end = std::to_chars(digits.data(), digits.data() + digits.size(), dotsPerInch).ptr;
-  write("density " + std::string(digits.data(), end));
+  file.write("density " + std::string(digits.data(), end));
 }
 
 void TraceRecorder::input(uint64_t time, const Event& record) {
   const std::string words = textOfRecord(record);
-  if (!words.empty()) write(std::to_string(time) + ' ' + words);
+  if (!words.empty()) file.write(std::to_string(time) + ' ' + words);
 }
 
-void TraceRecorder::close(uint64_t time) { write(std::to_string(time) + " close"); }
+void TraceRecorder::close(uint64_t time) { file.write(std::to_string(time) + " close"); }
 
 void TraceRecorder::figure(uint64_t time, const std::string& name, const std::string& value) {
-  write(std::to_string(time) + " world figure " + inQuotes(name) + ' ' + inQuotes(value));
+  file.write(std::to_string(time) + " world figure " + inQuotes(name) + ' ' + inQuotes(value));
 }
 
 void TraceRecorder::frame(uint64_t time, const std::vector<std::string>& items) {
@@ -96,12 +86,9 @@ void TraceRecorder::frame(uint64_t time, const std::vector<std::string>& items) 
     lines += "\n| " + std::to_string(i) + ' ' + items[i];
   }
   lastItems = items;
-  write(lines);
+  file.write(lines);
 }
 
-void TraceRecorder::end(uint64_t time) {
-  write(std::to_string(time) + " end");
-  file.close();
-}
+void TraceRecorder::end(uint64_t time) { file.write(std::to_string(time) + " end"); }
 
 }  // namespace brimol::pc

@@ -4,20 +4,19 @@
 #include <brimol/input.h>
 
 #include <cstdint>
-#include <fstream>
 #include <string>
 #include <vector>
 
+#include "input/line_file.h"
 #include "scene/geometry.h"
 
 namespace brimol::pc {
 
-/// A file that is written line by line, each as soon as it is known. Not guarded: Session is. Times
-/// are milliseconds since the start and do not run back.
+/// Not guarded: Session is. Times are milliseconds since the start and do not run back.
 class TraceRecorder {
  public:
-  /// Begins the file anew. `error` says in one line why it cannot be written.
-  TraceRecorder(const std::string& path, std::string& error);
+  /// As LineFile's.
+  TraceRecorder(const std::string& path, std::string& error) : file(path, error) {}
 
   /// The lines at the head, to be written first: of a script, whose frames are not compared, or of
   /// a recording. Time of day in milliseconds since 1970.
@@ -32,9 +31,7 @@ class TraceRecorder {
   void end(uint64_t time);
 
  private:
-  void write(const std::string& line);
-
-  std::ofstream file;
+  LineFile file;
   std::vector<std::string> lastItems;
 };
 

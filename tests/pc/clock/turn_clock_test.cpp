@@ -69,6 +69,15 @@ TEST(TurnClock, GivesTurnsByTimeAndThenByTheOrderOfComing) {
   }
 }
 
+TEST(TurnClock, EndsPausesAtWholeSteps) {
+  TurnClock clock(3, Speed::Free);
+  clock.setStep(10);
+  for (const auto& [pause, end] : {std::pair(1U, 10U), {10U, 20U}, {11U, 40U}}) {
+    clock.delay(pause);
+    EXPECT_EQ(clock.now(), end) << pause;
+  }
+}
+
 TEST(TurnClock, HasAnAgentActBeforeTheTurnsOfItsTime) {
   TurnClock clock(0, Speed::Free);
   Journal journal(clock);

@@ -33,6 +33,8 @@ TEST(SessionSettings, SayWhatIsWrong) {
             "BRIMOL_CLOCK=fast: wanted real, simulated or paced");
   EXPECT_EQ(errorWith({{"BRIMOL_CLOCK_START", "4294967296"}}),
             "BRIMOL_CLOCK_START=4294967296: wanted milliseconds, 0 to 4294967295");
+  EXPECT_EQ(errorWith({{"BRIMOL_CLOCK_STEP", "0"}}),
+            "BRIMOL_CLOCK_STEP=0: wanted milliseconds, 1 to 1000");
   EXPECT_EQ(errorWith({{"BRIMOL_REPORT_PICTURES", "all"}}),
             "BRIMOL_REPORT_PICTURES=all: wanted changed or none");
   EXPECT_EQ(errorWith({{"BRIMOL_REPORT_ITEMS", "1"}}),

@@ -1,0 +1,98 @@
+#!/usr/bin/env bash
+# Lets monkeys use the whole example application. `scripts/monkey.sh --help` says how.
+set -euo pipefail
+cd "$(dirname "$0")/.."
+
+usage() {
+  cat <<'END'
+Usage: scripts/monkey.sh [--preset NAME] [--events N] [--days N] SEED...
+
+Each seed plays in a process of its own, in simulated time, on a screen of 480x800. The session's memory, threads and
+open files are printed after each million events and each simulated day. A seed fails if the application crashes,
+leaks (with a sanitizer's preset), does not close, shows the same for 5,000 events, or if from the first of those
+lines to the last its memory grows by more than 1 % or a thread or an open file is left. Its trace stays in
+build/monkey/SEED.trace, for scripts/shrink_trace.py.
+
+  --preset NAME   the build, `release` when not said
+  --events N      so many events each, 1000000 when not said
+  --days N        with rests in between, so that they take N days; the clock starts over in the middle
+  --help          this text
+END
+}
+
+fail_usage() {
+  echo "monkey.sh: $1 (try --help)" >&2
+  exit 2
+}
+
+readonly day=86400000 # ms
+preset=release events=1000000 days=0 seeds=()
+while (($# > 0)); do
+  case $1 in
+    --help) usage; exit ;;
+    --preset | --events | --days)
+      (($# > 1)) || fail_usage "$1 needs a value"
+      declare "${1#--}=$2"
+      shift
+      ;;
+    *) seeds+=("$1") ;;
+  esac
+  shift
+done
+((${#seeds[@]} > 0)) || fail_usage "which seeds?"
+for number in "$events" "$days" "${seeds[@]}"; do
+  [[ $number =~ ^(0|[1-9][0-9]{0,17})$ ]] || fail_usage "'$number' is not a number"
+done
+((events >= 100)) || fail_usage "--events needs 100 at least"
+
+export LC_ALL=C.UTF-8 BRIMOL_DISPLAY=headless BRIMOL_SCREEN=480x800
+export LSAN_OPTIONS="suppressions=$PWD/cmake/lsan.supp:print_suppressions=0"
+export TSAN_OPTIONS="suppressions=$PWD/cmake/tsan.supp:halt_on_error=1"
+rest=0
+export BRIMOL_CLOCK_STEP=10 # a millisecond each would cost ten times as much
+if ((days > 0)); then
+  rest=$((days * day / (events / 100)))
+  BRIMOL_CLOCK_STEP=50
+  export BRIMOL_CLOCK_START=$(((2 ** 32 - days * day / 2) % 2 ** 32))
+fi
+
+if command -v ccache >/dev/null; then
+  export CMAKE_C_COMPILER_LAUNCHER=ccache CMAKE_CXX_COMPILER_LAUNCHER=ccache
+fi
+cmake --preset "$preset" >/dev/null
+cmake --build --preset "$preset" --target factory_test >/dev/null
+program=$PWD/build/$preset/apps/factory_test/factory_test
+mkdir -p build/monkey
+cd build/monkey
+
+# Compares the first line that tells of memory (KiB), threads and open files with the last one.
+judge() {
+  awk '/ KiB resident/ {
+         memory = $(NF - 7); threads = $(NF - 4); files = $(NF - 2)
+         if (!lines++) { memory1 = memory; threads1 = threads; files1 = files }
+       }
+       END {
+         if (!lines) { print "nothing was told"; exit 1 }
+         growth = 100 * (memory - memory1) / memory1
+         printf "growth from the first line to the last: %.2f %%\n", growth
+         exit growth > 1 || threads > threads1 || files > files1
+       }' "$1"
+}
+
+# play SEED: with the exit codes of verdicts, which a monkey gives as it likes, it is well.
+play() {
+  local code=0
+  BRIMOL_MONKEY=$1:$events:$rest BRIMOL_RECORD=$1.trace "$program" --stay 2>&1 | tee "$1.log" || code=$?
+  ((code == 0 || code == 3 || code == 4)) || { echo "exit code $code"; return 1; }
+  judge "$1.log"
+}
+
+failed=()
+for seed in "${seeds[@]}"; do
+  if play "$seed"; then
+    rm "$seed.trace"
+  else
+    failed+=("$seed")
+  fi
+done
+((${#failed[@]} == 0)) || { echo "monkey.sh: failed: ${failed[*]}; see build/monkey" >&2; exit 1; }

@@ -1,0 +1,85 @@
+"""A station's session on its screen, played without one: session_test.py FACTORY_TEST"""
+
+import json
+import os
+import pathlib
+import sqlite3
+import subprocess
+import sys
+import tempfile
+import time
+import unittest
+
+FACTORY_TEST = sys.argv[1]
+PLAN = {"version": 1, "name": "Short", "steps": [{"test": "stuck_touch", "parameters": {"seconds": 1}}]}
+NEXT = "wait 1300\nexpect text \"1 of 1 done: *\"\nwait 800\ntap \"{}\"\nexpect text \"Which unit?\"\n"
+# Holds a verdict up until the test lets go of the database.
+SHELL = """cd {}
+if mkdir first; then until [ -e locked ]; do sleep 0.05; done
+else mkdir second; until [ -e released ]; do sleep 0.05; done; fi"""
+PASS = """wait until text "*exit code 0*" within 86400000
+tap "OK"
+wait 800
+tap "PASS"
+"""
+
+
+class SessionTest(unittest.TestCase):
+    def setUp(self):
+        self.folder = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
+        self.database = self.folder / "station.db"
+
+    def start(self, trace, *options):
+        file = self.folder / "played.trace"
+        file.write_text("brimol-trace 1\n" + trace)
+        return subprocess.Popen([FACTORY_TEST, "--headless", "--database", self.database, *options],
+                                stderr=subprocess.PIPE, text=True,
+                                env=os.environ | {"BRIMOL_TRACE": str(file), "BRIMOL_SCREEN": "480x800"})
+
+    def ask(self, sql):
+        store = sqlite3.connect(self.database)
+        try:
+            return store.execute(sql).fetchall()
+        finally:
+            store.close()
+
+    def await_folder(self, name, program):
+        while not (self.folder / name).exists():
+            if program.poll() is not None:
+                self.fail(program.communicate()[1])
+            time.sleep(0.02)
+
+    def test_one_unit_after_another(self):
+        """The second one fails; the exit code tells of it, though the third one passes."""
+        plan = self.folder / "plan.json"
+        plan.write_text(json.dumps(PLAN))
+        trace = "expect text \"Which unit?\"\n"
+        for unit, touched, end in (("a1", "", "NEXT UNIT"), ("b2", "tap 50% 50%\n", "END"), ("c3", "", "END")):
+            trace += f"type \"{unit}\"\ntap \"enter\"\n{touched}{NEXT.format(end)}"
+        played = self.start(trace, "--plan", plan, "--run", "--stay")
+        says = played.communicate()[1]
+        self.assertEqual((3, ""), (played.returncode, says))
+        self.assertEqual([("a1", "finished", "PASS"), ("b2", "finished", "FAIL"), ("c3", "finished", "PASS")],
+                         self.ask("select unit, state, verdict from runs r join verdicts on run = r.id order by r.number"))
+
+    def test_a_locked_database_holds_up_no_screen(self):
+        played = self.start(PASS + """expect text "Shell: PASS, saving..."
+expect text "Not saved" within 5000
+wait 800
+tap "LATER"
+tap "Shell: PASS, not saved"
+""" + PASS + "expect text \"Shell: PASS\"\n", "--serial", "a1", "--test", "shell", "--shell", SHELL.format(self.folder))
+        self.await_folder("first", played)
+        store = sqlite3.connect(self.database)
+        store.execute("begin immediate")
+        (self.folder / "locked").touch()
+        self.await_folder("second", played)
+        store.close()
+        (self.folder / "released").touch()
+        says = played.communicate()[1]
+        self.assertEqual((0, 1), (played.returncode, says.count("\n")), says)
+        self.assertEqual([("PASS", 1), ("PASS", 2)], self.ask("select verdict, attempt from verdicts order by number"))
+
+
+if __name__ == "__main__":
+    unittest.main(argv=sys.argv[:1])

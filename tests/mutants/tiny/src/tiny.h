@@ -1,0 +1,4 @@
+#pragma once
+
+bool isNegative(int number);
+int countBits(unsigned bits);
