@@ -118,6 +118,7 @@ TEST_F(StaticTextTest, InitStartsOver) {
   EXPECT_EQ(viewer.isActive(), 0);
   EXPECT_EQ(viewer.top_index, 0);
   EXPECT_EQ(viewer.w_count, 2) << "no longer that of a clock";
+  EXPECT_EQ(Viewer({0, 0, 63, 9, 0}, textRecord("", 7, 1, 1)).w_count, 108) << "of one pixel";
   EXPECT_EQ(viewer.rows(0), "|");
   viewer.setActive(1);
   press(viewer, {5, 5});
