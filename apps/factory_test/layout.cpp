@@ -10,6 +10,8 @@
 #include <string>
 #include <string_view>
 
+#include "utf8.h"
+
 #include "language/language.h"
 #include "text_fit.h"
 
@@ -58,22 +60,6 @@ int groupHeight(ScreenSize screen) {
 }
 
 SKIA_Rect contentArea() { return layOutPage(screenSize()).content; }
-
-namespace {
-
-// So much of the text as ends with a whole character, at most `most` bytes.
-std::size_t wholeBytes(std::string_view words, std::size_t most) {
-  if (words.size() <= most) return words.size();
-  const auto isInside = [&](std::size_t at) {
-    constexpr unsigned kKind = 0xC0;
-    constexpr unsigned kFollows = 0x80;
-    return (static_cast<unsigned char>(words[at]) & kKind) == kFollows;
-  };
-  while (most > 0 && isInside(most)) --most;
-  return most;
-}
-
-}  // namespace
 
 SKIA_Text textOf(const char* words, uint32_t color, int align, int size) {
   SKIA_Text text = {};

@@ -1,6 +1,7 @@
 // The example application: a factory test that shows the toolkit's widgets at work.
 #include <brimol/host.h>
 
+#include <csignal>
 #include <cstdio>
 #include <cstdlib>
 #include <span>
@@ -35,10 +36,12 @@ int printPlan(const factory_test::Options& options) {
 }  // namespace
 
 int main(int count, char** arguments) {
+  // What goes beyond a limit for files fails as on a full disk, instead of ending the program.
+  std::signal(SIGXFSZ, SIG_IGN);
   std::string error;
   const std::span<const char* const> all(arguments, static_cast<std::size_t>(count));
   const auto words = all.subspan(all.empty() ? 0 : 1);
-  if (const auto done = factory_test::runRecordsCommand(words)) return *done;
+  if (const auto done = factory_test::runRecordsCommand(words)) return static_cast<int>(*done);
   const auto options = factory_test::parseOptions(words, error);
   if (!options) {
     factory_test::complain(error);

@@ -57,7 +57,9 @@ constexpr auto kOptions = std::to_array<OptionRow>({
     {"--plan", "FILE.json", "test what this plan says, see docs/plans.md",
      [](Options& options, const char* value) { options.plan = value; }},
     {"--print-plan", nullptr, "print the plan with every field, and end",
-     [](Options& options, const char*) { options.action = Options::Action::PrintPlan; }},
+     [](Options& options, const char*) {
+       if (options.action == Options::Action::Run) options.action = Options::Action::PrintPlan;
+     }},
     {"--run", nullptr, "perform the plan from first to last, without the menu",
      [](Options& options, const char*) { options.run = true; }},
     {"--simulate", "LIST",
@@ -96,22 +98,19 @@ std::span<const BrimolDevice> devices() {
   return {first, static_cast<std::size_t>(count)};
 }
 
-// What is left behind one option and its value; nothing, with `error`, where it is wrong.
-std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::string& error) {
+// Takes one option and its value from the front. What is wrong with them; empty: nothing.
+std::string takeOne(Arguments& arguments, Options& options) {
   const std::string_view given = arguments.front();
   const auto equals = given.starts_with("--") ? given.find('=') : std::string_view::npos;
   const bool holdsValue = equals != std::string_view::npos;
   const std::string name(given == "-h" ? "--help" : given.substr(0, equals));
   arguments = arguments.subspan(1);
   const auto* const row = std::ranges::find(kOptions, name, &OptionRow::name);
-  if (row == kOptions.end()) {
-    error = "unknown option '" + name + "', see --help";
-    return {};
-  }
+  if (row == kOptions.end()) return "unknown option '" + name + "', see --help";
   if (row->value == nullptr) {
-    if (holdsValue) error = name + " takes no value";
+    if (holdsValue) return name + " takes no value";
     row->apply(options, nullptr);
-    return holdsValue ? std::optional<Arguments>() : arguments;
+    return "";
   }
   const char* value = "";
   if (holdsValue) {
@@ -120,12 +119,9 @@ std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::st
     value = arguments.front();
     arguments = arguments.subspan(1);
   }
-  if (*value == '\0') {
-    error = name + " needs a value: " + row->value;
-    return {};
-  }
+  if (*value == '\0') return name + " needs a value: " + row->value;
   row->apply(options, value);
-  return arguments;
+  return "";
 }
 
 // What two options say that must not name one file, as one of the two is written; empty: they do
@@ -188,42 +184,45 @@ std::string sizeOf(const BrimolDevice& device) {
          std::to_string(std::lround(device.density)) + " dots per inch, ";
 }
 
-}  // namespace
-
-std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
-  Options options;
-  while (!arguments.empty()) {
-    const auto rest = parseOne(arguments, options, error);
-    if (!rest) return {};
-    arguments = *rest;
-  }
-  error = sameFiles(options);
+// What is wrong with options that are right one by one; empty: nothing.
+std::string wrongTogether(const Options& options) {
+  std::string error = sameFiles(options);
   if (error.empty()) error = wrongRecords(options);
-  if (!error.empty()) return {};
+  if (!error.empty()) return error;
   if (!options.device.empty() && brimol_device_named(options.device.c_str()) == nullptr) {
-    error = wrongDevice(options.device);
-    return {};
+    return wrongDevice(options.device);
   }
   const bool isMonkeys = !options.events.empty() || !options.monkeyTrace.empty();
   if (options.monkey.empty()
           ? isMonkeys
           : !isNumber(options.monkey) || (!options.events.empty() && !isNumber(options.events))) {
-    error = wrongMonkey(options);
-    return {};
+    return wrongMonkey(options);
   }
   if (!options.language.empty() && std::ranges::count(languages(), options.language) == 0) {
-    error = wrongLanguage(options.language);
-    return {};
+    return wrongLanguage(options.language);
   }
   if (options.run && !options.test.empty()) {
-    error = "--run performs the plan, --test one test: not both";
-    return {};
+    return "--run performs the plan, --test one test: not both";
   }
-  if (!options.test.empty() && placeOf(options.test) == testEntries().size()) {
-    error = wrongTest(options.test);
-    return {};
+  const bool isUnknown = !options.test.empty() && placeOf(options.test) == testEntries().size();
+  return isUnknown ? wrongTest(options.test) : "";
+}
+
+}  // namespace
+
+std::optional<Options> parseOptions(Arguments arguments, std::string& error) {
+  using Action = Options::Action;
+  Options options;
+  std::string first;  // that was wrong
+  while (!arguments.empty()) {
+    const std::string wrong = takeOne(arguments, options);
+    if (first.empty()) first = wrong;
   }
-  return options;
+  if (options.action == Action::Help || options.action == Action::Version) return options;
+  if (first.empty()) first = wrongTogether(options);
+  if (first.empty()) return options;
+  error = first;
+  return {};
 }
 
 std::string usage() {

@@ -37,7 +37,8 @@ struct Options {
 
 using Arguments = std::span<const char* const>;
 
-/// The options, or nothing for a wrong command line; `error` then says in one line what is wrong.
+/// The options, or nothing for a wrong command line; `error` then says in one line what is wrong
+/// first. --help and --version win over that, wherever they stand.
 /// `arguments` does not hold the program's name.
 std::optional<Options> parseOptions(Arguments arguments, std::string& error);
 

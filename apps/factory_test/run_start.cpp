@@ -7,6 +7,8 @@
 
 #include "plan/plan_json.h"
 #include "records/postgres.h"
+#include "results/junit.h"
+#include "results/whole_file.h"
 #include "version.h"
 #include "world.h"
 
@@ -60,7 +62,11 @@ RunStart runStartOf(const Options& options, const Plan& plan) {
 }
 
 std::string wrongRecords(const Options& options) {
+  constexpr std::size_t kHeadBytes = 4096;
   std::string why;
+  if (!isJunitHead(readHead(options.junit, kHeadBytes))) {
+    return "--junit: " + options.junit + " holds something else than a report, and stays as it is";
+  }
   if (!options.serial.empty() && !isSerial(options.serial, why)) return "--serial: " + why;
   if (options.line.empty()) return "";
   if (options.database.empty()) return "--line needs --database, which always comes first";

@@ -2,6 +2,7 @@
 
 #include "pages/table.h"
 #include "plan/plan_reader.h"
+#include "records/run.h"
 
 namespace factory_test {
 
@@ -23,7 +24,7 @@ std::optional<Task> chooseTask(const Options& options, std::string& error) {
   if (!plan) return {};
   auto simulation = Simulation::parse(options.simulate, *plan, error);
   if (!simulation) return {};
-  if (!simulation->isEmpty()) plan->name += " (rehearsal)";
+  if (!simulation->isEmpty()) plan->name += kRehearsal;
   return Task{*std::move(plan), *std::move(simulation), options.run};
 }
 

@@ -20,11 +20,12 @@ set(CMAKE_FIND_ROOT_PATH_MODE_INCLUDE ONLY)
 set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
 set(CMAKE_EXE_LINKER_FLAGS_INIT "-fuse-ld=lld")
 set(CMAKE_SHARED_LINKER_FLAGS_INIT "-fuse-ld=lld")
+# The libraries of the folder, not those of this machine.
+string(CONCAT libraries "${root}/lib/${BRIMOL_TRIPLE}:${root}/usr/lib/${BRIMOL_TRIPLE}:"
+                        "${root}/usr/lib/${BRIMOL_TRIPLE}/android:${root}/usr/lib/p7zip")
 if(BRIMOL_EMULATOR)
-  set(CMAKE_CROSSCOMPILING_EMULATOR ${BRIMOL_EMULATOR} -L "${root}")
+  # By their own names: a 32-bit loader asks whether a folder exists by a call that -L does not change.
+  set(CMAKE_CROSSCOMPILING_EMULATOR ${BRIMOL_EMULATOR} -L "${root}" -E "LD_LIBRARY_PATH=${libraries}")
 else()
-  # The libraries of the folder, not those of this machine.
-  string(CONCAT libraries "${root}/lib/${BRIMOL_TRIPLE}:${root}/usr/lib/${BRIMOL_TRIPLE}:"
-                          "${root}/usr/lib/${BRIMOL_TRIPLE}/android:${root}/usr/lib/p7zip")
   set(CMAKE_CROSSCOMPILING_EMULATOR "${root}${BRIMOL_LOADER}" --library-path "${libraries}")
 endif()

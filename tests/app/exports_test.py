@@ -8,6 +8,7 @@ import csv
 import io
 import json
 import pathlib
+import resource
 import subprocess
 import sys
 import tempfile
@@ -67,7 +68,9 @@ class ExportsTest(unittest.TestCase):
         results = self.folder / "results.json"
         subprocess.run([FACTORY_TEST, "--headless", "--results", results, "--shot", self.folder / "menu.png"],
                        check=True)
-        self.validate("results", json.loads(results.read_text()))
+        written = json.loads(results.read_text())
+        self.validate("results", written)
+        self.assertEqual(("Default", 64), (written["plan"]["name"], len(written["plan"]["hash"])))
         run = json.loads(self.export("export", "--json"))["runs"][0]
         for result in run["results"]:
             del result["id"]
@@ -80,6 +83,7 @@ class ExportsTest(unittest.TestCase):
         text = file.read_text()
         self.assertEqual(UNITS, text.count("<testsuite "))
         self.assertIn("worst distance", text)
+        self.assertEqual(UNITS, text.count('<property name="plan_hash" value="h3"/>'))
 
     def test_csv_has_a_line_for_each_value(self):
         rows = list(csv.DictReader(io.StringIO(self.export("export", "--csv"), newline=""), strict=True))
@@ -121,6 +125,36 @@ class ExportsTest(unittest.TestCase):
         self.assertNotIn("hits", page)
         self.assertIn("There are none.", self.export("report", "--value", "unknown"))
         self.assertIn("none yet", self.export("report", "--since", "2030-01-01"))
+
+    def test_full_disks_lose_nothing_that_was_there(self):
+        old = self.folder / "old.txt"
+        old.write_text("{}" + " " * 9000)
+        results = self.folder / "old.json"
+        document = json.loads(self.export("export", "--json"))["runs"][0]
+        for result in document["results"]:
+            del result["id"]
+        results.write_text(json.dumps({"version": 2, "results": document["results"]}))
+        verdicts = self.export("export", "--csv")
+        screen = ("--headless", "--shot", self.folder / "full.png")
+        with open("/dev/full", "w", encoding="ascii") as full:
+            for most, arguments, where, says in [
+                    (1 << 20, ["export", "--json", "--database", self.store], full, "stdout cannot be written"),
+                    (1 << 20, ["report", "--database", self.store, "--output", "/dev/full"], None, "not a regular file"),
+                    (33000, ["export", "--json", "--database", self.store, "--output", old], None,
+                     f"{old}: cannot be written: File too large"),
+                    (512, [*screen, "--results", results], None, f"{results}: cannot be written: File too large"),
+                    (4096, [*screen, "--serial", "x", "--database", self.store], None,
+                     f"{self.store}: cannot be read or written: File too large"),
+            ]:
+                with self.subTest(arguments):
+                    before = old.read_bytes(), results.read_bytes()
+                    out = subprocess.run(
+                        [FACTORY_TEST, *arguments], check=False, stdout=where, stderr=subprocess.PIPE, text=True,
+                        preexec_fn=lambda: resource.setrlimit(resource.RLIMIT_FSIZE, (most, most)))
+                    self.assertEqual((1, 1), (out.returncode, out.stderr.count("\n")), out.stderr)
+                    self.assertIn(says, out.stderr)
+                    self.assertEqual(before, (old.read_bytes(), results.read_bytes()))
+        self.assertEqual(verdicts, self.export("export", "--csv"))
 
     def test_wrong_use_and_what_cannot_be_read(self):
         store = ("--database", str(self.store))

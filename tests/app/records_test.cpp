@@ -130,7 +130,8 @@ TEST_F(Records, KnowARunThatADeadProgramLeft) {
   });
   ASSERT_TRUE(WIFSIGNALED(end));
   EXPECT_THAT(states(), ElementsAre("running", "running"));
-  const auto next = open(startOf("A3"));
+  fs::create_symlink(file, folder / "link.db");
+  const auto next = ResultBook::open({.database = folder / "link.db"}, startOf("A3"), error);
   ASSERT_TRUE(next) << error;
   EXPECT_THAT(states(), testing::UnorderedElementsAre("running", "aborted", "running"));
   const auto resumed = open(startOf("A2"));
@@ -166,8 +167,9 @@ TEST_F(Records, OfAnOlderVersionAreMigratedWithABackup) {
   std::ifstream dump(RECORDS_V1);
   const std::string sql((std::istreambuf_iterator<char>(dump)), {});
   Sqlite(file, Sqlite::Mode::Write).runAll(sql.c_str());
-  fs::create_directory(file.native() + ".v1.bak");  // in the way
-  ASSERT_TRUE(open(startOf("C1"))) << error;
+  fs::create_symlink("station.db.v1.bak", file.native() + ".v1.bak");  // in the way, and a loop
+  fs::create_symlink(file, folder / "link.db");
+  ASSERT_TRUE(ResultBook::open({.database = folder / "link.db"}, startOf("C1"), error)) << error;
   for (const auto& [path, version] : {std::pair(file, 3), {file.native() + ".v1.bak.2", 1}}) {
     Sqlite store(path, Sqlite::Mode::Read);
     EXPECT_EQ(store.number("pragma user_version"), version);
@@ -315,12 +317,15 @@ TEST_F(Records, TellYieldFailsAndValues) {
   };
   runs[0].verdicts[0].result.values[0].value = 9.5;
   runs[5].start.started += std::chrono::days(1);
+  runs.push_back(runOf("rehearsed", RunState::Finished, {kKeys, kTouch}));
+  runs.back().start.planName += kRehearsal;
   const Statistics all = statisticsOf(runs);
   EXPECT_EQ(all.total.units, 5);
   EXPECT_EQ(all.total.passed, 3);
   EXPECT_EQ(all.total.passedAtFirst, 1);
   EXPECT_EQ(all.days.size(), 2U);
   EXPECT_EQ(all.aborted, 2);
+  EXPECT_EQ(all.rehearsals, 1);
   ASSERT_EQ(all.tests.size(), 2U);
   EXPECT_EQ(all.tests[0].test, "touch");
   EXPECT_EQ(all.tests[0].fails, 3);

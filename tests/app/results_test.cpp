@@ -153,6 +153,18 @@ TEST_F(Results, GoOnlyWhereTheyCanBeKept) {
   EXPECT_TRUE(ResultBook::open("", error)->record(kColours, error)) << "in memory";
 }
 
+TEST_F(Results, TakeThePlaceOfTheFileThatALinkLeadsTo) {
+  constexpr auto kMode = fs::perms::owner_all | fs::perms::others_write;
+  fs::create_symlink("far", file);  // which is not there yet
+  auto book = ResultBook::open(file, error);
+  ASSERT_TRUE(book) << error;
+  fs::permissions(folder / "far", kMode);
+  EXPECT_TRUE(book->record(kColours, error)) << error;
+  EXPECT_TRUE(fs::is_symlink(file));
+  EXPECT_EQ(fs::status(folder / "far").permissions(), kMode);
+  EXPECT_TRUE(fs::exists(folder / "far.lock"));
+}
+
 TEST_F(Results, SurviveAFullDiskBehindALink) {
   fs::create_symlink(folder / "far", file);
   std::ofstream(folder / "far") << kDocumented;
@@ -189,7 +201,8 @@ TEST_F(Results, MakeAWellFormedReport) {
       results.push_back({before + std::string(1, static_cast<char>(byte))});
     }
   }
-  const JunitSuite suite = {.planned = {"later", "a.b", results[1].test}, .results = results};
+  const JunitSuite suite = {.run = {.tests = {"later", "a.b", results[1].test}},
+                            .results = results};
   const std::string xml = junitXml({&suite, 1});
   for (
       const char* const part :
@@ -201,6 +214,11 @@ TEST_F(Results, MakeAWellFormedReport) {
        R"(name="later" time="0.000">
       <skipped message="not run"/>)"}) {
     EXPECT_NE(xml.find(part), std::string::npos) << part;
+  }
+  EXPECT_TRUE(isJunitHead(xml) && isJunitHead("") &&
+              isJunitHead("\xef\xbb\xbf<!-- a --> <testsuite>"));
+  for (const char* const other : {"text", "<html>", "<testsuites", "<?xml <testsuites>", "<!--"}) {
+    EXPECT_EQ(isJunitHead(other), std::string_view(other) == "<testsuites") << other;
   }
   auto* const parser = XML_ParserCreate(nullptr);
   EXPECT_EQ(XML_Parse(parser, xml.data(), static_cast<int>(xml.size()), 1), XML_STATUS_OK);

@@ -38,23 +38,28 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
     std::vector<const char*> arguments;
     const char* word;
   };
-  for (const auto& [arguments, word] :
-       std::vector<WrongLine>{{{"--frobnicate"}, "--frobnicate"},
-                              {{"--shot"}, "--shot needs"},
-                              {{"--results", ""}, "--results needs"},
-                              {{"--device", "wvga"}, "wvga-4.0"},
-                              {{"--test", "colour"}, "colours"},
-                              {{"file"}, "'file'"},
-                              {{"--results", "a", "--junit", "a"}, "same file"},
-                              {{"--results=a", "--junit", "./a"}, "same file"},
-                              {{"--results=a", "--database", "a"}, "same file"},
-                              {{"--line", "postgresql://a/b"}, "--line needs --database"},
-                              {{"--line", "a", "--database", "b"}, "--line needs an address"},
-                              {{"--serial", "A 1"}, "without spaces"},
-                              {{"--headless=yes"}, "takes no value"}}) {
+  for (const auto& [arguments, word] : std::vector<WrongLine>{
+           {{"--frobnicate"}, "--frobnicate"},
+           {{"--shot"}, "--shot needs"},
+           {{"--results", ""}, "--results needs"},
+           {{"--device", "wvga"}, "wvga-4.0"},
+           {{"--test", "colour"}, "colours"},
+           {{"file"}, "'file'"},
+           {{"--results", "a", "--junit", "a"}, "same file"},
+           {{"--results=a", "--junit", "./a"}, "same file"},
+           {{"--results=a", "--database", "a"}, "same file"},
+           {{"--line", "postgresql://a/b"}, "--line needs --database"},
+           {{"--line", "a", "--database", "b"}, "--line needs an address"},
+           {{"--line", "postgresql://a/%zz", "--database", "b"}, "is no address"},
+           {{"--junit", results.c_str()}, "something else than a report"},
+           {{"--serial", "A 1"}, "without spaces"},
+           {{"--headless=yes"}, "takes no value"}}) {
     std::string error;
     EXPECT_FALSE(parseOptions(arguments, error)) << word;
     EXPECT_NE(error.find(word), std::string::npos) << error;
+    auto asking = arguments;
+    asking.insert(asking.begin(), "--help");
+    EXPECT_TRUE(parseOptions(asking, error)) << word;
   }
 }
 

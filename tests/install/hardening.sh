@@ -1,5 +1,5 @@
-# The shared libraries are linked so that nothing of them is both writable and executable, and the
-# toolkit's is compiled with the checks that its build promises.
+# The shared libraries are linked so that nothing of them is both writable and executable, and compiled with
+# the checks that their build promises.
 . "$SOURCE/tests/install/common.sh"
 
 for library in "$staged/$LIBRARIES"/libbrimol*.so; do
@@ -11,16 +11,17 @@ for library in "$staged/$LIBRARIES"/libbrimol*.so; do
 done
 
 # Marks of jumps are looked for in the code: with Debian's start files no library tells of them itself.
-library=$staged/$LIBRARIES/libbrimol3_widget.so
-hardening-check --nopie --nocfprotection "$library" || fail "A check is missing."
-if [[ $(uname -m) == x86_64 ]]; then
-  grep -q endbr64 <<<"$(objdump --disassemble --no-show-raw-insn "$library")" || fail "Jumps have no marks."
-fi
+for library in "$staged/$LIBRARIES"/libbrimol{3_widget,_pc}.so; do
+  hardening-check --nopie --nocfprotection "$library" || fail "A check is missing."
+  if [[ $(uname -m) == x86_64 ]]; then
+    grep -q endbr64 <<<"$(objdump --disassemble --no-show-raw-insn "$library")" || fail "Jumps have no marks."
+  fi
+done
 
 # blhc reads the commands of a Debian package's build.
 {
   echo "dpkg-buildpackage: info: source package brimol3-widget"
-  ninja -C "$BUILD" -t commands brimol3_widget | grep -E '/src/|libbrimol3_widget'
+  ninja -C "$BUILD" -t commands brimol3_widget brimol_pc | grep -E '/src/|/platform/pc/|libbrimol'
 } >"$WORK/commands"
 blhc --bindnow --ignore-flag=-g --arch="$(dpkg --print-architecture)" "$WORK/commands" ||
   fail "The commands above lack a flag."

@@ -19,6 +19,7 @@ SCENARIOS = {
     "walks while the layer is made wider": ["WALKERS=1", "WALKS=2", "RENEW"],
     "two handlers delete each other's widgets": ["WALKERS=2", "WALKS=2", "CIRCLE"],
     "three handlers delete in a circle": ["WALKERS=3", "WALKS=1", "CIRCLE"],
+    "a widget comes where one was that deleted itself": ["WALKERS=2", "WALKS=1", "REUSE"],
 }
 
 MISTAKES = {
@@ -33,6 +34,8 @@ MISTAKES = {
     "PINNED_BLOCKS_FREED": "walks while the layer is made wider",
     "PIN_WITHOUT_COMPARING": "walks while the layer is made wider",
     "CIRCLES_WAIT": "three handlers delete in a circle",
+    "NOT_FORGOTTEN": "a widget comes where one was that deleted itself",
+    "FORGOTTEN_LATE": "a widget comes where one was that deleted itself",
 }
 
 

@@ -20,12 +20,13 @@
 #define APPENDER (WALKERS + 1)
 #define WIDGETS (WALKERS + 1) /* that of the highest number stays */
 #define BLOCKS 3
-#define CAPACITY WIDGETS
+#define CAPACITY (WIDGETS + 1) /* one comes later */
 #define NOBODY 99
 
 /* widgets */
 bool freed[WIDGETS + 1];
 bool claimed[WIDGETS + 1]; /* a handler has begun to delete it */
+bool answered;             /* the widget that got the address of another has come and gone */
 
 /* blocks of a layer: places that are filled from the front */
 typedef Block {
@@ -168,6 +169,26 @@ inline clearPlaces(w) {
   od
 }
 
+/* LayerWalk::forget */
+inline forget(w) {
+#ifndef MISTAKE_NOT_FORGOTTEN
+  r = 0;
+  do
+  :: r < WALKERS ->
+     atomic {
+       if
+       :: record[r].calling == w -> record[r].calling = 0
+       :: else
+       fi
+     };
+     r++
+  :: else -> break
+  od
+#else
+  skip
+#endif
+}
+
 /* Layers::leave and the destructor's end */
 inline deleteWidget(me, w) {
 #ifdef MISTAKE_WAIT_BEFORE_CLEARING
@@ -181,7 +202,13 @@ inline deleteWidget(me, w) {
   waitUntilNotCalled(me, w);
 #endif
 #endif
+#ifdef MISTAKE_FORGOTTEN_LATE
+  freed[w] = true;
+  forget(w)
+#else
+  forget(w);
   freed[w] = true
+#endif
 }
 
 /* Layer::renew and freeOlderBlocks, with the lock held: a new block takes the widgets that are left over */
@@ -223,9 +250,23 @@ inline renew() {
   od
 }
 
-/* What a handler does: in the circle, that of each thread deletes the next thread's widget. */
+/* What a handler does. In the circle, that of each thread deletes the next thread's widget. Where an address
+ * is used again, the first widget's deletes its own one and waits until another has come there and gone. */
 inline handler(me, w) {
   assert(!freed[w]);
+#ifdef REUSE
+  victim = 0;
+  atomic {
+    if
+    :: w == 1 && !claimed[1] -> claimed[1] = true; victim = 1
+    :: else
+    fi
+  };
+  if
+  :: victim == 1 -> deleteWidget(me, 1); answered
+  :: else -> assert(!freed[w])
+  fi
+#else
 #ifdef CIRCLE
   if
   :: w == me + 1 ->
@@ -245,6 +286,7 @@ inline handler(me, w) {
 #else
   skip; /* it runs for a while */
   assert(!freed[w])
+#endif
 #endif
 }
 
@@ -322,6 +364,20 @@ proctype remover() {
   od
 }
 
+/* A new widget gets the address of the first one as soon as that is free. */
+proctype heir() {
+  byte r, i, b, at, seenTurn, seenThread;
+  bool circle;
+  freed[1];
+  freed[1] = false;
+  acquire(layerLock);
+  block[current].place[block[current].used] = 1;
+  block[current].used++;
+  release(layerLock);
+  deleteWidget(REMOVER, 1);
+  answered = true
+}
+
 /* Makes the layer wider, twice. */
 proctype appender() {
   byte r, i, b, before, pins, times;
@@ -344,10 +400,14 @@ init {
     :: n == WALKERS -> break
     :: else -> run walker(n); n++
     od;
+#ifdef REUSE
+    run heir()
+#else
 #ifndef CIRCLE
     run remover();
 #ifdef RENEW
     run appender()
+#endif
 #endif
 #endif
   }

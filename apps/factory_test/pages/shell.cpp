@@ -12,6 +12,7 @@
 #include "language/language.h"
 #include "page_test.h"
 #include "pages/table.h"
+#include "utf8.h"
 
 namespace factory_test {
 
@@ -74,18 +75,6 @@ class ShellTest : public LookTest {
     if (pending.empty()) return;
     shell->addShell(pending.c_str());
     pending.clear();
-  }
-
-  // Of UTF-8: all bytes of a character but the first.
-  static bool isInsideCharacter(char byte) {
-    constexpr unsigned int kMask = 0xC0;
-    constexpr unsigned int kFollowing = 0x80;
-    return (static_cast<unsigned char>(byte) & kMask) == kFollowing;
-  }
-
-  static bool isControl(char byte) {
-    constexpr char kDelete = 0x7F;
-    return (byte >= 0 && byte < ' ') || byte == kDelete;
   }
 
   Current<ShellTest> current{this};

@@ -8,6 +8,7 @@
 
 #include "plan/plan_json.h"
 #include "results/whole_file.h"
+#include "utf8.h"
 
 namespace factory_test {
 
@@ -65,11 +66,7 @@ bool readCount(const JsonNode& node, int most, int& count, const Reading& readin
 }
 
 std::size_t letters(std::string_view text) {
-  constexpr unsigned char kFollowing =
-      0x80;  // and the mask's upper two bits: a letter's later byte
-  constexpr unsigned char kMask = 0xC0;
-  return static_cast<std::size_t>(std::ranges::count_if(
-      text, [](char each) { return (static_cast<unsigned char>(each) & kMask) != kFollowing; }));
+  return text.size() - static_cast<std::size_t>(std::ranges::count_if(text, isInsideCharacter));
 }
 
 struct TextRange {
@@ -77,12 +74,6 @@ struct TextRange {
   std::size_t most;
   bool mayHaveLines;
 };
-
-bool isControl(char each) {
-  constexpr unsigned char kBlank = 0x20;
-  constexpr unsigned char kDelete = 0x7F;
-  return static_cast<unsigned char>(each) < kBlank || static_cast<unsigned char>(each) == kDelete;
-}
 
 bool readText(const JsonNode& node, TextRange range, std::string& text, const Reading& reading) {
   const bool isClean = std::ranges::none_of(node.text, [range](char each) {

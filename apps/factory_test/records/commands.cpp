@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <array>
 #include <cstdio>
-#include <cstdlib>
 #include <string_view>
 #include <utility>
 
@@ -19,11 +18,9 @@ namespace factory_test {
 
 namespace {
 
-constexpr int kUsageError = 2;
-
 using Format = std::string (*)(std::span<const RunRecord>);
 
-struct Command {
+struct Request {
   bool isReport = false;
   Format format = nullptr;
   std::string database = {};
@@ -46,47 +43,48 @@ constexpr auto kFormats = std::to_array<FormatRow>({
 
 struct OptionRow {
   std::string_view name;
-  std::string& (*place)(Command& command);
+  std::string& (*place)(Request& request);
 };
 constexpr auto kOptions = std::to_array<OptionRow>({
-    {"--database", [](Command& command) -> std::string& { return command.database; }},
-    {"--line", [](Command& command) -> std::string& { return command.line; }},
-    {"--output", [](Command& command) -> std::string& { return command.output; }},
-    {"--serial", [](Command& command) -> std::string& { return command.filter.unit; }},
-    {"--since", [](Command& command) -> std::string& { return command.filter.since; }},
-    {"--value", [](Command& command) -> std::string& { return command.value; }},
+    {"--database", [](Request& request) -> std::string& { return request.database; }},
+    {"--line", [](Request& request) -> std::string& { return request.line; }},
+    {"--output", [](Request& request) -> std::string& { return request.output; }},
+    {"--serial", [](Request& request) -> std::string& { return request.filter.unit; }},
+    {"--since", [](Request& request) -> std::string& { return request.filter.since; }},
+    {"--value", [](Request& request) -> std::string& { return request.value; }},
 });
 
 bool isDay(const std::string& text) { return parseUtc(text + "T00:00:00Z").has_value(); }
 
 // What is wrong with the whole; empty: nothing.
-std::string faultOf(const Command& command) {
-  if (command.database.empty() == command.line.empty()) {
+std::string faultOf(const Request& request) {
+  if (request.database.empty() == request.line.empty()) {
     return "needs one of --database FILE and --line postgresql://...";
   }
   for (const char* const its : {"", "-wal", "-shm", ".lock"}) {
-    if (command.output.empty() || command.database.empty()) break;
-    if (isSameFile(command.output, command.database + its)) return "--output names the database";
+    if (request.output.empty() || request.database.empty()) break;
+    if (isSameFile(request.output, placeOfFile(request.database).concat(its)))
+      return "--output names the database";
   }
-  if (!command.isReport && command.format == nullptr) {
+  if (!request.isReport && request.format == nullptr) {
     return "needs one of --json, --junit, --csv and --html";
   }
-  if (!command.isReport && !command.value.empty()) return "takes no --value";
-  if (!command.line.empty()) {
-    const std::string wrong = wrongPostgresUrl(command.line);
+  if (!request.isReport && !request.value.empty()) return "takes no --value";
+  if (!request.line.empty()) {
+    const std::string wrong = wrongPostgresUrl(request.line);
     if (!wrong.empty()) return "--line " + wrong;
   }
-  if (command.filter.since.empty() || isDay(command.filter.since)) return "";
+  if (request.filter.since.empty() || isDay(request.filter.since)) return "";
   return "--since needs a day like 2026-11-21";
 }
 
 // Takes "--name value" or "--name=value" at the front of `arguments`. Empty: done.
-std::string takeOption(std::span<const char* const>& arguments, Command& command) {
+std::string takeOption(std::span<const char* const>& arguments, Request& request) {
   const std::string_view whole = arguments.front();
   arguments = arguments.subspan(1);
   const auto* const format = std::ranges::find(kFormats, whole, &FormatRow::name);
-  if (!command.isReport && format != kFormats.end()) {
-    command.format = format->write;
+  if (!request.isReport && format != kFormats.end()) {
+    request.format = format->write;
     return "";
   }
   const std::size_t equals = whole.find('=');
@@ -101,32 +99,32 @@ std::string takeOption(std::span<const char* const>& arguments, Command& command
     arguments = arguments.subspan(1);
   }
   if (value.empty()) return std::string(name) + " needs a value";
-  row->place(command) = std::move(value);
+  row->place(request) = std::move(value);
   return "";
 }
 
 // What is wrong; empty: nothing.
-std::string parse(std::span<const char* const> arguments, Command& command) {
+std::string parse(std::span<const char* const> arguments, Request& request) {
   while (!arguments.empty()) {
-    std::string fault = takeOption(arguments, command);
+    std::string fault = takeOption(arguments, request);
     if (!fault.empty()) return fault;
   }
-  return faultOf(command);
+  return faultOf(request);
 }
 
-std::vector<RunRecord> read(const Command& command) {
-  if (!command.line.empty()) {
-    Postgres server(command.line);
+std::vector<RunRecord> read(const Request& request) {
+  if (!request.line.empty()) {
+    Postgres server(request.line);
     checkLine(server);
-    return readHistory(queryOf(server), command.filter);
+    return readHistory(queryOf(server), request.filter);
   }
-  Sqlite store(command.database, Sqlite::Mode::Read);
-  checkDatabase(store, command.database);
-  return readHistory(queryOf(store), command.filter);
+  Sqlite store(request.database, Sqlite::Mode::Read);
+  checkDatabase(store, request.database);
+  return readHistory(queryOf(store), request.filter);
 }
 
-bool write(const Command& command, const std::string& text, std::string& error) {
-  if (!command.output.empty()) return replaceFile(command.output, text, error);
+bool write(const Request& request, const std::string& text, std::string& error) {
+  if (!request.output.empty()) return replaceFile(request.output, text, error);
   if (std::fwrite(text.data(), 1, text.size(), stdout) == text.size() && std::fflush(stdout) == 0) {
     return true;
   }
@@ -134,12 +132,13 @@ bool write(const Command& command, const std::string& text, std::string& error) 
   return false;
 }
 
-bool perform(const Command& command, std::string& error) {
+bool perform(const Request& request, std::string& error) {
   try {
-    const std::vector<RunRecord> runs = read(command);
-    const std::string text =
-        command.isReport ? reportHtml(statisticsOf(runs), command.value) : command.format(runs);
-    return write(command, text, error);
+    std::vector<RunRecord> runs = read(request);
+    const std::string text = request.isReport
+                                 ? reportHtml(statisticsOf(std::move(runs)), request.value)
+                                 : request.format(runs);
+    return write(request, text, error);
   } catch (const StoreError& failure) {
     error = failure.what();
     return false;
@@ -148,7 +147,7 @@ bool perform(const Command& command, std::string& error) {
 
 }  // namespace
 
-std::optional<int> runRecordsCommand(std::span<const char* const> arguments) {
+std::optional<ExitCode> runRecordsCommand(std::span<const char* const> arguments) {
   if (arguments.empty()) return {};
   const std::string_view word = arguments.front();
   if (word != "export" && word != "report") return {};
@@ -156,17 +155,17 @@ std::optional<int> runRecordsCommand(std::span<const char* const> arguments) {
   const auto isHelp = [](std::string_view each) { return each == "--help" || each == "-h"; };
   if (std::ranges::any_of(rest, isHelp)) {
     std::fputs(recordsUsage().c_str() + 1, stdout);
-    return EXIT_SUCCESS;
+    return ExitCode::Passed;
   }
-  Command command = {.isReport = word == "report"};
-  std::string error = parse(rest, command);
+  Request request = {.isReport = word == "report"};
+  std::string error = parse(rest, request);
   if (!error.empty()) {
     complain(std::string(word) + ": " + error);
-    return kUsageError;
+    return ExitCode::WrongUse;
   }
-  if (perform(command, error)) return EXIT_SUCCESS;
+  if (perform(request, error)) return ExitCode::Passed;
   complain(error);
-  return EXIT_FAILURE;
+  return ExitCode::Trouble;
 }
 
 std::string recordsUsage() {

@@ -1,7 +1,14 @@
 #include "records/database_schema.h"
 
+#include <fcntl.h>
+#include <unistd.h>
+
 #include <array>
+#include <cerrno>
 #include <string>
+#include <system_error>
+
+#include "results/whole_file.h"
 
 namespace factory_test {
 
@@ -126,14 +133,34 @@ void refuseDamaged(Sqlite& store, const fs::path& path) {
   throw StoreError(named(path, "is damaged: put it aside, then begin a new one"));
 }
 
+// An empty file of a name that no other file has, nor gets meanwhile.
+fs::path reserve(const fs::path& wanted) {
+  constexpr mode_t kMode = 0666;  // less what the user's mask takes
+  fs::path copy = wanted;
+  for (int number = 2;; ++number) {
+    const int descriptor = ::open(copy.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kMode);
+    if (descriptor >= 0) {
+      ::close(descriptor);
+      return copy;
+    }
+    if (errno != EEXIST) {
+      throw StoreError(named(copy, "cannot be written: " + std::generic_category().message(errno)));
+    }
+    copy = fs::path(wanted).concat(".").concat(std::to_string(number));
+  }
+}
+
 void backUp(Sqlite& store, const fs::path& path) {
   const std::string version = std::to_string(versionOf(store));
-  const fs::path first = fs::path(path).concat(".v").concat(version).concat(".bak");
-  fs::path copy = first;
-  for (int number = 2; fs::exists(copy); ++number) {
-    copy = fs::path(first).concat(".").concat(std::to_string(number));
+  const fs::path copy = reserve(placeOfFile(path).concat(".v").concat(version).concat(".bak"));
+  try {
+    store.run("vacuum into ?", {copy.native()});
+    if (Sqlite(copy, Sqlite::Mode::Read).number("pragma user_version") != kDatabaseVersion) return;
+  } catch (const StoreError&) {
+    ::unlink(copy.c_str());
+    throw;
   }
-  store.run("vacuum into ?", {copy.native()});
+  ::unlink(copy.c_str());  // another program has brought the database up to date meanwhile
 }
 
 // Another program may have done it since: the version is read again behind its lock.

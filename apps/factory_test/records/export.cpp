@@ -98,7 +98,7 @@ std::string historyJunit(std::span<const RunRecord> runs) {
     const RunStart& start = runs[i].start;
     std::string name = start.unit.empty() ? "unknown unit" : start.unit;
     name.append(" ").append(utcText(start.started)).append(" ").append(stateName(runs[i].state));
-    suites.push_back({std::move(name), start.tests, results[i]});
+    suites.push_back({std::move(name), start, results[i]});
   }
   return junitXml(suites);
 }

@@ -9,6 +9,8 @@ namespace factory_test {
 
 namespace {
 
+constexpr std::size_t kHashDigits = 12;  // enough to tell plans apart
+
 std::string valuesCell(const TestResult& result) {
   std::string cell;
   for (const Measure& each : result.values) {
@@ -31,7 +33,8 @@ void addRun(std::string& body, const RunRecord& run) {
   if (run.ended) body.append(", last verdict ").append(utcText(*run.ended));
   body.append("; station ").append(htmlText(start.station));
   if (!start.operatorName.empty()) body.append(", operator ").append(htmlText(start.operatorName));
-  body.append("; plan ").append(htmlText(start.planName));
+  body.append("; plan ").append(
+      htmlText(start.planName + " " + start.planHash.substr(0, kHashDigits)));
   body.append("; software ").append(htmlText(start.software)).append("</p>\n<table>\n");
   body.append(htmlHead({"Test", "Verdict", "Attempt", "Began", "Seconds", "Values"}));
   for (const auto& [id, result] : run.verdicts) {

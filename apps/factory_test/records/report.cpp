@@ -31,6 +31,7 @@ void addFacts(std::string& body, const Statistics& all) {
   addFact(body, "First-pass yield", percentText(atFirst, units));
   addFact(body, "Runs", std::to_string(all.runs));
   addFact(body, "Runs aborted", std::to_string(all.aborted));
+  if (all.rehearsals > 0) addFact(body, "Rehearsals, left out", std::to_string(all.rehearsals));
   body +=
       "</dl>\n<p class=\"quiet\">A unit is judged by its newest finished run. It passed when each "
       "test of that run ended with PASS, and at first when no run ever gave it a FAIL. A run "

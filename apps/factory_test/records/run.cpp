@@ -4,19 +4,16 @@
 #include <string_view>
 
 #include "language/language.h"
+#include "utf8.h"
 #include "xml/xml_text.h"
 
 namespace factory_test {
 
 namespace {
 
-constexpr std::size_t kMostBytes = 200;
+constexpr std::size_t kMostBytes = 400;  // room for a plan's name in any script
 constexpr std::size_t kMostSerialBytes = 64;
 constexpr std::string_view kReplacement = "\xef\xbf\xbd";  // U+FFFD
-
-bool isContinuation(char byte) { return (static_cast<unsigned char>(byte) & 0xc0U) == 0x80U; }
-
-bool isControl(char letter) { return (letter >= '\0' && letter < ' ') || letter == '\x7f'; }
 
 }  // namespace
 
@@ -33,10 +30,8 @@ std::string storable(const std::string& text) {
   for (const char letter : brimol::xml::validUtf8(text)) {
     clean += isControl(letter) ? kReplacement : std::string_view(&letter, 1);
   }
-  if (clean.size() <= kMostBytes) return clean;
-  std::size_t end = kMostBytes;
-  while (isContinuation(clean[end])) --end;  // no letter is cut in two
-  return clean.substr(0, end);
+  clean.resize(wholeBytes(clean, kMostBytes));
+  return clean;
 }
 
 RunStart storable(RunStart start) {

@@ -4,6 +4,7 @@
 #include <chrono>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "results/test_result.h"
@@ -29,6 +30,10 @@ struct RunStart {
   std::chrono::sys_seconds started = {};
 };
 
+/// What the name of a plan ends with whose failures were rehearsed, so that nobody takes its
+/// results for others.
+inline constexpr std::string_view kRehearsal = " (rehearsal)";
+
 struct VerdictRecord {
   std::string id = {};  // UUID
   TestResult result = {};
@@ -44,7 +49,7 @@ struct RunRecord {
   std::vector<VerdictRecord> verdicts = {};  // all of them, in the order in which they were given
 };
 
-/// `text` in UTF-8 without control characters, which become U+FFFD, cut to 200 bytes at most:
+/// `text` in UTF-8 without control characters, which become U+FFFD, cut to 400 bytes at most:
 /// what every database and every export can hold.
 std::string storable(const std::string& text);
 /// The same for all of its texts.

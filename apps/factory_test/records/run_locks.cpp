@@ -7,6 +7,7 @@
 #include <system_error>
 
 #include "records/sqlite.h"
+#include "results/whole_file.h"
 
 namespace factory_test {
 
@@ -26,7 +27,7 @@ struct flock byteOf(std::int64_t run, short kind) {
 }  // namespace
 
 RunLocks::RunLocks(const std::filesystem::path& database) {
-  const std::filesystem::path file = std::filesystem::path(database).concat(".lock");
+  const std::filesystem::path file = placeOfFile(database).concat(".lock");
   descriptor = ::open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kMode);
   if (descriptor >= 0) return;
   throw StoreError(file.native() +

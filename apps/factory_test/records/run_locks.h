@@ -6,9 +6,10 @@
 
 namespace factory_test {
 
-/// Locks in the file DATABASE.lock, a byte for each run, that the kernel takes from a program when
-/// it ends, however it ends: a run whose byte is free has no program any more. That knows no
-/// process numbers, so none can come back as another program's.
+/// Locks in the file DATABASE.lock, beside the file that a symbolic link leads to, a byte for each
+/// run, that the kernel takes from a program when it ends, however it ends: a run whose byte is
+/// free has no program any more. That knows no process numbers, so none can come back as another
+/// program's.
 class RunLocks {
  public:
   /// Throws StoreError where the file cannot be opened.

@@ -116,8 +116,10 @@ void Yield::add(const Yield& other) {
   passedAtFirst += other.passedAtFirst;
 }
 
-Statistics statisticsOf(std::span<const RunRecord> runs) {
+Statistics statisticsOf(std::vector<RunRecord> runs) {
   Statistics all;
+  all.rehearsals = static_cast<int>(std::erase_if(
+      runs, [](const RunRecord& run) { return run.start.planName.ends_with(kRehearsal); }));
   all.runs = static_cast<int>(runs.size());
   all.aborted = static_cast<int>(std::ranges::count(runs, RunState::Aborted, &RunRecord::state));
   countUnits(runs, all);

@@ -45,6 +45,7 @@ struct ValueSeries {
 struct Statistics {
   int runs = 0;
   int aborted = 0;
+  int rehearsals = 0;  // runs that nothing else here counts
   Yield total = {};
   std::map<std::string, Yield> days = {};  // by "2026-11-21", UTC
   std::map<std::string, Yield> stations = {};
@@ -53,7 +54,7 @@ struct Statistics {
 };
 
 /// `runs`, oldest first.
-Statistics statisticsOf(std::span<const RunRecord> runs);
+Statistics statisticsOf(std::vector<RunRecord> runs);
 
 /// Figures of a series, which has a point at least.
 struct Spread {

@@ -10,6 +10,8 @@
 #include <system_error>
 #include <utility>
 
+#include "results/whole_file.h"
+
 namespace factory_test {
 
 namespace fs = std::filesystem;
@@ -64,9 +66,7 @@ int lock(const fs::path& path, std::string& reason) {
 }  // namespace
 
 std::optional<FileLock> FileLock::take(const fs::path& file, std::string& error) {
-  std::error_code failure;
-  const fs::path target = fs::weakly_canonical(file, failure);
-  const fs::path lockFile = fs::path(failure ? file : target).concat(".lock");
+  const fs::path lockFile = placeOfFile(file).concat(".lock");
   std::string reason;
   const int descriptor = lock(lockFile, reason);
   if (descriptor < 0) {

@@ -4,6 +4,8 @@
 #include <iomanip>
 #include <set>
 #include <sstream>
+#include <utility>
+#include <vector>
 
 #include "results/measure_text.h"
 #include "results/utc_time.h"
@@ -17,19 +19,32 @@ using brimol::xml::escaped;
 
 constexpr int kSecondDecimals = 3;
 
-void addProperty(std::ostream& xml, const std::string& name, const std::string& value) {
-  xml << R"(        <property name=")" << escaped(name) << R"(" value=")" << escaped(value)
-      << "\"/>\n";
+using Property = std::pair<std::string, std::string>;
+
+// Those that have a value, if there are any.
+void addProperties(std::ostream& xml, const std::string& indent, std::vector<Property> properties) {
+  std::erase_if(properties, [](const Property& each) { return each.second.empty(); });
+  if (properties.empty()) return;
+  xml << indent << "<properties>\n";
+  for (const auto& [name, value] : properties) {
+    xml << indent << R"(  <property name=")" << escaped(name) << R"(" value=")" << escaped(value)
+        << "\"/>\n";
+  }
+  xml << indent << "</properties>\n";
 }
 
-void addProperties(std::ostream& xml, const TestResult& result) {
+std::vector<Property> propertiesOf(const RunStart& run) {
+  return {{"plan", run.planName},   {"plan_hash", run.planHash},    {"unit", run.unit},
+          {"station", run.station}, {"operator", run.operatorName}, {"software", run.software}};
+}
+
+std::vector<Property> propertiesOf(const TestResult& result) {
   const auto [width, height] = result.screen;
-  xml << "      <properties>\n";
-  addProperty(xml, "started", utcText(result.started));
-  addProperty(xml, "screen", std::to_string(width) + "x" + std::to_string(height));
-  addProperty(xml, "attempt", std::to_string(result.attempt));
-  for (const Measure& each : result.values) addProperty(xml, each.name, measureText(each));
-  xml << "      </properties>\n";
+  std::vector<Property> all = {{"started", utcText(result.started)},
+                               {"screen", std::to_string(width) + "x" + std::to_string(height)},
+                               {"attempt", std::to_string(result.attempt)}};
+  for (const Measure& each : result.values) all.emplace_back(each.name, measureText(each));
+  return all;
 }
 
 // What a failure says first: the values that are at fault.
@@ -57,7 +72,7 @@ void addCase(std::ostream& xml, const std::string& test, const TestResult* resul
   if (result == nullptr) {
     xml << "      <skipped message=\"not run\"/>\n";
   } else {
-    addProperties(xml, *result);
+    addProperties(xml, "      ", propertiesOf(*result));
     addVerdict(xml, *result);
   }
   xml << "    </testcase>\n";
@@ -65,7 +80,7 @@ void addCase(std::ostream& xml, const std::string& test, const TestResult* resul
 
 // The planned tests, then what was done besides.
 std::vector<std::string> allTests(const JunitSuite& suite) {
-  std::vector<std::string> tests = suite.planned;
+  std::vector<std::string> tests = suite.run.tests;
   std::set<std::string> known(tests.begin(), tests.end());
   for (const TestResult& each : suite.results) {
     if (known.insert(each.test).second) tests.push_back(each.test);
@@ -96,8 +111,9 @@ void addSuite(std::ostream& xml, const JunitSuite& suite) {
   }
   xml << R"(  <testsuite name=")" << escaped(suite.name) << R"(" tests=")" << tests.size()
       << R"(" failures=")" << failures << R"(" errors="0" skipped=")" << skipped << R"(" time=")"
-      << seconds.count() << "\">\n"
-      << cases.str() << "  </testsuite>\n";
+      << seconds.count() << "\">\n";
+  addProperties(xml, "    ", propertiesOf(suite.run));
+  xml << cases.str() << "  </testsuite>\n";
 }
 
 }  // namespace
@@ -109,6 +125,23 @@ std::string junitXml(std::span<const JunitSuite> suites) {
   for (const JunitSuite& suite : suites) addSuite(xml, suite);
   xml << "</testsuites>\n";
   return xml.str();
+}
+
+bool isJunitHead(std::string_view head) {
+  constexpr std::string_view kBlanks = " \t\r\n";
+  constexpr std::string_view kByteOrderMark = "\xef\xbb\xbf";
+  if (head.starts_with(kByteOrderMark)) head.remove_prefix(kByteOrderMark.size());
+  for (;;) {
+    head.remove_prefix(std::min(head.find_first_not_of(kBlanks), head.size()));
+    const std::string_view end = head.starts_with("<?")     ? "?>"
+                                 : head.starts_with("<!--") ? "-->"
+                                                            : "";
+    const std::size_t at = end.empty() ? std::string_view::npos : head.find(end);
+    if (at == std::string_view::npos) break;
+    head.remove_prefix(at + end.size());
+  }
+  const std::string_view root = head.substr(0, head.find_first_of(" \t\r\n/>"));
+  return head.empty() || root == "<testsuites" || root == "<testsuite";
 }
 
 }  // namespace factory_test

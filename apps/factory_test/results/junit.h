@@ -3,23 +3,29 @@
 
 #include <span>
 #include <string>
-#include <vector>
+#include <string_view>
 
+#include "records/run.h"
 #include "results/test_result.h"
 
 namespace factory_test {
 
-/// One suite: the tests of a plan, and what became of them.
+/// One suite: a run of a plan, and what became of its tests.
 struct JunitSuite {
   std::string name = "factory_test";
-  std::vector<std::string> planned = {};  // in the plan's order; may be empty
+  RunStart run = {};
   std::span<const TestResult> results = {};
 };
 
-/// JUnit XML in UTF-8: a case for each planned test, in their order, and one for each other result
-/// behind them. FAIL is a failure, no verdict or none yet is a skipped case. A case's start time,
-/// screen size, attempt and values are its properties. Characters that XML cannot hold become
+/// JUnit XML in UTF-8: a case for each test of the plan, in their order, and one for each other
+/// result behind them. What is known of the run, such as its plan's name and hash, stands in the
+/// suite's properties. FAIL is a failure, no verdict or none yet is a skipped case. A case's start
+/// time, screen size, attempt and values are its properties. Characters that XML cannot hold become
 /// U+FFFD.
 std::string junitXml(std::span<const JunitSuite> suites);
+
+/// Whether a file that begins so is a report like these, whoever wrote it, or blank: one that may
+/// be written over.
+bool isJunitHead(std::string_view head);
 
 }  // namespace factory_test

@@ -90,8 +90,8 @@ bool ResultBook::startUnit(const RunStart& start, std::string& error) {
 
 bool ResultBook::saveFiles(std::string& error) {
   const bool isKept =
-      files.json.empty() || replaceFile(files.json, resultsJson(begun.unit, kept), error);
-  const JunitSuite suite = {.planned = begun.tests, .results = kept};
+      files.json.empty() || replaceFile(files.json, resultsJson(begun, kept), error);
+  const JunitSuite suite = {.run = begun, .results = kept};
   const bool isReported =
       files.junit.empty() || replaceFile(files.junit, junitXml({&suite, 1}), error);
   if (isKept && isReported) unsavedTests.clear();

@@ -37,11 +37,11 @@ struct Keeping {
 /// name.
 class ResultBook {
  public:
-  /// Begins a run, unless the unit is to be told first: with a database as Database::startRun() does, else with what the file at
-  /// `places.json` holds, which must be of the same unit or of none. All files are written at once,
-  /// so that one that cannot be is found before the first test. Nothing is returned for that, for a
-  /// file that another program keeps its results in, and for one that cannot be read; `error` then
-  /// says why, and what is there stays as it is.
+  /// Begins a run, unless the unit is to be told first: with a database as Database::startRun()
+  /// does, else with what the file at `places.json` holds, which must be of the same unit or of
+  /// none. All files are written at once, so that one that cannot be is found before the first
+  /// test. Nothing is returned for that, for a file that another program keeps its results in, and
+  /// for one that cannot be read; `error` then says why, and what is there stays as it is.
   static std::optional<ResultBook> open(const Keeping& places, const RunStart& start,
                                         std::string& error);
   /// A file alone, or none: the results stay in memory.

@@ -171,9 +171,10 @@ std::string jsonText(const ordered_json& root) {
   return root.dump(kIndent, ' ', false, json::error_handler_t::replace) + "\n";
 }
 
-std::string resultsJson(const std::string& unit, std::span<const TestResult> results) {
+std::string resultsJson(const RunStart& run, std::span<const TestResult> results) {
   ordered_json root = {{"version", kVersion}};
-  if (!unit.empty()) root["unit"] = unit;
+  if (!run.unit.empty()) root["unit"] = run.unit;
+  if (!run.planHash.empty()) root["plan"] = {{"name", run.planName}, {"hash", run.planHash}};
   ordered_json& list = root["results"] = ordered_json::array();
   for (const TestResult& result : results) list.push_back(resultEntry(result));
   return jsonText(root);

@@ -3,6 +3,7 @@
 ///     {
 ///       "version": 2,
 ///       "unit": "A1234",
+///       "plan": {"name": "Touch station", "hash": "9f86d081884c7d65..."},
 ///       "results": [
 ///         {
 ///           "test": "display colours",
@@ -20,8 +21,9 @@
 ///
 /// Members may come in any order; unknown ones are passed over. "verdict" is "PASS", "FAIL" or
 /// "none", "started" UTC, a figure 0 to INT_MAX, "attempt" 1 or more. "unit" is the serial number
-/// of what was tested, left out where nobody said one; "least" and "most" are left out where there
-/// is no limit. Version 1, which says no version, has neither units, attempts nor values.
+/// of what was tested, left out where nobody said one; "plan" is the one of the program that wrote
+/// the file last, by its name and its hash, and is not read; "least" and "most" are left out where
+/// there is no limit. Version 1, which says no version, has neither units, attempts nor values.
 #pragma once
 
 #include <optional>
@@ -30,6 +32,7 @@
 #include <string_view>
 #include <vector>
 
+#include "records/run.h"
 #include "results/test_result.h"
 
 namespace factory_test {
@@ -41,7 +44,7 @@ struct ResultFile {
 };
 
 /// The file's text for results that are clamped(). Bytes of a name that are no UTF-8 become U+FFFD.
-std::string resultsJson(const std::string& unit, std::span<const TestResult> results);
+std::string resultsJson(const RunStart& run, std::span<const TestResult> results);
 
 /// What `text` holds. Nothing for any other text; `reason` then says what is wrong.
 std::optional<ResultFile> parseResults(std::string_view text, std::string& reason);

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "clock/turn_clock.h"
+#include "host/memory_watch.h"
 #include "host/session_report.h"
 #include "host/session_settings.h"
 #include "host/world.h"
@@ -112,6 +113,8 @@ class Session {
   std::optional<TraceRunner> runner;
   std::optional<Monkey> monkey;
   std::optional<uint64_t> closedBy;  // when the application is to have ended, after a monkey
+  MemoryWatch memory;                // while the monkey plays
+  uint64_t nextLook = 0;             // at it: so many records have come then
   uint64_t nextTold = 0;             // of the monkey: records,
   uint64_t nextToldMs = 0;           // and time
   World world;

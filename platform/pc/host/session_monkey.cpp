@@ -1,8 +1,5 @@
 // A session that a monkey plays.
-#include <unistd.h>
-
 #include <filesystem>
-#include <fstream>
 #include <iostream>
 
 #include "host/session.h"
@@ -15,16 +12,7 @@ constexpr uint64_t kMostWithoutNews = 5'000;  // records
 constexpr uint64_t kCloseMs = 10'000;
 constexpr uint64_t kToldEach = 1'000'000;  // records
 constexpr uint64_t kToldEachMs = 86'400'000;
-
-// In KiB; 0 where the system does not tell.
-long residentMemory() {
-  constexpr long kKibi = 1024;
-  std::ifstream file("/proc/self/statm");
-  long all = 0;
-  long resident = 0;
-  file >> all >> resident;
-  return resident * (sysconf(_SC_PAGESIZE) / kKibi);
-}
+constexpr uint64_t kLookEach = 10'000;  // records
 
 // How many entries a folder has; 0 where the system has no such folder.
 std::ptrdiff_t entriesOf(const char* folder) {
@@ -48,7 +36,7 @@ void Session::tellOfMonkey() {
   nextTold = (monkey->posted() / kToldEach + 1) * kToldEach;
   nextToldMs = (now() / kToldEachMs + 1) * kToldEachMs;
   std::cerr << "brimol: monkey " << settings.monkey->seed << ": " << monkey->posted()
-            << " events in " << now() << " ms, " << frames << " frames, " << residentMemory()
+            << " events in " << now() << " ms, " << frames << " frames, " << memory.least()
             << " KiB resident, " << entriesOf("/proc/self/task") << " threads, "
             << entriesOf("/proc/self/fd") - 1 << " open files\n";  // without the look itself
 }
@@ -56,6 +44,10 @@ void Session::tellOfMonkey() {
 void Session::followMonkey(uint64_t moment) {
   if (closedBy) endMonkey("the application still runs 10 seconds after it was asked to close");
   monkey->act(moment, lastFrame);
+  if (monkey->posted() >= nextLook) {
+    memory.look();
+    nextLook = monkey->posted() + kLookEach;
+  }
   if (monkey->posted() >= nextTold || moment >= nextToldMs) tellOfMonkey();
   if (monkey->sinceNews() > kMostWithoutNews) {
     endMonkey("nothing new was shown for " + std::to_string(kMostWithoutNews) +
