@@ -16,6 +16,7 @@ import tempfile
 
 STEP = re.compile(r"(\d+) (.+)")
 SHORT_PAUSE = 1000  # ms; what most applications do by themselves takes less
+FEW = 8  # steps of one gesture
 
 
 class Shrinker:
@@ -40,29 +41,42 @@ class Shrinker:
         return ended == self.code
 
     def shrink(self, head, steps):
-        """Shortens pauses where that is well, and leaves out parts, large ones first, until no single step can go."""
-        shorter = [(min(pause, SHORT_PAUSE), words) for pause, words in steps]
-        if shorter != steps and self.fails(head, shorter):
-            steps = shorter
+        """Leaves out parts, large ones first, until no single step and no few in a row can go."""
         size = max(len(steps) // 2, 1)
         while size > 0:
             before = len(steps)
             steps = self.leave_out(head, steps, size)
-            if size > 1 or len(steps) == before:
-                size //= 2
-        return steps
+            # What is gone may have been what a larger part was needed for.
+            size = min(FEW, before // 2) if size == 1 and len(steps) < before else size // 2
+        shorter = [(min(pause, SHORT_PAUSE), words) for pause, words in steps]
+        return shorter if self.fails(head, shorter) else steps
+
+    def shorten_end(self, head, steps):
+        """The head, with less time after the last step if that is well: all runs that do not fail last until then."""
+        short = [re.sub(r"^linger \d+", "linger 500", line) for line in head]
+        return short if short != head and self.fails(short, steps) else head
 
     def leave_out(self, head, steps, size):
         """Goes over the steps once, and leaves out every part of this size without which the failure comes."""
         start = 0
         while start < len(steps):
-            rest = steps[:start] + steps[start + size:]
-            if self.fails(head, rest):
-                steps = rest
-                print(f"{len(steps)} steps", flush=True)
-            else:
+            rest = self.without(head, steps, start, start + size)
+            if rest is None:
                 start += size
+                continue
+            steps = rest
+            print(f"{len(steps)} steps", flush=True)
         return steps
+
+    def without(self, head, steps, start, end):
+        """The steps without a part, if the failure comes: the others at their times, or else earlier."""
+        before, gone, after = steps[:start], steps[start:end], steps[end:]
+        if after:
+            pause = sum(each for each, _ in gone) + after[0][0]
+            later = before + [(pause, after[0][1])] + after[1:]
+            if self.fails(head, later):
+                return later
+        return before + after if self.fails(head, before + after) else None
 
 
 def read(path):
@@ -94,6 +108,7 @@ def main():
     shrinker = Shrinker(wanted.program, wanted.exit, wanted.seconds)
     if not shrinker.fails(head, steps):
         sys.exit(f"shrink_trace.py: {wanted.trace}: the program does not fail under it")
+    head = shrinker.shorten_end(head, steps)
     steps = shrinker.shrink(head, steps)
     wanted.short.write_text("".join(head) + "".join(f"+{pause} {words}\n" for pause, words in steps))
     print(f"{len(steps)} steps after {shrinker.runs} runs: {wanted.short}")

@@ -40,7 +40,7 @@ class MonkeyTest(unittest.TestCase):
     @unittest.skipUnless(PLANTED_DIALOG, "a sanitizer wants to be loaded first")
     def test_a_crash_in_a_dialog_of_the_factory_test_is_found_and_made_short(self):
         settings = f"LD_PRELOAD={PLANTED_DIALOG}", "PLANTED=Not all was tested"
-        self.find_and_shrink("2:20000", "env", *settings, FACTORY_TEST, "--stay")
+        self.find_and_shrink("1:20000", "env", *settings, FACTORY_TEST, "--stay")
 
     def test_what_does_not_fail_is_not_made_short(self):
         trace = self.folder / "quiet.trace"

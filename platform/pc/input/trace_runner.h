@@ -75,6 +75,7 @@ class TraceRunner {
 
   const TraceStep& step() const { return trace.steps[next]; }
   std::optional<uint64_t> startOfStep() const;
+  uint64_t endOfTrace() const { return stepDone.value_or(0) + restMs + trace.lingerMs; }
   bool advance(uint64_t now);
   bool begin(uint64_t now);
   void finishStep(uint64_t now);

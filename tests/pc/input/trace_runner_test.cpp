@@ -103,6 +103,7 @@ INSTANTIATE_TEST_SUITE_P(
             "130:up 0 30 0 230:close "},
         RunCase{"Keys", "key select\n1000 key down 7\n+5 key up 7\nleave running",
                 "100:keydown 327 150:keyup 327 1000:keydown 7 1005:keyup 7 "},
+        RunCase{"Linger", "linger 4000\nkey down 7", "100:keydown 7 4200:close "},
         RunCase{"RawRecords", "5 down 1 3 4\n5 motion 1 5 4 2 0\n6 long 1 5 4\n7 close\n9 end",
                 "5:down 1 3 4 5:motion 1 5 4 2 0 6:long 1 5 4 7:close 10:close "},
         RunCase{"Looks",
