@@ -21,14 +21,15 @@ class Failure(Exception):
 
 
 class Build:
-    def __init__(self, project, folder):
-        self.project, self.folder = project, folder
+    def __init__(self, project, folder, without=()):
+        self.project, self.folder, self.without = project, folder, without
         self.build = folder / 'build' / 'mutants'
         self.commands = self.build / 'compile_commands.json'
         self.sources = folder / 'src'
         self.runs = []
         self.clean = {}  # the library's objects: their bytes' hashes, and copies
         self.kept = self.build / 'clean_objects'
+        self.mark = self.build / 'mutant_in_work'
 
     def copy(self):
         """What is the same stays as it is, and so does what was built from it."""
@@ -56,7 +57,7 @@ class Build:
         """Builds all without a mutant, runs the tests and keeps the library's objects."""
         environment = self.configure()
         self.drop_linked()
-        self.demand(['cmake', '--build', self.build, '--target', 'unit_tests'], environment)
+        self.demand(['cmake', '--build', '--preset', 'mutants'], environment)
         self.find_runs()
         for run in self.runs:
             begin = time.monotonic()
@@ -75,7 +76,11 @@ class Build:
                 self.clean[output] = hash_of(path)
 
     def drop_linked(self):
-        """There may still be a mutant in it, whose object is gone."""
+        """There may still be a mutant in it, whose object is gone; in the objects, if that run was killed."""
+        if self.mark.exists():
+            for path in self.kept.rglob('*.o'):
+                (self.build / path.relative_to(self.kept)).unlink(missing_ok=True)
+            self.mark.unlink()
         for path in list(self.build.rglob('*')):
             if path.is_file() and 'CMakeFiles' not in path.parts and (path.suffix == '.a' or os.access(path, os.X_OK)):
                 path.unlink()
@@ -92,8 +97,8 @@ class Build:
         listed = subprocess.run(['ctest', '--show-only=json-v1'], cwd=self.build, stdout=subprocess.PIPE, check=True)
         found = {}
         for test in json.loads(listed.stdout)['tests']:
-            program = pathlib.Path(test['command'][0])
-            if not program.is_relative_to(self.build):
+            program = pathlib.Path(test.get('command', ['not built'])[0])
+            if not program.is_relative_to(self.build) or program.name in self.without:
                 continue
             words = next((p['value'] for p in test['properties'] if p['name'] == 'ENVIRONMENT'), [])
             found[program, tuple(words)] = {'program': program, 'words': words}
@@ -107,7 +112,7 @@ class Build:
         environment = {**os.environ, 'GTEST_FAIL_FAST': '1', 'GTEST_BRIEF': '1',
                        **dict(word.split('=', 1) for word in run['words'])}
         command = ['prlimit', f'--as={MEMORY}', '--core=0', run['program']]
-        with subprocess.Popen(command, cwd=self.build, env=environment, stdin=subprocess.DEVNULL, stdout=subprocess.PIPE,
+        with subprocess.Popen(command, cwd=run['program'].parent, env=environment, stdin=subprocess.DEVNULL, stdout=subprocess.PIPE,
                               stderr=subprocess.STDOUT, start_new_session=True) as program:
             try:
                 output = program.communicate(timeout=seconds)[0].decode(errors='replace')
@@ -127,6 +132,7 @@ class Build:
         """The mutant's status and what it is due to. `seen`: asks whether an object is another mutant's, too."""
         path = self.folder / point.file
         source, times = path.read_bytes(), path.stat()
+        self.mark.touch()
         path.write_bytes(point.apply(source))
         try:
             if not self.ninja(self.clean):
@@ -142,6 +148,7 @@ class Build:
             os.utime(path, ns=(times.st_atime_ns, times.st_mtime_ns))
             for name in self.clean:
                 shutil.copy2(self.kept / name, self.build / name)
+            self.mark.unlink()
 
     def ninja(self, targets):
         environment = {**os.environ, 'CCACHE_DISABLE': '1'}

@@ -1,9 +1,9 @@
 #!/usr/bin/python3
 # Debian's Python, since python3-clang is installed for that one.
 """Measures how many small faults the unit tests find: each mutant is the library with one operator, constant,
-condition, result or call of src/ changed. A seed chooses them. A mutant is killed if a unit test fails, crashes or
-does not end. One that does not compile, or that compiles to the same as the original or as a mutant before, does not
-count: the next one takes its place.
+condition, result or call of src/ changed; lines of the log are left alone. A seed chooses them. A mutant is killed if
+a unit test fails, crashes or does not end. One that does not compile, or that compiles to the same as the original or
+as a mutant before, does not count: the next one takes its place.
 
 All is built in build/mutants. The results stand in build/mutants/seed_N.jsonl; a run that was interrupted goes on
 from there, until the sources change.
@@ -15,10 +15,12 @@ import itertools
 import json
 import pathlib
 import random
+import signal
 import sys
 import threading
 from concurrent.futures import ThreadPoolExecutor
 
+import mutation_points
 from mutant_build import Build, Failure
 from mutation_points import Point, find_points
 
@@ -59,10 +61,10 @@ class Results:
 class Session:
     """Mutants of one project, tried on several builds at once."""
 
-    def __init__(self, project, jobs):
+    def __init__(self, project, jobs, without):
         self.project = project
         self.folder = project / 'build' / 'mutants'
-        self.builds = [Build(project, self.folder / f'job_{job + 1}') for job in range(jobs)]
+        self.builds = [Build(project, self.folder / f'job_{job + 1}', without) for job in range(jobs)]
         self.builds[0].configure()
         self.digest = digest_of(project / 'src')
         self.points = self.find()
@@ -126,7 +128,8 @@ class Session:
 
 
 def digest_of(folder):
-    whole = hashlib.sha256()
+    """Of the sources and of what looks for points in them."""
+    whole = hashlib.sha256(pathlib.Path(mutation_points.__file__).read_bytes())
     for path in sorted(folder.rglob('*')):
         if path.is_file():
             whole.update(str(path.relative_to(folder)).encode() + b'\0' + path.read_bytes())
@@ -159,7 +162,9 @@ def parse():
     parser.add_argument('--count', type=number_from(1), default=300, help='how many have to count; 300')
     parser.add_argument('--jobs', type=number_from(1), default=1, help='how many are tried at once; 1')
     parser.add_argument('--project', type=pathlib.Path, default=pathlib.Path(__file__).parents[1],
-                        help="the project's folder, with a preset 'mutants' and a target 'unit_tests'")
+                        help="the project's folder, with presets 'mutants' to configure and to build its tests")
+    parser.add_argument('--without', action='append', default=[], metavar='PROGRAM',
+                        help='a test program to leave out, for a quick look; --again asks it')
     what = parser.add_mutually_exclusive_group()
     what.add_argument('--list', action='store_true', help='lists all possible mutants with their numbers')
     what.add_argument('--only', type=number_from(0), metavar='K', help='tries the mutant of this number again')
@@ -184,7 +189,7 @@ def run(wanted):
     if not (project / 'src').is_dir():
         raise Failure(f"{wanted.project}: there is no folder 'src'")
     (project / 'build' / 'mutants').mkdir(parents=True, exist_ok=True)
-    session = Session(project, wanted.jobs)
+    session = Session(project, wanted.jobs, wanted.without)
     if wanted.list:
         for number in range(len(session.points)):
             print(session.describe(number))
@@ -199,6 +204,7 @@ def run(wanted):
 
 
 if __name__ == '__main__':
+    signal.signal(signal.SIGTERM, signal.default_int_handler)
     try:
         run(parse())
     except (Failure, OSError, UnicodeDecodeError) as failure:

@@ -16,6 +16,7 @@ OPERATORS = {
 PREFIXES = {'++': '--', '--': '++', '!': '', '-': '', '~': ''}
 BRANCHES = {CursorKind.IF_STMT, CursorKind.WHILE_STMT, CursorKind.DO_STMT, CursorKind.FOR_STMT}
 BODIES = BRANCHES | {CursorKind.CXX_FOR_RANGE_STMT, CursorKind.CASE_STMT, CursorKind.DEFAULT_STMT}
+LOGS = {'print', '__android_log_print'}  # calls that write a line of the log, and no more
 BINARY = {CursorKind.BINARY_OPERATOR, CursorKind.COMPOUND_ASSIGNMENT_OPERATOR}
 
 
@@ -55,7 +56,7 @@ class FilePoints:
         self.points.add(Point(self.name, begin, end, kind, text))
 
     def visit(self, cursor, parent):
-        if cursor.kind == CursorKind.STATIC_ASSERT:
+        if cursor.kind == CursorKind.STATIC_ASSERT or (cursor.kind == CursorKind.CALL_EXPR and cursor.spelling in LOGS):
             return
         begin, end = extent(cursor)
         if begin < end:
@@ -143,7 +144,7 @@ class FilePoints:
             call = unwrap(child)
             before = self.before(begin)
             stands_alone = parent.kind == CursorKind.COMPOUND_STMT or before.endswith((b')', b':', b'else', b'do'))
-            if call.kind == CursorKind.CALL_EXPR and is_named(call) and \
+            if call.kind == CursorKind.CALL_EXPR and is_wanted(call) and \
                     stands_alone and self.after(end) == b';' and self.source[begin:end].endswith(b')'):
                 self.add(begin, end, 'call', b'\n' * self.source[begin:end].count(b'\n'))
 
@@ -154,9 +155,9 @@ class FilePoints:
         return self.source[end:end + 200].lstrip()[:1]
 
 
-def is_named(call):
-    """Not an assignment or the like, which is a call to the compiler alone."""
-    return call.spelling == 'operator()' or not call.spelling.startswith('operator')
+def is_wanted(call):
+    """No line of the log; not an assignment or the like, which is a call to the compiler alone."""
+    return call.spelling not in LOGS and (call.spelling == 'operator()' or not call.spelling.startswith('operator'))
 
 
 def extent(cursor):

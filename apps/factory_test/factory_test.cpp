@@ -18,7 +18,10 @@
 namespace factory_test {
 
 FactoryTest::FactoryTest(ResultBook& results, const Context& program, const Task& chosen)
-    : book(results), context(program), task(chosen), menu(book) {
+    : book(results),
+      context(program),
+      task(chosen),
+      menu(book, chosen.isOwnPlan ? &chosen.plan : nullptr) {
   book.setPatience(Patience::kTry);
   if (task.isRun) {
     beginRun();
@@ -235,7 +238,7 @@ void FactoryTest::start(std::size_t entry, uint32_t now) {
   const TestEntry& chosen = testEntries()[entry];
   context.log.add(std::string("Test ") + chosen.id);
   running = Running{entry, stepOf(context, chosen.id), chosen.make(context), presentTime(), now};
-  if (!running->step.text.empty()) running->test->instruct(running->step.text);
+  running->test->prepare(running->step);
   running->test->showProgress(progressOf(book));
   running->test->enter();
   MW::isDisplayUpdate(1);

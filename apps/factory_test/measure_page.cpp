@@ -6,11 +6,12 @@
 
 #include <algorithm>
 #include <cmath>
-#include <sstream>
+#include <utility>
 
 #include "language/language.h"
 #include "layout.h"
-#include "results/measure_text.h"
+#include "text_fit.h"
+#include "value_lines.h"
 
 namespace factory_test {
 
@@ -18,24 +19,15 @@ namespace {
 
 constexpr uint32_t kStillMs = 2000;
 constexpr double kStillMm = 2;
-constexpr int kLinePercent = 3;  // of the screen's longer side, from one line to the next
-
-// As measureText(), in the operator's language.
-std::string valueLine(const Measure& measure) {
-  std::string line = std::string(tr(measure.name.c_str())) + ": " + numberText(measure.value);
-  if (!measure.unit.empty()) line += " " + measure.unit;
-  if (measure.least && measure.most) {
-    return line + " (" + numberText(*measure.least) + tr(" to ") + numberText(*measure.most) + ")";
-  }
-  if (measure.least) return line + " (" + tr("at least ") + numberText(*measure.least) + ")";
-  return measure.most ? line + " (" + tr("at most ") + numberText(*measure.most) + ")" : line;
-}
+constexpr uint32_t kCardColor = 0xA8000000 | (kPanelInk.ground & 0x00FFFFFF);
 
 }  // namespace
 
 MeasurePage::MeasurePage(const Context& program, const char* test, const char* title,
                          const char* usualWords)
-    : LookTest(title, usualWords), step(stepOf(program, test)), instructions(usualWords) {}
+    : LookTest(title, usualWords), instructions(usualWords) {
+  planStep = stepOf(program, test);
+}
 
 std::string MeasurePage::question() const {
   return isDone() ? tr("Done. Is it right?") : tr("Not everything was seen.");
@@ -47,7 +39,7 @@ int MeasurePage::wordsAt() const {
 }
 
 Measure MeasurePage::measure(std::string_view name, double value) const {
-  return measured(step.test, name, value);
+  return measured(planStep.test, name, value);
 }
 
 double MeasurePage::millimetres(double pixels) {
@@ -98,55 +90,65 @@ bool MeasurePage::isWhereItWas(const Input& input) const {
   return millimetres(std::hypot(input.x - still->x, input.y - still->y)) <= kStillMm;
 }
 
-std::vector<std::string> MeasurePage::instructionLines() const {
-  std::vector<std::string> words;
-  std::istringstream text(instructions);
-  for (std::string line; std::getline(text, line);) words.push_back(line);
-  words.emplace_back(tr("Hold a finger still, or Back: end."));
-  return words;
+void MeasurePage::prepare(const PlanStep& planned) {
+  if (!planned.text.empty()) instructions = planned.text;
+  LookTest::prepare(planned);
 }
 
-std::vector<std::string> MeasurePage::valueLines() const {
-  std::vector<std::string> words;
-  for (Measure each : values()) {
-    const auto limits = step.limits.find(each.name);
-    if (limits != step.limits.end()) {
-      each.least = limits->second.least;
-      each.most = limits->second.most;
-    }
-    words.push_back(valueLine(each));
+void MeasurePage::showProgress(const RunProgress& sofar) {
+  progress = sofar;
+  LookTest::showProgress(sofar);
+}
+
+// What to do in large letters, then how to end, and the values.
+std::vector<MeasurePage::CardLine> MeasurePage::linesOfCard(int width) const {
+  constexpr int kLargePercent = 115;
+  const int size = textSize(screenSize());
+  const int large = percentOf(size, kLargePercent);
+  std::vector<CardLine> lines;
+  for (std::string& words : wrapped(instructions, large, width)) {
+    lines.push_back({std::move(words), large});
   }
-  return words;
+  const auto addLine = [&](const std::string& words) {
+    lines.push_back({words, fitted(words, size, width, lineHeight(size)).size});
+  };
+  addLine(tr("Hold a finger still, or Back: end."));
+  lines.push_back({"", size / 2});
+  for (const std::string& words : valueLines(values(), planStep)) addLine(words);
+  return lines;
 }
 
-int MeasurePage::drawLines(const std::vector<std::string>& words, SKIA_Rect area) {
+// Half transparent: what it stands on is under test, too.
+void MeasurePage::drawCard() const {
+  constexpr int kMostLetters = 30;
   const ScreenSize screen = screenSize();
-  area.h = percentOf(std::max(screen.width, screen.height), kLinePercent);
-  for (const std::string& each : words) {
-    skia_add_label_c(area,
-                     textOf(each.c_str(), kPageInk.text, SKIA_ALIGN_CENTRE, textSize(screen)));
-    area.y += area.h;
+  const int gap = gapOf(screen);
+  const int width = std::min(screen.width - 4 * gap, kMostLetters * textSize(screen));
+  const std::vector<CardLine> lines = linesOfCard(width - 2 * gap);
+  int height = 3 * gap;
+  for (const CardLine& line : lines) height += lineHeight(line.size);
+  const SKIA_Rect card = {(screen.width - width) / 2, percentOf(screen.height, wordsAt()), width,
+                          height, kCardColor};
+  skia_add_box_c(card);
+  drawProgress(progress, {card.x, card.y, card.w, gap / 2, 0});
+  SKIA_Rect row = {card.x + gap, card.y + 2 * gap, card.w - 2 * gap, 0, 0};
+  for (const CardLine& line : lines) {
+    row.h = lineHeight(line.size);
+    if (!line.words.empty()) {
+      skia_add_label_c(row,
+                       textOf(line.words.c_str(), kPanelInk.text, SKIA_ALIGN_CENTRE, line.size));
+    }
+    row.y += row.h;
   }
-  return area.y;
-}
-
-void MeasurePage::instruct(const std::string& words) {
-  instructions = words;
-  LookTest::instruct(words);
 }
 
 void MeasurePage::draw() {
   if (page.isAsking()) {
-    page.draw();
-    drawLines(valueLines(), contentArea());
+    LookTest::draw();
     return;
   }
   drawLook();
-  if (!hasWords()) return;
-  const ScreenSize screen = screenSize();
-  SKIA_Rect area = {0, percentOf(screen.height, wordsAt()), screen.width, 0, 0};
-  area.y = drawLines(instructionLines(), area);
-  drawLines(valueLines(), area);
+  if (hasWords()) drawCard();
 }
 
 }  // namespace factory_test

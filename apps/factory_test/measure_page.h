@@ -21,7 +21,8 @@ class MeasurePage : public LookTest {
   Outcome verdict() const final { return hasPassed ? Outcome::Pass : page.outcome(); }
   bool isComplete() const final { return hasPassed || isDone(); }
   void draw() final;
-  void instruct(const std::string& words) final;
+  void showProgress(const RunProgress& sofar) final;
+  void prepare(const PlanStep& planned) final;
 
  protected:
   /// `usualWords`: what to do, unless the plan says it.
@@ -33,9 +34,9 @@ class MeasurePage : public LookTest {
   virtual void updateAt(uint32_t now) { static_cast<void>(now); }
   /// Whether it has seen all that it must.
   virtual bool isDone() const = 0;
-  /// Draws the whole screen while it is looked at, but for the words in its middle.
+  /// Draws the whole screen while it is looked at, but for the words.
   virtual void drawLook() = 0;
-  /// Where the words stand, in per cent of the screen's height; whether they are there.
+  /// Where the card with the words stands, in per cent of the screen's height; whether it is there.
   virtual int wordsAt() const;
   virtual bool hasWords() const { return true; }
   /// Whether it goes on while a finger is down, which would move the menu that comes next.
@@ -47,7 +48,7 @@ class MeasurePage : public LookTest {
   virtual bool isForEyes() const { return false; }
   std::string question() const override;
 
-  double parameter(std::string_view name) const { return step.parameter(name); }
+  double parameter(std::string_view name) const { return planStep.parameter(name); }
   Measure measure(std::string_view name, double value) const;
   static double millimetres(double pixels);
   /// Of a finger that came down before the page.
@@ -67,12 +68,14 @@ class MeasurePage : public LookTest {
   void updateLook() final;
   void followStill(const Input& input);
   bool isWhereItWas(const Input& input) const;
-  std::vector<std::string> instructionLines() const;
-  std::vector<std::string> valueLines() const;  // with their limits
-  // From the area's top; returns where the next line begins.
-  static int drawLines(const std::vector<std::string>& words, SKIA_Rect area);
+  struct CardLine {
+    std::string words;
+    int size;
+  };
+  std::vector<CardLine> linesOfCard(int width) const;
+  void drawCard() const;
 
-  PlanStep step;
+  RunProgress progress;
   std::string instructions;
   bool hasPassed = false;
   std::set<uint32_t> fingers;  // that are down

@@ -53,28 +53,54 @@ int sizeInRow(const std::string& words) {
   return fitted(words, size, screen.width - 2 * gapOf(screen), lineHeight(size)).size;
 }
 
+struct MenuGroup {
+  std::string name;
+  std::vector<std::size_t> entries;  // numbers in testEntries()
+};
+
+std::vector<MenuGroup> groupsOf(const Plan* ownPlan) {
+  std::vector<MenuGroup> groups;
+  if (ownPlan != nullptr) {
+    groups.push_back({tr("Plan: ") + ownPlan->name, {}});
+    for (const PlanStep& step : ownPlan->steps) {
+      groups.back().entries.push_back(placeOf(step.test));
+    }
+  }
+  std::optional<Group> last;
+  for (std::size_t i = 0; i < testEntries().size(); ++i) {
+    const TestEntry& entry = testEntries()[i];
+    if (ownPlan != nullptr && ownPlan->find(entry.id) != nullptr) continue;
+    if (last != entry.group) {
+      groups.push_back(
+          {std::string(nameOf(entry.group)) + (ownPlan != nullptr ? tr(", not in the plan") : ""),
+           {}});
+    }
+    last = entry.group;
+    groups.back().entries.push_back(i);
+  }
+  return groups;
+}
+
 }  // namespace
 
-Menu::Menu(const ResultBook& results)
-    : book(results), faces(MW::MainList::kItems), list("", MenuHead::listMode()) {
+Menu::Menu(const ResultBook& results, const Plan* ownPlan)
+    : book(results),
+      rowOfEntry(testEntries().size(), kNothing),
+      faces(MW::MainList::kItems),
+      list("", MenuHead::listMode()) {
   // What stands there is the head's.
   for (int text = 0; text < MW::MainList::kOptions; ++text) list.setTextOption(text, "", 1);
-  std::optional<Group> group;
   // Of no height: the list does not draw a row that begins exactly at its top.
   const SKIA_Text nothing = {};
-  int row = list.addIndex(MW::MainList::kDark, &nothing, 0) + 1;
-  for (const TestEntry& entry : testEntries()) {
-    if (group != entry.group) {
-      addGroup(nameOf(entry.group));
-      ++row;
+  firstRow = list.addIndex(MW::MainList::kDark, &nothing, 0) + 2;  // behind a group's name
+  for (const MenuGroup& group : groupsOf(ownPlan)) {
+    addGroup(group.name);
+    for (const std::size_t entry : group.entries) {
+      rowOfEntry.at(entry) = addRow(tr(testEntries()[entry].name));
     }
-    group = entry.group;
-    addRow(tr(entry.name));
-    rowOfEntry.push_back(row++);
   }
   addGroup("");
-  addRow(tr("Leave"));
-  leaveRow = row + 1;
+  leaveRow = addRow(tr("Leave"));
   faces.at(static_cast<std::size_t>(leaveRow)) = kRowInk.ground;
   list.initFinish();
   showVerdicts();
@@ -87,19 +113,18 @@ Menu::Menu(const ResultBook& results)
   refreshFigures();
 }
 
-void Menu::addGroup(const char* name) {
-  const ScreenSize screen = screenSize();
-  const std::string words = rowWords(name);
-  const SKIA_Text text = textOf(words.c_str(), 0, leadingAlign(), textSize(screen));
-  list.addIndex(MW::MainList::kDark, &text, groupHeight(screen));
+int Menu::addGroup(const std::string& name) {
+  const std::string words = rowWords(name.c_str());
+  const SKIA_Text text = textOf(words.c_str(), 0, leadingAlign(), sizeInRow(words));
+  return list.addIndex(MW::MainList::kDark, &text, groupHeight(screenSize()));
 }
 
-void Menu::addRow(const char* name) {
-  const ScreenSize screen = screenSize();
+int Menu::addRow(const char* name) {
   const std::string words = rowWords(name);
-  const SKIA_Text text = textOf(words.c_str(), 0, leadingAlign(), textSize(screen));
-  list.setBGColor(list.addIndex(MW::MainList::kSelectable, &text, entryHeight(screen)),
-                  kRowInk.ground);
+  const SKIA_Text text = textOf(words.c_str(), 0, leadingAlign(), sizeInRow(words));
+  const int row = list.addIndex(MW::MainList::kSelectable, &text, entryHeight(screenSize()));
+  list.setBGColor(row, kRowInk.ground);
+  return row;
 }
 
 void Menu::show() {
@@ -121,6 +146,7 @@ void Menu::update(uint32_t now) {
 
 void Menu::refreshFigures() {
   head.tell(presentFigures());
+  head.tell(book.lineStatus());
   MW::isDisplayUpdate(1);
 }
 
@@ -147,7 +173,8 @@ void Menu::colourRow(int row) {
 }
 
 void Menu::markEntry(std::size_t entry) {
-  while (markedRow != rowOfEntry.at(entry)) followKey(MW::kKeyDown);
+  const int row = rowOfEntry.at(entry);
+  while (markedRow != row) followKey(markedRow < row ? MW::kKeyDown : MW::kKeyUp);
 }
 
 std::optional<std::size_t> Menu::takeChosen() {
@@ -169,7 +196,7 @@ void Menu::followKey(unsigned int code) {
   switch (code) {
     case MW::kKeyDown:
       // The list's own current item is the first one already, though nothing shows it yet.
-      mark(markedRow == kNothing ? rowOfEntry.front() : list.move_key_down(MW::kUnused));
+      mark(markedRow == kNothing ? firstRow : list.move_key_down(MW::kUnused));
       break;
     case MW::kKeyUp: mark(markAbove()); break;
     case MW::kKeySelect: choose(markedRow); break;
@@ -185,7 +212,7 @@ int Menu::markAbove() {
   MW::mouse_event belowEdge = {};
   belowEdge.y = head.height() + 1;
   MW::mouse_event down = {};
-  down.yrel = row == rowOfEntry.front() ? screenSize().height : 1;
+  down.yrel = row == firstRow ? screenSize().height : 1;
   if (row >= 0 && list.position2index(belowEdge) == row) list.onHover(down);
   return row;
 }

@@ -6,11 +6,13 @@
 #include <atomic>
 #include <cstdint>
 #include <optional>
+#include <string>
 #include <vector>
 
 #include "current.h"
 #include "look.h"
 #include "menu_head.h"
+#include "plan/plan.h"
 #include "results/results.h"
 
 namespace factory_test {
@@ -20,8 +22,9 @@ namespace factory_test {
 /// up and down move the mark; the back key, and the last row, ask to leave.
 class Menu {
  public:
-  /// Shows the verdicts of `results`, which outlives it.
-  explicit Menu(const ResultBook& results);
+  /// Shows the verdicts of `results`, which outlives it. The tests of `ownPlan` come first, in its
+  /// order, and the groups hold the others; without one (null) the groups hold all.
+  Menu(const ResultBook& results, const Plan* ownPlan);
 
   void show();
   void hide();
@@ -40,8 +43,8 @@ class Menu {
  private:
   static constexpr int kNothing = -1;
 
-  void addGroup(const char* name);
-  void addRow(const char* name);
+  int addGroup(const std::string& name);
+  int addRow(const char* name);
   void mark(int row);
   int markAbove();
   void choose(int row);
@@ -51,7 +54,8 @@ class Menu {
 
   Current<Menu> current{this};
   const ResultBook& book;
-  std::vector<int> rowOfEntry;  // the list's rows; neither changes once the constructor is done
+  std::vector<int> rowOfEntry;  // the list's rows; none changes once the constructor is done
+  int firstRow = kNothing;
   int leaveRow = kNothing;
   std::atomic<int> chosenRow = kNothing;
   std::atomic<bool> leaveAsked = false;

@@ -17,23 +17,43 @@ struct HeadLayout {
   SKIA_Rect title;
   SKIA_Rect hint;
   SKIA_Rect count;
+  SKIA_Rect line;
   SKIA_Rect bar;
   SKIA_Rect figures;
   Grid grid;
 };
 
+enum class LineRow { Shown, LeftOut };
+
 // On a wide screen what is one above the other elsewhere stands side by side.
-HeadLayout layOutHead(const SKIA_Rect& area, ScreenSize screen) {
+HeadLayout layOutHead(const SKIA_Rect& area, ScreenSize screen, LineRow lineRow) {
   const int gap = gapOf(screen);
-  const auto [title, rest] = rowsOf<2>(area, 0, {isLandscape(screen) ? 3 : 2, 8});
+  const bool isWide = isLandscape(screen);
+  const auto [title, rest] = rowsOf<2>(area, 0, {isWide ? 3 : 2, 8});
   const SKIA_Rect body = {rest.x + 2 * gap, rest.y + gap / 2, rest.w - 4 * gap, rest.h - gap, 0};
-  if (isLandscape(screen)) {
-    const auto [words, bar, figures] = rowsOf<3>(body, gap / 4, {4, 1, 5});
-    const auto [hint, count] = columnsOf<2>(words, gap, {1, 1});
-    return {title, hint, count, bar, figures, {2, 3}};
+  const int line = lineRow == LineRow::Shown ? 4 : 0;
+  const auto [words, bar, figures] =
+      rowsOf<3>(body, gap / 4, {isWide ? 4 : 8 + line, 1, isWide ? 5 : 8});
+  if (isWide) {
+    const auto [hint, count, sent] = columnsOf<3>(words, gap, {4, 4, line});
+    return {title, hint, count, sent, bar, figures, {2, 3}};
   }
-  const auto [hint, count, bar, figures] = rowsOf<4>(body, gap / 4, {4, 4, 1, 8});
-  return {title, hint, count, bar, figures, {3, 2}};
+  const auto [hint, count, sent] = rowsOf<3>(words, gap / 4, {4, 4, line});
+  return {title, hint, count, sent, bar, figures, {3, 2}};
+}
+
+struct LineWords {
+  std::string words;
+  Ink ink;
+};
+
+LineWords wordsOf(const LineStatus& line) {
+  const auto count = static_cast<unsigned long>(std::max<std::int64_t>(line.waiting, 0));
+  const std::string waiting =
+      std::to_string(count) + trn(" verdict waits", " verdicts wait", count);
+  if (!line.error.empty()) return {tr("Line out of reach: ") + waiting, kFailInk};
+  if (count > 0) return {tr("Line: ") + waiting, kRowInk};
+  return {tr("Line: all is sent"), kPassInk};
 }
 
 }  // namespace
@@ -59,7 +79,7 @@ MenuHead::~MenuHead() { leaveLayers(); }
 int MenuHead::show(unsigned int) {
   const ScreenSize screen = screenSize();
   const int size = textSize(screen);
-  const HeadLayout place = layOutHead(rect, screen);
+  const HeadLayout place = layOutHead(rect, screen, line ? LineRow::Shown : LineRow::LeftOut);
   skia_add_box_c(rect);
   skia_add_textbox_c(
       inColor(place.title, kHeadInk.ground),
@@ -69,6 +89,11 @@ int MenuHead::show(unsigned int) {
   };
   put(place.hint, tr("Choose a test, or Leave at the end."));
   put(place.count, progress.words());
+  if (line) {
+    const auto [words, ink] = wordsOf(*line);
+    skia_add_textbox_c(inColor(place.line, ink.ground),
+                       captionIn(place.line, words.c_str(), ink.text));
+  }
   drawProgress(progress, place.bar);
   drawFigures(place.figures, place.grid);
   return 1;

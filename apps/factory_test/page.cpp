@@ -52,14 +52,13 @@ void Page::drawFront() {
   head.show();
   drawProgress(progress, layOutPage(screenSize()).progress);
   titleText.show();
-  drawHint();
+  drawHint(layOutPage(screenSize()).hint);
   line.show();
   if (bar) bar->draw();
 }
 
-void Page::drawHint() const {
-  const ScreenSize screen = screenSize();
-  drawWords(layOutPage(screen).hint, hint, kPageInk.text, leadingAlign(), textSize(screen));
+void Page::drawHint(const SKIA_Rect& area) const {
+  drawWords(area, hint, kPageInk.text, leadingAlign(), textSize(screenSize()));
 }
 
 void Page::say(const char* words) {

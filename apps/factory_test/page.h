@@ -26,7 +26,7 @@ class Page {
   void showProgress(const RunProgress& newProgress) { progress = newProgress; }
   /// Changes the instructions.
   void instruct(const std::string& words) { hint = words; }
-  void drawHint() const;
+  void drawHint(const SKIA_Rect& area) const;
   /// Changes the line; the next frame shows it. Any thread.
   void say(const char* words);
 

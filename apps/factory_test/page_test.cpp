@@ -7,8 +7,38 @@
 
 #include "language/language.h"
 #include "layout.h"
+#include "text_fit.h"
+#include "value_lines.h"
 
 namespace factory_test {
+
+void PageTest::prepare(const PlanStep& planned) {
+  planStep = planned;
+  if (!planStep.text.empty()) page.instruct(planStep.text);
+}
+
+void PageTest::drawValues(const SKIA_Rect& area) const {
+  std::string words;
+  for (const std::string& line : valueLines(values(), planStep)) {
+    words.append(words.empty() ? "" : "\n").append(line);
+  }
+  if (words.empty()) return;
+  drawWords(area, words, kPageInk.text, SKIA_ALIGN_CENTRE, textSize(screenSize()));
+}
+
+void LookTest::draw() {
+  page.draw();
+  if (page.isAsking()) drawValues(contentArea());
+}
+
+void LookTest::drawHintOverLook() const {
+  if (page.isAsking()) return;
+  const ScreenSize screen = screenSize();
+  const int margin = 2 * gapOf(screen);
+  const int height = 3 * lineHeight(textSize(screen));
+  page.drawHint(
+      {margin, screen.height - entryHeight(screen) - height, screen.width - 2 * margin, height, 0});
+}
 
 void LookTest::leave() {
   page.endAsking();
@@ -49,6 +79,7 @@ void StepTest::endLook() {
 
 // The steps' widgets were drawn over it.
 void StepTest::drawOver() {
+  drawHintOverLook();
   if (end) end->show(GetTicks());
 }
 

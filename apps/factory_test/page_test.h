@@ -10,6 +10,7 @@
 #include "current.h"
 #include "on_top.h"
 #include "page.h"
+#include "plan/plan.h"
 #include "test.h"
 
 namespace factory_test {
@@ -20,14 +21,18 @@ class PageTest : public Test {
  public:
   Outcome verdict() const override { return page.outcome(); }
   void takeBack() override { page.takeBack(); }
-  void instruct(const std::string& words) override { page.instruct(words); }
+  void prepare(const PlanStep& planned) override;
   void showProgress(const RunProgress& progress) override { page.showProgress(progress); }
   void draw() override { page.draw(); }
 
  protected:
   PageTest(const char* title, const char* instructions) : page(title, instructions) {}
 
+  /// Draws the values so far, with their limits.
+  void drawValues(const SKIA_Rect& area) const;
+
   Page page;
+  PlanStep planStep = {};  // what the plan says of the test
 };
 
 /// A test that is looked at first and judged afterwards, as what it shows takes the whole screen,
@@ -37,9 +42,13 @@ class LookTest : public PageTest {
   void enter() final { beginLook(); }
   void leave() final;
   void update(uint32_t now) final;
+  void draw() override;
 
  protected:
   using PageTest::PageTest;
+
+  /// What to do, at the foot of what hides or darkens the page while it is looked at.
+  void drawHintOverLook() const;
 
   /// Puts the test's own widgets on the screen, and takes them off again; also when they are off.
   virtual void beginLook() = 0;

@@ -25,7 +25,7 @@ std::optional<Task> chooseTask(const Options& options, std::string& error) {
   auto simulation = Simulation::parse(options.simulate, *plan, error);
   if (!simulation) return {};
   if (!simulation->isEmpty()) plan->name += kRehearsal;
-  return Task{*std::move(plan), *std::move(simulation), options.run};
+  return Task{*std::move(plan), *std::move(simulation), !options.plan.empty(), options.run};
 }
 
 }  // namespace factory_test

@@ -13,7 +13,8 @@ namespace factory_test {
 struct Task {
   Plan plan;
   Simulation simulation;
-  bool isRun;  // from the plan's first step to its last one, without the menu
+  bool isOwnPlan;  // not the built-in one
+  bool isRun;      // from the plan's first step to its last one, without the menu
 };
 
 /// What the options name. Nothing for a plan file that is wrong, or a simulation that does not fit

@@ -9,6 +9,7 @@
 
 namespace factory_test {
 
+struct PlanStep;
 struct RunProgress;
 
 /// What became of a test so far.
@@ -22,8 +23,9 @@ class Test {
 
   /// How far the run had come before; asked for by a page that shows it.
   virtual void showProgress(const RunProgress&) {}
-  /// What the plan tells the operator, in the place of the page's own words; before enter().
-  virtual void instruct(const std::string& words) { static_cast<void>(words); }
+  /// What the plan says of the test, such as words for the operator in the place of the page's own;
+  /// before enter().
+  virtual void prepare(const PlanStep& step) { static_cast<void>(step); }
   /// Puts the test's widgets on the screen.
   virtual void enter() = 0;
   /// Takes them off again. No callback runs any more when it returns.

@@ -4,6 +4,8 @@
 #include <array>
 #include <utility>
 
+#include "utf8.h"
+
 namespace factory_test {
 
 namespace {
@@ -52,9 +54,6 @@ int widthOfLetter(char32_t letter) {
   const auto* const script = std::ranges::lower_bound(kScripts, letter, {}, &Script::last);
   return script != kScripts.end() && script->first <= letter ? script->width : kUsualWidth;
 }
-
-// Of UTF-8: all bytes of a character but the first.
-bool isInsideCharacter(char byte) { return (static_cast<unsigned char>(byte) & 0xC0U) == 0x80U; }
 
 // The bytes of the character at the text's beginning.
 std::size_t firstCharacter(std::string_view text) {

@@ -14,6 +14,7 @@ std::string told;
 void tell(int value) { told += std::to_string(value); }
 
 TEST(CallbackTest, CallsWhatWasStoredLast) {
+  told.clear();
   Callback word;
   EXPECT_FALSE(word);
   word(1);

@@ -4,6 +4,8 @@
 #include <array>
 #include <memory_resource>
 #include <random>
+#include <set>
+#include <string>
 
 #include "support/failing_malloc.h"
 #include "support/widget_test.h"
@@ -75,6 +77,22 @@ TEST_P(EveryClass, BearsThatAnyAllocationOfASessionFails) {
   }
   EXPECT_LT(nth, kMost);
   EXPECT_GT(nth, 1) << "not even the widget was allocated";
+}
+
+// What a menu or a dialog is made of stands in no layer of its own, and answers 0 when it draws.
+TEST_P(EveryClass, StandsInItsLayerAndAnswersThatItDrew) {
+  const std::set<std::string> parts = {"Box", "Image", "Label", "Line", "Textbox", "WidgetRcui"};
+  const std::set<std::string> covers = {"AutoCapScreen", "FullScreen"};
+  const std::string name = GetParam().name;
+  Arguments from({});
+  const auto widget = GetParam().make(from);
+  if (!parts.contains(name)) {
+    const bool isOnTop = covers.contains(name) || name.starts_with("Dialog");
+    EXPECT_EQ(widget->type(), isOnTop ? MW::kTopLayer : MW::kBaseLayer);
+  }
+  for (const unsigned int ticks : {1U, 2U}) {
+    EXPECT_EQ(widget->show(ticks), parts.contains(name) ? 0 : 1);
+  }
 }
 
 TEST_P(EveryClass, DrawsTheSameWhateverThePlatformAnswers) {

@@ -1,7 +1,7 @@
 #include "core/life_guard.h"
 
 #include <array>
-#include <latch>
+#include <barrier>
 #include <thread>
 
 #include "support/widget_test.h"
@@ -48,7 +48,7 @@ class Rival : public MW::Widget {
   }
 
   static inline thread_local const Rival* drawn = nullptr;  // the one of this thread
-  static inline std::latch bothInside{2};
+  static inline std::barrier<> bothInside{2};
 
  private:
   std::unique_ptr<Rival>& other;

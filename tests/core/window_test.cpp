@@ -115,6 +115,25 @@ TEST_F(WindowTest, TurnsMillimetresIntoPixels) {
             logLines(kError, {"[WINDOW] getMura[402.000000 dpi] 10.000000mm = 158 pixel"})[0]);
 }
 
+TEST_F(WindowTest, LogsEventsOfFingersAndKeys) {
+  const auto answered = [](uint32_t type) {
+    MW::event_data event = {};
+    event.type = type;
+    const int answer = Window::onRecvEvent(&event, 0);
+    std::string said = std::to_string(answer);
+    for (const LogLine& line : platform().takeLog()) said += line.message;
+    return said;
+  };
+  EXPECT_EQ(answered(MW::kEventMotion), "1[WINDOW] over!!");
+  EXPECT_EQ(answered(MW::kEventPress), "1[WINDOW] pressed!!");
+  EXPECT_EQ(answered(MW::kEventRelease), "1[WINDOW] released!!");
+  EXPECT_EQ(answered(MW::kEventLongPress), "1[WINDOW] long pressed!!");
+  EXPECT_EQ(answered(MW::kEventKeyPress), "1[WINDOW] key pressed!!");
+  EXPECT_EQ(answered(MW::kEventKeyRelease), "1[WINDOW] key released!!");
+  EXPECT_EQ(answered(MW::kEventUser), "0");
+  EXPECT_EQ(Window::onRecvEvent(nullptr, 0), 0);
+}
+
 const LogLine kLeftOver = logLines(
     kError, {"[WINDOW] destroy: a handler asks for it: the rest is left to another call"})[0];
 const LogLine kEnd = logLines(kError, {"[WINDOW] event_dispatcher End"})[0];

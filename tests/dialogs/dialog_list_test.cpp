@@ -38,6 +38,10 @@ const PlayTests kPlays = {
           "press- click+ press r2+ hover-"),
 };
 
+TEST_F(DialogListTest, TakesTheReleaseThatDeletesIt) {
+  EXPECT_EQ(played(threeRows, {release(725, 1514)}, 1), "hidden o1+");
+}
+
 TEST_F(DialogListTest, RefusesRowsThatAreTooLongTooManyOrLate) {
   DialogList dialog(nullptr);
   EXPECT_EQ(dialog.addIndex(nullptr), -1);

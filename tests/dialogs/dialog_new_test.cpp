@@ -25,6 +25,15 @@ TEST_F(DialogNewTest, TextsEndAtTheFirstNull) {
   EXPECT_EQ(shown(dialog).at(5).text, (DrawnText{kTooLong.substr(1), 7, 5, 70}));
 }
 
+TEST_F(DialogNewTest, TheBodyBlinks) {
+  DialogNew dialog("Title", 5, 7);
+  dialog.setBlink(1, 9);
+  dialog.show(1);
+  platform().takeDrawings();
+  dialog.show(5000);
+  EXPECT_EQ(platform().takeDrawings().at(3).rect.color, 9U);
+}
+
 TEST_F(DialogNewTest, TheBodyChangesItsColourWithTheNextLayout) {
   DialogNew dialog("Title", 5, 7);
   dialog.setDescBlink(0);

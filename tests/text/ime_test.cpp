@@ -96,6 +96,27 @@ TEST_F(ImeTest, DigitsAloneGreyTheRest) {
   EXPECT_EQ(platform().properties["brimol.info_1.ime_flag"], "true");
 }
 
+TEST_F(ImeTest, RowsOfKeysAreStaggered) {
+  struct KeyRow {
+    int left;
+    std::vector<int> widths;
+  };
+  const std::vector<int> tenKeys(10, 72);
+  const auto rows = std::to_array<KeyRow>({{0, {720}},
+                                           {0, tenKeys},
+                                           {0, tenKeys},
+                                           {36, std::vector<int>(9, 72)},
+                                           {0, {108, 72, 72, 72, 72, 72, 72, 72, 108}},
+                                           {0, {180, 360, 180}}});
+  std::ostringstream wanted("0,0 720x600|", std::ios::ate);
+  for (int y = 0; auto [x, widths] : rows) {
+    for (const int w : widths) wanted << std::exchange(x, x + w) << ',' << y << ' ' << w << "x100|";
+    y += 100;
+  }
+  Keyboard keyboard;
+  EXPECT_EQ(places(shown(keyboard)), wanted.str());
+}
+
 TEST_F(ImeTest, KeysStandInHalvesAndTheirBordersTakeNothing) {
   Keyboard keyboard({10, 20, 735, 605, 5});  // 73 x 100, and 36 are a half
   EXPECT_NE(places(shown(keyboard)).find("|192,520 365x100|557,520 182x100|"), std::string::npos);

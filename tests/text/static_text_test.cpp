@@ -93,6 +93,37 @@ TEST_F(StaticTextTest, ALongPressOnTheBarScrollsAClock) {
   EXPECT_EQ(viewer.w_count, 0) << "it knows of its numbers by now";
 }
 
+TEST_F(StaticTextTest, AViewOfFiguresLogsAllRowsUpToItsEnd) {
+  constexpr auto kRows = std::to_array<std::pair<const char*, const char*>>(
+      {{"cpu", "7"}, {"gpu", "7"}, {"ddr", "7"}, {"log", "1"}});
+  for (const auto& [info, rows] : kRows) {
+    platform().properties["brimol.info.type"] = info;
+    Viewer viewer(kFourRows);
+    viewer.top_index = 3;
+    platform().takeLog();
+    viewer.setText("x");
+    EXPECT_EQ(platform().takeLog().at(0).message,
+              std::string("[STATICTEXT] max_num_of_lines : ") + rows);
+  }
+}
+
+TEST_F(StaticTextTest, InitStartsOver) {
+  platform().properties["brimol.info.type"] = "cpu";
+  Viewer viewer(kFourRows);
+  viewer.found("a\nab\nb", "ab");
+  viewer.press_cb = [](int) { ADD_FAILURE() << "it was dropped"; };
+  viewer.setActive(1);
+  platform().hasProperties = false;
+  viewer.init(&kFourRows, &kLooks);
+  EXPECT_EQ(viewer.isActive(), 0);
+  EXPECT_EQ(viewer.top_index, 0);
+  EXPECT_EQ(viewer.w_count, 2) << "no longer that of a clock";
+  EXPECT_EQ(Viewer({0, 0, 63, 9, 0}, textRecord("", 7, 1, 1)).w_count, 108) << "of one pixel";
+  EXPECT_EQ(viewer.rows(0), "|");
+  viewer.setActive(1);
+  press(viewer, {5, 5});
+}
+
 std::unique_ptr<Viewer> sixRows() {
   auto viewer = std::make_unique<Viewer>(kFourRows);
   viewer->setText("1\n2\n3\n4\n5\n6");

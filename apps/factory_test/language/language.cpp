@@ -45,7 +45,8 @@ std::span<const std::string_view> languages() { return kLanguages; }
 
 void chooseLanguage(const std::string& code) {
   // Catalogues are read under any locale but "C", and this one is always there. LANGUAGE says
-  // whose.
+  // whose, and is read again when the locale changes.
+  std::setlocale(LC_MESSAGES, "C");
   std::setlocale(LC_MESSAGES, "C.UTF-8");
   setenv("LANGUAGE", (code.empty() ? environmentsLanguage() : code).c_str(), 1);
   bindtextdomain(kDomain, catalogues().c_str());

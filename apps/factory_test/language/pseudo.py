@@ -9,7 +9,7 @@ import sys
 
 import polib
 
-ACCENTS = str.maketrans("AaEeIiOoUuCcNnSsYyZz", "ÅåÉéÎîÖöÛûÇçÑñŠšÝýŽž")
+ACCENTS = str.maketrans("AaEeIiOoUuCcNnSsYyZz", "ÅåÉéÍíÖöÛûÇçÑñŠšÝýŽž")
 FORMAT = re.compile(r"(%[-+ 0#]*[0-9*]*(?:\.[0-9*]+)?[hlzjt]*[a-zA-Z%])")
 
 

@@ -2,6 +2,7 @@
 #include <MW/key.h>
 #include <MW/screen.h>
 #include <MW/window.h>
+#include <brimol/input.h>
 
 #include <algorithm>
 #include <atomic>
@@ -11,6 +12,7 @@
 
 #include "current.h"
 #include "language/language.h"
+#include "layout.h"
 #include "on_top.h"
 #include "page_test.h"
 #include "pages/table.h"
@@ -23,13 +25,24 @@ namespace {
 
 constexpr int kColours = MW::FullScreen::kGrey + 1;
 
-/// A tap, or the right key, shows the next colour. A long press, or the select key, ends the look,
-/// and the verdict is asked for.
+/// What to do stands on the first colour for a while. A tap, or the right key, shows the next
+/// colour. A long press, or the select key, ends the look, and the verdict is asked for.
 class ColourTest : public LookTest {
  public:
   ColourTest()
       : LookTest(tr("Colours"),
                  tr("Say what you saw: pixels and places\nthat differ are a fault.")) {}
+
+  void drawOver() override {
+    if (!hasWords || shown > 0 || page.isAsking()) return;
+    const ScreenSize screen = screenSize();
+    const SKIA_Rect foot =
+        rowsOf<2>({0, 0, screen.width, screen.height, kPanelInk.ground}, 0, {5, 1})[1];
+    skia_add_box_c(foot);
+    drawWords(within(foot, 2 * gapOf(screen)),
+              tr("Tap: the next colour.\nHold a finger still, or Select: end."), kPanelInk.text,
+              SKIA_ALIGN_CENTRE, textSize(screen));
+  }
 
   bool isComplete() const override { return shown >= kColours - 1; }
 
@@ -39,6 +52,7 @@ class ColourTest : public LookTest {
 
  protected:
   void beginLook() override {
+    began = GetTicks();
     colour.emplace(MW::FullScreen::kWhite).setActive(1);
     touch.emplace();
     touch->clickCallback = [](MW::mouse_event*) { Current<ColourTest>::get().next(); };
@@ -48,6 +62,14 @@ class ColourTest : public LookTest {
     key->keyPressCallback = [](MW::kbd_event* event) {
       Current<ColourTest>::get().followKey(event->code);
     };
+  }
+
+  // The first colour is seen whole once the words have been read.
+  void updateLook() override {
+    constexpr uint32_t kReadMs = 4000;
+    if (!hasWords || GetTicks() - began < kReadMs) return;
+    hasWords = false;
+    MW::isDisplayUpdate(1);
   }
 
   std::string question() const override { return tr("Was every colour even?"); }
@@ -68,6 +90,8 @@ class ColourTest : public LookTest {
   }
 
   Current<ColourTest> current{this};
+  uint32_t began = 0;  // GetTicks() milliseconds
+  bool hasWords = true;
   std::atomic<int> shown = 0;  // how often it moved on
   std::optional<MW::FullScreen> colour;
   std::optional<OnTop<MW::Screen>> touch;

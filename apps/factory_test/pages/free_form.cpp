@@ -19,7 +19,8 @@ namespace {
 class FreeFormTest : public StepTest {
  public:
   FreeFormTest()
-      : StepTest(tr("Free-form dialogs"), tr("Say whether every dialog looked right.")) {}
+      : StepTest(tr("Free-form dialogs"),
+                 tr("Tap through all dialogs, then say\nwhether each of them looked right.")) {}
 
  protected:
   std::string question() const override { return tr("Did all dialogs look right?"); }

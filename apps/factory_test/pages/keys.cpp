@@ -1,6 +1,7 @@
 // Every key once, and one of them twice and three times in a row.
 #include <MW/key.h>
 #include <MW/primitives.h>
+#include <MW/window.h>
 #include <brimol/input.h>
 
 #include <algorithm>
@@ -89,6 +90,7 @@ class KeyTest : public PageTest {
   void draw() override {
     page.draw();
     for (std::size_t i = 0; i < kAsked.size(); ++i) drawKey(static_cast<int>(i), pressed.at(i));
+    drawValues(areas().back());
   }
 
   std::vector<Measure> values() const override {
@@ -100,11 +102,9 @@ class KeyTest : public PageTest {
 
  private:
   void press(unsigned int code) {
-    const int before = bounce.count();
     bounce.press(code, GetTicks());
     mark(code);
-    if (bounce.count() == before) return;
-    page.say((tr("Bounce, at most ") + std::to_string(bounce.longestMs()) + " ms").c_str());
+    MW::isDisplayUpdate(1);
   }
 
   void mark(unsigned int code) {
@@ -114,13 +114,18 @@ class KeyTest : public PageTest {
     page.say(tr(row->name));
   }
 
+  // For the keys and the values.
+  static std::array<SKIA_Rect, 2> areas() {
+    return rowsOf<2>(contentArea(), gapOf(screenSize()), {4, 1});
+  }
+
   static void drawKey(int index, bool isPressed) {
     const ScreenSize screen = screenSize();
     const Grid grid = isLandscape(screen) ? Grid{3, 4} : Grid{4, 3};
     const std::string words = std::string(tr(kAsked.at(static_cast<std::size_t>(index)).name)) +
                               (isPressed ? "\nOK" : "");
     const Ink ink = isPressed ? kPassInk : kButtonInk;
-    const SKIA_Rect cell = inColor(cellOf(contentArea(), gapOf(screen), grid, index), ink.ground);
+    const SKIA_Rect cell = inColor(cellOf(areas().front(), gapOf(screen), grid, index), ink.ground);
     skia_add_textbox_c(cell, captionIn(cell, words.c_str(), ink.text));
   }
 

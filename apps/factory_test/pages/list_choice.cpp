@@ -25,6 +25,8 @@ class ListTest : public LookTest {
  public:
   ListTest() : LookTest(tr("List choice"), tr("Choose a row, then OK.")) {}
 
+  void drawOver() override { drawHintOverLook(); }
+
  protected:
   void beginLook() override {
     list.emplace(tr("Which part?"));

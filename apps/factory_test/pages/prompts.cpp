@@ -17,7 +17,9 @@ namespace {
 /// A touch, too, shows the next kind.
 class PromptTest : public StepTest {
  public:
-  PromptTest() : StepTest(tr("Prompts"), tr("Say whether every dialog looked right.")) {}
+  PromptTest()
+      : StepTest(tr("Prompts"),
+                 tr("Tap through all dialogs, then say\nwhether each of them looked right.")) {}
 
  protected:
   std::string question() const override { return tr("Did all dialogs look right?"); }

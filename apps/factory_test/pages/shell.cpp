@@ -25,7 +25,10 @@ constexpr std::size_t kCharacterRest = 3;  // bytes of a character behind its fi
 class ShellTest : public LookTest {
  public:
   explicit ShellTest(const Context& program)
-      : LookTest(tr("Shell"), tr("A command and what it writes.")), line(program.shellCommand) {}
+      : LookTest(tr("Shell"), tr("Read what the command writes, then OK.")),
+        line(program.shellCommand) {}
+
+  void drawOver() override { drawHintOverLook(); }
 
  protected:
   void beginLook() override {

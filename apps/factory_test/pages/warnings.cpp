@@ -21,7 +21,9 @@ constexpr uint32_t kCalm = 0xFF205080;
 /// A touch, too, shows the next page. Two releases of one key end the look.
 class WarningTest : public StepTest {
  public:
-  WarningTest() : StepTest(tr("Warning pages"), tr("Say whether both pages looked right.")) {}
+  WarningTest()
+      : StepTest(tr("Warning pages"),
+                 tr("Tap through both pages, then say\nwhether each of them looked right.")) {}
 
  protected:
   std::string question() const override { return tr("Did both pages look right?"); }

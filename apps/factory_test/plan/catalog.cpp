@@ -26,7 +26,7 @@ constexpr auto kGrid = std::to_array<ValueKind>({
 constexpr auto kGridParameters = std::to_array<ParameterKind>({{"cell mm", 3, 30, 8}});
 constexpr auto kLines = std::to_array<ValueKind>({
     {msg("lines followed"), "", least(2)},
-    {msg("worst distance"), "mm", most(5)},
+    {msg("worst distance"), msg("mm"), most(5)},
 });
 constexpr auto kTrails = std::to_array<ValueKind>({
     {msg("fingers counted"), "", least(2)},
@@ -34,8 +34,8 @@ constexpr auto kTrails = std::to_array<ValueKind>({
 });
 constexpr auto kFingers = std::to_array<ParameterKind>({{"fingers", 2, 10, 2}});
 constexpr auto kRate = std::to_array<ValueKind>({
-    {msg("event rate"), "1/s", least(20)},
-    {msg("longest gap"), "ms", none()},
+    {msg("event rate"), msg("1/s"), least(20)},
+    {msg("longest gap"), msg("ms"), none()},
     {msg("latency"), "ms", most(100)},
 });
 constexpr auto kRateParameters = std::to_array<ParameterKind>({{"seconds", 1, 30, 3}});

@@ -1,5 +1,8 @@
 #include "records/sqlite.h"
 
+#include <unistd.h>
+
+#include <cerrno>
 #include <charconv>
 #include <system_error>
 #include <utility>
@@ -26,7 +29,7 @@ std::string explain(sqlite3* handle, int code) {
   if (isBusy(code)) return "is locked by another program";
   switch (code & kPrimary) {
     case SQLITE_FULL: return "cannot be written: the disk is full";
-    case SQLITE_READONLY: return "cannot be written: it is read-only";
+    case SQLITE_READONLY: return "cannot be used: it or its folder is read-only";
     case SQLITE_CANTOPEN: return "cannot be opened" + systemText(handle);
     case SQLITE_IOERR: return "cannot be read or written" + systemText(handle);
     case SQLITE_NOTADB: return "is not a database";
@@ -60,6 +63,10 @@ std::optional<std::string> cellOf(sqlite3_stmt* statement, int column) {
   return text == nullptr ? std::string() : std::string(text, text + bytes);
 }
 
+std::filesystem::path folderOf(const std::filesystem::path& file) {
+  return file.has_parent_path() ? file.parent_path() : ".";
+}
+
 Cells rowOf(sqlite3_stmt* statement) {
   Cells row;
   for (int column = 0; column < sqlite3_column_count(statement); ++column) {
@@ -76,6 +83,12 @@ Sqlite::Sqlite(const std::filesystem::path& path, Mode mode) : file(path) {
   sqlite3* opened = nullptr;
   const int code = sqlite3_open_v2(path.c_str(), &opened, flags, nullptr);
   handle.reset(opened);  // also of one that failed
+  // SQLite then says that there is no such file.
+  if (code == SQLITE_CANTOPEN && mode == Mode::Write &&
+      ::access(folderOf(path).c_str(), W_OK) != 0 && errno != ENOENT) {
+    throw StoreError(path.native() +
+                     ": cannot be made in its folder: " + std::generic_category().message(errno));
+  }
   check(code);
   sqlite3_extended_result_codes(opened, 1);
   setPatience(kPatience);

@@ -22,6 +22,16 @@ Edges overwritten(const SKIA_Item& item) {
   return {};
 }
 
+// Whether the rows of the area through the hole are worth writing as a whole: those that the
+// processor's cache still has when the box is drawn over them.
+bool hasNarrowEnds(const Pixels& area, const Pixels& hole) {
+  constexpr int kRowsPerEnds = 8;
+  constexpr int64_t kMostPixels = int64_t{1} << 18;
+  const int ends = area.width - hole.width;
+  return ends > 0 && ends <= area.width / kRowsPerEnds &&
+         int64_t{area.width} * hole.height <= kMostPixels;
+}
+
 }  // namespace
 
 void Covers::collect(const Frame& frame, const Pixels& piece) {
@@ -41,7 +51,18 @@ bool Covers::hide(const Pixels& area, std::size_t first) const {
 }
 
 const Region& Covers::partsInSight(const Pixels& area, std::size_t first) {
+  split(area, first, Ends::Alone);
+  return parts;
+}
+
+Covers::Sight Covers::sightOf(const Pixels& area, std::size_t first) {
+  split(area, first, Ends::WithRow);
+  return {parts, rows};
+}
+
+void Covers::split(const Pixels& area, std::size_t first, Ends ends) {
   parts.clear();
+  rows.clear();
   rests.assign(1, {area, 0});
   while (!rests.empty()) {
     auto [rest, next] = rests.back();
@@ -53,13 +74,12 @@ const Region& Covers::partsInSight(const Pixels& area, std::size_t first) {
     if (isEmpty(hidden)) {
       parts.push_back(rest);
     } else {
-      pushAround(rest, hidden, next);
+      pushAround(rest, hidden, next, ends);
     }
   }
-  return parts;
 }
 
-void Covers::pushAround(const Pixels& area, const Pixels& hole, std::size_t cover) {
+void Covers::pushAround(const Pixels& area, const Pixels& hole, std::size_t cover, Ends ends) {
   const auto push = [&](const Edges& edges) {
     const Pixels rest = within(edges, area);
     if (!isEmpty(rest)) rests.push_back({rest, cover});
@@ -67,8 +87,12 @@ void Covers::pushAround(const Pixels& area, const Pixels& hole, std::size_t cove
   const Edges outer = edgesOf(area);
   const Edges inner = edgesOf(hole);
   push({outer.left, outer.top, outer.right, inner.top});
-  push({outer.left, inner.top, inner.left, inner.bottom});
-  push({inner.right, inner.top, outer.right, inner.bottom});
+  if (ends == Ends::WithRow && hasNarrowEnds(area, hole)) {
+    rows.push_back({area.x, hole.y, area.width, hole.height});
+  } else {
+    push({outer.left, inner.top, inner.left, inner.bottom});
+    push({inner.right, inner.top, outer.right, inner.bottom});
+  }
   push({outer.left, inner.bottom, outer.right, outer.bottom});
 }
 

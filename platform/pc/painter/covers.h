@@ -23,6 +23,16 @@ class Covers {
   /// until the next call.
   const Region& partsInSight(const Pixels& area, std::size_t first);
 
+  /// Both valid until the next call; disjoint.
+  struct Sight {
+    const Region& parts;  // in sight
+    const Region& rows;   // of which only narrow ends are
+  };
+
+  /// The same for an opaque area. Rows are written faster as a whole than at their two ends alone,
+  /// if the box over them is drawn right afterwards.
+  Sight sightOf(const Pixels& area, std::size_t first);
+
  private:
   struct Cover {
     std::size_t item;
@@ -33,11 +43,15 @@ class Covers {
     std::size_t cover;  // the next one to be asked
   };
 
-  void pushAround(const Pixels& area, const Pixels& hole, std::size_t cover);
+  enum class Ends : uint8_t { Alone, WithRow };
+
+  void split(const Pixels& area, std::size_t first, Ends ends);
+  void pushAround(const Pixels& area, const Pixels& hole, std::size_t cover, Ends ends);
 
   std::vector<Cover> covers;  // the last items first
   std::vector<Rest> rests;    // to be looked at
   Region parts;
+  Region rows;
 };
 
 }  // namespace brimol::pc

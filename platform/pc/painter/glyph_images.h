@@ -33,8 +33,8 @@ class GlyphImages {
     Place steps;
     friend bool operator<(const Pair& left, const Pair& right) {
       const auto words = [](const Pair& pair) {
-        const auto& [one, other, pixels, steps] = pair;
-        return std::tuple(one, other, pixels.x, pixels.y, steps.x, steps.y);
+        const auto& [first, second, away, stepsAway] = pair;
+        return std::tuple(first, second, away.x, away.y, stepsAway.x, stepsAway.y);
       };
       return words(left) < words(right);
     }

@@ -4,10 +4,9 @@
 
 namespace brimol::pc {
 
-void ItemPainter::draw(const Frame& frame, std::size_t number, const Pixels& clip, Covers& covers) {
+void ItemPainter::draw(const Frame& frame, std::size_t number, const Pixels& area, Covers& covers) {
   const SKIA_Item& item = frame[number];
-  const Pixels area = within(boundsOf(item, wholeOf(canvas.size())), clip);
-  if (isEmpty(area) || covers.hide(area, number + 1)) return;
+  if (covers.hide(area, number + 1)) return;
   const Edges box = edgesOf(item.rect);
   if (groundOf(item) == Ground::Round) fillRoundBox({canvas, area, item.rect.color}, box);
   if (groundOf(item) == Ground::Square && !isEmpty(within(box, area))) {

@@ -15,9 +15,14 @@ class ItemPainter {
   /// `target` outlives the painter.
   explicit ItemPainter(const Canvas& target) : canvas(target) {}
 
-  /// Draws of the item of that number what lies in `clip`: within the canvas, not empty. What
-  /// `covers` hide may be left out.
-  void draw(const Frame& frame, std::size_t number, const Pixels& clip, Covers& covers);
+  /// Draws of the item of that number what lies in `area`: the item's bounds, or a part of them
+  /// within the canvas. What `covers` hide may be left out.
+  void draw(const Frame& frame, std::size_t number, const Pixels& area, Covers& covers);
+
+  /// What the item's text touches of the item's bounds.
+  Pixels textArea(const SKIA_Item& item, const Pixels& bounds) {
+    return texts.touched(item.rect, item.text, bounds);
+  }
 
  private:
   void drawFigure(const SKIA_Item& item, const Pixels& clip);

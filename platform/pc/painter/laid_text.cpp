@@ -157,11 +157,29 @@ void LaidText::draw(const Canvas& canvas, const Edges& box, int align, Ink& ink,
                     const Pixels& clip) const {
   visit(box, align, [&](std::size_t i, const Place& place) {
     if (lines[i].isByPango) return drawByPango(canvas, i, place, ink.color(), clip);
-    for (std::size_t each = i == 0 ? 0 : lines[i - 1].end; each < lines[i].end; ++each) {
-      const auto& [image, corner] = images[each];
+    for (const auto& [image, corner] : imagesOf(i)) {
       image->draw(canvas, {place.x + corner.x, place.y + corner.y}, ink, clip);
     }
   });
+}
+
+std::optional<Edges> LaidText::drawnArea(const Edges& box, int align) const {
+  if (std::ranges::any_of(lines, &Line::isByPango)) return std::nullopt;
+  Edges area = {0, 0, 0, 0};
+  visit(box, align, [&](std::size_t i, const Place& place) {
+    for (const PlacedImage& placed : imagesOf(i)) {
+      Pixels letter = placed.area();
+      letter.x += place.x;
+      letter.y += place.y;
+      area = isEmpty(area) ? edgesOf(letter) : around(area, edgesOf(letter));
+    }
+  });
+  return area;
+}
+
+std::span<const PlacedImage> LaidText::imagesOf(std::size_t line) const {
+  const std::size_t first = line == 0 ? 0 : lines[line - 1].end;
+  return std::span(images).subspan(first, lines[line].end - first);
 }
 
 TextInk LaidText::ink(const Edges& box, int align) const {

@@ -1,6 +1,8 @@
 /// A text in one size, laid out and ready to be drawn in any colour at any place.
 #pragma once
 
+#include <optional>
+#include <span>
 #include <string_view>
 #include <vector>
 
@@ -31,6 +33,9 @@ class LaidText {
   /// Draws what text_painter.h describes.
   void draw(const Canvas& canvas, const Edges& box, int align, Ink& ink, const Pixels& clip) const;
 
+  /// What draw() may change: empty for a text without letters, and nothing where Pango draws.
+  std::optional<Edges> drawnArea(const Edges& box, int align) const;
+
   /// Where the letters' outlines lie. Only for a text that Pango has shaped.
   TextInk ink(const Edges& box, int align) const;
 
@@ -52,6 +57,7 @@ class LaidText {
   bool addPlainLine(const PlainShapes::Sheet& sheet, GlyphRun& run, std::string_view words);
   void addLine(PangoLayoutIter* iter, GlyphRun& run);
   bool addImages(const PangoLayoutLine& line, GlyphRun& run);
+  std::span<const PlacedImage> imagesOf(std::size_t line) const;
   void drawByPango(const Canvas& canvas, std::size_t line, const Place& place, uint32_t color,
                    const Pixels& clip) const;
 

@@ -20,6 +20,12 @@ void TextPainter::draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_T
   laidText(text).draw(canvas, edgesOf(rect), text.align, ink, clip);
 }
 
+Pixels TextPainter::touched(const SKIA_Rect& rect, const SKIA_Text& text, const Pixels& bounds) {
+  if (!isDrawn(text)) return {};
+  const std::optional<Edges> area = laidText(text).drawnArea(edgesOf(rect), text.align);
+  return area ? within(*area, bounds) : bounds;
+}
+
 // From Pango itself, which knows where the outlines lie.
 TextInk TextPainter::inkOf(const SKIA_Rect& rect, const SKIA_Text& text) {
   if (!isDrawn(text)) return {};

@@ -27,6 +27,9 @@ class TextPainter {
   /// replacement character.
   void draw(const Canvas& canvas, const SKIA_Rect& rect, const SKIA_Text& text, const Pixels& clip);
 
+  /// What draw() changes of the item's bounds at most.
+  Pixels touched(const SKIA_Rect& rect, const SKIA_Text& text, const Pixels& bounds);
+
   /// Where the text's letters lie, though the rectangle's sides may cut them; empty for a text that
   /// draws nothing.
   TextInk inkOf(const SKIA_Rect& rect, const SKIA_Text& text);

@@ -89,6 +89,14 @@ bool sameRect(const SKIA_Rect& one, const SKIA_Rect& other) {
   return std::tie(one.x, one.y, one.w, one.h) == std::tie(other.x, other.y, other.w, other.h);
 }
 
+// At most in the words of a figure that both have.
+bool differInFigureAlone(const SKIA_Item& one, const SKIA_Item& other) {
+  const Figure figure = figureOf(one);
+  if (one.kind != other.kind || figure != figureOf(other)) return false;
+  if (figure != Figure::Line && !sameRect(one.rect, other.rect)) return false;
+  return groundOf(one) == Ground::None || one.rect.color == other.rect.color;
+}
+
 }  // namespace
 
 Ground groundOf(const SKIA_Item& item) {
@@ -111,11 +119,11 @@ std::string_view shownText(const SKIA_Text& text) {
 int textSizeOf(const SKIA_Text& text) { return std::clamp(text.size, 0, kMostTextSize); }
 
 bool drawTheSame(const SKIA_Item& one, const SKIA_Item& other) {
-  const Figure figure = figureOf(one);
-  if (one.kind != other.kind || figure != figureOf(other)) return false;
-  if (figure != Figure::Line && !sameRect(one.rect, other.rect)) return false;
-  if (groundOf(one) != Ground::None && one.rect.color != other.rect.color) return false;
-  return traitsOf(figure).same(one, other);
+  return differInFigureAlone(one, other) && traitsOf(figureOf(one)).same(one, other);
+}
+
+bool differInTextAlone(const SKIA_Item& one, const SKIA_Item& other) {
+  return figureOf(one) == Figure::Text && differInFigureAlone(one, other);
 }
 
 Pixels boundsOf(const SKIA_Item& item, const Pixels& limits) {

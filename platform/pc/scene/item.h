@@ -72,6 +72,9 @@ std::string_view shownText(const SKIA_Text& text);
 /// Whether both draw the same, as far as their words tell.
 bool drawTheSame(const SKIA_Item& one, const SKIA_Item& other);
 
+/// Whether both draw a text, and the same besides.
+bool differInTextAlone(const SKIA_Item& one, const SKIA_Item& other);
+
 /// The pixels that the record asks the text to be high, at most kMostTextSize; 0: it is not drawn.
 int textSizeOf(const SKIA_Text& text);
 inline constexpr int kMostTextSize = 1024;

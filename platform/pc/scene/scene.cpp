@@ -17,11 +17,14 @@ constexpr std::size_t kMostBounds = 256;
 constexpr int kMostPieces = 32;
 
 Pixels unionOf(const Pixels& one, const Pixels& other) {
+  if (isEmpty(one) || isEmpty(other)) return isEmpty(one) ? other : one;
   const int left = std::min(one.x, other.x);
   const int top = std::min(one.y, other.y);
   return {left, top, std::max(one.x + one.width, other.x + other.width) - left,
           std::max(one.y + one.height, other.y + other.height) - top};
 }
+
+int64_t sizeOf(const Pixels& area) { return int64_t{area.width} * area.height; }
 
 // Most frames are the one before, byte for byte; records have no gaps.
 bool areEqual(const Frame& shown, const Frame& next) {
@@ -47,21 +50,36 @@ void Changes::collect(const Frame& shown, const Frame& next) {
   const auto [shownLast, nextLast] =
       std::mismatch(shown.rbegin(), std::make_reverse_iterator(shownFirst), next.rbegin(),
                     std::make_reverse_iterator(nextFirst), drawTheSame);
+  const auto addItem = [this](const SKIA_Item& item) { add(boundsOf(item, wholeOf(screen))); };
   auto older = shownFirst;
   auto newer = nextFirst;
   for (; older != shownLast.base() && newer != nextLast.base(); ++older, ++newer) {
     if (drawTheSame(*older, *newer)) continue;
-    add(*older);
-    add(*newer);
+    if (differInTextAlone(*older, *newer)) {
+      addTexts(*older, *newer);
+    } else {
+      addItem(*older);
+      addItem(*newer);
+    }
   }
-  std::for_each(older, shownLast.base(), [this](const SKIA_Item& item) { add(item); });
-  std::for_each(newer, nextLast.base(), [this](const SKIA_Item& item) { add(item); });
+  std::for_each(older, shownLast.base(), addItem);
+  std::for_each(newer, nextLast.base(), addItem);
 }
 
-void Changes::add(const SKIA_Item& item) {
-  const Pixels area = boundsOf(item, wholeOf(screen));
+// Of a text that leaves most of its item free, the rest stays. Others are left whole, since the
+// items of neighbours become one piece.
+void Changes::addTexts(const SKIA_Item& older, const SKIA_Item& newer) {
+  const Pixels before = boundsOf(older, wholeOf(screen));
+  const Pixels after = boundsOf(newer, wholeOf(screen));
+  const Pixels whole = unionOf(before, after);
+  if (pieces.size() >= kMostPieces) return add(whole);
+  const Pixels texts = unionOf(textArea(older, before), textArea(newer, after));
+  add(2 * sizeOf(texts) <= sizeOf(whole) ? texts : whole);
+}
+
+void Changes::add(const Pixels& area) {
   if (isEmpty(area)) return;
-  around = isEmpty(around) ? area : unionOf(around, area);
+  around = unionOf(around, area);
   if (pieces.size() <= kMostBounds) pieces.push_back(area);
 }
 

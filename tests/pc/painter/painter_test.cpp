@@ -51,6 +51,16 @@ TEST(Painter, RoundBoxesHaveSmoothCorners) {
   }
 }
 
+TEST(Painter, RowsOverAGroundLeaveItsEndsAndWhatStandsThere) {
+  const Picture picture =
+      painted({boxItem({0, 0, 100, 60, kWhite}), boxItem({1, 20, 3, 3, kRed}),
+               boxItem({4, 10, 92, 30, kBlack}), boxItem({97, 20, 3, 3, kBlue})});
+  EXPECT_EQ(picture.inkIn({4, 10, 92, 30}), 0);
+  EXPECT_EQ(picture.inkIn({0, 0, 100, 60}, kWhite), 92 * 30 + 2 * 3 * 3);
+  EXPECT_EQ(picture.inkIn({1, 20, 3, 3}, kRed & 0xFFFFFF), 0);
+  EXPECT_EQ(picture.inkIn({97, 20, 3, 3}, kBlue & 0xFFFFFF), 0);
+}
+
 TEST(Painter, DrawsLinesInTheirWidthFromAnywhereToAnywhere) {
   const auto line = [](SKIA_Point points) { return painted({lineItem(points)}); };
   EXPECT_EQ(line({40, 30, 20, 30, kRed, 4}), painted({boxItem({20, 28, 20, 4, kRed})}));
