@@ -97,6 +97,9 @@ class TraceRunner {
 
   Outcome lookAgainUntil(uint64_t deadline, uint64_t now, const std::string& why);
   std::optional<ScreenPoint> find(const Place& place, std::string& why) const;
+  std::optional<ScreenPoint> findKey(const std::string& text, std::string& why) const;
+  static std::optional<ScreenPoint> pick(const std::vector<ShownText>& texts,
+                                         const TextPattern& wanted, std::string& why);
   void planTouch(const Touch& touch, ScreenPoint place, ScreenPoint to, uint64_t now);
   Planned moveStep(const Motion& motion, int number);
   std::string whyNot(const Look& look);
