@@ -149,9 +149,9 @@ std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::st
 // One name for all names of a file, whether there is one or not.
 std::filesystem::path placeOf(const std::filesystem::path& file) {
   std::error_code failure;
-  const std::filesystem::path place =
-      std::filesystem::weakly_canonical(std::filesystem::absolute(file), failure);
-  return failure ? file.lexically_normal() : place;
+  const std::filesystem::path whole = std::filesystem::absolute(file, failure);
+  const std::filesystem::path place = std::filesystem::weakly_canonical(whole, failure);
+  return failure ? file : place;
 }
 
 // Empty: each file to write is another one, and none that is read or that the application is given.
