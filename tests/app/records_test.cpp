@@ -328,7 +328,7 @@ TEST_F(Records, SurviveAFullDiskAndALock) {
 class SilentServer {
  public:
   SilentServer() {
-    ::bind(socket, reinterpret_cast<const sockaddr*>(&address), sizeof address);
+    EXPECT_EQ(::bind(socket, reinterpret_cast<const sockaddr*>(&address), sizeof address), 0);
     ::listen(socket, 1);
     socklen_t length = sizeof address;
     ::getsockname(socket, reinterpret_cast<sockaddr*>(&address), &length);

@@ -168,9 +168,9 @@ void readUndisturbed(const fs::path& path, const std::function<void()>& task) {
   const auto filesNow = [&path] {
     return std::pair(stateOf(placeOfFile(path)), stateOf(beside(path, "-wal")));
   };
-  for (int left = kMostTries;; --left) {
+  for (int tries = 0; tries < kMostTries; ++tries) {
     const auto before = filesNow();
-    const bool isSafe = wayToRead(path).hasLocks || left == 1;
+    const bool isSafe = wayToRead(path).hasLocks;
     try {
       task();
       if (isSafe || filesNow() == before) return;
@@ -178,6 +178,7 @@ void readUndisturbed(const fs::path& path, const std::function<void()>& task) {
       if (isSafe || filesNow() == before) throw;
     }
   }
+  throw StoreBusy(path.native() + ": is opened and closed all the time by other programs");
 }
 
 bool isOfDatabase(const fs::path& file, const fs::path& database) {
