@@ -50,16 +50,17 @@ ExitCode judgeLast(const Options& options, const ResultBook& book) {
 }
 
 std::string wrongScreen() {
-  constexpr int kLeastShort = 320;  // pixels
-  constexpr int kLeastLong = 480;
+  constexpr int kLeastWidth = 320;   // pixels
+  constexpr int kLeastHeight = 480;  // the menu's head takes 340 of them
   constexpr int kMostRatio = 3;
   int width = 0;
   int height = 0;
   brimol_host_screen_size(&width, &height);
   const auto [shorter, longer] = std::minmax(width, height);
-  if (shorter >= kLeastShort && longer >= kLeastLong && longer <= kMostRatio * shorter) return {};
+  if (width >= kLeastWidth && height >= kLeastHeight && longer <= kMostRatio * shorter) return {};
   return "the screen of " + std::to_string(width) + "x" + std::to_string(height) +
-         " pixels has no room for the pages: at least 320x480, and no side three times the other";
+         " pixels has no room for the pages: at least 320 wide and 480 high, and no side more than "
+         "three times the other";
 }
 
 void loop(FactoryTest& test, bool stays) {
@@ -125,6 +126,9 @@ void tellWaiting(const ResultBook& book) {
 ExitCode runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
   chooseLanguage(options.language);
+  if (!options.language.empty() && !hasCatalogue(options.language)) {
+    complain("no catalogue of the language '" + options.language + "': texts are English");
+  }
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   if (!options.monkey.empty()) letMonkeyPlay(options);
