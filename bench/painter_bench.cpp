@@ -5,9 +5,9 @@
 #include <benchmark/benchmark.h>
 
 #include <algorithm>
-#include <array>
 #include <chrono>
 #include <cstring>
+#include <deque>
 #include <vector>
 
 #include "allocations.h"
@@ -30,26 +30,26 @@ double microsecondsOf(const Work& work) {
   return Microseconds(Clock::now() - start).count();
 }
 
-// Frames' worth of memory, more of it than caches hold.
+// The pictures of idle painters, in pages like those that are measured; more than caches hold.
 class Buffers {
  public:
   Buffers() {
-    for (auto& buffer : buffers) buffer.resize(kFrameBytes);
+    while (painters.size() < kCount) painters.emplace_back(scenes::kScreen);
   }
 
   double setNext() {
-    auto& buffer = buffers.at(next % buffers.size());
+    auto* const bytes = cairo_image_surface_get_data(painters.at(next % kCount).picture());
     ++next;
-    return microsecondsOf([&buffer, value = static_cast<int>(next % 2)] {
-      std::memset(buffer.data(), value, buffer.size());
-      benchmark::DoNotOptimize(buffer.data());
+    return microsecondsOf([bytes, value = static_cast<int>(next % 2)] {
+      std::memset(bytes, value, kFrameBytes);
+      benchmark::DoNotOptimize(bytes);
       benchmark::ClobberMemory();
     });
   }
 
  private:
   static constexpr std::size_t kCount = 6;
-  std::array<std::vector<unsigned char>, kCount> buffers;
+  std::deque<Painter> painters;
   std::size_t next = 0;
 };
 

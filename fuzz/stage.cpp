@@ -69,7 +69,7 @@ Stage::Stage(test::Arguments& given) : from(given) {
 Stage::~Stage() {
   test::whenTold = nullptr;
   for (Occupant& each : occupants) each.reset();
-  while (MW::Window::getEventService()->recvEvent() != nullptr) continue;
+  while (MW::EventService::recvEvent() != nullptr) continue;
   MW::WidgetList::destroy();
   MW::isDisplayUpdate(0);
 }
@@ -95,7 +95,7 @@ void Stage::operate(std::size_t place) {
 }
 
 void Stage::dispatch(const Event& event) {
-  MW::Window::getEventService()->sendEvent(&event);
+  MW::EventService::sendEvent(&event);
   dispatcher().threadLoop();
 }
 

@@ -57,6 +57,17 @@ class Results:
         """The first `count` numbers in this order that count; fewer as long as there are no more."""
         return list(itertools.islice((n for n in order if n in self.of and self.of[n]['status'] in COUNTED), count))
 
+    def first_missing(self, order, count, taken):
+        """The first number that is neither tried nor taken, or None where enough before it count."""
+        for number in order:
+            if number in self.of:
+                count -= self.of[number]['status'] in COUNTED
+            elif number not in taken:
+                return number
+            if count == 0:
+                break
+        return None
+
 
 class Session:
     """Mutants of one project, tried on several builds at once."""
@@ -93,7 +104,7 @@ class Session:
 
     def run(self, order, count, results):
         """Tries the mutants in this order until so many count."""
-        waiting = iter([number for number in order if number not in results.of])
+        taken = set()
         for number, line in results.of.items():
             if line['status'] in COUNTED:
                 self.objects.setdefault(line['objects'], number)
@@ -102,8 +113,8 @@ class Session:
             build.make()
             while True:
                 with self.lock:
-                    done = len(results.counted(order, count)) >= count
-                    number = None if done else next(waiting, None)
+                    number = results.first_missing(order, count, taken)
+                    taken.add(number)
                 if number is None:
                     return
                 self.try_one(build, number, results)

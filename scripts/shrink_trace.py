@@ -15,7 +15,8 @@ import sys
 import tempfile
 
 STEP = re.compile(r"(\d+) (.+)")
-LONGEST_PAUSE = 1000  # ms; what an application does by itself takes less
+SHORT_PAUSE = 1000  # ms; what most applications do by themselves takes less
+FEW = 8  # steps of one gesture
 
 
 class Shrinker:
@@ -40,19 +41,42 @@ class Shrinker:
         return ended == self.code
 
     def shrink(self, head, steps):
-        """Leaves out parts, large ones first, until no single step can go."""
-        size = len(steps) // 2
+        """Leaves out parts, large ones first, until no single step and no few in a row can go."""
+        size = max(len(steps) // 2, 1)
         while size > 0:
-            start = 0
-            while start < len(steps):
-                rest = steps[:start] + steps[start + size:]
-                if self.fails(head, rest):
-                    steps = rest
-                    print(f"{len(steps)} steps", flush=True)
-                else:
-                    start += size
-            size //= 2
+            before = len(steps)
+            steps = self.leave_out(head, steps, size)
+            # What is gone may have been what a larger part was needed for.
+            size = min(FEW, before // 2) if size == 1 and len(steps) < before else size // 2
+        shorter = [(min(pause, SHORT_PAUSE), words) for pause, words in steps]
+        return shorter if self.fails(head, shorter) else steps
+
+    def shorten_end(self, head, steps):
+        """The head, with less time after the last step if that is well: all runs that do not fail last until then."""
+        short = [re.sub(r"^linger \d+", "linger 500", line) for line in head]
+        return short if short != head and self.fails(short, steps) else head
+
+    def leave_out(self, head, steps, size):
+        """Goes over the steps once, and leaves out every part of this size without which the failure comes."""
+        start = 0
+        while start < len(steps):
+            rest = self.without(head, steps, start, start + size)
+            if rest is None:
+                start += size
+                continue
+            steps = rest
+            print(f"{len(steps)} steps", flush=True)
         return steps
+
+    def without(self, head, steps, start, end):
+        """The steps without a part, if the failure comes: the others at their times, or else earlier."""
+        before, gone, after = steps[:start], steps[start:end], steps[end:]
+        if after:
+            pause = sum(each for each, _ in gone) + after[0][0]
+            later = before + [(pause, after[0][1])] + after[1:]
+            if self.fails(head, later):
+                return later
+        return before + after if self.fails(head, before + after) else None
 
 
 def read(path):
@@ -64,7 +88,7 @@ def read(path):
             head.append(line)
             continue
         time = int(found[1])
-        steps.append((min(time - last, LONGEST_PAUSE), found[2]))
+        steps.append((time - last, found[2]))
         last = time
     return head, steps
 
@@ -84,6 +108,7 @@ def main():
     shrinker = Shrinker(wanted.program, wanted.exit, wanted.seconds)
     if not shrinker.fails(head, steps):
         sys.exit(f"shrink_trace.py: {wanted.trace}: the program does not fail under it")
+    head = shrinker.shorten_end(head, steps)
     steps = shrinker.shrink(head, steps)
     wanted.short.write_text("".join(head) + "".join(f"+{pause} {words}\n" for pause, words in steps))
     print(f"{len(steps)} steps after {shrinker.runs} runs: {wanted.short}")

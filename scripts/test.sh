@@ -53,10 +53,10 @@ run_tests() {
     return
   fi
   (while :; do :; done) &
-  local busy=$! result=0
-  ctest --preset "$@" --parallel "$(nproc)" --schedule-random --repeat "until-fail:$repeat" || result=$?
-  kill $busy
-  return $result
+  trap "kill $!" EXIT
+  ctest --preset "$@" --parallel "$(nproc)" --schedule-random --repeat "until-fail:$repeat"
+  kill $!
+  trap - EXIT
 }
 
 run_suite() {

@@ -21,6 +21,9 @@ from batches import make_batches
 # file's. The compiler looks for hidden names in each file by itself.
 LEFT_OUT = ('--checks=-bugprone-suspicious-include', '--extra-arg=-Wno-shadow')
 
+# Projects of their own, which tests build.
+STAND_ALONE = ('tests/install/outer/', 'tests/mutants/tiny/')
+
 
 def read_units(folder, files):
     """The options of each of the files, without its own name and what it is compiled to."""
@@ -31,6 +34,13 @@ def read_units(folder, files):
             command = re.sub(r' -(o|MT|MF) \S+', '', entry['command'])
             units[path] = tuple(word for word in shlex.split(command) if word not in ('-c', '-MD', entry['file']))
     return units
+
+
+def check_all_known(units, files):
+    """What no target of the build compiles would be passed over in silence."""
+    unknown = [name for name in files if os.path.realpath(name) not in units and not name.startswith(STAND_ALONE)]
+    if unknown:
+        sys.exit(f'tidy.py: not of this build: {", ".join(unknown)}')
 
 
 def batches_of(units):
@@ -67,6 +77,7 @@ def look_at(folder, batch):
 def main():
     build = pathlib.Path(sys.argv[1]).resolve()
     units = read_units(build, {os.path.realpath(name) for name in sys.argv[2:]})
+    check_all_known(units, sys.argv[2:])
     batches = batches_of(units)
     folder = build / 'tidy'
     write_batches(folder, batches)

@@ -34,6 +34,9 @@ void receiveLog(const __android_logger_data* data, const char* message) {
   }
 }
 
+// Counts down to the call that fails. The platform's lock is held.
+bool failsNow() { return thePlatform.failingCall > 0 && --thePlatform.failingCall == 0; }
+
 DrawnText drawn(const SKIA_Text& text) {
   const auto length = static_cast<std::size_t>(text.string_len);
   // A length outside the record is kept as a text that fits into none.
@@ -45,7 +48,7 @@ int draw(Call call, const SKIA_Rect& rect, const SKIA_Text& text = {}, const SKI
          int kind = 0) {
   const std::lock_guard guard(thePlatform.lock);
   if (thePlatform.records) thePlatform.drawings.push_back({call, rect, line, drawn(text), kind});
-  return thePlatform.nextHandle;
+  return failsNow() ? -1 : thePlatform.nextHandle;
 }
 
 }  // namespace
@@ -76,6 +79,7 @@ void RecordingPlatform::reset() {
 
 using brimol::test::Call;
 using brimol::test::draw;
+using brimol::test::failsNow;
 using brimol::test::platform;
 
 // What was drawn before goes into no frame.
@@ -148,7 +152,7 @@ void getDpi(float* xdpi, float* ydpi) {
 // NOLINTNEXTLINE(readability-identifier-naming): the parameters are named as in the contract
 int property_get(const char* key, char* value, const char* default_value) {
   const std::lock_guard guard(platform().lock);
-  if (!platform().hasProperties) return -1;
+  if (!platform().hasProperties || failsNow()) return -1;
   // Without memory: tests let allocations fail.
   const auto& all = platform().properties;
   const auto found = std::ranges::find(
@@ -162,7 +166,7 @@ int property_get(const char* key, char* value, const char* default_value) {
 
 int property_set(const char* key, const char* value) {
   const std::lock_guard guard(platform().lock);
-  if (!platform().hasProperties) return -1;
+  if (!platform().hasProperties || failsNow()) return -1;
   platform().properties.insert_or_assign(key, value);
   return 0;
 }

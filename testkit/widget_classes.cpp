@@ -149,7 +149,7 @@ void listenToPanel(MW::Widget& widget) {
 // A descriptor and what it makes, which has its callbacks from it.
 class Described : public MW::WidgetRcui {
  public:
-  explicit Described(Arguments& from) : Described(from, std::make_unique<Parts>(from)) {}
+  explicit Described(Arguments& from) : Described(Parts(from)) {}
 
  private:
   struct Parts {
@@ -177,8 +177,7 @@ class Described : public MW::WidgetRcui {
     MW::ref_t ref;
     MW::ref_cb_t callbacks;
   };
-  Described(Arguments&, std::unique_ptr<Parts> parts)
-      : WidgetRcui(&parts->ref, &parts->callbacks, 0) {}
+  explicit Described(Parts&& parts) : WidgetRcui(&parts.ref, &parts.callbacks, 0) {}
 };
 
 const Operations kOfStyled = {operation(&MW::ButtonNew::setBdWidth)};

@@ -132,7 +132,7 @@ void FactoryTest::updateTest(uint32_t now) {
   const Outcome outcome = running->test->verdict();
   if (outcome == Outcome::Running && isOverdue(running->step, now - running->startTicks)) {
     context.log.add("Time-out");
-    finish(Outcome::Fail, now);
+    finish(Outcome::Fail, now, Reason::TimeOut);
     return;
   }
   if (outcome == Outcome::Running) return;
@@ -244,7 +244,8 @@ void FactoryTest::start(std::size_t entry, uint32_t now) {
   MW::isDisplayUpdate(1);
 }
 
-void FactoryTest::finish(Outcome outcome, uint32_t now) {
+// `failure`: why, where the outcome is a FAIL.
+void FactoryTest::finish(Outcome outcome, uint32_t now, Reason failure) {
   const std::size_t entry = running->entry;
   running->test->leave();
   if (outcome == Outcome::Retry) {
@@ -257,7 +258,7 @@ void FactoryTest::finish(Outcome outcome, uint32_t now) {
                                                    : Verdict::None;
   // Looking at a test without a verdict keeps the one that it had.
   const bool isNew = given != Verdict::None || book.find(running->step.test) == nullptr;
-  const Verdict verdict = isNew ? keep(*running, given, now) : given;
+  const Verdict verdict = isNew ? keep(*running, given, failure, now) : given;
   running.reset();
   if (run) {
     run->finish(verdict);
@@ -272,11 +273,13 @@ int FactoryTest::attemptAt(const std::string& test) const {
   return earlier == nullptr ? 1 : earlier->attempt + 1;
 }
 
-Verdict FactoryTest::keep(const Running& done, Verdict given, uint32_t now) {
+Verdict FactoryTest::keep(const Running& done, Verdict given, Reason failure, uint32_t now) {
   std::vector<Measure> values = done.test->values();
   const PlanStep& step = done.step;
-  const Verdict verdict =
-      task.simulation.rehearsed(judge(given, values, step), step.test, attemptAt(step.test));
+  const Verdict judged = judge(given, values, step);
+  const Verdict verdict = task.simulation.rehearsed(judged, step.test, attemptAt(step.test));
+  if (judged != given) failure = Reason::Limit;
+  if (verdict != judged) failure = Reason::Rehearsal;
   for (const Measure& each : values) context.log.add(each.name + ": " + measureText(each));
   context.log.add(std::string("Verdict ") + verdictName(verdict));
   std::string error;
@@ -285,7 +288,8 @@ Verdict FactoryTest::keep(const Running& done, Verdict given, uint32_t now) {
                                    .started = done.started,
                                    .duration = std::chrono::milliseconds(now - done.startTicks),
                                    .screen = screenSize(),
-                                   .values = std::move(values)},
+                                   .values = std::move(values),
+                                   .reason = verdict == Verdict::Fail ? failure : Reason::Unknown},
                                   error);
   showKept(isKept, error, now);
   return verdict;

@@ -63,9 +63,9 @@ class FactoryTest {
   void follow(bool isYes, uint32_t now);
   void ask(Asked what, const Question& question);
   void start(std::size_t entry, uint32_t now);
-  void finish(Outcome outcome, uint32_t now);
+  void finish(Outcome outcome, uint32_t now, Reason failure = Reason::Operator);
   int attemptAt(const std::string& test) const;
-  Verdict keep(const Running& done, Verdict given, uint32_t now);
+  Verdict keep(const Running& done, Verdict given, Reason failure, uint32_t now);
   void endRun(uint32_t now);
   void showKept(bool isKept, const std::string& error, uint32_t now);
 

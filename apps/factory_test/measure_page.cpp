@@ -42,12 +42,16 @@ Measure MeasurePage::measure(std::string_view name, double value) const {
   return measured(planStep.test, name, value);
 }
 
+std::vector<Measure> MeasurePage::measure(std::initializer_list<Figure> figures) const {
+  return measured(planStep.test, figures);
+}
+
 double MeasurePage::millimetres(double pixels) {
   constexpr double kInch = 25.4;
   float across = 0;
   float down = 0;
   getDpi(&across, &down);
-  return across > 0 ? pixels * kInch / across : 0;
+  return across > 0 ? pixels * kInch / across : kNotMeasured;
 }
 
 void MeasurePage::updateLook() {

@@ -50,6 +50,8 @@ class MeasurePage : public LookTest {
 
   double parameter(std::string_view name) const { return planStep.parameter(name); }
   Measure measure(std::string_view name, double value) const;
+  std::vector<Measure> measure(std::initializer_list<Figure> figures) const;
+  /// Not measured where the panel's density is unknown.
   static double millimetres(double pixels);
   /// Of a finger that came down before the page.
   bool isOfAnOldTouch(const Input& input) const;

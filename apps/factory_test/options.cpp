@@ -15,6 +15,7 @@
 #include "language/language.h"
 #include "pages/table.h"
 #include "records/commands.h"
+#include "records/sqlite.h"
 #include "results/whole_file.h"
 #include "run_start.h"
 
@@ -140,6 +141,11 @@ std::string sameFiles(const Options& options) {
       if (name == other || file.empty() || its.empty() || !isSameFile(file, its)) continue;
       return std::string(name) + " and " + other + " name the same file";
     }
+  }
+  for (const auto& [name, file] : files) {
+    if (options.database.empty() || file.empty() || name == std::string_view("--database"))
+      continue;
+    if (isOfDatabase(file, options.database)) return std::string(name) + " names the database";
   }
   return "";
 }

@@ -42,7 +42,8 @@ Keeping keepingOf(const Options& options) {
           .database = options.database,
           .resume = options.newRun ? Database::Resume::No : Database::Resume::Yes,
           .first = asksForUnit(options) ? FirstRun::WithUnit : FirstRun::AtOnce,
-          .line = options.line};
+          .line = options.line,
+          .isOnlyShown = !options.shot.empty()};
 }
 
 bool asksForUnit(const Options& options) {
@@ -68,6 +69,13 @@ std::string wrongRecords(const Options& options) {
     return "--junit: " + options.junit + " holds something else than a report, and stays as it is";
   }
   if (!options.serial.empty() && !isSerial(options.serial, why)) return "--serial: " + why;
+  if (!options.database.empty() && !options.monkey.empty()) {
+    return "--monkey judges nothing: no --database";
+  }
+  if (!options.shot.empty() && !(options.database.empty() && options.junit.empty())) {
+    return "--shot keeps nothing: neither --database nor --junit";
+  }
+  if (options.newRun && options.database.empty()) return "--new-run needs --database";
   if (options.line.empty()) return "";
   if (options.database.empty()) return "--line needs --database, which always comes first";
   const std::string wrong = wrongPostgresUrl(options.line);

@@ -1,7 +1,9 @@
 /// Texts in UTF-8, byte by byte.
 #pragma once
 
+#include <algorithm>
 #include <cstddef>
+#include <string>
 #include <string_view>
 
 namespace factory_test {
@@ -27,5 +29,19 @@ constexpr std::size_t wholeBytes(std::string_view text, std::size_t most) {
 }
 static_assert(wholeBytes("a\xc3\xa4", 2) == 1);
 static_assert(wholeBytes("a\xc3\xa4", 3) == 3);
+
+/// The text as a message quotes it: of a long one so many bytes, and dots.
+inline std::string shortened(std::string_view text, std::size_t most = 60) {
+  const std::string_view shown = text.substr(0, wholeBytes(text, most));
+  return std::string(shown) + (shown.size() < text.size() ? "..." : "");
+}
+
+/// The line, from 1, of the first NUL byte, which readers of JSON take for the text's end; 0: there
+/// is none.
+inline int lineOfNul(std::string_view text) {
+  const std::size_t nul = text.find('\0');
+  if (nul == std::string_view::npos) return 0;
+  return 1 + static_cast<int>(std::ranges::count(text.substr(0, nul), '\n'));
+}
 
 }  // namespace factory_test

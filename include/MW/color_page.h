@@ -30,7 +30,7 @@ class MW_API ColorPage : public Widget {
   /// A box below it that was not set has no size and says "ABC". Returns 1.
   int show(unsigned int ticks) override;
   /// Raises the redraw flag from the time of the last key click on, if a derived class has set
-  /// `timerOn`.
+  /// `timerOn`: in every timer pass from the first one on that finds the time reached.
   void updateTimer(unsigned int ticks) override;
   /// Makes it inactive. Returns 1.
   int hide() override;
@@ -87,7 +87,8 @@ class MW_API ColorPage : public Widget {
   unsigned int bgColor;
   unsigned int textCount = 0;  // boxes drawn
   std::array<TextBox, kTexts> boxes = {};
-  KeyClicks keyClicks;  // updateTimer() waits for its time
+  KeyClicks keyClicks;           // updateTimer() waits for its time
+  unsigned int timeReached = 0;  // which it found reached last: later wraps do not matter to it
 };
 
 }  // namespace MW

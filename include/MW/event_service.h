@@ -5,18 +5,19 @@
 #include <MW/records.h>
 #include <brimol/input.h>
 
-#include <atomic>
-#include <list>
-
 namespace MW {
 
 /// Polls the platform's input on a thread of its own and queues what comes for the dispatch
 /// thread. Window::init creates the one service, Window::destroy deletes it.
+///
+/// All operations are static, so that a call through what Window::getEventService() returned harms
+/// nothing when no service runs any more: an event is then lost, and a warning is logged.
 class MW_API EventService {
  public:
   /// Starts the platform's input and the input thread. Window::init does it for the application.
   EventService();
-  /// Stops both and waits. Events that are still queued are lost, and their memory is not freed.
+  /// Stops both and waits. Events that are still queued are lost, and their memory is not freed:
+  /// the process keeps it to its end.
   ~EventService();
   EventService(const EventService&) = delete;
   EventService& operator=(const EventService&) = delete;
@@ -25,23 +26,23 @@ class MW_API EventService {
   /// error line, when the thread could not be created.
   static int startEvent();
   static int stopEvent();
-  /// 1 until the destructor begins. Any thread.
-  int isActive() const;
+  /// 1 from the constructor on until the destructor begins, else 0. Any thread.
+  static int isActive();
 
   /// Converts the platform's record and queues it. Without memory the event is lost and a line is
   /// logged. Any thread.
-  void sendEvent(const Event* event);
+  static void sendEvent(const Event* event);
   /// Fills `data` from the platform's record. A type that is not known gives kEventUnknown.
   static void parseEvent(const Event* event, event_data* data);
   /// Queues a block from malloc, which recvEvent() frees. A block still queued when the service
-  /// ends is freed by nobody. Without memory to queue it, it is freed at once and a line is logged.
-  /// Null is ignored. Any thread.
-  void saveQueue(event_data* data);
+  /// ends is freed by nobody. Without memory to queue it, or without a service, it is freed at once
+  /// and a line is logged. Null is ignored. Any thread.
+  static void saveQueue(event_data* data);
   /// Queues an application event (code 6) that carries `value`. As for sendEvent. Any thread.
-  void AppEvent(int value);
+  static void AppEvent(int value);
   /// The oldest event, in a record of the service that stays valid until the next call, or null.
   /// For one thread alone; while the window runs that is the dispatch thread.
-  event_data* recvEvent();
+  static event_data* recvEvent();
 
   /// Whether it is a pointer event inside `area`, left and top edges in, the others out. False
   /// where one of the two is null. Any thread; works without a service.
@@ -49,10 +50,6 @@ class MW_API EventService {
   /// The same for the event's point and those 20 pixels right, left, below and above it: whether
   /// one of them is inside.
   static bool isMouseEventAroundMe(const SKIA_Rect* area, const event_data* event);
-
- private:
-  std::list<event_data*> queue;  // guarded by the queue lock
-  std::atomic<int> active = 1;
 };
 
 /// True only for a pointer event of finger 0; false for null.

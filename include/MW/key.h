@@ -57,9 +57,11 @@ class MW_API Key : public Widget {
   void onKeyClickCount(kbd_event key);
 
  protected:
-  KeyClicks keyClicks;       // dispatch thread
-  kbd_event plugEvent = {};  // the one held back; these two are guarded by stateLock
-  unsigned int plugDue = 0;  // GetTicks() milliseconds, 0: none is held
+  KeyClicks keyClicks;  // dispatch thread
+  // Guarded by stateLock.
+  kbd_event plugEvent = {};  // the last PlugCode, held back or told
+  bool plugHeld = false;     // it is held back
+  unsigned int plugDue = 0;  // until then: GetTicks() milliseconds
 };
 
 }  // namespace MW

@@ -230,7 +230,8 @@ class MW_API Widget {
   std::atomic<int> ownerFinger = -1;  // what setOwnerFinger() was given
   FingerHold hold{select};            // which finger holds it
   unsigned int blinkColor = 0;        // 0xAARRGGBB
-  unsigned int blinkNext = 0;         // GetTicks() milliseconds, 0: not started
+  unsigned int blinkNext = 0;         // when the phase ends: GetTicks() milliseconds
+  bool blinkRuns = false;             // false: the first phase begins with the next drawing
   unsigned int blinkCount = 0;        // toggles so far
   int keyDir = kNoSide;               // last key selection
 

@@ -27,7 +27,8 @@ class MW_API Window {
   /// the window is ended again before init() returns.
   static int init();
   /// Stops the dispatch thread and then input, and waits for both. Returns 1. The widgets stay as
-  /// they are. Any thread: a call waits while another thread is inside init() or destroy().
+  /// they are. Where nothing runs, only the log tells of the call. Any thread: a call waits while
+  /// another thread is inside init() or destroy().
   ///
   /// It may also be called in a handler or callback. There it waits for no thread that runs
   /// handlers, since that thread might be waiting for this very handler. On the dispatch thread
@@ -41,8 +42,8 @@ class MW_API Window {
   /// until then. If another thread is inside init() or destroy(), a handler's destroy() logs that
   /// line and leaves the end to the other thread.
   static int destroy();
-  /// The running event service; null before init() and after destroy(). Valid until destroy()
-  /// begins; no thread may use it from then on.
+  /// The running event service; null before init() and after destroy(). Events that are posted
+  /// through it from then on are lost, and the log tells of each.
   static EventService* getEventService();
 
   /// Appends the widget to the layer that its type() names (0 top, 1 base) and sets its id to the

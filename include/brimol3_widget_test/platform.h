@@ -24,6 +24,7 @@ struct PlatformState {
   int liveAsked = 0;           ///< how often it was asked
   int nextHandle = 0;          ///< what drawing calls return
   bool hasProperties = true;   ///< false: calls of properties fail, and leave alone what is given
+  int failingCall = 0;         ///< which drawing or property call fails; 1: the next, 0: none
   float xdpi = 0;              ///< dots per inch, 0: unknown
   float ydpi = 0;              ///< the same
   int inits = 0;               ///< of the input service

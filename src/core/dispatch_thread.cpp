@@ -88,9 +88,7 @@ android::status_t func_dispatchEvent::readyToRun() {
 
 bool func_dispatchEvent::threadLoop() {
   thread = std::this_thread::get_id();
-  EventService* const service = Window::getEventService();
-  const event_data* const received = service != nullptr ? service->recvEvent() : nullptr;
-  if (received != nullptr) {
+  if (const event_data* const received = EventService::recvEvent(); received != nullptr) {
     // A handler may end and start the window, so that the service's record changes meanwhile.
     event_data event = *received;
     if (dispatch(&event)) isDisplayUpdate(1);

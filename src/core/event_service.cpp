@@ -3,7 +3,9 @@
 
 #include <algorithm>
 #include <array>
+#include <atomic>
 #include <cstdlib>
+#include <list>
 #include <memory>
 #include <mutex>
 #include <new>
@@ -22,6 +24,16 @@ constexpr int kProbeDistance = 20;  // pixels
 
 constinit std::mutex EvtQL;  // the queue lock
 constinit event_data handedOut = {};
+constinit std::atomic<int> active = 0;
+
+// Guarded by EvtQL.
+struct Queue {
+  bool isOpen = false;  // a service runs
+  std::list<event_data*> waiting;
+  std::list<event_data*> lost;  // what waited when a service ended may be the application's
+};
+// Never deleted: threads may still post while the process ends.
+Queue& queue = *new Queue;
 
 // Null until startEvent. Whoever creates and deletes the service touches it, one thread at a time:
 // Window's lock sees to that.
@@ -53,12 +65,20 @@ void parseKey(EventCode code, const BrimolKeyEvent& event, event_data& data) {
 
 EventService::EventService() {
   thread_event.clear();  // the ended thread of a service before this one
+  {
+    const std::lock_guard guard(EvtQL);
+    queue.isOpen = true;
+  }
+  active = 1;
   startEvent();
 }
 
 EventService::~EventService() {
   active = 0;
   stopEvent();
+  const std::lock_guard guard(EvtQL);
+  queue.isOpen = false;
+  queue.lost.splice(queue.lost.end(), queue.waiting);
 }
 
 int EventService::startEvent() {
@@ -81,7 +101,7 @@ int EventService::stopEvent() {
   return 1;
 }
 
-int EventService::isActive() const { return active; }
+int EventService::isActive() { return active; }
 
 void EventService::sendEvent(const Event* event) {
   EventBlock block = allocateEvent();
@@ -120,8 +140,12 @@ void EventService::saveQueue(event_data* data) {
   if (data == nullptr) return;
   EventBlock block(data);
   const std::lock_guard guard(EvtQL);
+  if (!queue.isOpen) {
+    kLog.print(LogLevel::Warning, "saveQueue: no service runs, the event is lost");
+    return;
+  }
   try {
-    queue.push_back(data);
+    queue.waiting.push_back(data);
     (void)block.release();
   } catch (const std::bad_alloc&) {
     kLog.print(LogLevel::Debug, "saveQueue malloc fail!.");
@@ -141,9 +165,9 @@ void EventService::AppEvent(int value) {
 
 event_data* EventService::recvEvent() {
   const std::lock_guard guard(EvtQL);
-  if (queue.empty()) return nullptr;
-  const EventBlock front(queue.front());
-  queue.pop_front();
+  if (queue.waiting.empty()) return nullptr;
+  const EventBlock front(queue.waiting.front());
+  queue.waiting.pop_front();
   handedOut = *front;
   return &handedOut;
 }

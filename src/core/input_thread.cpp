@@ -13,12 +13,11 @@ namespace {
 constexpr ClassLog kLog("EVENTSERVICE");
 
 void passOn(const Event& event) {
-  EventService* const service = Window::getEventService();
-  if (service == nullptr) {
+  if (Window::getEventService() == nullptr) {
     kLog.print(LogLevel::Error, "eventLoop Window::getEventService FAIL %d!", 1);
     return;
   }
-  service->sendEvent(&event);
+  EventService::sendEvent(&event);
 }
 
 }  // namespace

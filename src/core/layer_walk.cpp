@@ -154,7 +154,7 @@ void waitForCall(WalkRecord& record, const Widget* widget) {
 LayerWalk::LayerWalk(const Layer& layer)
     : block(layer.current), record(block != nullptr ? takeRecord(block) : nullptr) {
   if (record == nullptr) return;
-  record->thread.store(thisThread(), std::memory_order_release);
+  record->thread = thisThread();
   // Pinned first and compared then: a block that is still current was not freed before it was
   // pinned, and is not freed while it is.
   while (layer.current != block) {

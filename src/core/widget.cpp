@@ -1,3 +1,4 @@
+#include <MW/detail/clock_order.h>
 #include <MW/widget.h>
 
 #include "core/hit_test.h"
@@ -76,6 +77,7 @@ unsigned int Widget::setBlink(int on, unsigned int color) {
   blink = on != 0 ? 1 : 0;
   if (blink == 0) return 0;
   blinkNext = 0;
+  blinkRuns = false;
   blinkCount = 0;
   blinkColor = color;
   return color;
@@ -83,9 +85,10 @@ unsigned int Widget::setBlink(int on, unsigned int color) {
 
 unsigned int Widget::updateBlink(unsigned int now) {
   if (blink == 0) return kColorBlack;
-  if (blinkNext == 0) blinkNext = now + kBlinkMs;
+  if (!blinkRuns) blinkNext = now + kBlinkMs;
+  blinkRuns = true;
   // Counted from the tick that notices the end of a phase, not from the one that was planned.
-  if (blinkNext < now) {
+  if (isOver(now, blinkNext, kBlinkMs)) {
     blinkNext = now + kBlinkMs;
     ++blinkCount;
   }

@@ -54,6 +54,9 @@ void endService() {
 }
 
 void end() {
+  if (event_dispatcher == nullptr && eventService == nullptr) {
+    kLog.print(LogLevel::Warning, "destroy: it does not run");
+  }
   if (!endDispatcher()) {
     kLog.print(LogLevel::Error, kEndLeft);
     return;

@@ -1,5 +1,6 @@
 #include <MW/c_api.h>
 #include <MW/color_page.h>
+#include <MW/detail/clock_order.h>
 #include <brimol/input.h>
 
 #include <algorithm>
@@ -34,7 +35,13 @@ int ColorPage::show(unsigned int) {
 }
 
 void ColorPage::updateTimer(unsigned int ticks) {
-  if (timerOn != 0 && ticks >= read(keyClicks.time)) isDisplayUpdate_c(1);
+  {
+    const std::lock_guard guard(stateLock);
+    const unsigned int due = keyClicks.time;
+    if (due != timeReached && ticks < due && isLater(due, ticks)) return;
+    timeReached = due;
+  }
+  if (timerOn != 0) isDisplayUpdate_c(1);
 }
 
 int ColorPage::hide() {

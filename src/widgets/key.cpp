@@ -1,3 +1,4 @@
+#include <MW/detail/clock_order.h>
 #include <MW/key.h>
 #include <MW/window.h>
 #include <brimol/input.h>
@@ -37,10 +38,10 @@ int Key::show(unsigned int) {
   std::optional<kbd_event> settled;
   {
     const std::lock_guard guard(stateLock);
-    if (plugDue == 0 || plugDue >= GetTicks()) return 1;
+    if (!plugHeld || !isOver(GetTicks(), plugDue, kPlugHoldMs)) return 1;
     if (isPassing(plugEvent.code)) plugEvent.code = kPlugSettled;
     settled = plugEvent;
-    plugDue = 0;
+    plugHeld = false;
   }
   plugCallback(&*settled);
   return 1;
@@ -67,12 +68,13 @@ void Key::onPlugKey(kbd_event key) {
     const std::lock_guard guard(stateLock);
     if (key.code == kPlugSettled || isPassing(key.code)) {
       plugEvent = key;
+      plugHeld = true;
       plugDue = GetTicks() + kPlugHoldMs;
       return;
     }
     if (isPassing(plugEvent.code)) return;
     isTold = plugEvent.code == kPlugSettled;
-    plugDue = 0;
+    plugHeld = false;
   }
   if (isTold) plugCallback(&key);
 }

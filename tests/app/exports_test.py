@@ -7,6 +7,7 @@ import base64
 import csv
 import io
 import json
+import os
 import pathlib
 import resource
 import subprocess
@@ -66,8 +67,14 @@ class ExportsTest(unittest.TestCase):
 
     def test_results_file_fits_its_schema(self):
         results = self.folder / "results.json"
-        subprocess.run([FACTORY_TEST, "--headless", "--results", results, "--shot", self.folder / "menu.png"],
-                       check=True)
+        trace = self.folder / "short.trace"
+        trace.write_text("brimol-trace 1\nwait 10\n")
+        out = subprocess.run([FACTORY_TEST, "--headless", "--results", results], check=False,
+                             env=os.environ | {"BRIMOL_TRACE": str(trace)})
+        self.assertEqual(4, out.returncode)
+        before = results.stat()
+        self.program("--headless", "--results", results, "--shot", self.folder / "menu.png")
+        self.assertEqual(before, results.stat(), "a picture keeps nothing")
         written = json.loads(results.read_text())
         self.validate("results", written)
         self.assertEqual(("Default", 64), (written["plan"]["name"], len(written["plan"]["hash"])))
@@ -83,6 +90,7 @@ class ExportsTest(unittest.TestCase):
         text = file.read_text()
         self.assertEqual(UNITS, text.count("<testsuite "))
         self.assertIn("worst distance", text)
+        self.assertIn('<failure message="time-out"/>', text)
         self.assertEqual(UNITS, text.count('<property name="plan_hash" value="h3"/>'))
 
     def test_csv_has_a_line_for_each_value(self):
@@ -91,6 +99,7 @@ class ExportsTest(unittest.TestCase):
         self.assertEqual({"'=s-0"}, {row["unit"] for row in rows[:TESTS * 2]}, "no formula for a spreadsheet")
         self.assertEqual({"7"}, {row["value"] for row in rows if row["value_name"] == "<i>hits</i>"})
         self.assertNotIn(None, rows[0].values())
+        self.assertEqual({("PASS", ""), ("FAIL", "time-out")}, {(row["verdict"], row["reason"]) for row in rows})
 
     def test_pages_stand_alone_in_a_browser(self):
         for name, options in (("runs", ["export", "--html"]), ("report", ["report"])):
@@ -123,7 +132,10 @@ class ExportsTest(unittest.TestCase):
         page = self.export("report", "--value", "worst distance")
         self.assertIn("worst distance", page)
         self.assertNotIn("hits", page)
-        self.assertIn("There are none.", self.export("report", "--value", "unknown"))
+        for word in ("--value", "--serial"):
+            out = self.program("report", word, "unknown", "--database", self.store)
+            self.assertEqual((0, 1), (out.returncode, out.stderr.count("unknown\n")))
+            self.assertIn("There are none.", out.stdout)
         self.assertIn("none yet", self.export("report", "--since", "2030-01-01"))
 
     def test_full_disks_lose_nothing_that_was_there(self):
@@ -135,7 +147,7 @@ class ExportsTest(unittest.TestCase):
             del result["id"]
         results.write_text(json.dumps({"version": 2, "results": document["results"]}))
         verdicts = self.export("export", "--csv")
-        screen = ("--headless", "--shot", self.folder / "full.png")
+        screen = ("--headless",)
         with open("/dev/full", "w", encoding="ascii") as full:
             for most, arguments, where, says in [
                     (1 << 20, ["export", "--json", "--database", self.store], full, "stdout cannot be written"),
@@ -158,10 +170,12 @@ class ExportsTest(unittest.TestCase):
 
     def test_wrong_use_and_what_cannot_be_read(self):
         store = ("--database", str(self.store))
+        (self.folder / "empty.db").touch()
         for arguments, code, says in [
                 (["export", "--json"], 2, "needs one of --database"),
                 (["export", *store], 2, "needs one of --json"),
                 (["export", "--json", *store, "--line", "postgresql://x"], 2, "needs one of --database"),
+                (["export", "--json", "--csv", *store], 2, "takes only one of --json"),
                 (["report", "--json", *store], 2, "unknown option '--json'"),
                 (["report", "--database"], 2, "--database needs a value"),
                 (["report", "--since", "2026-02-30", *store], 2, "--since needs a day"),
@@ -169,6 +183,7 @@ class ExportsTest(unittest.TestCase):
                 (["report", "--line", "x"], 2, "--line needs an address"),
                 (["report", "--database", "/none.db"], 1, "/none.db: cannot be opened: No such file"),
                 (["report", "--database", __file__], 1, "is not a database"),
+                (["report", "--database", self.folder / "empty.db"], 1, "holds no factory test's records"),
                 (["report", *store, "--output", "/none/x"], 1, "/none/x: cannot be written: No such file"),
         ]:
             with self.subTest(arguments):

@@ -66,6 +66,13 @@ class LineTest(unittest.TestCase):
         for number in range(STATIONS):
             own |= history("--database", self.folder / f"{number}.db")
         self.assertEqual(own, line)
+        # A line that an older program made.
+        self.server.ask("alter table factory_test.verdicts drop column operator, drop column reason")
+        self.assertEqual(own.keys(), history("--line", self.server.url).keys())
+        with self.station(9, units=1) as late:
+            late.communicate()
+        late = history("--database", self.folder / "9.db")
+        self.assertEqual(late, {run: each for run, each in history("--line", self.server.url).items() if run in late})
 
     def test_a_line_that_is_away_holds_up_nothing(self):
         for url in (f"postgresql:///none?host={self.folder}", "postgresql://127.0.0.1:1/none", "postgresql://%zz"):

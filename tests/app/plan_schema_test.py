@@ -75,6 +75,8 @@ def check_test(test, limits, parameters):
         for value in (of["minimum"], of["maximum"], of["minimum"] - 1, of["maximum"] + 1):
             is_right = of["minimum"] <= value <= of["maximum"]
             check_step({"test": test, "parameters": {name: value}}, is_right)
+        half = of["minimum"] + 0.5
+        check_step({"test": test, "parameters": {name: half}}, of.get("type") != "integer")
 
 
 with tempfile.TemporaryDirectory() as name:

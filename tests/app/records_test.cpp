@@ -30,7 +30,8 @@ RunStart startOf(const std::string& unit) {
 TestResult resultOf(const std::string& test, Verdict verdict, int attempt = 1) {
   const Measure distance = {"worst distance", "mm", 0.1, {}, 2.5};
   return {test,       verdict,    kMorning, std::chrono::milliseconds(4200),
-          {480, 800}, {distance}, attempt};
+          {480, 800}, {distance}, attempt,  Reason::Unknown,
+          "Ann"};
 }
 const TestResult kKeys = resultOf("keys", Verdict::Pass);
 const TestResult kTouch = resultOf("touch", Verdict::Fail);
@@ -120,6 +121,26 @@ TEST_F(Records, AreFinishedWithTheirPlan) {
   EXPECT_EQ(run.verdicts[1].result, resultOf("keys", Verdict::Pass, 2));
 }
 
+TEST_F(Records, NameWhoGaveEachVerdictAndWhy) {
+  RunStart start = startOf("B1");
+  ASSERT_TRUE(open(start)->record(kTouch, error));
+  for (const auto& [name, reason] :
+       {std::pair("Bob", Reason::TimeOut), {"", Reason::Limit}, {"Cem", Reason::Rehearsal}}) {
+    start.operatorName = name;
+    TestResult result = kTouch;
+    result.reason = reason;
+    result.operatorName = "";
+    ASSERT_TRUE(open(start)->record(result, error)) << error;
+  }
+  const RunRecord run = history().at(0);
+  EXPECT_EQ(run.start.operatorName, "Ann");
+  std::vector<std::string> said;
+  for (const VerdictRecord& each : run.verdicts) {
+    said.push_back(each.result.operatorName + " " + reasonName(each.result.reason));
+  }
+  EXPECT_THAT(said, ElementsAre("Ann ", "Bob time-out", " limit", "Cem rehearsal"));
+}
+
 TEST_F(Records, KnowARunThatADeadProgramLeft) {
   auto living = open(startOf("A1"));
   ASSERT_TRUE(living) << error;
@@ -170,16 +191,55 @@ TEST_F(Records, OfAnOlderVersionAreMigratedWithABackup) {
   fs::create_symlink("station.db.v1.bak", file.native() + ".v1.bak");  // in the way, and a loop
   fs::create_symlink(file, folder / "link.db");
   ASSERT_TRUE(ResultBook::open({.database = folder / "link.db"}, startOf("C1"), error)) << error;
-  for (const auto& [path, version] : {std::pair(file, 3), {file.native() + ".v1.bak.2", 1}}) {
+  for (const auto& [path, version] : {std::pair(file, 4), {file.native() + ".v1.bak.2", 1}}) {
     Sqlite store(path, Sqlite::Mode::Read);
     EXPECT_EQ(store.number("pragma user_version"), version);
     const auto runs = readHistory(queryOf(store), {.unit = "OLD 1"});
     ASSERT_EQ(runs.size(), 1U);
+    EXPECT_EQ(runs[0].verdicts.at(1).result.operatorName, version == 1 ? "" : "Eve");
     EXPECT_EQ(runs[0].verdicts.at(1).result.values.at(0), (Measure{"gap", "mm", 0.25, {}, 1.5}));
   }
   Sqlite store(file, Sqlite::Mode::Read);
   EXPECT_EQ(store.number("select count(*) from changes where verdict is not null"), 2);
   EXPECT_EQ(store.number("select revision from runs where unit = 'OLD 1'"), 1);
+}
+
+TEST_F(Records, AreReadWithoutLeavingAFile) {
+  const fs::path odd = folder / "100%?#.db";
+  ASSERT_TRUE(ResultBook::open({.database = odd}, startOf("A1"), error)->record(kKeys, error));
+  const auto expectVerdicts = [&](std::size_t count) {
+    const auto files = [this] {
+      return std::distance(fs::directory_iterator(folder), fs::directory_iterator());
+    };
+    const auto before = files();
+    readUndisturbed(odd, [&] {
+      Sqlite store(odd, Sqlite::Mode::Read);
+      EXPECT_EQ(readHistory(queryOf(store), {}).at(0).verdicts.size(), count);
+    });
+    EXPECT_EQ(files(), before);
+  };
+  expectVerdicts(1);
+  inChild([&] {
+    auto book = ResultBook::open({.database = odd}, startOf("A1"), error);
+    book->record(kKeys, error);
+    ::raise(SIGKILL);
+  });
+  expectVerdicts(2);  // from the log that was left
+  fs::remove(odd.native() + "-shm");
+  expectVerdicts(2);
+  const int end = inChild([&] {
+    fs::permissions(folder, fs::perms(0555));
+    if (::setuid(65'534) != 0 && ::getuid() == 0) ::_exit(2);
+    expectVerdicts(2);
+    ::_exit(HasFailure() ? 1 : 0);
+  });
+  EXPECT_EQ(end, 0) << "a folder that cannot be written";
+  fs::permissions(folder, fs::perms::owner_all);
+  int reads = 0;
+  readUndisturbed(odd, [&] {
+    if (++reads == 1) (void)ResultBook::open({.database = odd}, startOf("A2"), error);
+  });
+  EXPECT_EQ(reads, 2) << "somebody wrote meanwhile";
 }
 
 TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
@@ -193,12 +253,14 @@ TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
     std::function<void()> prepare;
   };
   for (const auto& [says, prepare] : std::vector<Case>{
-           {"is of version 4, newer than this program's 3",
-            [&] { run("pragma user_version = 4"); }},
+           {"is of version 5, newer than this program's 4",
+            [&] { run("pragma user_version = 5"); }},
+           {"has lost its version: put it aside, then begin a new one",
+            [&] { run("pragma user_version = 0"); }},
            {"is another program's database", [&] { run("pragma application_id = 7"); }},
            {"is damaged: put it aside, then begin a new one",
             [&] {
-              run("pragma application_id = 1179927618; pragma user_version = 3");
+              run("pragma application_id = 1179927618; pragma user_version = 4");
               for (std::streamoff page = 1; page < 30; ++page)
                 damage(page * 4096, std::string(64, '\x7f'));
             }},
@@ -291,11 +353,16 @@ TEST_F(Records, SayWhatASilentLineDoesNotTake) {
     store.runAll("insert into lines values ('other', 1000, 'host=other ')");
   }
   const SilentServer server;
-  auto book = ResultBook::open({.database = file, .line = server.url()}, startOf("A2"), error);
-  ASSERT_TRUE(book && book->record(kKeys, error)) << error;
-  EXPECT_TRUE(book->close(error)) << error;
-  EXPECT_EQ(book->lineStatus()->waiting, 2);
-  EXPECT_EQ(book->lineStatus()->error, "the line's database: has not answered in time");
+  int waiting = 1;
+  for (const auto& [url, why] :
+       {std::pair(server.url(), "has not answered in time"),
+        std::pair<std::string, const char*>("postgresql://127.0.0.1:1/line", "refused")}) {
+    auto book = ResultBook::open({.database = file, .line = url}, startOf("A2"), error);
+    ASSERT_TRUE(book && book->record(kKeys, error)) << error;
+    EXPECT_TRUE(book->close(error)) << error;
+    EXPECT_EQ(book->lineStatus()->waiting, ++waiting);
+    EXPECT_THAT(book->lineStatus()->error, testing::HasSubstr(why));
+  }
   EXPECT_THAT(states(), ElementsAre("aborted", "aborted"));
 }
 

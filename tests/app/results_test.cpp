@@ -78,7 +78,8 @@ TEST_F(Results, KeepWhatWasMeasuredOnOneUnit) {
   TestResult result = kColours;
   result.values = {{"worst distance", "mm", 0.1, {}, 2.5}, {"steps", "", 1e300, -1, {}}};
   {
-    auto book = ResultBook::open({.json = file}, {.unit = "A1"}, error);
+    auto book = ResultBook::open({.json = file}, {.unit = "A1", .operatorName = "Bob"}, error);
+    result.reason = Reason::TimeOut;
     ASSERT_TRUE(book && book->record(result, error)) << error;
     result.values.front().value = std::numeric_limits<double>::infinity();  // no number of a file
     ASSERT_TRUE(book->record(result, error)) << error;
@@ -90,6 +91,7 @@ TEST_F(Results, KeepWhatWasMeasuredOnOneUnit) {
   EXPECT_EQ(book->run().unit, "A1");
   result.values.erase(result.values.begin());
   result.attempt = 2;
+  result.operatorName = "Bob";
   EXPECT_EQ(book->results(), std::vector{result});
 }
 
@@ -115,6 +117,7 @@ TEST_F(Results, ThatAreDamagedAreNamedAndLeftAsTheyAre) {
            {kDocumented, "{", "is not JSON"},
            {"1440,", "1440", "is not JSON"},
            {"1440", "1e999", "is not JSON"},
+           {"]}", std::string("]}\n\0{", 5), "is not JSON: holds a NUL byte in line 2"},
            {"colours", "\xff", "is not JSON"},
            {kDocumented, std::string(2 << 20, ' '), "is longer than a MiB"},
            {kDocumented, "[1]", "has no list of \"results\""},
@@ -124,6 +127,8 @@ TEST_F(Results, ThatAreDamagedAreNamedAndLeftAsTheyAre) {
            {"11-21", "02-29", "result 1 has no valid \"started\""},
            {"4200", "18446744073709551615", "result 1 has no valid \"duration_ms\""},
            {"1440", "2147483648", "result 1 has no valid \"screen\""},
+           {"\"attempt\"", R"("reason":"bad","attempt")", "result 1 has no valid \"reason\""},
+           {"\"attempt\"", R"("operator":7,"attempt")", "result 1 has no valid \"operator\""},
            {"height", "depth", "result 1 has no valid \"screen\""},
            {"\"attempt\":1", "\"attempt\":0", "result 1 has no valid \"attempt\""},
            {"[]}", R"([{"name":"a","unit":"","value":"1"}]})", "result 1 has no valid \"values\""},

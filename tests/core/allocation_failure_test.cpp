@@ -21,21 +21,20 @@ using MW::Window;
 
 // An event takes two allocations, its own and the queue's.
 TEST_F(LiveWindowTest, ALostEventIsLoggedAndChangesNothingElse) {
-  MW::EventService& service = *Window::getEventService();
   const auto logOf = [](int nth, const auto& queue) {
     platform().takeLog();
     const FailingAllocation failure(nth);
     queue();
     return platform().takeLog().at(0).message;
   };
-  const auto raise = [&] { service.AppEvent(9); };
-  service.AppEvent(1);
-  EXPECT_EQ(logOf(1, [&] { service.sendEvent(nullptr); }),
+  const auto raise = [&] { MW::EventService::AppEvent(9); };
+  MW::EventService::AppEvent(1);
+  EXPECT_EQ(logOf(1, [&] { MW::EventService::sendEvent(nullptr); }),
             "[EVENTSERVICE] sendEvent malloc fail!.");
   EXPECT_EQ(logOf(1, raise), "[EVENTSERVICE] AppEvent malloc fail!.");
   EXPECT_EQ(logOf(2, raise), "[EVENTSERVICE] saveQueue malloc fail!.");
-  EXPECT_EQ(service.recvEvent()->value, 1);
-  EXPECT_EQ(service.recvEvent(), nullptr);
+  EXPECT_EQ(MW::EventService::recvEvent()->value, 1);
+  EXPECT_EQ(MW::EventService::recvEvent(), nullptr);
 }
 
 TEST_F(WidgetTest, ADisplayItemThatFindsNoMemoryTakesNoIndex) {
@@ -94,7 +93,7 @@ TEST_F(LiveWindowTest, ADialogKeepsAnEventEvenWithoutMemory) {
     int left = passes;
     below.onShow = [&](unsigned int) {
       if (--left > 0) return Window::show(0);
-      Window::getEventService()->AppEvent(1);
+      MW::EventService::AppEvent(1);
       const FailingAllocation failure(1);
       dispatcher->threadLoop();
     };

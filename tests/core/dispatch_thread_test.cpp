@@ -13,8 +13,6 @@ using MW::event_data;
 
 using DispatchTest = LiveWindowTest;
 
-MW::EventService& service() { return *MW::Window::getEventService(); }
-
 // Who is offered an event, ! when that raises the redraw flag, and how often the display is asked
 // whether it is live. The members are registered in this order. Capitals stand in the top layer;
 // t, x and h take what they are offered, s, x and i are selected, h and i are hidden.
@@ -30,7 +28,7 @@ std::string route(const std::string& members) {
     widgets.back()->setSelect(isOneOf("sxiSXI") ? 1 : 0);
   }
   platform().liveAsked = 0;
-  service().AppEvent(1);
+  MW::EventService::AppEvent(1);
   EXPECT_TRUE(dispatcher->threadLoop());
   EXPECT_EQ(std::exchange(platform().paused, 0), 1U);
   return offered + (MW::isDisplayUpdate(0) != 0 ? "!" : "") + std::to_string(platform().liveAsked);
@@ -57,13 +55,14 @@ TEST_F(DispatchTest, ARunningHandlersEventIsItsOwn) {
   int seen = 0;
   ProbeWidget widget;
   widget.onEvent = [&](const event_data* event, unsigned int) {
-    service().AppEvent(9);
-    EXPECT_EQ(service().recvEvent()->value, 9) << "as a window that was started anew would take it";
+    MW::EventService::AppEvent(9);
+    EXPECT_EQ(MW::EventService::recvEvent()->value, 9)
+        << "as a window that was started anew would take it";
     seen = event->value;
     return true;
   };
   widget.enter();
-  service().AppEvent(5);
+  MW::EventService::AppEvent(5);
   dispatcher->threadLoop();
   EXPECT_EQ(seen, 5);
 }

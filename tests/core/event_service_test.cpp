@@ -15,8 +15,6 @@ using MW::EventService;
 
 using EventServiceTest = LiveWindowTest;
 
-EventService& service() { return *MW::Window::getEventService(); }
-
 TEST(EventParseTest, FillsTheRecord) {
   Event event = {};
   for (std::size_t i = 0; i < sizeof event; ++i) event.bytes[i] = static_cast<uint8_t>(0xF0 + i);
@@ -41,16 +39,16 @@ TEST(EventParseTest, FillsTheRecord) {
 }
 
 TEST_F(EventServiceTest, EventsComeOutInTheirOrderInOneRecord) {
-  service().AppEvent(-5);
-  service().sendEvent(nullptr);
-  service().saveQueue(nullptr);
-  service().AppEvent(6);
-  const event_data* const handedOut = service().recvEvent();
+  EventService::AppEvent(-5);
+  EventService::sendEvent(nullptr);
+  EventService::saveQueue(nullptr);
+  EventService::AppEvent(6);
+  const event_data* const handedOut = EventService::recvEvent();
   EXPECT_EQ(handedOut->value, -5);
-  EXPECT_EQ(service().recvEvent(), handedOut);
+  EXPECT_EQ(EventService::recvEvent(), handedOut);
   EXPECT_EQ(handedOut->type, MW::kEventUnknown);
-  EXPECT_EQ(service().recvEvent(), handedOut);
-  EXPECT_EQ(service().recvEvent(), nullptr);
+  EXPECT_EQ(EventService::recvEvent(), handedOut);
+  EXPECT_EQ(EventService::recvEvent(), nullptr);
   EXPECT_EQ(handedOut->value, 6) << "an empty queue leaves the record";
 }
 
@@ -62,7 +60,7 @@ TEST_F(EventServiceTest, InputThreadDrainsAtFullSpeedWhileThereIsAService) {
   EXPECT_EQ(std::pair(platform().inits, platform().initFlags), std::pair(1, 0x01000001U));
   platform().feed(pointerInput(BRIMOL_POINTER_DOWN, {3, 4}));
   EXPECT_TRUE(input->threadLoop());
-  EXPECT_NE(service().recvEvent(), nullptr);
+  EXPECT_NE(EventService::recvEvent(), nullptr);
   EXPECT_EQ(platform().paused, 0U);
   EXPECT_TRUE(input->threadLoop());
   EXPECT_EQ(platform().paused, 1U);
@@ -71,6 +69,23 @@ TEST_F(EventServiceTest, InputThreadDrainsAtFullSpeedWhileThereIsAService) {
   EXPECT_TRUE(input->threadLoop());
   EXPECT_EQ(platform().takeLog().back(),
             logLines(kError, {"[EVENTSERVICE] eventLoop Window::getEventService FAIL 1!"})[0]);
+}
+
+// What is left in the queue is lost with its service, and so is what is posted from then on.
+TEST_F(WidgetTest, EventsWithoutAServiceAreLostAndLogged) {
+  {
+    const EventService service;
+    EXPECT_EQ(EventService::isActive(), 1);
+    EventService::AppEvent(1);
+  }
+  EXPECT_EQ(EventService::isActive(), 0);
+  platform().takeLog();
+  EventService::AppEvent(2);
+  EventService::sendEvent(nullptr);
+  const std::string lost = "[EVENTSERVICE] saveQueue: no service runs, the event is lost";
+  EXPECT_EQ(platform().takeLog(), logLines(kWarning, {lost, lost}));
+  const EventService next;
+  EXPECT_EQ(EventService::recvEvent(), nullptr);
 }
 
 // '#' is on the area, '+' around it.

@@ -49,10 +49,10 @@ std::string phases(std::initializer_list<unsigned int> ticks) {
 TEST_F(WidgetTest, Blinks) {
   EXPECT_EQ(phases({1000, 1500, 1501}), "ddl.");
   EXPECT_EQ(phases({1000, 1900, 2400, 2401}), "dlld.") << "counted from the late tick";
-  // The next toggle lies behind the wrap and looks past until the clock has wrapped.
-  EXPECT_EQ(phases({0xFFFFFF00, 0xFFFFFF01, 0x10, 0x200}), "lddl.");
-  // A toggle at tick 0 stands for none and is set anew behind the wrap.
-  EXPECT_EQ(phases({0xFFFFFE0C, 0x10, 0x204, 0x205}), "llld.");
+  EXPECT_EQ(phases({0xFFFFFF00, 0xFFFFFF01, 0xF4, 0xF5}), "dddl.") << "over the wrap";
+  EXPECT_EQ(phases({0xFFFFFE0C, 0, 1}), "ddl.") << "up to the wrap";
+  EXPECT_EQ(phases({0xFFFFFD00, 0x10, 0x205}), "dld.") << "none was drawn from its end to the wrap";
+  EXPECT_EQ(phases({0xF0000000, 0xA0000000}), "dl.") << "hidden for a month";
 }
 
 struct KeyDirWidget : W {

@@ -142,6 +142,18 @@ long countOf(const std::vector<LogLine>& lines, const LogLine& line) {
   return std::ranges::count(lines, line);
 }
 
+TEST_F(WindowTest, AnEndWithoutAStartIsLogged) {
+  const LogLine refusal = logLines(kWarning, {"[WINDOW] destroy: it does not run"})[0];
+  EXPECT_EQ(Window::destroy(), 1);
+  EXPECT_EQ(platform().takeLog(), (std::vector{refusal, kEnd}));
+  Window::init();
+  Window::destroy();
+  EXPECT_EQ(countOf(platform().takeLog(), refusal), 0);
+  Window::destroy();
+  EXPECT_EQ(countOf(platform().takeLog(), refusal), 1);
+  EXPECT_EQ(std::pair(platform().inits, platform().quits), std::pair(1, 1));
+}
+
 TEST_F(WindowTest, StartsAndEndsOnAnyThreadsAtOnce) {
   for (int round = 0; round < 50; ++round) {
     ASSERT_EQ(Window::init(), 1);
@@ -179,7 +191,7 @@ TEST_F(WindowTest, ADrawnHandlerThatEndsTheWindowDoesNotWait) {
     return true;
   };
   offered.enter();
-  Window::getEventService()->AppEvent(1);
+  MW::EventService::AppEvent(1);
   Window::show(0);
   EXPECT_EQ(countOf(platform().takeLog(), kLeftOver), 1);
   EXPECT_EQ(Window::init(), 1) << "ends the rest, and starts anew";
@@ -202,13 +214,13 @@ TEST_F(WindowTest, ADispatchedHandlerEndsAndStartsTheWindow) {
     EXPECT_EQ(Window::destroy(), 1);
     EXPECT_EQ(Window::getEventService(), nullptr);
     EXPECT_EQ(Window::init(), 1);
-    Window::getEventService()->AppEvent(2);
+    MW::EventService::AppEvent(2);
     for (int i = 0; i < 2000; ++i) std::this_thread::yield();
     order += "end";
     return true;
   };
   widget.enter();
-  Window::getEventService()->AppEvent(1);
+  MW::EventService::AppEvent(1);
   isOver.wait();
   Window::destroy();
   EXPECT_EQ(order, "1end2");
@@ -228,7 +240,7 @@ TEST_F(WindowTest, AnEndThatAHandlerAsksForDuringAStartIsNotLost) {
     return true;
   };
   widget.enter();
-  Window::getEventService()->AppEvent(1);
+  MW::EventService::AppEvent(1);
   isEnding.wait();
   EXPECT_EQ(Window::init(), 1) << "waits for the handler";
   EXPECT_EQ(Window::getEventService(), nullptr);
@@ -246,7 +258,7 @@ TEST_F(WindowTest, AHandlerEndsTheWindowWhileAnotherThreadDoes) {
       return Window::destroy() == 1;
     };
     widget.enter();
-    Window::getEventService()->AppEvent(1);
+    MW::EventService::AppEvent(1);
     bothThere.arrive_and_wait();
     Window::destroy();
     EXPECT_EQ(Window::getEventService(), nullptr);

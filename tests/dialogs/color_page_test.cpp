@@ -52,4 +52,24 @@ TEST_F(ColorPageTest, AnAutoCapScreenChangesAtOnceAndWithItsLayout) {
   EXPECT_EQ(page.getText(4), nullptr);
 }
 
+struct TimedPage : MW::DialogWarn {
+  TimedPage() : DialogWarn(MW::kColorRed) { timerOn = 1; }
+};
+
+TEST_F(ColorPageTest, AsksForFramesFromTheLastKeyOn) {
+  const auto asks = [](std::initializer_list<unsigned int> passes) {
+    TimedPage page;
+    platform().ticks = 0xFFFFFFF0;
+    offer(page, keyEvent(MW::kEventKeyRelease, 5));
+    std::string asked;
+    for (const unsigned int pass : passes) {
+      page.updateTimer(pass);
+      asked += MW::isDisplayUpdate(0) == 1 ? '+' : '-';
+    }
+    return asked;
+  };
+  EXPECT_EQ(asks({0xFFFFFFEF, 0xFFFFFFF0, 0x10, 0x90000000}), "-+++") << "for weeks";
+  EXPECT_EQ(asks({0x10}), "+") << "the clock wraps before the first pass";
+}
+
 }  // namespace

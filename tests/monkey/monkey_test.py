@@ -1,4 +1,4 @@
-"""What a monkey finds, and how short it becomes: monkey_test.py PLANTED FACTORY_TEST SHRINK"""
+"""What a monkey finds, and how short it becomes: monkey_test.py PLANTED FACTORY_TEST SHRINK [PLANTED_DIALOG]"""
 
 import os
 import pathlib
@@ -9,6 +9,7 @@ import tempfile
 import unittest
 
 PLANTED, FACTORY_TEST, SHRINK = sys.argv[1:4]
+PLANTED_DIALOG = sys.argv[4] if len(sys.argv) > 4 else None
 
 
 class MonkeyTest(unittest.TestCase):
@@ -19,19 +20,27 @@ class MonkeyTest(unittest.TestCase):
     def run_program(self, *command, **environment):
         settings = {**os.environ, "BRIMOL_DISPLAY": "headless", "BRIMOL_DEVICE": "", "BRIMOL_SCREEN": "480x800",
                     **environment}
-        return subprocess.run(command, env=settings, cwd=self.folder, capture_output=True, text=True, timeout=100,
+        return subprocess.run(command, env=settings, cwd=self.folder, capture_output=True, text=True, timeout=250,
                               check=False)
 
-    def test_a_crash_on_the_third_screen_is_found_and_made_short(self):
+    def find_and_shrink(self, wish, *program):
         trace, short = self.folder / "long.trace", self.folder / "short.trace"
-        found = self.run_program(PLANTED, BRIMOL_MONKEY="1:5000", BRIMOL_RECORD=str(trace))
+        found = self.run_program(*program, BRIMOL_MONKEY=wish, BRIMOL_RECORD=str(trace))
         self.assertEqual(found.returncode, -signal.SIGABRT, found.stderr)
-        self.assertEqual(self.run_program(PLANTED, BRIMOL_TRACE=str(trace)).returncode, -signal.SIGABRT)
-        shrunk = self.run_program(SHRINK, str(trace), str(short), "--", PLANTED)
+        self.assertEqual(self.run_program(*program, BRIMOL_TRACE=str(trace)).returncode, -signal.SIGABRT)
+        shrunk = self.run_program(SHRINK, str(trace), str(short), "--", *program)
         self.assertEqual(shrunk.returncode, 0, shrunk.stdout + shrunk.stderr)
-        self.assertEqual(self.run_program(PLANTED, BRIMOL_TRACE=str(short)).returncode, -signal.SIGABRT)
+        self.assertEqual(self.run_program(*program, BRIMOL_TRACE=str(short)).returncode, -signal.SIGABRT)
         steps = [line for line in short.read_text().splitlines() if line.startswith("+")]
         self.assertLessEqual(len(steps), 20, steps)
+
+    def test_a_crash_on_the_third_screen_is_found_and_made_short(self):
+        self.find_and_shrink("1:5000", PLANTED)
+
+    @unittest.skipUnless(PLANTED_DIALOG, "a sanitizer wants to be loaded first")
+    def test_a_crash_in_a_dialog_of_the_factory_test_is_found_and_made_short(self):
+        settings = f"LD_PRELOAD={PLANTED_DIALOG}", "PLANTED=Not all was tested"
+        self.find_and_shrink("1:20000", "env", *settings, FACTORY_TEST, "--stay")
 
     def test_what_does_not_fail_is_not_made_short(self):
         trace = self.folder / "quiet.trace"
@@ -52,11 +61,11 @@ class MonkeyTest(unittest.TestCase):
         self.assertEqual(ended.returncode, 0, ended.stderr)
         self.assertEqual(ended.stderr.count("/dev/full: No space left on device"), 1, ended.stderr)
 
-    def test_a_program_that_ignores_everything_is_told_of(self):
-        deaf = "8:20000"
-        ended = self.run_program(PLANTED, BRIMOL_MONKEY=deaf, BRIMOL_SCREEN="30x30")
-        self.assertEqual(ended.returncode, 1, ended.stderr)
-        self.assertIn("nothing has changed on the screen for 5000 events", ended.stderr)
+    def test_a_program_that_ignores_everything_is_told_of_though_it_blinks(self):
+        for what in [], ["blink"]:
+            ended = self.run_program(PLANTED, *what, BRIMOL_MONKEY="8:20000", BRIMOL_SCREEN="30x30")
+            self.assertEqual(ended.returncode, 1, ended.stderr)
+            self.assertIn("nothing new was shown for 5000 events", ended.stderr)
 
     def test_wrong_wishes_are_refused(self):
         for wish in "x", "1:", "1:2:3:4", "-1":

@@ -1,4 +1,5 @@
-// A program of three screens, the last of which crashes where one of its buttons is pressed.
+// A program of three screens, the last of which crashes where one of its buttons is pressed. With
+// an argument a corner of it blinks.
 #include <MW/MW.h>
 #include <brimol/frame.h>
 #include <brimol/host.h>
@@ -38,15 +39,19 @@ struct ScreenOfButtons {
 
 }  // namespace
 
-int main() {
+int main(int words, char**) {
+  constexpr int kBlink = 50;  // passes
   if (brimol_host_open() == 0) return 1;
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   MW::Window::init();
   std::optional<ScreenOfButtons> shown;
-  for (int number = -1; brimol_host_close_requested() == 0;) {
+  int number = -1;
+  for (int pass = 0; brimol_host_close_requested() == 0; ++pass) {
+    if (words > 1 && pass % kBlink == 0) MW::isDisplayUpdate(1);
     if (number != screen) shown.emplace(number = screen);
     if (MW::isDisplayUpdate(0) == 1) {
       skia_begin_frame_c();
+      if (words > 1) skia_add_box_c({0, 0, 5, 5, pass / kBlink % 2 == 0 ? 0xFF406080 : 0xFF804060});
       MW::Window::show();
       skia_end_frame_c();
     }

@@ -5,7 +5,9 @@
 #include <MW/button.h>
 #include <MW/dialog_new.h>
 #include <MW/event_service.h>
+#include <MW/key.h>
 
+#include <array>
 #include <cstdlib>
 #include <thread>
 
@@ -59,15 +61,14 @@ MW::event_data* keyRelease() {
 
 // Every kind of post, and widgets of the thread's own.
 void post(int events) {
-  MW::EventService& service = *Window::getEventService();
   for (int i = 0; i < events; ++i) {
     const Event down = pointerInput(BRIMOL_POINTER_DOWN, {5, 5});
     const Event up = pointerInput(BRIMOL_POINTER_UP, {5, 5});
     switch (i % 4) {
-      case 0: service.sendEvent(&down); break;
-      case 1: service.sendEvent(&up); break;
-      case 2: service.saveQueue(keyRelease()); break;
-      default: service.AppEvent(i); break;
+      case 0: MW::EventService::sendEvent(&down); break;
+      case 1: MW::EventService::sendEvent(&up); break;
+      case 2: MW::EventService::saveQueue(keyRelease()); break;
+      default: MW::EventService::AppEvent(i); break;
     }
     MW::isDisplayUpdate(1);
     if (i % 16 == 0) makeButton();
@@ -90,7 +91,7 @@ void postFromTwoThreads(int events) {
 void drain(const std::atomic<bool>& isDrained) {
   while (!isDrained) {
     delete prompt.exchange(nullptr);
-    Window::getEventService()->AppEvent(kLast);
+    MW::EventService::AppEvent(kLast);
     for (int i = 0; i < 64 && !isDrained; ++i) std::this_thread::yield();
   }
 }
@@ -122,6 +123,74 @@ TEST_F(WidgetTest, EverythingAtOnce) {
   answers = 0;
   for (int start = 0; start < kStarts; ++start) runWindowOnce(events);
   EXPECT_GT(answers, 0);
+}
+
+constexpr std::size_t kMostInCircle = 3;
+// Whoever takes one out deletes it.
+std::array<std::atomic<MW::Widget*>, kMostInCircle> circle = {};
+std::atomic<std::size_t> arriving = 0;  // callbacks that the others still wait for
+std::atomic<std::size_t> leaving = 0;   // callbacks that have something left to do
+
+void countDown(std::atomic<std::size_t>& count) {
+  if (--count == 0) count.notify_all();
+}
+void awaitZero(const std::atomic<std::size_t>& count) {
+  for (std::size_t seen = count; seen != 0; seen = count) count.wait(seen);
+}
+
+// Waits until each widget of the circle runs its callback, and deletes the next one and its own.
+void breakCircle(std::size_t own, std::size_t size) {
+  countDown(arriving);
+  awaitZero(arriving);
+  delete circle.at((own + 1) % size).exchange(nullptr);
+  delete circle.at(own).exchange(nullptr);
+  countDown(leaving);
+}
+
+// The place of its own, and of how many, a key tells by the state and the code of its plug.
+void keepPlug(std::size_t own, std::size_t size) {
+  auto key = std::make_unique<MW::Key>();
+  key->plugCallback = [](MW::kbd_event* plug) {
+    breakCircle(plug->state % kMostInCircle, plug->state / kMostInCircle);
+  };
+  key->onPlugKey({static_cast<uint32_t>(size * kMostInCircle + own), MW::Key::kPlugSettled});
+  circle.at(own) = key.release();
+}
+
+template <std::size_t size>
+void putDialog() {
+  auto dialog = std::make_unique<MW::DialogNew>("Circle", SKIA_ALIGN_CENTRE, 7);
+  dialog->keyReleaseCallback = [](MW::kbd_event*) { breakCircle(0, size); };
+  dialog->setActive(1);
+  circle.at(0) = dialog.release();
+}
+
+// The dispatch thread answers a dialog while drawing threads tell of plugs.
+template <std::size_t size>
+void runCircle() {
+  arriving = leaving = size;
+  putDialog<size>();
+  for (std::size_t own = 1; own < size; ++own) keepPlug(own, size);
+  platform().ticks += 1000;
+  MW::EventService::saveQueue(keyRelease());
+  {
+    std::array<std::jthread, size - 1> drawing;
+    for (auto& each : drawing) each = std::jthread([] { Window::show(GetTicks()); });
+  }
+  awaitZero(leaving);
+}
+
+TEST_F(WidgetTest, CirclesOfThreadsDeleteEachOthersWidgets) {
+  platform().records = false;
+  for (int start = 0; start < kStarts; ++start) {
+    ASSERT_EQ(Window::init(), 1);
+    for (int round = 0; round < 20; ++round) {
+      runCircle<2>();
+      runCircle<3>();
+    }
+    Window::destroy();
+    for (const auto& each : circle) EXPECT_EQ(each, nullptr);
+  }
 }
 
 }  // namespace

@@ -45,16 +45,40 @@ TEST_F(LiveWindowTest, AFloodKeepsItsOrderAndGivesItsMemoryBack) {
   EXPECT_GT(allocatedBytes(), before + kEvents * sizeof(MW::event_data));
   for (unsigned int round = 0; round < kEvents; ++round) dispatcher->threadLoop();
   EXPECT_EQ(next, kEvents);
-  EXPECT_EQ(Window::getEventService()->recvEvent(), nullptr);
+  EXPECT_EQ(MW::EventService::recvEvent(), nullptr);
   EXPECT_LE(platform().paused, kEvents) << "more than a millisecond an event";
   std::deque<Event>().swap(platform().fed);  // what it keeps for itself is not the toolkit's
   EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 16));
 }
 
-std::ptrdiff_t threads() {
-  const std::filesystem::directory_iterator all("/proc/self/task");
+// One second of ten fingers at 1,000 Hz. The dispatch thread takes an event in each of its rounds,
+// which last a millisecond here.
+TEST_F(LiveWindowTest, TenFingersAtAThousandHertzKeepTheirOrder) {
+  constexpr unsigned int kMs = 1000;
+  unsigned int next = 0;
+  ProbeWidget widget;
+  widget.onEvent = [&next](MW::event_data* event, auto) {
+    if (event->mouse.x == static_cast<int>(next) && event->mouse.finger == next % kFingers) ++next;
+    return true;
+  };
+  widget.enter();
+  unsigned int rounds = 0;
+  for (; rounds <= kMs * kFingers && next < kMs * kFingers; ++rounds) {
+    for (unsigned int finger = 0; rounds < kMs && finger < kFingers; ++finger) {
+      platform().feed(numbered(rounds * kFingers + finger));
+    }
+    platform().turns.give(++platform().ticks);
+    EXPECT_TRUE(platform().fed.empty()) << "input is taken as it comes";
+  }
+  EXPECT_EQ(next, kMs * kFingers);
+}
+
+std::ptrdiff_t entriesOf(const char* folder) {
+  const std::filesystem::directory_iterator all(folder);
   return std::distance(begin(all), end(all));
 }
+std::ptrdiff_t threads() { return entriesOf("/proc/self/task"); }
+std::ptrdiff_t openFiles() { return entriesOf("/proc/self/fd"); }
 
 TEST_F(WidgetTest, AThousandStartsAndEndsLeaveNothing) {
   platform().records = false;
@@ -66,7 +90,9 @@ TEST_F(WidgetTest, AThousandStartsAndEndsLeaveNothing) {
   const std::ptrdiff_t threadsBefore = threads();
   startAndEnd();
   const std::size_t before = allocatedBytes();
+  const std::ptrdiff_t filesBefore = openFiles();
   for (int i = 0; i < 1000; ++i) startAndEnd();
+  EXPECT_EQ(openFiles(), filesBefore);
   // The last ones have done their work; the system may still take them down.
   while (threads() > threadsBefore) std::this_thread::yield();
   EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 16));

@@ -14,6 +14,8 @@ class FailingAllocation {
   FailingAllocation(const FailingAllocation&) = delete;
   FailingAllocation& operator=(const FailingAllocation&) = delete;
 
+  /// Whether the next one is it.
+  static bool isNext() { return allocationsLeft == 1; }
   /// Whether it came to that.
   static bool hasFailed() { return allocationsLeft == 0; }
 };

@@ -58,7 +58,9 @@ INSTANTIATE_TEST_SUITE_P(
         WrongLine{"BundleAgainst",
                   {"--from-bundle", "b", "--against", "d", "--", "a"},
                   "--against does not go"},
-        WrongLine{"SameFiles", {"--junit=f", "--report=f", "t", "--", "a"}, "same name: f"}),
+        WrongLine{"SameFiles", {"--junit=f", "--report=./f", "t", "--", "a"}, "written over"},
+        WrongLine{"OwnTrace", {"--report=t", "./t", "--", "a"}, "written over"},
+        WrongLine{"FileOfTheApplication", {"--bundle=p", "t", "--", "a", "p"}, "written over"}),
     [](const auto& given) { return given.param.name; });
 
 }  // namespace

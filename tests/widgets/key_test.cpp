@@ -23,6 +23,10 @@ const PlayTests kPlays = {
     kKey("TellsAPassingPlugAsSettled", {plug(17), later(50), plug(18), plug(5), later(101), draw()},
          "+ + + plug2"),
     kKey("AnotherPlugReplacesASettledOne", {plug(2), plug(5), later(200), draw()}, "+ plug5+"),
+    kKey(
+        "TellsAPlugThatNoPassMetBeforeTheWrap",
+        {at(~0x100U), plug(17), at(0x100), draw(), at(~99U), plug(2), at(0), draw(), at(1), draw()},
+        "+ plug2 + plug2"),
     kNoPlug("HoldsNoPlugWithoutACallback",
             {plug(2),
              call([](MW::Widget& key) { key.plugCallback = [](MW::kbd_event*) { note("plug"); }; }),

@@ -1,8 +1,10 @@
 #include "options.h"
 
 #include <algorithm>
-#include <array>
 #include <charconv>
+#include <filesystem>
+#include <set>
+#include <string>
 #include <string_view>
 
 #include "verdict.h"
@@ -144,6 +146,29 @@ std::optional<Arguments> parseOne(Arguments arguments, Options& options, std::st
   return holdsValue ? arguments : arguments.subspan(1);
 }
 
+// One name for all names of a file, whether there is one or not.
+std::filesystem::path placeOf(const std::filesystem::path& file) {
+  std::error_code failure;
+  const std::filesystem::path whole = std::filesystem::absolute(file, failure);
+  const std::filesystem::path place = std::filesystem::weakly_canonical(whole, failure);
+  return failure ? file : place;
+}
+
+// Empty: each file to write is another one, and none that is read or that the application is given.
+std::string whatIsOverwritten(const Options& options) {
+  std::set<std::filesystem::path> taken;
+  for (const auto& file : {options.trace, options.fromBundle}) {
+    if (!file.empty()) taken.insert(placeOf(file));
+  }
+  for (const std::string& word : options.command) taken.insert(placeOf(word));
+  for (const auto& file : {options.report, options.junit, options.bundle}) {
+    if (!file.empty() && !taken.insert(placeOf(file)).second) {
+      return file.native() + " would be written over: it is used as another file, too";
+    }
+  }
+  return {};
+}
+
 // Empty: the options fit together.
 std::string whatIsWrong(const Options& options) {
   if (options.trace.empty() == options.fromBundle.empty()) {
@@ -160,12 +185,7 @@ std::string whatIsWrong(const Options& options) {
     return "which application? Give -- APP ARGS behind the trace, see --help";
   }
   if (!options.accepted.empty() && !options.lints) return "--accepted goes with --lint alone";
-  const std::array files = {options.report, options.junit, options.bundle};
-  for (std::size_t one = 0; one < files.size(); ++one) {
-    if (files[one].empty() || std::count(files.begin(), files.end(), files[one]) == 1) continue;
-    return "two files to write have the same name: " + files[one].native();
-  }
-  return {};
+  return whatIsOverwritten(options);
 }
 
 bool isOption(std::string_view argument) { return argument.size() > 1 && argument.front() == '-'; }

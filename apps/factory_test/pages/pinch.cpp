@@ -26,8 +26,10 @@ class PinchPage : public MeasurePage {
                     tr("Put the fingers down together,\nthen spread them.")) {}
 
   std::vector<Measure> values() const override {
-    return {measure("fingers counted", most), measure("narrowest", millimetres(narrowest)),
-            measure("widest", millimetres(widest))};
+    const bool isMeasured = most >= wanted();
+    return measure({{"fingers counted", most},
+                    {"narrowest", isMeasured ? millimetres(narrowest) : kNotMeasured},
+                    {"widest", isMeasured ? millimetres(widest) : kNotMeasured}});
   }
 
  protected:

@@ -58,8 +58,8 @@ class TouchLinesPage : public MeasurePage {
 
   std::vector<Measure> values() const override {
     const auto count = std::ranges::count(lines, true, &Line::isFollowed);
-    return {measure("lines followed", static_cast<double>(count)),
-            measure("worst distance", millimetres(worst))};
+    return measure({{"lines followed", static_cast<double>(count)},
+                    {"worst distance", count > 0 ? millimetres(worst) : kNotMeasured}});
   }
 
  protected:

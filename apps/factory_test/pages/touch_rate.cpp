@@ -26,8 +26,9 @@ class TouchRatePage : public MeasurePage {
                     tr("Draw circles with one finger,\nquickly and without a stop.")) {}
 
   std::vector<Measure> values() const override {
-    return {measure("event rate", moved > 0 ? reports * kSecond / moved : 0),
-            measure("longest gap", longestGap), measure("latency", frames > 0 ? late / frames : 0)};
+    return measure({{"event rate", moved > 0 ? reports * kSecond / moved : kNotMeasured},
+                    {"longest gap", reports > 0 ? longestGap : kNotMeasured},
+                    {"latency", frames > 0 ? late / frames : kNotMeasured}});
   }
 
  protected:

@@ -39,8 +39,8 @@ class TouchTrailsPage : public MeasurePage {
                     tr("Draw with several fingers at once:\nthe numbers stay with the fingers.")) {}
 
   std::vector<Measure> values() const override {
-    return {measure("fingers counted", mostDrawing),
-            measure("longest trail", millimetres(longest))};
+    return measure({{"fingers counted", mostDrawing},
+                    {"longest trail", longest > 0 ? millimetres(longest) : kNotMeasured}});
   }
 
  protected:

@@ -32,7 +32,7 @@ constexpr auto kTrails = std::to_array<ValueKind>({
     {msg("fingers counted"), "", least(2)},
     {msg("longest trail"), "mm", none()},
 });
-constexpr auto kFingers = std::to_array<ParameterKind>({{"fingers", 2, 10, 2}});
+constexpr auto kFingers = std::to_array<ParameterKind>({{"fingers", 2, 10, 2, true}});
 constexpr auto kRate = std::to_array<ValueKind>({
     {msg("event rate"), msg("1/s"), least(20)},
     {msg("longest gap"), msg("ms"), none()},
@@ -45,7 +45,7 @@ constexpr auto kPinch = std::to_array<ValueKind>({
     {msg("widest"), "mm", none()},
 });
 constexpr auto kStuck = std::to_array<ValueKind>({{msg("touches seen"), "", most(0)}});
-constexpr auto kStuckParameters = std::to_array<ParameterKind>({{"seconds", 1, 600, 60}});
+constexpr auto kStuckParameters = std::to_array<ParameterKind>({{"seconds", 1, 600, 60, true}});
 constexpr auto kKeys = std::to_array<ValueKind>({
     {msg("keys seen"), "", none()},
     {msg("bounces"), "", most(0)},
@@ -80,7 +80,15 @@ Measure measured(std::string_view test, std::string_view name, double value) {
   assert(kind != kinds.end());
   return {.name = std::string(name),
           .unit = std::string(kind->unit),
-          .value = std::isfinite(value) ? std::round(value * kParts) / kParts : 0};
+          .value = std::round(value * kParts) / kParts};
+}
+
+std::vector<Measure> measured(std::string_view test, std::initializer_list<Figure> figures) {
+  std::vector<Measure> values;
+  for (const auto& [name, figure] : figures) {
+    if (std::isfinite(figure)) values.push_back(measured(test, name, figure));
+  }
+  return values;
 }
 
 }  // namespace factory_test

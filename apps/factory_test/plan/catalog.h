@@ -1,9 +1,13 @@
 /// What tests measure, and what about them can be set.
 #pragma once
 
+#include <initializer_list>
+#include <limits>
 #include <optional>
 #include <span>
 #include <string_view>
+#include <utility>
+#include <vector>
 
 #include "results/test_result.h"
 
@@ -27,6 +31,7 @@ struct ParameterKind {
   double least;
   double most;
   double usual;
+  bool isWhole = false;  // nothing between whole numbers
 };
 
 /// Tests that are not in the catalogue measure nothing and have no parameters.
@@ -39,7 +44,15 @@ struct TestKind {
 
 const TestKind& testKind(std::string_view test);
 
-/// A value of the catalogue as the test delivers it, to a hundredth; what is not finite becomes 0.
+/// A value of the catalogue as the test delivers it, to a hundredth.
 Measure measured(std::string_view test, std::string_view name, double value);
+
+/// The figure of what was not measured.
+inline constexpr double kNotMeasured = std::numeric_limits<double>::quiet_NaN();
+
+using Figure = std::pair<std::string_view, double>;  // by the value's name
+
+/// The same for several values. What is not measured, or not finite, is left out.
+std::vector<Measure> measured(std::string_view test, std::initializer_list<Figure> figures);
 
 }  // namespace factory_test

@@ -5,6 +5,8 @@
 #include <nlohmann/json.hpp>
 #include <utility>
 
+#include "utf8.h"
+
 namespace factory_test {
 
 namespace {
@@ -53,12 +55,13 @@ class CountingIterator {
 // The parser's words without their head, "[json.exception.parse_error.101] parse error at line 1,
 // column 2: ", as its lines are told by us.
 std::string wordsOf(const json::exception& exception) {
+  constexpr std::size_t kMostBytes = 160;
   const std::string_view words = exception.what();
   const std::size_t head = words.find("] ");
   const std::size_t place = words.find("parse error at ");
   const std::size_t colon = place == std::string_view::npos ? place : words.find(": ", place);
-  if (colon != std::string_view::npos) return std::string(words.substr(colon + 2));
-  return std::string(head == std::string_view::npos ? words : words.substr(head + 2));
+  if (colon != std::string_view::npos) return shortened(words.substr(colon + 2), kMostBytes);
+  return shortened(head == std::string_view::npos ? words : words.substr(head + 2), kMostBytes);
 }
 
 // What the parser calls, value by value; the names are the parser's.
@@ -134,6 +137,10 @@ class TreeBuilder {
 }  // namespace
 
 std::optional<JsonNode> parseJson(std::string_view text, Complaint& complaint) {
+  if (const int line = lineOfNul(text); line > 0) {
+    complaint = {line, "is not JSON: holds a NUL byte"};
+    return {};
+  }
   LineCount count;
   TreeBuilder builder(count, complaint);
   const CountingIterator first(text.data(), &count);

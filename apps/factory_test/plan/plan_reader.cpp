@@ -35,7 +35,7 @@ struct Reading {
 
 std::string inQuotes(std::string_view words) {
   std::string text = "'";
-  text.append(words).append("'");
+  text.append(shortened(words)).append("'");
   return text;
 }
 
@@ -55,12 +55,19 @@ bool readNumber(const JsonNode& node, Limits range, double& number, const Readin
   return true;
 }
 
-bool readCount(const JsonNode& node, int most, int& count, const Reading& reading) {
-  const double number = node.number;
-  if (node.kind != Kind::Number || number < 0 || number > most || number != std::floor(number)) {
-    return reading.refuse(
-        node, inQuotes(node.name) + " is no whole number from 0 to " + std::to_string(most));
+bool readWhole(const JsonNode& node, Limits range, double& number, const Reading& reading) {
+  if (node.kind != Kind::Number || node.number < *range.least || node.number > *range.most ||
+      node.number != std::floor(node.number)) {
+    return reading.refuse(node, inQuotes(node.name) + " is no whole number from " +
+                                    plain(*range.least) + " to " + plain(*range.most));
   }
+  number = node.number;
+  return true;
+}
+
+bool readCount(const JsonNode& node, int most, int& count, const Reading& reading) {
+  double number = 0;
+  if (!readWhole(node, {0, most}, number, reading)) return false;
   count = static_cast<int>(number);
   return true;
 }
@@ -79,8 +86,11 @@ bool readText(const JsonNode& node, TextRange range, std::string& text, const Re
   const bool isClean = std::ranges::none_of(node.text, [range](char each) {
     return isControl(each) && !(range.mayHaveLines && each == '\n');
   });
+  if (node.kind == Kind::Text && !isClean) {
+    return reading.refuse(node, inQuotes(node.name) + " has a control character");
+  }
   const std::size_t length = letters(node.text);
-  if (node.kind != Kind::Text || length < range.least || length > range.most || !isClean) {
+  if (node.kind != Kind::Text || length < range.least || length > range.most) {
     return reading.refuse(node, inQuotes(node.name) + " is no text of " +
                                     std::to_string(range.least) + " to " +
                                     std::to_string(range.most) + " letters");
@@ -241,7 +251,8 @@ bool checkNames(const JsonNode& node, const PlanStep& step, const Reading& readi
                                            ", it has:" + namesOf(kind.parameters));
     }
     double number = 0;
-    if (!readNumber(parameter, {found->least, found->most}, number, reading)) return false;
+    const auto read = found->isWhole ? readWhole : readNumber;
+    if (!read(parameter, {found->least, found->most}, number, reading)) return false;
   }
   return true;
 }

@@ -61,10 +61,9 @@ std::string faultOf(const Request& request) {
   if (request.database.empty() == request.line.empty()) {
     return "needs one of --database FILE and --line postgresql://...";
   }
-  for (const char* const its : {"", "-wal", "-shm", ".lock"}) {
-    if (request.output.empty() || request.database.empty()) break;
-    if (isSameFile(request.output, placeOfFile(request.database).concat(its)))
-      return "--output names the database";
+  if (!request.output.empty() && !request.database.empty() &&
+      isOfDatabase(request.output, request.database)) {
+    return "--output names the database";
   }
   if (!request.isReport && request.format == nullptr) {
     return "needs one of --json, --junit, --csv and --html";
@@ -84,6 +83,7 @@ std::string takeOption(std::span<const char* const>& arguments, Request& request
   arguments = arguments.subspan(1);
   const auto* const format = std::ranges::find(kFormats, whole, &FormatRow::name);
   if (!request.isReport && format != kFormats.end()) {
+    if (request.format != nullptr) return "takes only one of --json, --junit, --csv and --html";
     request.format = format->write;
     return "";
   }
@@ -118,9 +118,30 @@ std::vector<RunRecord> read(const Request& request) {
     checkLine(server);
     return readHistory(queryOf(server), request.filter);
   }
-  Sqlite store(request.database, Sqlite::Mode::Read);
-  checkDatabase(store, request.database);
-  return readHistory(queryOf(store), request.filter);
+  std::vector<RunRecord> runs;
+  readUndisturbed(request.database, [&] {
+    Sqlite store(request.database, Sqlite::Mode::Read);
+    checkDatabase(store, request.database);
+    runs = readHistory(queryOf(store), request.filter);
+  });
+  return runs;
+}
+
+// What was asked for and is not there is said, too: the file alone would be an empty one.
+void tellMissing(const Request& request, std::span<const RunRecord> runs) {
+  if (!request.filter.unit.empty() && runs.empty()) {
+    complain("there is no run of the unit " + request.filter.unit);
+  }
+  const auto isIt = [&](const Measure& each) { return each.name == request.value; };
+  const auto hasIt = [&](const VerdictRecord& each) {
+    return std::ranges::any_of(each.result.values, isIt);
+  };
+  const auto hasAny = [&](const RunRecord& run) {
+    return std::ranges::any_of(run.verdicts, hasIt);
+  };
+  if (!request.value.empty() && std::ranges::none_of(runs, hasAny)) {
+    complain("there is no value " + request.value);
+  }
 }
 
 bool write(const Request& request, const std::string& text, std::string& error) {
@@ -135,6 +156,7 @@ bool write(const Request& request, const std::string& text, std::string& error) 
 bool perform(const Request& request, std::string& error) {
   try {
     std::vector<RunRecord> runs = read(request);
+    tellMissing(request, runs);
     const std::string text = request.isReport
                                  ? reportHtml(statisticsOf(std::move(runs)), request.value)
                                  : request.format(runs);

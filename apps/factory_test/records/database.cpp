@@ -113,10 +113,7 @@ bool Database::takeAborted(const RunStart& start) {
         run = row[1].value_or("");
       });
   if (number == 0) return false;
-  store.run(
-      "update runs set state = 'running', ended = null, operator = coalesce(?, operator) "
-      "where number = ?",
-      {orNull(start.operatorName), number});
+  store.run("update runs set state = 'running', ended = null where number = ?", {number});
   return true;
 }
 
@@ -149,10 +146,10 @@ void Database::add(const TestResult& result) {
   store.run(
       "insert into verdicts values (?1, ?2, "
       "(select coalesce(max(number), 0) + 1 from verdicts where run = ?2), "
-      "?3, ?4, ?5, ?6, ?7, ?8, ?9)",
+      "?3, ?4, ?5, ?6, ?7, ?8, ?9, ?10, ?11)",
       {id, run, storable(result.test), result.attempt, verdictName(result.verdict),
        utcText(result.started), std::int64_t{result.duration.count()}, result.screen.width,
-       result.screen.height});
+       result.screen.height, orNull(result.operatorName), orNull(reasonName(result.reason))});
   std::int64_t position = 0;
   for (const Measure& each : result.values) {
     store.run("insert into measures values (?, ?, ?, ?, ?, ?, ?)",

@@ -105,6 +105,12 @@ end;
     R"sql(
 alter table lines add column place text;
 )sql",
+    // A run may be gone on with by another operator.
+    R"sql(
+alter table verdicts add column operator text;
+alter table verdicts add column reason text;
+update verdicts set operator = (select operator from runs where id = run);
+)sql",
 });
 
 std::string named(const fs::path& path, const std::string& what) {
@@ -117,8 +123,12 @@ std::int64_t versionOf(Sqlite& store) { return store.number("pragma user_version
 bool isNew(Sqlite& store) { return store.number("select count(*) from sqlite_schema") == 0; }
 
 void refuseOthers(Sqlite& store, const fs::path& path) {
+  if (isNew(store)) throw StoreError(named(path, "holds no factory test's records"));
   if (store.number("pragma application_id") != kApplication) {
     throw StoreError(named(path, "is another program's database"));
+  }
+  if (versionOf(store) < 1) {
+    throw StoreError(named(path, "has lost its version: put it aside, then begin a new one"));
   }
   if (versionOf(store) <= kDatabaseVersion) return;
   throw StoreError(named(path, "is of version " + std::to_string(versionOf(store)) +

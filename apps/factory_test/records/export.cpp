@@ -54,7 +54,7 @@ std::string csvVerdict(const RunRecord& run, const VerdictRecord& verdict) {
   const TestResult& result = verdict.result;
   std::string line;
   for (const std::string& text :
-       {run.id, run.start.unit, run.start.station, run.start.operatorName, run.start.software,
+       {run.id, run.start.unit, run.start.station, result.operatorName, run.start.software,
         run.start.planName, run.start.planHash, std::string(stateName(run.state)), verdict.id,
         result.test, std::string(verdictName(result.verdict)), utcText(result.started)}) {
     line += csvField(text) + ",";
@@ -69,12 +69,13 @@ std::string limitText(const std::optional<double>& limit) {
 
 std::string csvLines(const RunRecord& run, const VerdictRecord& verdict) {
   const std::string before = csvVerdict(run, verdict);
-  if (verdict.result.values.empty()) return before + ",,,,\r\n";
+  const std::string behind = std::string(",") + reasonName(verdict.result.reason) + "\r\n";
+  if (verdict.result.values.empty()) return before + ",,,," + behind;
   std::string lines;
   for (const Measure& each : verdict.result.values) {
     lines += before + csvField(each.name) + "," + csvField(each.unit) + "," +
              numberText(each.value) + "," + limitText(each.least) + "," + limitText(each.most) +
-             "\r\n";
+             behind;
   }
   return lines;
 }
@@ -106,7 +107,7 @@ std::string historyJunit(std::span<const RunRecord> runs) {
 std::string historyCsv(std::span<const RunRecord> runs) {
   std::string text =
       "run,unit,station,operator,software,plan,plan_hash,state,verdict_id,test,verdict,started,"
-      "attempt,duration_ms,value_name,value_unit,value,least,most\r\n";
+      "attempt,duration_ms,value_name,value_unit,value,least,most,reason\r\n";
   for (const RunRecord& run : runs) {
     for (const VerdictRecord& verdict : run.verdicts) text += csvLines(run, verdict);
   }

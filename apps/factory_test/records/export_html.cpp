@@ -32,14 +32,16 @@ void addRun(std::string& body, const RunRecord& run) {
   body.append(utcText(start.started));
   if (run.ended) body.append(", last verdict ").append(utcText(*run.ended));
   body.append("; station ").append(htmlText(start.station));
-  if (!start.operatorName.empty()) body.append(", operator ").append(htmlText(start.operatorName));
+  if (!start.operatorName.empty()) body.append(", begun by ").append(htmlText(start.operatorName));
   body.append("; plan ").append(
       htmlText(start.planName + " " + start.planHash.substr(0, kHashDigits)));
   body.append("; software ").append(htmlText(start.software)).append("</p>\n<table>\n");
-  body.append(htmlHead({"Test", "Verdict", "Attempt", "Began", "Seconds", "Values"}));
+  body.append(
+      htmlHead({"Test", "Verdict", "Why", "Operator", "Attempt", "Began", "Seconds", "Values"}));
   for (const auto& [id, result] : run.verdicts) {
     const std::chrono::duration<double> seconds = result.duration;
     body.append(htmlRow({htmlText(result.test), htmlVerdict(verdictName(result.verdict)),
+                         reasonName(result.reason), htmlText(result.operatorName),
                          std::to_string(result.attempt), utcText(result.started),
                          numberText(seconds.count()), valuesCell(result)}));
   }

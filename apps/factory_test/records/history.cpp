@@ -17,7 +17,11 @@ class Columns {
  public:
   explicit Columns(const Cells& cells) : row(cells) {}
 
-  std::string text() { return row.at(next++).value_or(""); }
+  // Empty for a column that databases of older versions do not have.
+  std::string text() {
+    const std::size_t place = next++;
+    return place < row.size() ? row[place].value_or("") : "";
+  }
   int count() { return parsed<int>(text()).value_or(0); }
   double figure() { return parsed<double>(text()).value_or(0); }
   std::optional<double> limit() { return parsed<double>(text()); }
@@ -77,13 +81,15 @@ RunRecord runOf(const Cells& row) {
   return run;
 }
 
-// Without the run, which is the row's first column.
+constexpr std::size_t kRunColumn = 1;  // of a verdict
+
 VerdictRecord verdictOf(const Cells& row) {
   Columns columns(row);
-  columns.text();
   VerdictRecord record;
   TestResult& result = record.result;
   record.id = columns.text();
+  columns.text();  // the run
+  columns.text();  // its number in the run
   result.test = columns.text();
   result.attempt = columns.count();
   result.verdict =
@@ -92,6 +98,11 @@ VerdictRecord verdictOf(const Cells& row) {
   result.duration = std::chrono::milliseconds(columns.count());
   result.screen.width = columns.count();
   result.screen.height = columns.count();
+  result.operatorName = columns.text();
+  result.reason = kindNamed(
+      columns.text(),
+      {Reason::Unknown, Reason::Operator, Reason::Limit, Reason::TimeOut, Reason::Rehearsal},
+      reasonName);
   return record;
 }
 
@@ -126,11 +137,11 @@ std::vector<RunRecord> readRuns(const Query& ask, const Choice& choice) {
 void readVerdicts(const Query& ask, const Choice& choice, std::vector<RunRecord>& runs) {
   std::unordered_map<std::string, RunRecord*> byId;
   for (RunRecord& run : runs) byId[run.id] = &run;
-  ask("select v.run, v.id, v.test, v.attempt, v.verdict, v.started, v.duration_ms, v.width, "
-      "v.height from verdicts v join runs r on r.id = v.run" +
-          choice.where + " order by v.run, v.number",
+  // In the order of the tables, which only ever grow at their end.
+  ask("select v.* from verdicts v join runs r on r.id = v.run" + choice.where +
+          " order by v.run, v.number",
       choice.parameters, [&](const Cells& row) {
-        const auto run = byId.find(row.front().value_or(""));
+        const auto run = byId.find(row.at(kRunColumn).value_or(""));
         if (run != byId.end()) run->second->verdicts.push_back(verdictOf(row));
       });
 }

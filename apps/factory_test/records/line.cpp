@@ -159,6 +159,9 @@ void Line::end() {
   }
   now.stop.ring();
   now.changed.wait_for(lock, kGrace, [&now] { return now.hasEnded; });
+  if (now.isServed()) return;
+  lock.unlock();
+  now.count();  // all of them, also those that the thread has not come to
 }
 
 void Line::wake(std::size_t newVerdicts) {

@@ -56,7 +56,9 @@ create table if not exists verdicts (
   started timestamptz not null,
   duration_ms integer not null,
   width integer not null,
-  height integer not null
+  height integer not null,
+  operator text,
+  reason text
 );
 create table if not exists measures (
   verdict uuid not null references verdicts,
@@ -121,13 +123,16 @@ where excluded.revision > runs.revision)sql"},
     {R"sql(
 select json_group_array(json_object('id', v.id, 'run', v.run, 'number', v.number, 'test', v.test,
   'attempt', v.attempt, 'verdict', v.verdict, 'started', v.started, 'duration_ms', v.duration_ms,
-  'width', v.width, 'height', v.height)) from changes c join verdicts v on v.id = c.verdict
+  'width', v.width, 'height', v.height, 'operator', v.operator, 'reason', v.reason))
+from changes c join verdicts v on v.id = c.verdict
 where c.number > ?1 and c.number <= ?2)sql",
      R"sql(
-insert into verdicts select id, run, number, test, attempt, verdict, started, duration_ms, width, height
+insert into verdicts (id, run, number, test, attempt, verdict, started, duration_ms, width, height,
+  operator, reason)
+select id, run, number, test, attempt, verdict, started, duration_ms, width, height, operator, reason
 from jsonb_to_recordset($1::jsonb) as t(id uuid, run uuid, number integer, test text,
   attempt integer, verdict text, started timestamptz, duration_ms integer, width integer,
-  height integer)
+  height integer, operator text, reason text)
 on conflict (id) do nothing)sql"},
     // As texts, which keep every digit.
     {R"sql(
@@ -143,6 +148,17 @@ from jsonb_to_recordset($1::jsonb) as t(verdict uuid, position integer, name tex
   value double precision, least double precision, most double precision)
 on conflict do nothing)sql"},
 });
+
+// Older programs made the table without these, and go on without them.
+constexpr auto kLateColumns = R"sql(
+alter table verdicts add column if not exists operator text;
+alter table verdicts add column if not exists reason text)sql";
+
+bool hasLateColumns(Postgres& server) {
+  return server.cell(
+             "select count(*) from information_schema.columns where table_schema = 'factory_test' "
+             "and table_name = 'verdicts' and column_name = 'reason'") == "1";
+}
 
 bool hasTables(Postgres& server) {
   return server.cell("select to_regclass('factory_test.line') is not null") == "t";
@@ -178,6 +194,7 @@ LineTransfer::LineTransfer(const std::filesystem::path& station, const std::stri
     server.runAll((kTables + own).c_str());
   }
   checkLine(server);
+  if (!hasLateColumns(server)) server.runAll(kLateColumns);
   line = server.cell("select id from line");
   nameLine(postgresPlace(url));
 }

@@ -2,16 +2,22 @@
 
 #include <unistd.h>
 
+#include <algorithm>
+#include <array>
+#include <cctype>
 #include <cerrno>
 #include <charconv>
 #include <system_error>
 #include <utility>
 
 #include "results/measure_text.h"
+#include "results/whole_file.h"
 
 namespace factory_test {
 
 namespace {
+
+namespace fs = std::filesystem;
 
 std::string systemText(sqlite3* handle) {
   const int number = handle == nullptr ? 0 : sqlite3_system_errno(handle);
@@ -75,23 +81,108 @@ Cells rowOf(sqlite3_stmt* statement) {
   return row;
 }
 
+fs::path beside(const fs::path& database, const char* ending) {
+  return placeOfFile(database).concat(ending);
+}
+
+// What stands there and when it was written last; nothing for no file, or an empty one.
+struct FileState {
+  std::uintmax_t size = 0;
+  fs::file_time_type written = {};
+
+  bool operator==(const FileState&) const = default;
+};
+
+FileState stateOf(const fs::path& file) {
+  std::error_code failure;
+  FileState state = {fs::file_size(file, failure), fs::last_write_time(file, failure)};
+  return failure ? FileState() : state;
+}
+
+// How a database is read without leaving a file beside it, which would be the reader's and in the
+// writers' way: SQLite itself makes those that are missing.
+struct ReadWay {
+  const char* settings;
+  bool hasLocks = false;
+  bool hasLog = true;  // what was written last stands in it
+};
+constexpr ReadWay kOpenElsewhere = {"mode=ro&readonly_shm=1", true};
+constexpr ReadWay kLeftWithItsLog = {"mode=ro&vfs=unix-none"};
+constexpr ReadWay kClosed = {"immutable=1", false, false};
+
+ReadWay wayToRead(const fs::path& path) {
+  std::error_code failure;
+  if (stateOf(beside(path, "-wal")) == FileState()) {
+    return fs::exists(beside(path, "-wal"), failure) && fs::exists(beside(path, "-shm"), failure)
+               ? kOpenElsewhere
+               : kClosed;
+  }
+  return fs::exists(beside(path, "-shm"), failure) ? kOpenElsewhere : kLeftWithItsLog;
+}
+
+std::string uriOf(const fs::path& path, const char* settings) {
+  constexpr std::string_view kDigits = "0123456789ABCDEF";
+  constexpr unsigned int kHalf = 16;
+  const fs::path place = placeOfFile(path);
+  std::string uri = "file:";
+  for (const char letter : place.native()) {
+    const auto byte = static_cast<unsigned char>(letter);
+    if (std::isalnum(byte) != 0 || letter == '/') {
+      uri += letter;
+    } else {
+      (uri += '%') += kDigits[byte / kHalf];
+      uri += kDigits[byte % kHalf];
+    }
+  }
+  return uri.append("?").append(settings);
+}
+
 }  // namespace
 
 Sqlite::Sqlite(const std::filesystem::path& path, Mode mode) : file(path) {
   constexpr int kNew = SQLITE_OPEN_READWRITE | SQLITE_OPEN_CREATE;
-  const int flags = (mode == Mode::Write ? kNew : SQLITE_OPEN_READONLY) | SQLITE_OPEN_NOMUTEX;
+  const bool writes = mode == Mode::Write;
+  const ReadWay way = writes ? ReadWay() : wayToRead(path);
+  const int flags = (writes ? kNew : SQLITE_OPEN_READONLY | SQLITE_OPEN_URI) | SQLITE_OPEN_NOMUTEX;
   sqlite3* opened = nullptr;
-  const int code = sqlite3_open_v2(path.c_str(), &opened, flags, nullptr);
+  const std::string name = writes ? path.native() : uriOf(path, way.settings);
+  const int code = sqlite3_open_v2(name.c_str(), &opened, flags, nullptr);
   handle.reset(opened);  // also of one that failed
   // SQLite then says that there is no such file.
-  if (code == SQLITE_CANTOPEN && mode == Mode::Write &&
-      ::access(folderOf(path).c_str(), W_OK) != 0 && errno != ENOENT) {
+  if (code == SQLITE_CANTOPEN && writes && ::access(folderOf(path).c_str(), W_OK) != 0 &&
+      errno != ENOENT) {
     throw StoreError(path.native() +
                      ": cannot be made in its folder: " + std::generic_category().message(errno));
   }
   check(code);
   sqlite3_extended_result_codes(opened, 1);
   setPatience(kPatience);
+  if (writes || way.hasLocks || !way.hasLog) return;
+  // The log's index stands in memory then, and the log is left where it is.
+  runAll("pragma locking_mode = exclusive");
+  check(sqlite3_db_config(opened, SQLITE_DBCONFIG_NO_CKPT_ON_CLOSE, 1, nullptr));
+}
+
+void readUndisturbed(const fs::path& path, const std::function<void()>& task) {
+  constexpr int kMostTries = 5;
+  const auto filesNow = [&path] {
+    return std::pair(stateOf(placeOfFile(path)), stateOf(beside(path, "-wal")));
+  };
+  for (int left = kMostTries;; --left) {
+    const auto before = filesNow();
+    const bool isSafe = wayToRead(path).hasLocks || left == 1;
+    try {
+      task();
+      if (isSafe || filesNow() == before) return;
+    } catch (const StoreError&) {
+      if (isSafe || filesNow() == before) throw;
+    }
+  }
+}
+
+bool isOfDatabase(const fs::path& file, const fs::path& database) {
+  const auto isIt = [&](const char* ending) { return isSameFile(file, beside(database, ending)); };
+  return std::ranges::any_of(std::array{"", "-wal", "-shm", "-journal", ".lock"}, isIt);
 }
 
 void Sqlite::setPatience(std::chrono::milliseconds patience) const {

@@ -49,7 +49,8 @@ class Sqlite {
   /// How long it waits for others that write, unless it is told otherwise.
   static constexpr std::chrono::milliseconds kPatience{3000};
 
-  /// Opens the database; Mode::Write makes one that is missing.
+  /// Opens the database; Mode::Write makes one that is missing, Mode::Read leaves nothing beside it
+  /// and needs no right to write.
   Sqlite(const std::filesystem::path& path, Mode mode);
   void setPatience(std::chrono::milliseconds patience) const;
 
@@ -99,6 +100,15 @@ class Transaction {
   Sqlite& store;
   bool isOpen = true;
 };
+
+/// Performs `task`, which reads the database at `path` from its opening on and throws StoreError.
+/// What nobody else has open is read without locks: it is read anew where somebody opens it
+/// meanwhile.
+void readUndisturbed(const std::filesystem::path& path, const std::function<void()>& task);
+
+/// Whether writing to `file` would write over the database or one of the files that stand beside it
+/// while it is open.
+bool isOfDatabase(const std::filesystem::path& file, const std::filesystem::path& database);
 
 /// A limit or another figure that may be missing.
 inline Sqlite::Value orNull(const std::optional<double>& figure) {

@@ -42,14 +42,15 @@ std::vector<Property> propertiesOf(const TestResult& result) {
   const auto [width, height] = result.screen;
   std::vector<Property> all = {{"started", utcText(result.started)},
                                {"screen", std::to_string(width) + "x" + std::to_string(height)},
-                               {"attempt", std::to_string(result.attempt)}};
+                               {"attempt", std::to_string(result.attempt)},
+                               {"operator", result.operatorName}};
   for (const Measure& each : result.values) all.emplace_back(each.name, measureText(each));
   return all;
 }
 
-// What a failure says first: the values that are at fault.
+// What a failure says first: why, and the values that are at fault.
 std::string failureText(const TestResult& result) {
-  std::string text;
+  std::string text = reasonName(result.reason);
   for (const Measure& each : result.values) {
     if (each.isWithin()) continue;
     text += (text.empty() ? "" : "; ") + each.name + " " + measureText(each);

@@ -35,6 +35,7 @@ std::optional<ResultBook> ResultBook::open(const Keeping& places, const RunStart
 }
 
 bool ResultBook::lockFiles(std::string& error) {
+  if (files.isOnlyShown) return true;
   for (const auto& file : {files.json, files.junit}) {
     if (file.empty()) continue;
     auto lock = FileLock::take(file, error);
@@ -89,6 +90,7 @@ bool ResultBook::startUnit(const RunStart& start, std::string& error) {
 }
 
 bool ResultBook::saveFiles(std::string& error) {
+  if (files.isOnlyShown) return true;
   const bool isKept =
       files.json.empty() || replaceFile(files.json, resultsJson(begun, kept), error);
   const JunitSuite suite = {.run = begun, .results = kept};
@@ -117,6 +119,7 @@ bool ResultBook::record(TestResult result, std::string& error) {
     result.attempt =
         std::max(result.attempt, earlier->attempt + (earlier->attempt < INT_MAX ? 1 : 0));
   }
+  if (result.operatorName.empty()) result.operatorName = begun.operatorName;
   if (database) unsavedVerdicts.push_back(result);
   unsavedTests.push_back(result.test);
   put(std::move(result));

@@ -28,7 +28,8 @@ struct Keeping {
   std::filesystem::path database = {};  // all verdicts of all units, see records/database.h
   Database::Resume resume = Database::Resume::Yes;
   FirstRun first = FirstRun::AtOnce;
-  std::string line = {};  // the address of the line's database, see records/line.h; empty: none
+  std::string line = {};     // the address of the line's database, see records/line.h; empty: none
+  bool isOnlyShown = false;  // the JSON file is read, and nothing is written
 };
 
 /// The newest result of each test of one unit, and what keeps them. One thread at a time uses a
@@ -57,8 +58,8 @@ class ResultBook {
   bool hasBegun() const { return isBegun; }
 
   /// Puts `result`, clamped(), in the place of the test's earlier one, whose attempts it goes on to
-  /// count, or at the end; then writes. False: it goes out with the next record() or saveAgain().
-  /// Waits for the disk, often some milliseconds.
+  /// count, or at the end, with the run's operator; then writes. False: it goes out with the next
+  /// record() or saveAgain(). Waits for the disk, often some milliseconds.
   bool record(TestResult result, std::string& error);
 
   /// Whether the test has a result, and all that it is kept in holds it.

@@ -8,6 +8,7 @@
 
 #include "results/result_entry.h"
 #include "results/utc_time.h"
+#include "utf8.h"
 
 namespace factory_test {
 
@@ -76,6 +77,20 @@ bool readAttempt(const json& value, TestResult& result) {
   return value.is_null() || (readCount(value, result.attempt) && result.attempt > 0);
 }
 
+bool readReason(const json& value, TestResult& result) {
+  if (value.is_null()) return true;
+  for (const auto reason : {Reason::Operator, Reason::Limit, Reason::TimeOut, Reason::Rehearsal}) {
+    if (value != reasonName(reason)) continue;
+    result.reason = reason;
+    return true;
+  }
+  return false;
+}
+
+bool readOperator(const json& value, TestResult& result) {
+  return value.is_null() || readText(value, result.operatorName);
+}
+
 bool readLimit(const json& value, std::optional<double>& limit) {
   if (value.is_number()) limit = value.get<double>();
   return value.is_number() || value.is_null();
@@ -105,6 +120,8 @@ struct Member {
 constexpr auto kMembers = std::to_array<Member>({
     {"test", readTest},
     {"verdict", readVerdict},
+    {"reason", readReason},
+    {"operator", readOperator},
     {"attempt", readAttempt},
     {"started", readStarted},
     {"duration_ms", readDuration},
@@ -158,13 +175,15 @@ bool readResults(const json& list, std::vector<TestResult>& results, std::string
 ordered_json resultEntry(const TestResult& result) {
   ordered_json values = ordered_json::array();
   for (const Measure& each : result.values) values.push_back(measureEntry(each));
-  return {{"test", result.test},
-          {"verdict", verdictName(result.verdict)},
-          {"attempt", result.attempt},
-          {"started", utcText(result.started)},
-          {"duration_ms", result.duration.count()},
-          {"screen", {{"width", result.screen.width}, {"height", result.screen.height}}},
-          {"values", std::move(values)}};
+  ordered_json entry = {{"test", result.test}, {"verdict", verdictName(result.verdict)}};
+  if (result.reason != Reason::Unknown) entry["reason"] = reasonName(result.reason);
+  if (!result.operatorName.empty()) entry["operator"] = result.operatorName;
+  entry["attempt"] = result.attempt;
+  entry["started"] = utcText(result.started);
+  entry["duration_ms"] = result.duration.count();
+  entry["screen"] = {{"width", result.screen.width}, {"height", result.screen.height}};
+  entry["values"] = std::move(values);
+  return entry;
 }
 
 std::string jsonText(const ordered_json& root) {
@@ -181,6 +200,10 @@ std::string resultsJson(const RunStart& run, std::span<const TestResult> results
 }
 
 std::optional<ResultFile> parseResults(std::string_view text, std::string& reason) {
+  if (const int line = lineOfNul(text); line > 0) {
+    reason = "is not JSON: holds a NUL byte in line " + std::to_string(line);
+    return {};
+  }
   const json root = json::parse(text, nullptr, false);  // without exceptions
   const json& list = memberOf(root, "results");
   if (!list.is_array()) {

@@ -20,7 +20,8 @@
 ///     }
 ///
 /// Members may come in any order; unknown ones are passed over. "verdict" is "PASS", "FAIL" or
-/// "none", "started" UTC, a figure 0 to INT_MAX, "attempt" 1 or more. "unit" is the serial number
+/// "none", "started" UTC, a figure 0 to INT_MAX, "attempt" 1 or more. Of a FAIL "reason" may say
+/// why, of any verdict "operator" who gave it. "unit" is the serial number
 /// of what was tested, left out where nobody said one; "plan" is the one of the program that wrote
 /// the file last, by its name and its hash, and is not read; "least" and "most" are left out where
 /// there is no limit. Version 1, which says no version, has neither units, attempts nor values.

@@ -26,6 +26,16 @@ const char* verdictName(Verdict verdict) {
   }
 }
 
+const char* reasonName(Reason reason) {
+  switch (reason) {
+    case Reason::Operator: return "operator";
+    case Reason::Limit: return "limit";
+    case Reason::TimeOut: return "time-out";
+    case Reason::Rehearsal: return "rehearsal";
+    default: return "";
+  }
+}
+
 TestResult clamped(TestResult result) {
   result.started = std::clamp(result.started, sys_seconds(), kLastSecond);
   result.duration = std::clamp(result.duration, milliseconds(0), kLongestDuration);

@@ -15,6 +15,14 @@ enum class Verdict { None, Pass, Fail };
 /// The word of the files for it: "PASS", "FAIL" or "none".
 const char* verdictName(Verdict verdict);
 
+/// Why a test failed: the operator said so, a value was outside its limits or missing, its time was
+/// over, or the failure was rehearsed. Unknown for every other verdict, and for results of older
+/// programs.
+enum class Reason { Unknown, Operator, Limit, TimeOut, Rehearsal };
+
+/// The word of the files for it: "operator", "limit", "time-out" or "rehearsal"; empty for Unknown.
+const char* reasonName(Reason reason);
+
 /// A value that a test delivered.
 struct Measure {
   std::string name = {};             // "cells missed"; [a-z0-9 ], the key of limits and history
@@ -35,6 +43,8 @@ struct TestResult {
   ScreenSize screen = {};
   std::vector<Measure> values = {};
   int attempt = 1;  // 1 or more
+  Reason reason = Reason::Unknown;
+  std::string operatorName = {};  // who gave the verdict; empty: unknown
 
   bool operator==(const TestResult&) const = default;
 };

@@ -6,8 +6,16 @@
 namespace MW {
 
 /// Counts taps, each of which ends within 500 ms of the one before. Times are GetTicks()
-/// milliseconds; 0 stands for none. The clock's wrap may cut a series short. Use it on the
-/// thread that handles events only.
+/// milliseconds; 0 stands for none. Use it on the thread that handles events only.
+///
+/// Sums and differences of times wrap with the clock and are compared as they are. Where the clock
+/// starts over:
+/// - A tap that ends before the wrap counts 0 if its press, or the tap before it in the series,
+/// lies
+///   in the last 500 ms before the wrap.
+/// - In the first 500 ms after the wrap a press forgets each tap since the wrap: taps count 1.
+/// - If the first press after the wrap comes later than that, its tap joins the last tap before the
+///   wrap, however old.
 class DoubleTap {
  public:
   static constexpr uint32_t kWindowMs = 500;

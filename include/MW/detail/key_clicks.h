@@ -8,9 +8,11 @@
 namespace MW {
 
 /// Counts the releases of one key, each of which comes within 1000 ms of the one before. Times are
-/// GetTicks() milliseconds. If they wrap between two releases, a series may be cut short, or two
-/// releases far apart may count as one series. It belongs to the thread that handles events, or to
-/// the holder's lock.
+/// GetTicks() milliseconds. It belongs to the thread that handles events, or to the holder's lock.
+///
+/// Sums of times wrap with the clock and are compared as they are. Where the clock starts over:
+/// - A release before the wrap counts 1 if the one before lies in the last 1000 ms.
+/// - The first release after the wrap joins one that lies further back, however old.
 class KeyClicks {
  public:
   static constexpr uint32_t kWindowMs = 1000;

@@ -297,7 +297,7 @@ void Session::frame(Platform& platform, Frame&& shown) {
                   std::chrono::duration_cast<std::chrono::microseconds>(taken).count());
   }
   if (recorder && !monkey) recorder->frame(now(), items);
-  if (monkey) monkey->seeFrame(now());
+  if (monkey) monkey->seeFrame(now(), lastFrame);
   if (runner) runner->seeFrame(now(), lastFrame, items);
   endIfFailed();
 }

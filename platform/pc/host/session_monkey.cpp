@@ -8,7 +8,7 @@ namespace brimol::pc {
 
 namespace {
 
-constexpr uint64_t kMostWithoutChange = 5'000;  // records
+constexpr uint64_t kMostWithoutNews = 5'000;  // records
 constexpr uint64_t kCloseMs = 10'000;
 constexpr uint64_t kToldEach = 1'000'000;  // records
 constexpr uint64_t kToldEachMs = 86'400'000;
@@ -49,8 +49,8 @@ void Session::followMonkey(uint64_t moment) {
     nextLook = monkey->posted() + kLookEach;
   }
   if (monkey->posted() >= nextTold || moment >= nextToldMs) tellOfMonkey();
-  if (monkey->sinceChange() > kMostWithoutChange) {
-    endMonkey("nothing has changed on the screen for " + std::to_string(kMostWithoutChange) +
+  if (monkey->sinceNews() > kMostWithoutNews) {
+    endMonkey("nothing new was shown for " + std::to_string(kMostWithoutNews) +
               " events");
   }
   if (!monkey->isOver()) return;

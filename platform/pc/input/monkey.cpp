@@ -27,6 +27,21 @@ constexpr auto kKeys = std::to_array<uint32_t>(
 // Codes of plugs that widgets know, and one that they do not.
 constexpr auto kPlugs = std::to_array<uint32_t>({2, 17, 18, 40});
 
+constexpr std::size_t kMostLayouts = 32;  // more than a blinking or growing dialog has
+
+// A number that tells frames apart by where their items are.
+std::size_t layoutOf(const Frame& shown) {
+  std::size_t layout = 0;
+  for (const SKIA_Item& item : shown) {
+    for (const int32_t number : {item.kind, item.rect.x, item.rect.y, item.rect.w, item.rect.h,
+                                 item.point.x1, item.point.y1, item.point.x2, item.point.y2}) {
+      constexpr std::size_t kFactor = 1'000'003;
+      layout = layout * kFactor + static_cast<std::size_t>(number);
+    }
+  }
+  return layout;
+}
+
 }  // namespace
 
 /// What it does in `share` of a hundred cases.
@@ -62,9 +77,13 @@ void Monkey::post(const Event& record) {
   target(record);
 }
 
-void Monkey::seeFrame(uint64_t now) {
-  countAtChange = count;
+void Monkey::seeFrame(uint64_t now, const Frame& shown) {
   if (!nextHabit) nextHabit = now + kFirstMs;
+  const std::size_t layout = layoutOf(shown);
+  if (std::ranges::find(layouts, layout) != layouts.end()) return;
+  countAtNews = count;
+  layouts.push_back(layout);
+  if (layouts.size() > kMostLayouts) layouts.pop_front();
 }
 
 std::optional<uint64_t> Monkey::due(uint64_t soonest) const {

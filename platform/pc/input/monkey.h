@@ -34,12 +34,13 @@ class Monkey {
   /// `shown` is the newest frame.
   void act(uint64_t now, const Frame& shown);
   /// A frame was drawn that differs from the one before.
-  void seeFrame(uint64_t now);
+  void seeFrame(uint64_t now, const Frame& shown);
 
   bool isOver() const { return over; }
   uint64_t posted() const { return count; }
-  /// So many records came since anything changed on the screen.
-  uint64_t sinceChange() const { return count - countAtChange; }
+  /// So many records came since anything new was shown: items in other places than in any of the
+  /// layouts before. What blinks, or tells the time, shows nothing new.
+  uint64_t sinceNews() const { return count - countAtNews; }
 
  private:
   struct Planned {
@@ -77,7 +78,8 @@ class Monkey {
   MonkeyWish wanted;
   uint64_t count = 0;
   uint64_t nextRest;  // so many records have come then
-  uint64_t countAtChange = 0;
+  uint64_t countAtNews = 0;
+  std::deque<std::size_t> layouts;    // the last ones that were new
   std::deque<Planned> planned;        // in the order of their times
   std::optional<uint64_t> nextHabit;  // none: no frame was seen yet
   uint64_t planTime = 0;              // when what is planned last happens

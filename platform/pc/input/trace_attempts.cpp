@@ -67,8 +67,20 @@ TraceRunner::Outcome TraceRunner::lookAgainUntil(uint64_t deadline, uint64_t now
 std::optional<ScreenPoint> TraceRunner::find(const Place& place, std::string& why) const {
   if (!place.text)
     return ScreenPoint{place.x.pixels(stage.screen.w), place.y.pixels(stage.screen.h)};
-  const std::vector<ShownText> texts = shownTexts(newest, stage.screen);
-  const std::vector<ShownText> found = fitting(texts, *place.text);
+  return pick(shownTexts(newest, stage.screen), *place.text, why);
+}
+
+// A key of a keyboard; what a field shows of a text that is being typed is none.
+std::optional<ScreenPoint> TraceRunner::findKey(const std::string& text, std::string& why) const {
+  std::vector<ShownText> texts = shownTexts(newest, stage.screen);
+  std::erase_if(
+      texts, [this](const ShownText& each) { return newest.at(each.item).kind != SKIA_BUTTONBOX; });
+  return pick(texts, TextPattern({text}), why);
+}
+
+std::optional<ScreenPoint> TraceRunner::pick(const std::vector<ShownText>& texts,
+                                             const TextPattern& wanted, std::string& why) {
+  const std::vector<ShownText> found = fitting(texts, wanted);
   if (found.size() == 1) return middleOf(found.front().area);
   why = found.empty() ? "no item shows this text; shown are:" + listOf(texts)
                       : "several items show this text:" + listOf(found);
@@ -151,13 +163,13 @@ TraceRunner::Outcome TraceRunner::attempt(const Typing& typing, uint64_t now) {
   const std::size_t length = lengthOfCharacter(left);
   const std::string key = left.front() == ' ' ? "space" : std::string(left.substr(0, length));
   std::string why;
-  auto place = find({.x = {}, .y = {}, .text = TextPattern({key})}, why);
+  auto place = findKey(key, why);
   if (place) {
     typed += length;
     shifts = 0;
   } else if (shifts < kMostShifts) {
     std::string ignored;
-    place = find({.x = {}, .y = {}, .text = TextPattern({"shift"})}, ignored);
+    place = findKey("shift", ignored);
     if (place) ++shifts;
   }
   if (!place)

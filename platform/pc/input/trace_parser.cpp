@@ -230,6 +230,8 @@ bool TraceParser::readSetting(const TraceLine& line, TraceWords& words) {
   } else if (words.takes("leave")) {
     words.expect("running");
     trace.leavesRunning = true;
+  } else if (words.takes("linger")) {
+    trace.lingerMs = words.number("a number of milliseconds", kMostTime);
   } else {
     return false;
   }
@@ -278,7 +280,11 @@ std::string TraceParser::finish() {
     if (hasEnd) return lastLine + ": " + bad.why;
     trace.frames.pop_back();
   }
-  if (trace.isRecording && !hasEnd) trace.cutAt = lastLine;
+  if (trace.isRecording && !hasEnd) {
+    constexpr uint64_t kAftermathMs = 5000;  // the crash came after the last line
+    trace.cutAt = lastLine;
+    trace.lingerMs = kAftermathMs;
+  }
   return {};
 }
 

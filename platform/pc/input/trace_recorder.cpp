@@ -48,6 +48,7 @@ std::string textOfRecord(const Event& record) {
 void TraceRecorder::startScript(uint32_t clockStart) {
   file.write("brimol-trace 1");
   file.write("clock start " + std::to_string(clockStart));
+  file.write("linger 5000");  // a crash comes after the last line
 }
 
 void TraceRecorder::start(uint32_t clockStart, uint64_t utcMs, uint64_t seed) {

@@ -69,7 +69,7 @@ std::optional<uint64_t> TraceRunner::due(uint64_t soonest) const {
     consider(planned.front().time);
   } else if (isOver()) {
     if (!trace.leavesRunning || !closedBy) {
-      consider(closedBy.value_or(stepDone.value_or(0) + restMs));
+      consider(closedBy.value_or(endOfTrace()));
     }
   } else if (lookUntil) {
     consider(hasSeen ? std::min(soonest, *lookUntil) : *lookUntil);
@@ -130,8 +130,7 @@ void TraceRunner::finishStep(uint64_t now) {
 }
 
 void TraceRunner::finishTrace(uint64_t now) {
-  const uint64_t start = stepDone.value_or(0) + restMs;
-  if (!closedBy && start > now) return;
+  if (!closedBy && endOfTrace() > now) return;
   if (!closedBy) {
     closedBy = now + kCloseMs;
     if (!trace.leavesRunning) stage.close();

@@ -75,6 +75,7 @@ class TraceRunner {
 
   const TraceStep& step() const { return trace.steps[next]; }
   std::optional<uint64_t> startOfStep() const;
+  uint64_t endOfTrace() const { return stepDone.value_or(0) + restMs + trace.lingerMs; }
   bool advance(uint64_t now);
   bool begin(uint64_t now);
   void finishStep(uint64_t now);
@@ -96,6 +97,9 @@ class TraceRunner {
 
   Outcome lookAgainUntil(uint64_t deadline, uint64_t now, const std::string& why);
   std::optional<ScreenPoint> find(const Place& place, std::string& why) const;
+  std::optional<ScreenPoint> findKey(const std::string& text, std::string& why) const;
+  static std::optional<ScreenPoint> pick(const std::vector<ShownText>& texts,
+                                         const TextPattern& wanted, std::string& why);
   void planTouch(const Touch& touch, ScreenPoint place, ScreenPoint to, uint64_t now);
   Planned moveStep(const Motion& motion, int number);
   std::string whyNot(const Look& look);

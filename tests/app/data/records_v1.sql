@@ -54,8 +54,8 @@ pragma user_version = 1;
 insert into plans values ('h1', 'Line A');
 insert into plan_tests values ('h1', 1, 'keys'), ('h1', 2, 'touch');
 insert into units values ('OLD 1', '2026-11-20T07:00:00Z');
-insert into runs (id, unit, plan, station, software, started, ended, state) values
-  ('0b1ddc6e-5fb0-4d6e-8d1c-000000000001', 'OLD 1', 'h1', 'bench7', '0.1.0', '2026-11-20T07:00:00Z',
+insert into runs (id, unit, plan, station, operator, software, started, ended, state) values
+  ('0b1ddc6e-5fb0-4d6e-8d1c-000000000001', 'OLD 1', 'h1', 'bench7', 'Eve', '0.1.0', '2026-11-20T07:00:00Z',
    '2026-11-20T07:01:00Z', 'finished');
 insert into verdicts values
   ('0b1ddc6e-5fb0-4d6e-8d1c-000000000002', '0b1ddc6e-5fb0-4d6e-8d1c-000000000001', 1, 'keys', 1, 'PASS',

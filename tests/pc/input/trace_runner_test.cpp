@@ -103,6 +103,7 @@ INSTANTIATE_TEST_SUITE_P(
             "130:up 0 30 0 230:close "},
         RunCase{"Keys", "key select\n1000 key down 7\n+5 key up 7\nleave running",
                 "100:keydown 327 150:keyup 327 1000:keydown 7 1005:keyup 7 "},
+        RunCase{"Linger", "linger 400\nkey down 7", "100:keydown 7 500:close "},
         RunCase{"RawRecords", "5 down 1 3 4\n5 motion 1 5 4 2 0\n6 long 1 5 4\n7 close\n9 end",
                 "5:down 1 3 4 5:motion 1 5 4 2 0 6:long 1 5 4 7:close 10:close "},
         RunCase{"Looks",
@@ -128,12 +129,15 @@ TEST(TraceRunner, WaitsForWhatItLooksFor) {
             "501:passed 901:down 0 5 5 951:up 0 5 5 1201:passed 1201:passed 1201:close ");
 }
 
-TEST(TraceRunner, TypesOnTheKeyboardThatItSees) {
+TEST(TraceRunner, TypesOnTheKeyboardThatItSeesAndNotOnWhatWasTyped) {
   Played played("type \"aB \"");
   const Frame small = {button("a", {0, 0, 10, 10, kRed}), button("b", {20, 0, 10, 10, kRed}),
                        button("shift", {40, 0, 10, 10, kRed}),
                        button("space", {60, 0, 10, 10, kRed})};
   Frame capitals = small;
+  SKIA_Item field = button("B", {0, 40, 10, 10, kRed});
+  field.kind = SKIA_TEXTBOX;
+  capitals.push_back(field);
   capitals[1] = button("B", {20, 0, 10, 10, kRed});
   played.until(3000, {{0, [&] { played.show(small); }}, {220, [&] { played.show(capitals); }}});
   EXPECT_EQ(played.failure(), "");
