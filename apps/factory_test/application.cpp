@@ -10,10 +10,7 @@
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
-#include <filesystem>
-#include <fstream>
 #include <optional>
-#include <sstream>
 #include <string>
 #include <utility>
 
@@ -21,6 +18,7 @@
 #include "factory_test.h"
 #include "language/language.h"
 #include "pages/table.h"
+#include "results/whole_file.h"
 #include "run_start.h"
 #include "task.h"
 
@@ -76,17 +74,11 @@ void loop(FactoryTest& test, bool stays) {
 
 // The file as a text of the toolkit, which ends at a NUL: spaces stand for these. Nothing, with the
 // reason in `error`, for one that cannot be read.
-std::optional<std::string> readText(const std::string& path, std::string& error) {
-  std::ifstream file(path, std::ios::binary);
-  std::ostringstream bytes;
-  if (!std::filesystem::is_directory(path) && file &&
-      (file.peek() == EOF || bytes << file.rdbuf())) {
-    std::string text = std::move(bytes).str();
-    std::ranges::replace(text, '\0', ' ');
-    return text;
-  }
-  error = path + ": cannot be read";
-  return {};
+std::optional<std::string> readLog(const std::string& path, std::string& error) {
+  constexpr std::size_t kMostMiB = 16;
+  std::optional<std::string> text = readFile(path, error, kMostMiB);
+  if (text) std::ranges::replace(*text, '\0', ' ');
+  return text;
 }
 
 void letMonkeyPlay(const Options& options) {
@@ -142,7 +134,7 @@ ExitCode runApplication(const Options& options) {
   if (!book) return fail(error);
   Context context = {*book, log, {}, options.shell, task->plan};
   if (!options.log.empty()) {
-    context.logText = readText(options.log, error);
+    context.logText = readLog(options.log, error);
     if (!context.logText) return fail(error);
   }
   if (brimol_host_open() == 0) return ExitCode::Trouble;
