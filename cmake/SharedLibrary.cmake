@@ -20,8 +20,6 @@ function(brimol_shared_library target component map)
                LINK_DEPENDS "${map}")
   target_include_directories(${target} PUBLIC "$<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/include>")
   target_compile_features(${target} PUBLIC cxx_std_20)
-  target_link_options(${target} PRIVATE "LINKER:--version-script=${map}"
-                                        "LINKER:-z,relro" "LINKER:-z,now" "LINKER:-z,noexecstack"
-                                        "LINKER:-z,text")
+  target_link_options(${target} PRIVATE "LINKER:--version-script=${map}")
   brimol_install_library(${target} ${component} ${ARGN})
 endfunction()

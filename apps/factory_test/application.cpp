@@ -10,10 +10,7 @@
 #include <csignal>
 #include <cstdio>
 #include <cstdlib>
-#include <filesystem>
-#include <fstream>
 #include <optional>
-#include <sstream>
 #include <string>
 #include <utility>
 
@@ -21,6 +18,7 @@
 #include "factory_test.h"
 #include "language/language.h"
 #include "pages/table.h"
+#include "results/whole_file.h"
 #include "run_start.h"
 #include "task.h"
 
@@ -50,16 +48,17 @@ ExitCode judgeLast(const Options& options, const ResultBook& book) {
 }
 
 std::string wrongScreen() {
-  constexpr int kLeastShort = 320;  // pixels
-  constexpr int kLeastLong = 480;
+  constexpr int kLeastWidth = 320;   // pixels
+  constexpr int kLeastHeight = 480;  // the menu's head takes 340 of them
   constexpr int kMostRatio = 3;
   int width = 0;
   int height = 0;
   brimol_host_screen_size(&width, &height);
   const auto [shorter, longer] = std::minmax(width, height);
-  if (shorter >= kLeastShort && longer >= kLeastLong && longer <= kMostRatio * shorter) return {};
+  if (width >= kLeastWidth && height >= kLeastHeight && longer <= kMostRatio * shorter) return {};
   return "the screen of " + std::to_string(width) + "x" + std::to_string(height) +
-         " pixels has no room for the pages: at least 320x480, and no side three times the other";
+         " pixels has no room for the pages: at least 320 wide and 480 high, and no side more than "
+         "three times the other";
 }
 
 void loop(FactoryTest& test, bool stays) {
@@ -75,17 +74,11 @@ void loop(FactoryTest& test, bool stays) {
 
 // The file as a text of the toolkit, which ends at a NUL: spaces stand for these. Nothing, with the
 // reason in `error`, for one that cannot be read.
-std::optional<std::string> readText(const std::string& path, std::string& error) {
-  std::ifstream file(path, std::ios::binary);
-  std::ostringstream bytes;
-  if (!std::filesystem::is_directory(path) && file &&
-      (file.peek() == EOF || bytes << file.rdbuf())) {
-    std::string text = std::move(bytes).str();
-    std::ranges::replace(text, '\0', ' ');
-    return text;
-  }
-  error = path + ": cannot be read";
-  return {};
+std::optional<std::string> readLog(const std::string& path, std::string& error) {
+  constexpr std::size_t kMostMiB = 16;
+  std::optional<std::string> text = readFile(path, error, kMostMiB);
+  if (text) std::ranges::replace(*text, '\0', ' ');
+  return text;
 }
 
 void letMonkeyPlay(const Options& options) {
@@ -125,6 +118,9 @@ void tellWaiting(const ResultBook& book) {
 ExitCode runApplication(const Options& options) {
   SessionLog log(options.verbose ? SessionLog::Echo::ToStderr : SessionLog::Echo::None);
   chooseLanguage(options.language);
+  if (!options.language.empty() && !hasCatalogue(options.language)) {
+    complain("no catalogue of the language '" + options.language + "': texts are English");
+  }
   if (options.headless) setenv("BRIMOL_DISPLAY", "headless", 1);
   if (!options.device.empty()) setenv("BRIMOL_DEVICE", options.device.c_str(), 1);
   if (!options.monkey.empty()) letMonkeyPlay(options);
@@ -138,7 +134,7 @@ ExitCode runApplication(const Options& options) {
   if (!book) return fail(error);
   Context context = {*book, log, {}, options.shell, task->plan};
   if (!options.log.empty()) {
-    context.logText = readText(options.log, error);
+    context.logText = readLog(options.log, error);
     if (!context.logText) return fail(error);
   }
   if (brimol_host_open() == 0) return ExitCode::Trouble;

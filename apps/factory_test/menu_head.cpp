@@ -83,7 +83,7 @@ int MenuHead::show(unsigned int) {
   skia_add_box_c(rect);
   skia_add_textbox_c(
       inColor(place.title, kHeadInk.ground),
-      textOf(tr("Factory test"), kHeadInk.text, SKIA_ALIGN_CENTRE, percentOf(size, 120)));
+      captionIn(place.title, tr("Factory test"), kHeadInk.text, percentOf(size, 120)));
   const auto put = [&](const SKIA_Rect& row, const std::string& words) {
     drawWords(row, words, kPageInk.text, leadingAlign(), size);
   };

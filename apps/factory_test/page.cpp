@@ -17,7 +17,8 @@ struct Record {
 Record titleRecord(const char* title) {
   const ScreenSize screen = screenSize();
   const int size = percentOf(textSize(screen), 120);
-  return {layOutPage(screen).title, textOf(title, kHeadInk.text, SKIA_ALIGN_CENTRE, size)};
+  const SKIA_Rect area = layOutPage(screen).title;
+  return {area, captionIn(area, title, kHeadInk.text, size)};
 }
 
 Record lineRecord() { return {layOutPage(screenSize()).line, captionOf("", kPanelInk.text)}; }

@@ -27,7 +27,8 @@ using brimol::test::Screen;
 const std::vector<Profile> kProfiles = {{"wvga-4.0", {480, 800}, 233},
                                         {"hd-4.7", {720, 1280}, 313},
                                         {"wqhd-5.5", {1440, 2560}, 534},
-                                        {"landscape", {2560, 1440}, 534}};
+                                        {"landscape", {2560, 1440}, 534},
+                                        {"large", {4000, 3000}, 534}};
 
 // What these pages show first has letters of the classes' own size.
 const std::vector<std::string> kFixedLetters = {"prompts",   "list_choice", "six_choice",

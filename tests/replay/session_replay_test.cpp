@@ -76,6 +76,14 @@ TEST_F(SessionReplay, IsTheSameTenMinutesEveryTime) {
   EXPECT_NE(firstResults.find("2026-01-01T00:"), std::string::npos) << firstResults;
 }
 
+TEST_F(SessionReplay, WritesNoPictureThroughALink) {
+  fs::create_directories(report);
+  fs::create_symlink(folder, report + "/link");
+  EXPECT_EQ(play(writeTrace("shot link/x.png\n"), {{"BRIMOL_REPORT_DIR", report}}), 1);
+  EXPECT_NE(readAll(folder / "stderr").find("is outside of the folder"), std::string::npos);
+  EXPECT_FALSE(fs::exists(folder / "x.png"));
+}
+
 TEST_F(SessionReplay, PaintsTheSamePictures) {
   const fs::path other = folder / "other";
   const std::string trace =

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <nlohmann/json.hpp>
 
+#include "input/inside.h"
 #include "picture.h"
 
 namespace brimol::replay {
@@ -77,7 +78,7 @@ std::optional<fs::path> fileOf(const fs::path& folder, const std::string& name) 
   const fs::path inside = fs::path(name).lexically_normal();
   const bool isOutside = name.empty() || name.find('\0') != std::string::npos ||
                          inside.is_absolute() || *inside.begin() == "..";
-  if (isOutside) return {};
+  if (isOutside || !isInside(folder, folder / inside)) return {};
   return folder / inside;
 }
 

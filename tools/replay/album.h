@@ -47,7 +47,7 @@ class Album {
   std::map<std::filesystem::path, std::optional<std::size_t>> files;
 };
 
-/// Where a file that a session names stands, if it is in the session's folder.
+/// Where a file that a session names stands, if it is in the session's folder, with links followed.
 std::optional<std::filesystem::path> fileOf(const std::filesystem::path& folder,
                                             const std::string& name);
 

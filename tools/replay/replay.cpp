@@ -140,6 +140,9 @@ Launch launchOf(const Plan& plan) {
     launch.environment[name] = isSet ? std::optional(found->second) : std::nullopt;
   }
   launch.environment["BRIMOL_TRACE"] = plan.record.trace;
+  if (!plan.options.fromBundle.empty()) {
+    launch.environment["BRIMOL_TRACE_ROOT"] = plan.folder / kUnpackedName;
+  }
   launch.environment["BRIMOL_RECORD"] = std::nullopt;
   launch.environment["BRIMOL_REPORT_DIR"] = plan.folder.native();
   if (plan.options.lints) launch.environment["BRIMOL_REPORT_ITEMS"] = "changed";

@@ -53,6 +53,12 @@ void chooseLanguage(const std::string& code) {
   bind_textdomain_codeset(kDomain, "UTF-8");
 }
 
+bool hasCatalogue(const std::string& code) {
+  std::error_code failed;
+  const auto file = catalogues() / code / "LC_MESSAGES" / (std::string(kDomain) + ".mo");
+  return code == "en" || std::filesystem::exists(file, failed);
+}
+
 // The empty text is that of a catalogue's head.
 const char* tr(const char* english) {
   return *english == '\0' ? english : dgettext(kDomain, english);

@@ -16,6 +16,9 @@ std::span<const std::string_view> languages();
 /// English. Call it before tr(), on the main thread, while there is no other.
 void chooseLanguage(const std::string& code);
 
+/// Whether the program finds the texts of one of languages(); those of "en" are its own.
+bool hasCatalogue(const std::string& code);
+
 /// The text in the chosen language, in UTF-8; English where the catalogue lacks it. It stays valid.
 /// Any thread.
 const char* tr(const char* english);

@@ -8,6 +8,7 @@
 #include <atomic>
 #include <memory>
 #include <optional>
+#include <string>
 #include <vector>
 
 #include "current.h"
@@ -39,9 +40,10 @@ class ColourTest : public LookTest {
     const SKIA_Rect foot =
         rowsOf<2>({0, 0, screen.width, screen.height, kPanelInk.ground}, 0, {5, 1})[1];
     skia_add_box_c(foot);
-    drawWords(within(foot, 2 * gapOf(screen)),
-              tr("Tap: the next colour.\nHold a finger still, or Select: end."), kPanelInk.text,
-              SKIA_ALIGN_CENTRE, textSize(screen));
+    const std::string plans = planStep.text.empty() ? "" : planStep.text + "\n";
+    drawWords(within(foot, gapOf(screen)),
+              plans + tr("Tap: the next colour.\nHold a finger still, or Select: end."),
+              kPanelInk.text, SKIA_ALIGN_CENTRE, textSize(screen));
   }
 
   bool isComplete() const override { return shown >= kColours - 1; }

@@ -9,12 +9,14 @@
 #include <array>
 #include <atomic>
 #include <memory>
+#include <string>
 #include <vector>
 
 #include "current.h"
 #include "language/language.h"
 #include "layout.h"
 #include "pages/table.h"
+#include "plan/plan.h"
 #include "test.h"
 #include "verdict_bar.h"
 
@@ -34,6 +36,8 @@ constexpr SKIA_Rect kNoPlace = {0, 0, 0, 0, kBarColor};  // of what places itsel
 /// PASS, RETRY and FAIL are squares of the page itself; the select key passes, the back key leaves.
 class DescriptorTest : public Test {
  public:
+  void prepare(const PlanStep& step) override { plans = step.text; }
+
   void enter() override {
     MW::WidgetList::init();
     for (const Entry& entry : kEntries) build(entry);
@@ -46,7 +50,14 @@ class DescriptorTest : public Test {
 
   Outcome verdict() const override { return chosen; }
 
-  void draw() override { MW::WidgetList::show(); }
+  void draw() override {
+    MW::WidgetList::show();
+    if (plans.empty()) return;
+    const SKIA_Rect area = pixelsOf({1, 11, 8, 13, kBarColor});
+    skia_add_box_c(area);
+    drawWords(within(area, gapOf(screenSize()) / 2), plans, MW::kColorBlack, SKIA_ALIGN_CENTRE,
+              textSize(screenSize()));
+  }
 
   void update(uint32_t now) override {
     if (!find(kRcuiFullScreen).isActive() || now - whiteSince < kWhiteMs) return;
@@ -106,10 +117,16 @@ class DescriptorTest : public Test {
     if (event->code == kKeyBack) Self::get().chosen = Outcome::Left;
   }
 
-  void build(const Entry& entry) {
-    const ScreenSize screen = screenSize();
-    const auto& [left, top, columns, height, color] = entry.place;
+  // Of a place in an entry's units.
+  static SKIA_Rect pixelsOf(const SKIA_Rect& place) {
     constexpr int kColumnPercent = 10;
+    const ScreenSize screen = screenSize();
+    return {percentOf(screen.width, place.x * kColumnPercent), percentOf(screen.height, place.y),
+            percentOf(screen.width, place.w * kColumnPercent), percentOf(screen.height, place.h),
+            place.color};
+  }
+
+  void build(const Entry& entry) {
     std::array<SKIA_Text, kTexts> texts;
     std::ranges::transform(entry.texts, texts.begin(), [](const char* words) {
       return captionOf(words != nullptr ? tr(words) : "", MW::kColorWhite);
@@ -120,19 +137,21 @@ class DescriptorTest : public Test {
     // These squares share the screen's width, which on a wide screen makes them too high.
     const bool isSquare = entry.kind == kRcuiButton3Left || entry.kind == kRcuiButton3Centre ||
                           entry.kind == kRcuiButton3Right;
-    ref.visible = entry.isShown && !(isSquare && isLandscape(screen)) ? 1 : 0;
+    const bool isHint = entry.kind == kRcuiFirstInColumn || entry.kind == kRcuiNextInColumn;
+    const bool isLeftOut = isSquare ? isLandscape(screenSize()) : isHint && !plans.empty();
+    ref.visible = entry.isShown && !isLeftOut ? 1 : 0;
     ref.cbIndex = 1;
-    ref.rect = {percentOf(screen.width, left * kColumnPercent), percentOf(screen.height, top),
-                percentOf(screen.width, columns * kColumnPercent), percentOf(screen.height, height),
-                color};
+    ref.rect = pixelsOf(entry.place);
     ref.lineWidth = kLineWidth;
-    ref.text = captionOf(tr(entry.words), color == kBarColor ? MW::kColorBlack : MW::kColorWhite);
+    ref.text = captionOf(tr(entry.words),
+                         entry.place.color == kBarColor ? MW::kColorBlack : MW::kColorWhite);
     ref.desc = entry.texts.front() != nullptr ? texts.data() : nullptr;
     built.push_back(std::make_unique<MW::WidgetRcui>(&ref, &entry.callbacks, MW::kUnused));
     if (ref.index > 0) MW::WidgetList::show(ref.index);
   }
 
   Current<DescriptorTest> current{this};
+  std::string plans;  // what the plan tells the operator
   std::atomic<Outcome> chosen = Outcome::Running;
   std::atomic<uint32_t> whiteSince = 0;  // GetTicks() milliseconds
   std::vector<std::unique_ptr<MW::WidgetRcui>> built;

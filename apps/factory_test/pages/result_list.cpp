@@ -105,7 +105,8 @@ class ResultListTest : public LookTest {
       self().finishLookOn(event->code);
     };
     const auto [left, right] = header();
-    const SKIA_Text hint = captionIn(left, tr("Tap a line twice"));
+    const char* const usual = tr("Tap a line twice");
+    const SKIA_Text hint = captionIn(left, planStep.text.empty() ? usual : planStep.text.c_str());
     heading.emplace(MW::ButtonS::kTextBox, &left, &hint).setActive(1);
     done.emplace(right, kFaces);
   }

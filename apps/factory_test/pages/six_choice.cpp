@@ -9,6 +9,7 @@
 
 #include "current.h"
 #include "language/language.h"
+#include "layout.h"
 #include "page_test.h"
 #include "pages/table.h"
 
@@ -22,6 +23,14 @@ constexpr auto kChoices = std::to_array<const char*>({"2G", "3G", "4G", "5G", "B
 class SixChoiceTest : public LookTest {
  public:
   SixChoiceTest() : LookTest(tr("Six-way choice"), tr("Choose one.")) {}
+
+  void drawOver() override {
+    constexpr int kBelowDialog = 91;  // per cent of the screen's height
+    if (page.isAsking()) return;
+    const ScreenSize screen = screenSize();
+    const int top = percentOf(screen.height, kBelowDialog);
+    page.drawHint(within({0, top, screen.width, screen.height - top, 0}, gapOf(screen) / 2));
+  }
 
  protected:
   void beginLook() override {

@@ -17,16 +17,17 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr uintmax_t kMostBytes = uintmax_t{1} << 20;
-
 // Why it cannot be read; empty: it stands in `bytes`.
-std::string readInto(std::string& bytes, const fs::path& file) {
+std::string readInto(std::string& bytes, const fs::path& file, std::size_t mostMiB) {
+  constexpr uintmax_t kMiB = uintmax_t{1} << 20;
   std::error_code failure;
   const auto status = fs::status(file, failure);
   if (failure) return failure.message();
   if (!fs::is_regular_file(status)) return "is not a regular file";
   const uintmax_t size = fs::file_size(file, failure);
-  if (size > kMostBytes) return "is longer than a MiB";
+  if (size > mostMiB * kMiB) {
+    return "is longer than " + (mostMiB == 1 ? std::string("a") : std::to_string(mostMiB)) + " MiB";
+  }
   std::ifstream stream(file, std::ios::binary);
   bytes.resize(size);
   stream.read(bytes.data(), static_cast<std::streamsize>(size));
@@ -62,9 +63,9 @@ bool writeNewFile(const fs::path& file, std::string_view bytes, FileMode mode) {
 
 }  // namespace
 
-std::optional<std::string> readFile(const fs::path& file, std::string& error) {
+std::optional<std::string> readFile(const fs::path& file, std::string& error, std::size_t mostMiB) {
   std::string bytes;
-  const std::string reason = readInto(bytes, file);
+  const std::string reason = readInto(bytes, file, mostMiB);
   if (reason.empty()) return bytes;
   error = file.native() + ": " + reason;
   return {};

@@ -11,9 +11,10 @@ namespace factory_test {
 /// The first bytes of a regular file, `most` of them; empty for any other.
 std::string readHead(const std::filesystem::path& file, std::size_t most);
 
-/// What a regular file of at most a MiB holds. Nothing for any other, which is never waited for;
-/// `error` then says why in one line that begins with the file's name.
-std::optional<std::string> readFile(const std::filesystem::path& file, std::string& error);
+/// What a regular file of at most `mostMiB` MiB holds. Nothing for any other, which is never waited
+/// for; `error` then says why in one line that begins with the file's name.
+std::optional<std::string> readFile(const std::filesystem::path& file, std::string& error,
+                                    std::size_t mostMiB = 1);
 
 /// Where a file is, or would be, by whatever symbolic links and dots it is named.
 std::filesystem::path placeOfFile(const std::filesystem::path& file);

@@ -15,6 +15,7 @@
 #include "host/open_platform.h"
 #include "host/png_file.h"
 #include "input/input_service.h"
+#include "input/inside.h"
 #include "scene/item.h"
 #include "scene/item_text.h"
 
@@ -64,7 +65,7 @@ Session* session() {
 }
 
 Session::Session(SessionSettings wanted) : settings(std::move(wanted)), problem(settings.error) {
-  if (isPlaying()) parsed = parseTrace(settings.trace);
+  if (isPlaying()) parsed = parseTrace(settings.trace, settings.traceRoot);
   takeScreen();
   if (!parsed.error.empty() || !problem.empty()) return;
   if (settings.clock != ClockChoice::Real) startClock();
@@ -324,6 +325,8 @@ std::optional<uint32_t> Session::pixel(ScreenPoint place) {
 
 std::string Session::shoot(const std::string& file) {
   const std::filesystem::path path = std::filesystem::path(settings.reportFolder) / file;
+  // A link of the folder may lead elsewhere.
+  if (!isInside(settings.reportFolder, path)) return path.native() + " is outside of the folder";
   const CairoSurface picture = open == nullptr ? nullptr : open->copyPicture(kPictureBound);
   if (!picture) return "there is no picture";
   std::string error = writePng(picture.get(), path);

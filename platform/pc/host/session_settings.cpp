@@ -113,6 +113,7 @@ std::string readItems(const VariableLookup& lookup, SessionSettings& settings) {
 SessionSettings readSessionSettings(const VariableLookup& lookup) {
   SessionSettings settings;
   settings.trace = valueOf(lookup, "BRIMOL_TRACE");
+  settings.traceRoot = valueOf(lookup, "BRIMOL_TRACE_ROOT");
   settings.recording = valueOf(lookup, "BRIMOL_RECORD");
   settings.reportFolder = valueOf(lookup, "BRIMOL_REPORT_DIR");
   std::vector<std::string> errors = {readMonkey(lookup, settings), readClock(lookup, settings)};

@@ -17,6 +17,7 @@ struct SessionSettings {
   std::optional<uint32_t> clockStart;
   std::optional<uint32_t> clockStep;
   std::string trace;                 // what is played; empty: nothing
+  std::string traceRoot;             // where it includes from; empty: its own folder
   std::string recording;             // what is recorded into; empty: nothing
   std::optional<MonkeyWish> monkey;  // who plays instead of a trace or a user
   std::string reportFolder;          // empty: none
@@ -25,9 +26,9 @@ struct SessionSettings {
   std::string error;                 // one line about the first wrong value; empty: none is wrong
 };
 
-/// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_CLOCK_STEP, BRIMOL_TRACE, BRIMOL_RECORD,
-/// BRIMOL_MONKEY, BRIMOL_REPORT_DIR, BRIMOL_REPORT_PICTURES and BRIMOL_REPORT_ITEMS; an empty value
-/// is no value.
+/// Reads BRIMOL_CLOCK, BRIMOL_CLOCK_START, BRIMOL_CLOCK_STEP, BRIMOL_TRACE, BRIMOL_TRACE_ROOT,
+/// BRIMOL_RECORD, BRIMOL_MONKEY, BRIMOL_REPORT_DIR, BRIMOL_REPORT_PICTURES and BRIMOL_REPORT_ITEMS;
+/// an empty value is no value.
 SessionSettings readSessionSettings(const VariableLookup& lookup);
 
 }  // namespace brimol::pc

@@ -5,11 +5,11 @@
 #include <filesystem>
 #include <fstream>
 #include <limits>
-#include <sstream>
 #include <string_view>
 #include <system_error>
 #include <utility>
 
+#include "input/inside.h"
 #include "input/trace_steps.h"
 #include "input/trace_words.h"
 #include "scene/item_text.h"
@@ -18,7 +18,9 @@ namespace brimol::pc {
 
 namespace {
 
-constexpr std::size_t kMostIncludes = 16;  // one in the other
+constexpr std::string_view kMark = "brimol-trace";          // what the first line begins with
+constexpr std::size_t kMostBytes = std::size_t{256} << 20;  // of all files of a trace
+constexpr std::size_t kMostIncludes = 16;                   // one in the other
 constexpr int kMostFiles = 10'000;
 constexpr uint64_t kMostTime = uint64_t{1} << 40;
 constexpr uint64_t kMostItems = 65536;
@@ -147,8 +149,7 @@ std::string TraceParser::readOne(const TraceLine& line) {
 
 void TraceParser::readHeader(const TraceLine& line) {
   TraceWords words(line.text);
-  if (!words.takes("brimol-trace"))
-    throw BadLine{"not a trace: its first line is 'brimol-trace 1'"};
+  if (!words.takes(kMark)) throw BadLine{"not a trace: its first line is 'brimol-trace 1'"};
   if (words.peek() != "1") throw BadLine{"this version of the format is not known; 1 is"};
   (void)words.word("a version");
   const bool isRecording = words.takes("recording");
@@ -246,7 +247,7 @@ void TraceParser::include(const TraceLine& line, const std::string& file) {
   if (open.size() >= kMostIncludes || filesRead >= kMostFiles) {
     throw BadLine{"too many files are included"};
   }
-  if (!begin(path)) throw BadLine{"'" + path + "' cannot be read"};
+  if (!begin(path)) throw BadLine{"'" + path + "' cannot be read as a file of this trace"};
 }
 
 void TraceParser::readTimed(const TraceLine& line, TraceWords& words) {
@@ -288,6 +289,26 @@ std::string TraceParser::finish() {
   return {};
 }
 
+// At most `left` bytes, which become fewer. Of a file that is no trace only the beginning, which
+// says so.
+std::optional<std::string> bytesOf(const std::string& file, std::size_t& left) {
+  constexpr std::size_t kChunk = std::size_t{1} << 16;
+  std::error_code isNoFile;
+  const uintmax_t size = std::filesystem::file_size(file, isNoFile);
+  if (!isNoFile && size > left) return std::nullopt;
+  std::ifstream in(file, std::ios::binary);
+  std::string bytes;
+  std::string chunk(kChunk, '\0');
+  while (in.read(chunk.data(), kChunk) || in.gcount() > 0) {
+    bytes.append(chunk, 0, static_cast<std::size_t>(in.gcount()));
+    if (bytes.size() > left) return std::nullopt;
+    if (!trimmed(bytes).starts_with(kMark)) break;
+  }
+  if (!in.is_open() || in.bad()) return std::nullopt;
+  left -= bytes.size();
+  return bytes;
+}
+
 }  // namespace
 
 std::vector<std::string> itemsOf(const Trace& trace, std::size_t frame) {
@@ -308,16 +329,16 @@ ParsedTrace parseTrace(const std::string& path, const TraceFiles& files) {
   return parsed;
 }
 
-ParsedTrace parseTrace(const std::string& path) {
-  return parseTrace(path, [&path](const std::string& file) -> std::optional<std::string> {
+ParsedTrace parseTrace(const std::string& path, const std::string& root) {
+  namespace fs = std::filesystem;
+  const fs::path folder = root.empty() ? fs::path(path).parent_path() : fs::path(root);
+  std::size_t left = kMostBytes;
+  return parseTrace(path, [&](const std::string& file) -> std::optional<std::string> {
     std::error_code failure;
-    if (std::filesystem::is_directory(file, failure)) return std::nullopt;
-    // A device or a pipe may have no end: the user can name one, a trace cannot.
-    if (file != path && !std::filesystem::is_regular_file(file, failure)) return std::nullopt;
-    std::ifstream in(file, std::ios::binary);
-    std::ostringstream bytes;
-    if (!in || (in.peek() != EOF && !(bytes << in.rdbuf()))) return std::nullopt;
-    return std::move(bytes).str();
+    if (fs::is_directory(file, failure)) return std::nullopt;
+    // A device or a pipe may hang: the user can name one, a trace cannot.
+    const bool isFit = fs::is_regular_file(file, failure) && isInside(folder, file);
+    return file == path || isFit ? bytesOf(file, left) : std::nullopt;
   });
 }
 

@@ -20,7 +20,8 @@ struct ParsedTrace {
 /// Reads `path` and what it includes. Throws nothing, whatever the files hold.
 ParsedTrace parseTrace(const std::string& path, const TraceFiles& files);
 
-/// The same from the file system.
-ParsedTrace parseTrace(const std::string& path);
+/// The same from the file system: 256 MiB at most. What is included is a regular file in the folder
+/// `root` or below it, wherever links lead; an empty root is the folder of `path`.
+ParsedTrace parseTrace(const std::string& path, const std::string& root);
 
 }  // namespace brimol::pc

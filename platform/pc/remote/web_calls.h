@@ -38,6 +38,7 @@ struct WebCalls {
   decltype(&lws_service) service = library.function("lws_service");
   decltype(&lws_set_log_level) setLogLevel = library.function("lws_set_log_level");
   decltype(&lws_set_timeout) setTimeout = library.function("lws_set_timeout");
+  decltype(&lws_set_timer_usecs) setTimerUsecs = library.function("lws_set_timer_usecs");
   decltype(&lws_write) write = library.function("lws_write");
 };
 

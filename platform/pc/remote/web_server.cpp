@@ -15,14 +15,15 @@
 #include "remote/hosts.h"
 #include "remote/signals.h"
 #include "remote/web_answers.h"
+#include "remote/web_replies.h"
 
 namespace brimol::pc {
 namespace {
 
-constexpr std::size_t kMaxConnections = 64;
 constexpr std::size_t kMaxViewers = 16;
-constexpr int kSecondsToIntroduce = 5;  // for a request, and for a viewer's password
-constexpr int kSecondsToRead = 20;      // something of what waits
+constexpr int kSecondsToRead = 20;  // something of what waits
+// Of time after a wrong password in which no viewer is asked for one.
+constexpr std::chrono::milliseconds kPause{250};
 constexpr std::size_t kChunk = std::size_t{1} << 16;
 constexpr std::size_t kEnoughForServer = std::size_t{1} << 16;
 constexpr const char* kProtocol = "screen";
@@ -51,47 +52,9 @@ void setUp(int connection) {
 
 bool isOutOfResources(int error) { return error != EAGAIN && error != ECONNABORTED; }
 
-std::optional<std::string> header(lws* wsi, lws_token_indexes token) {
-  constexpr int kLongest = 256;
-  std::array<char, kLongest> text = {};
-  const int length = websockets().hdrCopy(wsi, text.data(), kLongest, token);
-  if (length <= 0) return std::nullopt;
-  return std::string(text.data(), static_cast<std::size_t>(length));
-}
-
 std::string_view bytesAt(const void* in, std::size_t length) {
   return in == nullptr ? std::string_view()
                        : std::string_view(static_cast<const char*>(in), length);
-}
-
-int sendText(lws* wsi, const WebAnswer& answer) {
-  constexpr std::size_t kHeadBytes = 2048;
-  std::array<unsigned char, LWS_PRE + kHeadBytes> head = {};
-  unsigned char* const start = head.data() + LWS_PRE;
-  unsigned char* place = start;
-  unsigned char* const end = head.data() + head.size();
-  if (websockets().addHttpCommonHeaders(wsi, HTTP_STATUS_OK, answer.type, answer.text.size(),
-                                        &place, end) != 0 ||
-      websockets().finalizeWriteHttpHeader(wsi, start, &place, end) != 0) {
-    return 1;
-  }
-  std::vector<unsigned char> body(LWS_PRE);
-  body.insert(body.end(), answer.text.begin(), answer.text.end());
-  const int sent =
-      websockets().write(wsi, body.data() + LWS_PRE, answer.text.size(), LWS_WRITE_HTTP_FINAL);
-  return sent < 0 || websockets().httpTransactionCompleted(wsi) != 0 ? 1 : 0;
-}
-
-int sendFile(lws* wsi, const WebAnswer& answer) {
-  const int result = websockets().serveHttpFile(wsi, answer.file.c_str(), answer.type, nullptr, 0);
-  return result < 0 || (result > 0 && websockets().httpTransactionCompleted(wsi) != 0) ? 1 : 0;
-}
-
-int refuse(lws* wsi, unsigned int status) {
-  return websockets().returnHttpStatus(wsi, status, nullptr) != 0 ||
-                 websockets().httpTransactionCompleted(wsi) != 0
-             ? 1
-             : 0;
 }
 
 }  // namespace
@@ -127,9 +90,10 @@ void WebServer::createContext() {
   info.port = CONTEXT_PORT_NO_LISTEN_SERVER;
   info.protocols = protocols();
   info.user = this;
-  info.fd_limit_per_thread = kMaxConnections + kMaxViewers + 8;  // and libwebsockets' own
-  info.timeout_secs = kSecondsToIntroduce;
-  info.keepalive_timeout = kSecondsToIntroduce;
+  constexpr unsigned int kOwn = 32;  // libwebsockets', and of connections that are about to end
+  info.fd_limit_per_thread = 2 * Connections::kMost + kOwn;
+  info.timeout_secs = Connections::kToIntroduce.count();
+  info.keepalive_timeout = Connections::kToIntroduce.count();
   info.retry_and_idle_policy = &kNoProbes;
   info.vhost_name = "brimol";
   const BrokenPipeKeeper keeper;  // libwebsockets has it ignored in the whole process
@@ -157,7 +121,9 @@ int WebServer::callback(lws* wsi, lws_callback_reasons reason, void* user, void*
   auto* const server =
       static_cast<WebServer*>(websockets().contextUser(websockets().getContext(wsi)));
   int result = 0;
-  if (server->isHandled(wsi, reason, bytesAt(in, length), result)) return result;
+  if (server->isHandled(wsi, reason, bytesAt(in, length), result)) {
+    return result == 0 ? 0 : -1;  // plain connections end for negative numbers alone
+  }
   return websockets().callbackHttpDummy(wsi, reason, user, in, length);
 }
 
@@ -175,28 +141,31 @@ bool WebServer::isHandled(lws* wsi, lws_callback_reasons reason, std::string_vie
     case LWS_CALLBACK_RAW_WRITEABLE: result = send(wsi); return true;
     case LWS_CALLBACK_CLOSED:
     case LWS_CALLBACK_RAW_CLOSE: end(wsi); return true;
-    case LWS_CALLBACK_WSI_DESTROY: connections.erase(wsi); return true;
+    case LWS_CALLBACK_WSI_DESTROY: connections.remove(wsi); return true;
+    case LWS_CALLBACK_TIMER: result = look(wsi); return true;
+    case LWS_CALLBACK_HTTP_FILE_COMPLETION:
+      connections.endFile(wsi);
+      setTimer(wsi);
+      return false;
     default: return false;
   }
 }
 
+// One at a time: the others are told of again, and those that were dropped for this one are gone
+// then.
 void WebServer::accept(lws* wsi) {
-  const Door door = doors.at(wsi);
-  const int listener = websockets().getSocketFd(wsi);
-  while (true) {
-    Socket connection(::accept4(listener, nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
-    if (connection.get() >= 0) {
-      receive(std::move(connection), door);
-      continue;
-    }
+  Socket connection(
+      ::accept4(websockets().getSocketFd(wsi), nullptr, nullptr, SOCK_NONBLOCK | SOCK_CLOEXEC));
+  if (connection.get() >= 0) {
+    receive(std::move(connection), doors.at(wsi));
+  } else if (isOutOfResources(errno)) {
     // Without descriptors the listener stays ready: trying at once would only heat the processor.
-    if (isOutOfResources(errno)) std::this_thread::sleep_for(std::chrono::milliseconds(100));
-    return;
+    std::this_thread::sleep_for(std::chrono::milliseconds(100));
   }
 }
 
 void WebServer::receive(Socket connection, Door door) {
-  if (connections.size() >= kMaxConnections || (door == Door::Vnc && !hasRoom())) return;
+  if ((door == Door::Vnc && !hasRoom()) || !makeRoom()) return;
   setUp(connection.get());
   lws_sock_file_fd_type descriptor = {};
   descriptor.sockfd = connection.release();
@@ -205,8 +174,43 @@ void WebServer::receive(Socket connection, Door door) {
   lws* const wsi = websockets().adoptDescriptorVhost(
       host, kind, descriptor, door == Door::Web ? nullptr : kProtocol, nullptr);
   if (wsi == nullptr) return;
-  connections.insert(wsi);
+  connections.add(wsi, Clock::now());
+  setTimer(wsi);
   if (door == Door::Vnc) begin(wsi, door);
+}
+
+// Whoever has not proved the password may have to go for a newcomer, the oldest first.
+bool WebServer::makeRoom() {
+  if (!connections.isFull()) return true;
+  lws* const oldest = connections.oldest([this](lws* each) { return isAdmitted(each); });
+  if (oldest == nullptr) return false;
+  connections.remove(oldest);
+  shutdown(websockets().getSocketFd(oldest), SHUT_RDWR);
+  return true;
+}
+
+// libwebsockets has time limits of its own, which each request begins anew.
+void WebServer::setTimer(lws* wsi) const {
+  const auto found = lines.find(wsi);
+  const bool waits = found != lines.end() && found->second->waitsForServer();
+  const Connections::Time end = connections.endOf(wsi);
+  const auto left = (waits ? std::min(end, pauseEnd) : end) - Clock::now();
+  const auto us = std::chrono::duration_cast<std::chrono::microseconds>(left).count();
+  websockets().setTimerUsecs(wsi, std::max<lws_usec_t>(us, 1));
+}
+
+int WebServer::look(lws* wsi) {
+  if (!connections.contains(wsi) || isAdmitted(wsi)) return 0;
+  if (Clock::now() >= connections.endOf(wsi)) return 1;
+  const auto found = lines.find(wsi);
+  if (found != lines.end() && !mayConnectToServer(found->second)) return 1;
+  setTimer(wsi);
+  return 0;
+}
+
+bool WebServer::isAdmitted(lws* wsi) const {
+  const auto found = lines.find(wsi);
+  return found != lines.end() && found->second->caller.shared()->isAdmitted;
 }
 
 int WebServer::answer(lws* wsi, std::string_view path) {
@@ -214,7 +218,10 @@ int WebServer::answer(lws* wsi, std::string_view path) {
   if (!asked || !isTrustedHost(*asked, ownName)) return refuse(wsi, HTTP_STATUS_FORBIDDEN);
   const std::optional<WebAnswer> found = webAnswer(path);
   if (!found) return refuse(wsi, HTTP_STATUS_NOT_FOUND);
-  return found->file.empty() ? sendText(wsi, *found) : sendFile(wsi, *found);
+  if (found->file.empty()) return sendText(wsi, *found);
+  connections.beginFile(wsi);
+  setTimer(wsi);
+  return sendFile(wsi, *found);
 }
 
 bool WebServer::isOfOwnPage(lws* wsi) const {
@@ -224,13 +231,14 @@ bool WebServer::isOfOwnPage(lws* wsi) const {
 }
 
 bool WebServer::hasRoom() const {
-  const auto isOuter = [](const auto& line) { return line.first == line.second->outer; };
-  return static_cast<std::size_t>(std::ranges::count_if(lines, isOuter)) < kMaxViewers;
+  const auto isViewer = [](const auto& line) {
+    return line.first == line.second->outer && line.second->caller.shared()->isAdmitted;
+  };
+  return static_cast<std::size_t>(std::ranges::count_if(lines, isViewer)) < kMaxViewers;
 }
 
 void WebServer::begin(lws* wsi, Door door) {
   lines[wsi] = std::make_shared<Line>(Line{{}, door, wsi});
-  websockets().setTimeout(wsi, PENDING_TIMEOUT_USER_OK, kSecondsToIntroduce);
   websockets().callbackOnWritable(wsi);
 }
 
@@ -241,8 +249,15 @@ int WebServer::hear(lws* wsi, std::string_view bytes) {
   if (line->outer == nullptr) return 1;
   if (wsi == line->inner) return hearServer(*line, bytes);
   const int result = hearViewer(*line, bytes);
-  if (result != 0 || line->inner != nullptr || !line->caller.isReadyForServer()) return result;
-  return connectToServer(line) ? 0 : 1;
+  return result == 0 && !mayConnectToServer(line) ? 1 : result;
+}
+
+// False: it has to be connected, and cannot be.
+bool WebServer::mayConnectToServer(const LinePointer& line) {
+  if (!line->waitsForServer()) return true;
+  if (Clock::now() >= pauseEnd) return connectToServer(line);
+  setTimer(line->outer);
+  return true;
 }
 
 int WebServer::hearViewer(Line& line, std::string_view bytes) {
@@ -300,11 +315,22 @@ int WebServer::sendToViewer(Line& line) {
   const auto kind = line.door == Door::Web ? LWS_WRITE_BINARY : LWS_WRITE_RAW;
   if (websockets().write(line.outer, buffer.data() + LWS_PRE, chunk.size(), kind) < 0) return 1;
   line.caller.drop(chunk.size());
+  if (!isServed(line)) return 1;
   watch(line);
   service.lookAgain();
   if (!line.caller.forViewer().isEmpty() || line.isEnding)
     websockets().callbackOnWritable(line.outer);
   return 0;
+}
+
+// More may have proved the password at once than there is room for.
+bool WebServer::isServed(Line& line) const {
+  if (line.isCounted || !line.caller.shared()->isAdmitted) return true;
+  const auto isOther = [](const auto& each) {
+    return each.first == each.second->outer && each.second->isCounted;
+  };
+  line.isCounted = static_cast<std::size_t>(std::ranges::count_if(lines, isOther)) < kMaxViewers;
+  return line.isCounted;
 }
 
 // Not by libwebsockets, which reads nothing more from a connection while some of what it sends
@@ -342,6 +368,7 @@ void WebServer::end(lws* wsi) {
   if (wsi == line->inner) {
     line->inner = nullptr;
     line->isEnding = true;
+    if (!line->caller.shared()->isAdmitted) pauseEnd = Clock::now() + kPause;
     if (line->outer != nullptr) websockets().callbackOnWritable(line->outer);
     return;
   }

@@ -2,17 +2,18 @@
 #pragma once
 
 #include <atomic>
+#include <chrono>
 #include <cstddef>
 #include <functional>
 #include <map>
 #include <memory>
-#include <set>
 #include <string>
 #include <string_view>
 #include <thread>
 #include <vector>
 
 #include "remote/caller.h"
+#include "remote/connections.h"
 #include "remote/listener.h"
 #include "remote/web_calls.h"
 
@@ -49,9 +50,15 @@ class WebServer {
     Door door;
     lws* outer;  // null once it is closed
     lws* inner = nullptr;
-    bool isEnding = false;  // once the viewer has what waits for it
+    bool isCounted = false;  // among the viewers
+    bool isEnding = false;   // once the viewer has what waits for it
+
+    bool waitsForServer() const {
+      return inner == nullptr && !isEnding && caller.isReadyForServer();
+    }
   };
   using LinePointer = std::shared_ptr<Line>;
+  using Clock = std::chrono::steady_clock;
 
   // libwebsockets' own signature, which is why there are two void*.
   static int callback(lws* wsi, lws_callback_reasons reason, void* user, void* in,
@@ -64,6 +71,10 @@ class WebServer {
   bool isHandled(lws* wsi, lws_callback_reasons reason, std::string_view in, int& result);
   void accept(lws* wsi);
   void receive(Socket connection, Door door);
+  bool makeRoom();
+  void setTimer(lws* wsi) const;
+  int look(lws* wsi);
+  bool isAdmitted(lws* wsi) const;
   int answer(lws* wsi, std::string_view path);
   bool isOfOwnPage(lws* wsi) const;
 
@@ -72,9 +83,11 @@ class WebServer {
   int hear(lws* wsi, std::string_view bytes);
   static int hearViewer(Line& line, std::string_view bytes);
   int hearServer(Line& line, std::string_view bytes) const;
+  bool mayConnectToServer(const LinePointer& line);
   bool connectToServer(const LinePointer& line);
   int send(lws* wsi);
   int sendToViewer(Line& line);
+  bool isServed(Line& line) const;
   static int sendToServer(Line& line);
   static void watch(const Line& line);
   void end(lws* wsi);
@@ -83,11 +96,12 @@ class WebServer {
   const ViewerService service;
   const std::string ownName;
   std::map<lws*, Door> doors;         // the listeners
-  std::set<lws*> connections;         // of browsers and viewers
+  Connections connections;            // of browsers and viewers
   std::map<lws*, LinePointer> lines;  // by both of their ends
   std::vector<unsigned char> buffer;  // what is sent, behind room for libwebsockets
   std::unique_ptr<lws_context, WebContextDeleter> context;
-  lws_vhost* host = nullptr;  // the context's
+  lws_vhost* host = nullptr;   // the context's
+  Connections::Time pauseEnd;  // of the pause after a wrong password
   std::atomic<bool> isOver = false;
   std::thread thread;
 };

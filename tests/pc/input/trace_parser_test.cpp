@@ -1,15 +1,18 @@
 #include "input/trace_parser.h"
 
 #include <gtest/gtest.h>
+#include <sys/resource.h>
 #include <unistd.h>
 
 #include <algorithm>
+#include <csignal>
 #include <filesystem>
 #include <fstream>
 #include <map>
 #include <random>
 
 #include "input/event_records.h"
+#include "input/line_file.h"
 #include "input/trace_recorder.h"
 #include "input/trace_steps.h"
 #include "scene/item_text.h"
@@ -147,6 +150,72 @@ TEST(TraceParserTest, IncludesFilesAndNamesTheirLines) {
   files["t/sub/part.trace"] = "brimol-trace 1\ninclude ../sub/../main.trace\n";
   EXPECT_NE(parse(files).error, "") << "it ends, whatever the names";
   EXPECT_EQ(parse(Files{}).error, "t/main.trace:1: cannot be read");
+}
+
+class FilesOfATrace : public testing::Test {
+ protected:
+  FilesOfATrace() {
+    std::filesystem::create_directories(folder / "t/sub");
+    write("main.trace", "brimol-trace 1\nwait 1\n");
+    write("t/sub/part.trace", "brimol-trace 1\nwait 1\n");
+    std::filesystem::create_symlink(folder, folder / "t/link");
+  }
+  ~FilesOfATrace() override { std::filesystem::remove_all(folder); }
+
+  void write(const std::string& name, const std::string& text) const {
+    std::ofstream(folder / name) << text;
+  }
+  std::string errorOf(const std::string& lines, const std::string& root = {}) const {
+    write("t/main.trace", "brimol-trace 1\n" + lines);
+    return parseTrace(folder / "t/main.trace", root).error;
+  }
+  std::string included(const std::string& file) const {
+    std::ifstream in(folder / file);
+    return {std::istreambuf_iterator<char>(in), {}};
+  }
+
+  const std::filesystem::path folder = std::filesystem::path(testing::TempDir()) /
+                                       ("files_of_a_trace." + std::to_string(::getpid()));
+};
+
+TEST_F(FilesOfATrace, StandInItsFolder) {
+  const std::string absolute = folder / "main.trace";
+  EXPECT_EQ(errorOf("include sub/part.trace\ninclude sub/../sub/part.trace"), "");
+  for (const std::string& name :
+       {std::string("../main.trace"), absolute, std::string("link/main.trace")}) {
+    EXPECT_NE(errorOf("include " + name).find("cannot be read"), std::string::npos) << name;
+    EXPECT_EQ(errorOf("include " + name, folder), "") << name;
+  }
+}
+
+TEST_F(FilesOfATrace, AreNoHugeOnes) {
+  for (const char* const beginning : {"PNG\n", "brimol-trace 1\n"}) {
+    write("t/huge", beginning);
+    std::filesystem::resize_file(folder / "t/huge", std::uintmax_t{1} << 40);
+    EXPECT_NE(errorOf("include huge").find("cannot be read"), std::string::npos);
+  }
+}
+
+TEST_F(FilesOfATrace, KeepWhatTheyHeldWhereTheDiskIsFull) {
+  std::filesystem::create_symlink(folder / "main.trace", folder / "recording");
+  const std::string before = included("main.trace");
+  (void)std::signal(SIGXFSZ, SIG_IGN);
+  rlimit former = {};
+  ::getrlimit(RLIMIT_FSIZE, &former);
+  const rlimit none = {0, former.rlim_max};
+  std::string error;
+  {
+    LineFile file(folder / "recording", error);
+    ::setrlimit(RLIMIT_FSIZE, &none);
+    file.write("brimol-trace 1 recording");
+    ::setrlimit(RLIMIT_FSIZE, &former);
+    file.write("it has ended");
+  }
+  EXPECT_EQ(error, "");
+  EXPECT_EQ(included("recording"), before);
+  EXPECT_FALSE(std::filesystem::exists(folder / "main.trace.part"));
+  LineFile(folder / "recording", error).write("new");
+  EXPECT_EQ(included("main.trace"), "new\n");
 }
 
 TEST(TraceParserTest, ReadsTimesOfDay) {

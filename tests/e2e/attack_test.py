@@ -1,0 +1,201 @@
+"""Clients that mean harm to an application whose screen is served: attack_test.py PROGRAM
+
+An honest viewer sees the screen all the while.
+"""
+
+import os
+import pathlib
+import re
+import select
+import socket
+import struct
+import subprocess
+import sys
+import time
+import unittest
+
+PROGRAM = sys.argv.pop(1)
+MOST_CONNECTIONS = 64
+MOST_VIEWERS = 16
+PAUSE = 0.25  # seconds after a wrong password
+
+
+class Application:
+    def __init__(self):
+        settings = {**os.environ, "BRIMOL_DISPLAY": "browser", "BRIMOL_LISTEN": "127.0.0.1:0"}
+        self.process = subprocess.Popen([PROGRAM], stderr=subprocess.PIPE, text=True, env=settings)
+        said = self.process.stderr.readline() + self.process.stderr.readline()
+        self.web, self.vnc, self.password = re.search(
+            r"http://127.0.0.1:(\d+)/.*\n.*127.0.0.1::(\d+), password (\w+)", said).groups()
+
+    def figures(self):
+        """Threads, descriptors, and memory in MiB."""
+        folder = pathlib.Path(f"/proc/{self.process.pid}")
+        status = (folder / "status").read_text()
+        memory = int(re.search(r"VmRSS:\s+(\d+)", status).group(1)) >> 10
+        return len(list((folder / "task").iterdir())), len(list((folder / "fd").iterdir())), memory
+
+    def end(self):
+        self.process.kill()
+        self.process.communicate()
+
+
+def connect(port, said=b""):
+    connection = socket.create_connection(("127.0.0.1", int(port)), timeout=60)
+    connection.sendall(said)
+    return connection
+
+
+def read(connection, count):
+    """That many bytes; fewer where the connection ends."""
+    got = b""
+    try:
+        while len(got) < count and (more := connection.recv(count - len(got))):
+            got += more
+    except ConnectionError:
+        pass
+    return got
+
+
+def has_ended(connection):
+    """Whether the other side has ended it; what it sent before is read."""
+    try:
+        while select.select([connection], [], [], 0)[0]:
+            if not connection.recv(1 << 16):
+                return True
+    except ConnectionError:
+        return True
+    return False
+
+
+def waits_for_end(connection):
+    return read(connection, 1 << 26) is not None
+
+
+def cipher(password, challenge):
+    """VNC's: each byte of the key the other way round."""
+    key = "".join(f"{int(f'{byte:08b}'[::-1], 2):02x}" for byte in password.encode().ljust(8, b"\0"))
+    command = ["openssl", "enc", "-des-ecb", "-K", key, "-nopad", "-provider", "legacy", "-provider", "default"]
+    return subprocess.run(command, input=challenge, stdout=subprocess.PIPE, check=True).stdout
+
+
+def viewer(application, password=None):
+    """A viewer that was let in, or None."""
+    connection = connect(application.vnc, b"RFB 003.008\n\2")
+    challenge = read(connection, 12 + 2 + 16)[14:]
+    if len(challenge) == 16:
+        connection.sendall(cipher(password or application.password, challenge) + b"\1")
+        if read(connection, 4) == bytes(4) and len(read(connection, 24)) == 24:
+            return connection
+    connection.close()
+    return None
+
+
+def ask_for_picture(connection):
+    connection.sendall(struct.pack(">BBHHHH", 3, 0, 0, 0, 2000, 4000))
+
+
+class AttackTest(unittest.TestCase):
+    @classmethod
+    def setUpClass(cls):
+        cls.application = Application()
+        cls.addClassCleanup(cls.application.end)
+        cls.opened = []
+        cls.before = None
+
+    def setUp(self):
+        self.honest = self.comes_in()
+        self.assertTrue(self.is_served(self.honest))
+        if self.before is None:
+            type(self).before = self.application.figures()
+
+    def tearDown(self):
+        self.assertTrue(self.is_served(self.honest), "the honest viewer is held up")
+        for connection in [*self.opened, self.honest]:
+            connection.close()
+        self.opened.clear()
+
+    def is_served(self, connection):
+        connection.sendall(struct.pack(">BBHHHH", 3, 0, 0, 0, 1, 1))
+        return len(read(connection, 20)) == 20  # one part of one pixel
+
+    def comes_in(self):
+        """An honest viewer, who tries again as the page does."""
+        for _ in range(60):
+            if connection := viewer(self.application):
+                read(connection, 6)  # the screen's name
+                return connection
+            time.sleep(0.5)
+        self.fail("an honest viewer is kept out")
+
+    def open(self, *arguments):
+        self.opened.append(connect(*arguments))
+        return self.opened[-1]
+
+    def test_who_asks_again_and_again_or_byte_by_byte_or_nothing_has_to_go(self):
+        slow = [self.open(port) for port in (self.application.web, self.application.vnc)]
+        asking, dripping = self.open(self.application.web), self.open(self.application.web)
+        request = b"GET /x HTTP/1.1\r\nHost: localhost\r\n\r\n"
+        for byte in b"GET / HTTP/1.1\r\nA: " + 50 * b"a":
+            try:
+                if not has_ended(asking):
+                    asking.sendall(request)
+                if not has_ended(dripping):
+                    dripping.sendall(bytes([byte]))
+            except ConnectionError:
+                pass
+            if all(map(has_ended, [asking, dripping, *slow])):
+                return
+            time.sleep(0.5)
+        self.fail("one stays")
+
+    def test_many_without_the_password_leave_room_for_one_with_it(self):
+        for _ in range(3 * MOST_CONNECTIONS):
+            self.open(self.application.web, b"GET / HTTP/1.1\r\n")
+        self.comes_in().close()
+        self.assertLessEqual(len([each for each in self.opened if not has_ended(each)]), MOST_CONNECTIONS)
+
+    def test_viewers_are_sixteen_and_go_where_they_read_nothing(self):
+        for _ in range(MOST_VIEWERS - 1):
+            self.opened.append(self.comes_in())
+            self.assertTrue(self.is_served(self.opened[-1]))
+        self.assertEqual(read(self.open(self.application.vnc), 12), b"", "one more than there is room for")
+        for connection in self.opened[:-1]:
+            ask_for_picture(connection)
+            ask_for_picture(connection)
+        self.comes_in().close()
+
+    def test_wrong_passwords_make_a_pause(self):
+        tries = 8
+        begin = time.monotonic()
+        for _ in range(tries):
+            self.assertIsNone(viewer(self.application, "wrong"))
+        self.assertGreaterEqual(time.monotonic() - begin, (tries - 1) * PAUSE)
+
+    def test_huge_and_broken_messages_end_the_connection(self):
+        huge = self.open(self.application.web)
+        try:
+            huge.sendall(b"GET / HTTP/1.1\r\nHost: localhost\r\n" + 40000 * b"A: aaaaaaaaaaaaaaaaaaaaa\r\n")
+        except ConnectionError:
+            pass
+        self.assertTrue(waits_for_end(huge))
+        for message in b"\2\0\xff\xff", b"\x80", b"\xc7":  # too many encodings, and unknown kinds
+            self.opened.append(self.comes_in())
+            self.opened[-1].sendall(message)
+            self.assertTrue(waits_for_end(self.opened[-1]))
+        clipboard = self.comes_in()
+        clipboard.sendall(b"\6\0\0\0\x7f\xff\xff\xff" + (32 << 20) * b"a")
+        clipboard.close()
+
+    def test_z_it_is_as_it_was(self):
+        for _ in range(60):
+            now = self.application.figures()
+            if now[:2] == self.before[:2]:
+                break
+            time.sleep(0.5)
+        self.assertEqual(now[:2], self.before[:2], "threads and descriptors")
+        self.assertLess(now[2], self.before[2] + 64, "MiB of memory")  # less than five pictures of the screen
+
+
+if __name__ == "__main__":
+    unittest.main()
