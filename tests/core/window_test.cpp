@@ -116,7 +116,7 @@ TEST_F(WindowTest, TurnsMillimetresIntoPixels) {
 }
 
 TEST_F(WindowTest, LogsEventsOfFingersAndKeys) {
-  const auto answered = [](uint32_t type) {
+  const auto answered = [](int type) {
     MW::event_data event = {};
     event.type = type;
     const int answer = Window::onRecvEvent(&event, 0);

@@ -129,6 +129,7 @@ TEST_F(WidgetTest, TheWindowsThreadsBringInputToAWidget) {
     EXPECT_EQ(MW::isDisplayUpdate(0), 1);
   }
   EXPECT_EQ(Window::getEventService(), nullptr);
+  Window::destroy();  // waits for the thread that ended itself
 }
 
 void unregister(std::unique_ptr<ProbeWidget>& widget) { Window::unregisterWidget(widget.get()); }
