@@ -110,7 +110,7 @@ TEST_F(Report, KeepsEachPictureOnceAndWithinItsBounds) {
 
 TEST_F(Report, ReadsNoPictureOutsideTheRun) {
   EXPECT_EQ(fileOf(folder, "a/b.png"), folder / "a/b.png");
-  fs::create_symlink("/etc", folder / "link");
+  std::filesystem::create_symlink("/etc", folder / "link");
   for (const char* const name : {"", "link/passwd", "/etc/passwd", "../x.png", "a/../../x.png"}) {
     EXPECT_EQ(fileOf(folder, name), std::nullopt) << name;
   }
