@@ -88,10 +88,11 @@ TEST_F(SessionReplay, PaintsTheSamePictures) {
   const fs::path other = folder / "other";
   const std::string trace =
       writeTrace("screen 720x1280\ndensity 312.5\ninclude " TRACES "minute.trace\n");
-  ASSERT_EQ(play(trace, {{"BRIMOL_REPORT_DIR", report}}), kNotAllPassed)
+  const std::pair<std::string, std::string> root = {"BRIMOL_TRACE_ROOT", TRACES};
+  ASSERT_EQ(play(trace, {{"BRIMOL_REPORT_DIR", report}, root}), kNotAllPassed)
       << readAll(folder / "stderr");
   const BusyCore busy;
-  ASSERT_EQ(play(trace, {{"BRIMOL_REPORT_DIR", other}}), kNotAllPassed);
+  ASSERT_EQ(play(trace, {{"BRIMOL_REPORT_DIR", other}, root}), kNotAllPassed);
   int pictures = 0;
   for (const auto& entry : fs::directory_iterator(report)) {
     if (entry.path().extension() != ".png") continue;

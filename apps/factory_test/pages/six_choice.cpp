@@ -29,7 +29,7 @@ class SixChoiceTest : public LookTest {
     if (page.isAsking()) return;
     const ScreenSize screen = screenSize();
     const int top = percentOf(screen.height, kBelowDialog);
-    page.drawHint(within({0, top, screen.width, screen.height - top, 0}, gapOf(screen) / 2));
+    page.drawHint(within({0, top, screen.width, screen.height - top, 0}, gapOf(screen)));
   }
 
  protected:
