@@ -50,8 +50,7 @@ void Session::followMonkey(uint64_t moment) {
   }
   if (monkey->posted() >= nextTold || moment >= nextToldMs) tellOfMonkey();
   if (monkey->sinceNews() > kMostWithoutNews) {
-    endMonkey("nothing new was shown for " + std::to_string(kMostWithoutNews) +
-              " events");
+    endMonkey("nothing new was shown for " + std::to_string(kMostWithoutNews) + " events");
   }
   if (!monkey->isOver()) return;
   tellOfMonkey();

@@ -120,7 +120,7 @@ struct Trace {
   bool isRecording = false;
   bool leavesRunning = false;
   uint64_t lingerMs = 0;  // from the last step's end to the wish to close
-  std::string cutAt;  // a recording without an end: where it stops, for the user
+  std::string cutAt;      // a recording without an end: where it stops, for the user
   std::optional<Size> screen;
   std::optional<float> density;  // dots per inch
   std::optional<uint32_t> clockStart;
