@@ -62,7 +62,7 @@ class Visit {
     for (std::size_t i = 0; i < testEntries().size(); ++i) {
       program->open(i, GetTicks());
       screen.settle();
-      if (!std::ranges::count(kFixedLetters, testEntries()[i].id)) look();
+      if (std::ranges::count(kFixedLetters, testEntries()[i].id) == 0) look();
       leavePage(testEntries()[i].id);
     }
     passUnseen();

@@ -73,9 +73,12 @@ std::string csvLines(const RunRecord& run, const VerdictRecord& verdict) {
   if (verdict.result.values.empty()) return before + ",,,," + behind;
   std::string lines;
   for (const Measure& each : verdict.result.values) {
-    lines += before + csvField(each.name) + "," + csvField(each.unit) + "," +
-             numberText(each.value) + "," + limitText(each.least) + "," + limitText(each.most) +
-             behind;
+    lines += before;
+    for (const std::string& field : {csvField(each.name), csvField(each.unit),
+                                     numberText(each.value), limitText(each.least)}) {
+      lines += field + ",";
+    }
+    lines += limitText(each.most) + behind;
   }
   return lines;
 }
