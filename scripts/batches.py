@@ -11,7 +11,7 @@ import sys
 MOST_FILES = 12
 # Of a line that starts at the margin, as every declaration outside functions and classes does here: what
 # stands before the first sign that ends a declared name.
-DECLARED = re.compile(r'^(?!namespace\b)[A-Za-z_][\w:<>,&* ]*?(?<!:)\b(\w+)(?:\[[^\]]*\])? ?(?:[=({;]|$)', re.MULTILINE)
+DECLARED = re.compile(r'^(?:extern "C" )?(?!namespace\b)[A-Za-z_][\w:<>,&* ]*?(?<!:)\b(\w+)(?:\[[^\]]*\])? ?(?:[=({;]|$)', re.MULTILINE)
 
 
 def make_batches(paths):
