@@ -1,3 +1,4 @@
+#include <fcntl.h>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <netinet/in.h>
@@ -6,6 +7,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <array>
 #include <csignal>
 #include <fstream>
 #include <iterator>
@@ -163,18 +165,25 @@ TEST_F(Records, KnowARunThatADeadProgramLeft) {
 }
 
 TEST_F(Records, TakeSeveralProgramsAtOnce) {
-  constexpr int kPrograms = 4;
+  constexpr int kPrograms = 8;
   constexpr int kVerdicts = 25;
   std::vector<pid_t> children;
+  std::array<int, 2> gate = {};
+  ASSERT_EQ(::pipe2(gate.data(), O_CLOEXEC), 0);
   for (int program = 0; program < kPrograms; ++program) {
     children.push_back(::fork());
     if (children.back() != 0) continue;
+    ::close(gate[1]);
+    char unused = 0;
+    while (::read(gate[0], &unused, 1) > 0) {
+    }
     auto book = open(startOf("A" + std::to_string(program)));
     for (int i = 0; book && i < kVerdicts; ++i) {
       if (!book->record(kKeys, error)) ::_exit(1);
     }
     ::_exit(book ? 0 : 1);
   }
+  for (const int each : gate) ::close(each);  // all begin the same new database now
   for (const pid_t child : children) {
     int end = 0;
     ::waitpid(child, &end, 0);

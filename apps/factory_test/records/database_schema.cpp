@@ -5,8 +5,10 @@
 
 #include <array>
 #include <cerrno>
+#include <chrono>
 #include <string>
 #include <system_error>
+#include <thread>
 
 #include "results/whole_file.h"
 
@@ -184,6 +186,22 @@ void bringUpToDate(Sqlite& store) {
   transaction.commit();
 }
 
+// SQLite itself waits for nobody here: of programs that begin one new database at once it refuses all
+// but the first.
+void keepLogOf(Sqlite& store) {
+  constexpr std::chrono::milliseconds kPause{5};
+  const auto end = std::chrono::steady_clock::now() + Sqlite::kPatience;
+  for (;;) {
+    try {
+      store.runAll("pragma journal_mode = wal");
+      return;
+    } catch (const StoreBusy&) {
+      if (std::chrono::steady_clock::now() >= end) throw;
+    }
+    std::this_thread::sleep_for(kPause);
+  }
+}
+
 }  // namespace
 
 const int kDatabaseVersion = static_cast<int>(kSteps.size());
@@ -192,7 +210,7 @@ void prepareDatabase(Sqlite& store, const fs::path& path) {
   // Each commit is on the disk when it returns.
   store.runAll("pragma foreign_keys = on; pragma synchronous = full");
   if (!isNew(store)) checkDatabase(store, path);
-  store.runAll("pragma journal_mode = wal");
+  keepLogOf(store);
   if (!isNew(store) && versionOf(store) == kDatabaseVersion) return;
   if (!isNew(store)) backUp(store, path);
   bringUpToDate(store);
