@@ -89,7 +89,7 @@ class Application {
         gPainted.set();
       }
     }
-    MW::Window::updateTimer(MW::kUnused);
+    MW::Window::updateTimer(0);  // older commits, too, are measured by this
     Delay(kLoopMs);
   }
 
@@ -180,7 +180,7 @@ void idle(benchmark::State& state) {
 
 BENCHMARK(pressToCallback)->Iterations(500)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(pressToFrame)->Iterations(500)->Unit(benchmark::kMillisecond)->UseRealTime();
-BENCHMARK(pressBehindTenFingers)->Iterations(1)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(pressBehindTenFingers)->Iterations(3)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(idle)->Iterations(1)->Unit(benchmark::kMillisecond)->UseRealTime();
 
 }  // namespace
