@@ -12,7 +12,11 @@ readonly rounds=5
 # build SOURCE BUILD PROGRAM...
 build() {
   cmake -S "$1" -B "$2" -G Ninja -DCMAKE_BUILD_TYPE=Release >/dev/null
-  cmake --build "$2" --target "${@:3}" >/dev/null
+  cmake --build "$2" --target "${@:3}" >"$2/build.log" || {
+    grep -m 3 'error' "$2/build.log" >&2
+    echo "bench.sh: $1 does not build under these benchmarks: $2/build.log" >&2
+    return 1
+  }
 }
 
 # run BUILD PROGRAM: what the benchmark found, as JSON.
@@ -23,15 +27,29 @@ figures() {
   local program
   for program in painter_bench start_bench latency_bench; do
     run "$1" $program | jq -r '.benchmarks[] | . as $of | ["least_us", "median_us", "least_ms", "median_ms",
-      "p99_ms", "resident_mb", "core_percent", "wakeups_per_s"][] | select($of[.]) |
-      [($of.name | gsub("^painting/|/(iterations:\\d+|manual_time|real_time)"; "")), ., $of[.]] | @tsv'
+      "p99_ms", "resident_mb", "core_percent", "wakeups_per_s", "allocations"][] | select($of[.]) |
+      [($of.name | gsub("^painting/|/(iterations:\\d+|manual_time|real_time)"; "") | gsub("_"; " ")) +
+        ", " + sub("_(?<unit>.*)"; " \(.unit)" | gsub("_"; " ")), $of[.]] | @tsv'
   done
 }
 
-# Of all rounds the smallest value of each figure, in the order of the first round.
-best() {
-  awk -F'\t' '{ key = $1 " " $2 } !(key in low) { order[++count] = key; low[key] = $3 }
-    $3 < low[key] { low[key] = $3 } END { for (i = 1; i <= count; ++i) print order[i] "\t" low[order[i]] }'
+# compared OLD NEW: the least and the median of each figure's rounds, in the order of the first round, and
+# their ratios.
+compared() {
+  jq -rn --arg old "$1" --arg new "$2" '
+    def rounds: split("\n") | map(select(. != "") | split("\t") | {name: .[0], value: (.[1] | tonumber)});
+    def values($name): map(select(.name == $name).value) | sort;
+    def middle: if length == 0 then null else .[length / 2 | floor] end;
+    def ratio($a; $b): if $a == null or $b == null or $a == 0 then null else $b / $a end;
+    ($old | rounds) as $olds | ($new | rounds) as $news |
+    (reduce $news[].name as $each ([]; if index([$each]) then . else . + [$each] end))[] as $name |
+    ($olds | values($name)) as $a | ($news | values($name)) as $b |
+    [$name, $a[0], $b[0], ratio($a[0]; $b[0]), ($a | middle), ($b | middle), ratio($a | middle; $b | middle)] |
+    map(. // "-") | @tsv' | awk -F'\t' '
+    function shown(value) { return value == "-" ? value : sprintf("%.2f", value) }
+    BEGIN { printf "%-46s %29s  %29s\n", "", "least: old, new, ratio", "median: old, new, ratio" }
+    { printf "%-46s %10s %10s %7s  %10s %10s %7s\n", $1, shown($2), shown($3), shown($4), shown($5), shown($6),
+      shown($7) }'
 }
 
 compare_with() {
@@ -51,9 +69,8 @@ compare_with() {
     old_runs+=$(figures "$folder/build")$'\n'
     new_runs+=$(figures build/release)$'\n'
   done
-  echo "== The least of each figure: $commit, this tree, ratio"
-  paste <(best <<<"${old_runs%$'\n'}") <(best <<<"${new_runs%$'\n'}") |
-    awk -F'\t' '{ printf "%-44s %10.2f %10.2f %6.2f\n", $1, $2, $4, $4 / $2 }'
+  echo "== Of all rounds: $commit, this tree, ratio"
+  compared "$old_runs" "$new_runs"
 }
 
 # table MARK HEADER FORMAT: puts a table of the lines of values that it reads between two marks of the

@@ -104,12 +104,11 @@ void InputService::pausePoller(Lock& lock, Time end) {
 void InputService::pauseOther(Lock& lock, uint32_t ms, Time end) {
   EarlyEnds::Pause pause(earlyEnds, ms);
   const auto handMoved = [&, handAtStart = handChanges] { return handChanges != handAtStart; };
-  if (pause.isBounded()) {
-    const Time soonest = std::min(end, steady_clock::now() + milliseconds(1));
-    if (wake.wait_until(lock, soonest, handMoved)) return;
-  }
+  const Time soonest = std::min(end, steady_clock::now() + milliseconds(1));
   pause.wake().wait_until(lock, end, [&] { return handMoved() || pause.isOver(); });
-  if (pause.isOver()) pause.endEarly();
+  if (!pause.isOver()) return;
+  if (pause.isBounded()) wake.wait_until(lock, soonest, handMoved);
+  pause.endEarly();
 }
 
 void InputService::takeHand(uint32_t start) {
