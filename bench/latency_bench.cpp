@@ -1,6 +1,6 @@
 // How long an event takes from its arrival at the platform to the application's callback and to the
 // painted frame, on the real threads of an application; how late it comes behind a flood; and what
-// an application costs in which nothing happens.
+// an application costs in which nothing happens, or which draws the same again.
 #include <MW/button.h>
 #include <MW/event_service.h>
 #include <MW/window.h>
@@ -18,6 +18,7 @@
 #include <thread>
 #include <vector>
 
+#include "allocations.h"
 #include "host/open_platform.h"
 #include "input/event_records.h"
 #include "input/input_service.h"
@@ -53,6 +54,7 @@ class Mark {
 Mark gCalled;
 Mark gPainted;
 std::atomic<bool> gWantsFrame = false;
+std::atomic<int> gFrames = 0;
 
 // An application with one button and the usual loop, which draws and tells when it was painted.
 class Application {
@@ -84,6 +86,7 @@ class Application {
       skia_begin_frame_c();
       MW::Window::show();
       skia_end_frame_c();
+      ++gFrames;
       if (gWantsFrame.exchange(false)) {
         brimol::pc::openedPlatform()->copyPicture(std::chrono::seconds(1));
         gPainted.set();
@@ -178,9 +181,26 @@ void idle(benchmark::State& state) {
   }
 }
 
+// What all threads together ask for, from the drawing to the picture.
+void sameFrame(benchmark::State& state) {
+  const Application application;
+  std::this_thread::sleep_for(std::chrono::milliseconds(100));
+  for ([[maybe_unused]] auto round : state) {
+    const uint64_t before = allocationCount();
+    const int frames = gFrames;
+    for (int wanted = 0; wanted < 100; ++wanted) {
+      MW::isDisplayUpdate(1);
+      std::this_thread::sleep_for(std::chrono::milliseconds(2 * kLoopMs));
+    }
+    state.counters["allocations"] =
+        static_cast<double>(allocationCount() - before) / (gFrames - frames);
+  }
+}
+
 BENCHMARK(pressToCallback)->Iterations(500)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(pressToFrame)->Iterations(500)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(pressBehindTenFingers)->Iterations(3)->Unit(benchmark::kMillisecond)->UseRealTime();
+BENCHMARK(sameFrame)->Iterations(1)->Unit(benchmark::kMillisecond)->UseRealTime();
 BENCHMARK(idle)->Iterations(1)->Unit(benchmark::kMillisecond)->UseRealTime();
 
 }  // namespace

@@ -12,6 +12,7 @@
 #include "records/run.h"
 #include "results/measure_text.h"
 #include "run_progress.h"
+#include "standing.h"
 #include "world.h"
 
 namespace factory_test {
@@ -122,6 +123,7 @@ void FactoryTest::updateMenu(uint32_t now) {
 }
 
 void FactoryTest::updateTest(uint32_t now) {
+  showStanding(now);
   running->test->update(now);
   const Outcome outcome = running->test->verdict();
   if (outcome == Outcome::Running && isOverdue(running->step, now - running->startTicks)) {
@@ -231,10 +233,21 @@ void FactoryTest::follow(bool isYes, uint32_t now) {
 void FactoryTest::start(std::size_t entry, uint32_t now) {
   const TestEntry& chosen = testEntries()[entry];
   context.log.add(std::string("Test ") + chosen.id);
-  running = Running{entry, stepOf(context, chosen.id), chosen.make(context), presentTime(), now};
+  running =
+      Running{entry, stepOf(context, chosen.id), chosen.make(context), presentTime(), now, ""};
   running->test->prepare(running->step);
+  showStanding(now);
   running->test->showProgress(progressOf(book));
   running->test->enter();
+  MW::isDisplayUpdate(1);
+}
+
+void FactoryTest::showStanding(uint32_t now) {
+  std::string words =
+      standingOf(running->step, run ? run->attempt() : 1, now - running->startTicks);
+  if (words == running->standing) return;
+  running->test->showStanding(words);
+  running->standing = std::move(words);
   MW::isDisplayUpdate(1);
 }
 

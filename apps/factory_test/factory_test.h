@@ -47,6 +47,7 @@ class FactoryTest {
     std::unique_ptr<Test> test;
     std::chrono::sys_seconds started;
     uint32_t startTicks;
+    std::string standing;  // as it is shown
   };
 
   enum class Asked { Leave, IncompletePass, SaveAgain, Repeat, GoOn, RunEnd };
@@ -57,6 +58,7 @@ class FactoryTest {
   void startUnit(uint32_t now);
   void updateMenu(uint32_t now);
   void updateTest(uint32_t now);
+  void showStanding(uint32_t now);
   bool isWithinLimits() const;
   void updateRun(uint32_t now);
   void updatePrompt(uint32_t now);

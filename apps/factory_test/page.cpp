@@ -59,7 +59,8 @@ void Page::drawFront() {
 }
 
 void Page::drawHint(const SKIA_Rect& area) const {
-  drawWords(area, hint, kPageInk.text, leadingAlign(), textSize(screenSize()));
+  drawWords(area, standing.empty() ? hint : hint + "\n" + standing, kPageInk.text, leadingAlign(),
+            textSize(screenSize()));
 }
 
 void Page::say(const char* words) {

@@ -24,6 +24,9 @@ class Page {
   void drawFront();
   /// How much of the title's bar is full.
   void showProgress(const RunProgress& newProgress) { progress = newProgress; }
+  /// What stands below the instructions; may be empty.
+  void showStanding(const std::string& words) { standing = words; }
+  const std::string& shownStanding() const { return standing; }
   /// Changes the instructions.
   void instruct(const std::string& words) { hint = words; }
   void drawHint(const SKIA_Rect& area) const;
@@ -48,6 +51,7 @@ class Page {
   MW::Box head;
   MW::Label titleText;
   std::string hint;
+  std::string standing;
   MW::Textbox line;
   std::optional<VerdictBar> bar;
 };

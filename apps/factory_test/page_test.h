@@ -23,6 +23,7 @@ class PageTest : public Test {
   void takeBack() override { page.takeBack(); }
   void prepare(const PlanStep& planned) override;
   void showProgress(const RunProgress& progress) override { page.showProgress(progress); }
+  void showStanding(const std::string& words) override { page.showStanding(words); }
   void draw() override { page.draw(); }
 
  protected:

@@ -26,6 +26,9 @@ class Test {
   /// What the plan says of the test, such as words for the operator in the place of the page's own;
   /// before enter().
   virtual void prepare(const PlanStep& step) { static_cast<void>(step); }
+  /// How the attempt stands in the plan, such as its number and the time left; may be empty. Comes
+  /// before enter(), and with each change.
+  virtual void showStanding(const std::string& words) { static_cast<void>(words); }
   /// Puts the test's widgets on the screen.
   virtual void enter() = 0;
   /// Takes them off again. No callback runs any more when it returns.

@@ -18,7 +18,7 @@ UnitPage::UnitPage()
   const SKIA_Rect area = inColor(upper, kPanelInk.ground);
   const SKIA_Text looks = captionOf("");
   keyboard.emplace(&area, &looks);
-  keyboard->release_cb = [](int, MW::Ime* from) { Here::get().follow(*from); };
+  keyboard->release_cb = [](int, MW::Ime*) { Here::get().follow(*Here::get().keyboard); };
   keyboard->setActive(1);
   without.emplace(lower, kFaces);
   key.emplace().keyPressCallback = [](MW::kbd_event* event) {
@@ -31,11 +31,26 @@ void UnitPage::answer(std::string serial) {
   entered = std::move(serial);
 }
 
-void UnitPage::follow(MW::Ime& from) {
+// What was typed stays in the bar, for a correction.
+void UnitPage::follow(Keyboard& from) {
+  if (!from.isEntered()) return;
   const std::string serial = from.getResultString();
-  if (serial.empty()) return;
-  from.typing_reset();
-  answer(serial);
+  from.setResultString("");
+  if (serial.empty()) {
+    page.say(tr("No number was typed."));
+  } else {
+    answer(serial);
+  }
+}
+
+bool UnitPage::Keyboard::onRecvEvent(MW::event_data* event, unsigned int unused) {
+  if (event != nullptr && event->type == MW::kEventPress) {
+    const SKIA_Rect& enter = key_rect.back();
+    const auto& at = event->mouse;
+    hasEnter =
+        at.x > enter.x && at.x < enter.x + enter.w && at.y > enter.y && at.y < enter.y + enter.h;
+  }
+  return Ime::onRecvEvent(event, unused);
 }
 
 std::optional<std::string> UnitPage::takeAnswer() {

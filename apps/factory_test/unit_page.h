@@ -29,14 +29,27 @@ class UnitPage {
   void refuse(const std::string& why) { page.say(tr(why.c_str())); }
 
  private:
+  /// Tells of the enter key, whatever was typed.
+  class Keyboard : public MW::Ime {
+   public:
+    using Ime::Ime;
+    ~Keyboard() override { leaveLayers(); }
+    bool onRecvEvent(MW::event_data* event, unsigned int unused) override;
+    /// Whether enter was pressed last.
+    bool isEntered() const { return hasEnter; }
+
+   private:
+    bool hasEnter = false;  // dispatch thread
+  };
+
   void answer(std::string serial);
-  void follow(MW::Ime& from);
+  void follow(Keyboard& from);
 
   Current<UnitPage> current{this};
   Page page;
   std::mutex lock;
   std::optional<std::string> entered;  // guarded by lock
-  std::optional<MW::Ime> keyboard;
+  std::optional<Keyboard> keyboard;
   std::optional<ButtonRow> without;
   std::optional<MW::Key> key;
 };

@@ -49,6 +49,27 @@ class SessionTest(unittest.TestCase):
                 self.fail(program.communicate()[1])
             time.sleep(0.02)
 
+    def test_the_operator_is_told(self):
+        """That no number was typed, or a wrong one, which stays; the time left; the second attempt."""
+        plan = self.folder / "plan.json"
+        plan.write_text(json.dumps({"version": 1, "name": "Trails", "steps": [
+            {"test": "touch_trails", "timeout_s": 2, "retries": 1}]}))
+        trace = """tap "enter"
+expect text "No number was typed."
+type "a b"
+tap "enter"
+expect text "*serial number*"
+expect text "a b"
+tap "back"
+tap "back"
+tap "enter"
+expect text "Time left: 1 s"
+expect text "Attempt 2 of 2 · Time left: 2 s" within 2000
+expect text "1 of 1 done: *" within 3000
+"""
+        self.assertNotIn("played.trace", self.start(trace, "--plan", plan, "--run").communicate()[1])
+        self.assertEqual([("a",)], self.ask("select serial from units"))
+
     def test_one_unit_after_another(self):
         """The second one fails; the exit code tells of it, though the third one passes."""
         plan = self.folder / "plan.json"

@@ -40,10 +40,11 @@ class ColourTest : public LookTest {
     const SKIA_Rect foot =
         rowsOf<2>({0, 0, screen.width, screen.height, kPanelInk.ground}, 0, {5, 1})[1];
     skia_add_box_c(foot);
-    const std::string plans = planStep.text.empty() ? "" : planStep.text + "\n";
-    drawWords(within(foot, gapOf(screen)),
-              plans + tr("Tap: the next colour.\nHold a finger still, or Select: end."),
-              kPanelInk.text, SKIA_ALIGN_CENTRE, textSize(screen));
+    std::string words = planStep.text.empty() ? "" : planStep.text + "\n";
+    words += tr("Tap: the next colour.\nHold a finger still, or Select: end.");
+    if (!page.shownStanding().empty()) words.append("\n").append(page.shownStanding());
+    drawWords(within(foot, gapOf(screen)), words, kPanelInk.text, SKIA_ALIGN_CENTRE,
+              textSize(screen));
   }
 
   bool isComplete() const override { return shown >= kColours - 1; }

@@ -68,13 +68,12 @@ std::shared_ptr<Platform> openedPlatform() {
   return opened;
 }
 
-void submitFrame(Frame&& frame) {
+void submitFrame(Frame& frame) {
   Session* const played = session();
   const auto platform = openedPlatform();
   if (!platform) return;
   inputService().hearOfFrame();
-  played != nullptr ? played->frame(*platform, std::move(frame))
-                    : platform->submit(std::move(frame));
+  played != nullptr ? played->frame(*platform, frame) : platform->submit(frame);
 }
 
 }  // namespace brimol::pc

@@ -87,12 +87,12 @@ void Platform::close() {
   waiting = {};
 }
 
-void Platform::submit(Frame&& frame) {
+void Platform::submit(Frame& frame) {
   const int light = brightness;
   if (light < kFullLight) frame.push_back(veilOver(settings.screen, kFullLight - light));
-  addWork([&frame](Work& work) {
-    if (!work.frame) work.frame.emplace();
-    work.frame->swap(frame);  // what is overtaken is freed by the caller, outside the lock
+  addWork([this, &frame](Work& work) {
+    if (!work.frame) work.frame.emplace(std::exchange(shown, {}));
+    work.frame->swap(frame);
   });
 }
 
@@ -116,6 +116,11 @@ bool Platform::addWork(Change change) {
   change(waiting);
   if (awakener != nullptr) awakener->wake();
   return true;
+}
+
+void Platform::keepMemoryOf(Frame& painted) {
+  const std::lock_guard<std::mutex> lock(mutex);
+  shown.swap(painted);
 }
 
 // Nothing once the platform is to close.
@@ -150,7 +155,10 @@ void Platform::run(std::promise<std::string> opened) {
 void Platform::serve(Display& display, InputTranslator& input) {
   Painter painter(settings.screen);
   for (auto work = takeWork(); work; work = takeWork()) {
-    if (work->frame) show(*work->frame, painter, display);
+    if (work->frame) {
+      show(*work->frame, painter, display);
+      keepMemoryOf(*work->frame);
+    }
     for (const Action& action : work->actions) action(input);
     for (auto& picture : work->pictures) picture.set_value(copyOf(painter.picture()));
     input.tick(service.now());

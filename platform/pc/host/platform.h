@@ -49,7 +49,8 @@ class Platform {
   float density() const { return settings.density; }
 
   /// Shows `frame` soon, instead of one that still waits to be shown. Never waits itself.
-  void submit(Frame&& frame);
+  /// Afterwards `frame` is another one: which is overtaken, or shown before.
+  void submit(Frame& frame);
 
   /// Darkens the frames that are submitted from now on. `percent` is clamped to 0, dark, to 100,
   /// full light.
@@ -81,6 +82,7 @@ class Platform {
   void show(const Frame& frame, Painter& painter, Display& display) const;
   void attend(Display& display, const Painter& painter);
   std::optional<Work> takeWork();
+  void keepMemoryOf(Frame& painted);
   void setDisplay(Display* display);
   template <typename Change>
   bool addWork(Change change);
@@ -90,9 +92,10 @@ class Platform {
   std::atomic<bool> closeRequested = false;  // written by the platform's thread; orders nothing
   std::atomic<int> brightness = kFullLight;  // per cent; orders nothing
 
-  std::mutex mutex;  // guards the three below
+  std::mutex mutex;  // guards the four below
   bool isOver = false;
   Work waiting;
+  Frame shown;                  // painted already: its memory is for one to come
   Display* awakener = nullptr;  // the display while it can be woken; the thread owns it
 
   std::thread thread;

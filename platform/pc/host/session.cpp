@@ -277,19 +277,19 @@ std::optional<bool> Session::isCloseRequested() const {
   return closeAsked.load();
 }
 
-void Session::frame(Platform& platform, Frame&& shown) {
+void Session::frame(Platform& platform, Frame& shown) {
   if (turns) turns->takePart();
   const InsideWait wait(clock());
   const std::lock_guard lock(mutex);
   if (isOver || open == nullptr || (frames > 0 && isSameFrame(lastFrame, shown))) {
-    platform.submit(std::move(shown));
+    platform.submit(shown);
     return;
   }
   lastFrame = shown;
   ++frames;
   const std::vector<std::string> items = textOfFrame(lastFrame);
   const auto start = std::chrono::steady_clock::now();
-  platform.submit(std::move(shown));
+  platform.submit(shown);
   if (report) {
     CairoSurface picture;
     if (settings.keepsPictures) picture = platform.copyPicture(kPictureBound);

@@ -47,7 +47,7 @@ class Session {
 
   /// A frame was ended, on the thread that drew it. Returns when its picture is painted, if that is
   /// kept.
-  void frame(Platform& platform, Frame&& shown);
+  void frame(Platform& platform, Frame& shown);
   /// What the display reports of the user: for the recording, or nothing.
   void userInput(const Event& record);
   void userCloses();

@@ -1,7 +1,5 @@
 #include "scene/recorder.h"
 
-#include <utility>
-
 #include "scene/frame_sink.h"
 
 namespace brimol::pc {
@@ -10,7 +8,6 @@ namespace {
 
 struct Recording {
   Frame items;
-  std::size_t lastCount = 0;  // items of the frame before: what the next one is likely to need
   bool started = false;
 };
 
@@ -20,15 +17,13 @@ constinit thread_local Recording recording;
 
 void beginRecording() {
   recording.items.clear();
-  recording.items.reserve(recording.lastCount);
   recording.started = true;
 }
 
 void endRecording() {
   if (!recording.started) return;
   recording.started = false;
-  recording.lastCount = recording.items.size();
-  submitFrame(std::move(recording.items));
+  submitFrame(recording.items);
 }
 
 int record(const SKIA_Item& item) {
