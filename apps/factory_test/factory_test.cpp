@@ -68,16 +68,14 @@ void FactoryTest::startUnit(uint32_t now) {
   RunStart next = book.run();
   next.unit = serial;
   next.started = presentTime();
-  const ExitCode last = book.hasBegun() ? judgeRun(book, next.tests) : ExitCode::Passed;
   const bool isFit = serial.empty() || isSerial(serial, error);
-  if (!isFit || !book.startUnit(next, error)) {
+  if (!isFit || !leaveUnit(error) || !book.startUnit(next, error)) {
     const bool waits = isFit && book.isBusy() && !beginning.isOver(now);
     if (!waits) beginning.end();
     unitPage->refuse(waits ? tr("Saving...") : error);
     return;
   }
   beginning.end();
-  earlierUnits = worse(earlierUnits, last);
   unitPage.reset();
   menu.showVerdicts();
   if (task.isRun) {
@@ -88,17 +86,20 @@ void FactoryTest::startUnit(uint32_t now) {
   MW::isDisplayUpdate(1);
 }
 
+// Before the next one begins, of which a first try may fail half way.
+bool FactoryTest::leaveUnit(std::string& error) {
+  if (!book.saveAgain(error)) return false;
+  if (book.hasBegun()) earlierUnits = worse(earlierUnits, judgeRun(book, book.run().tests));
+  return true;
+}
+
 void FactoryTest::stay() {
   ended = false;
   if (asksForUnits) askForUnit();
 }
 
 void FactoryTest::update(uint32_t now) {
-  if (saving.takeTry(now)) {
-    std::string error;
-    const bool isKept = book.saveAgain(error);
-    showKept(isKept, error, now);
-  }
+  if (saving.takeTry(now)) saveAgain(now);
   if (prompt) {
     updatePrompt(now);
   } else if (unitPage) {
@@ -115,7 +116,15 @@ void FactoryTest::update(uint32_t now) {
 void FactoryTest::updateMenu(uint32_t now) {
   menu.update(now);
   if (menu.takeLeave()) {
-    ask(Asked::Leave, {tr("Leave"), tr("End the factory test?"), tr("OK"), tr("CANCEL")});
+    isLeaving = true;
+    if (!book.isAllSaved()) saveAgain(now);
+  } else if (isLeaving && !saving.isWaiting()) {
+    isLeaving = false;
+    ask(Asked::Leave, {tr("Leave"),
+                       book.isAllSaved() ? tr("End the factory test?")
+                                         : tr("Not all results are saved. End the factory test, and "
+                                              "lose them?"),
+                       tr("OK"), tr("CANCEL")});
   } else if (const auto chosen = menu.takeChosen()) {
     menu.hide();
     start(*chosen, now);
@@ -203,11 +212,7 @@ void FactoryTest::follow(bool isYes, uint32_t now) {
       }
       break;
     case Asked::SaveAgain:
-      if (isYes) {
-        std::string error;
-        const bool isKept = book.saveAgain(error);
-        showKept(isKept, error, now);
-      }
+      if (isYes) saveAgain(now);
       break;
     case Asked::Repeat:
       if (isYes) {
@@ -302,6 +307,12 @@ Verdict FactoryTest::keep(const Running& done, Verdict given, Reason failure, ui
   return verdict;
 }
 
+void FactoryTest::saveAgain(uint32_t now) {
+  std::string error;
+  const bool isKept = book.saveAgain(error);
+  showKept(isKept, error, now);
+}
+
 // Another program that writes into the database is waited for, while the screen goes on.
 void FactoryTest::showKept(bool isKept, const std::string& error, uint32_t now) {
   const bool waits = !isKept && book.isBusy();
@@ -311,7 +322,7 @@ void FactoryTest::showKept(bool isKept, const std::string& error, uint32_t now) 
   MW::isDisplayUpdate(1);
   if (isKept || saving.isWaiting()) return;
   complain(error);
-  ask(Asked::SaveAgain, {tr("Not saved"), error, tr("TRY AGAIN"), tr("LATER")});
+  ask(Asked::SaveAgain, {tr("Not saved"), trError(error), tr("TRY AGAIN"), tr("LATER")});
 }
 
 void FactoryTest::draw() {

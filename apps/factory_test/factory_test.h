@@ -56,6 +56,7 @@ class FactoryTest {
   void askForUnit();
   void updateUnit(uint32_t now);
   void startUnit(uint32_t now);
+  bool leaveUnit(std::string& error);
   void updateMenu(uint32_t now);
   void updateTest(uint32_t now);
   void showStanding(uint32_t now);
@@ -69,6 +70,7 @@ class FactoryTest {
   int attemptAt(const std::string& test) const;
   Verdict keep(const Running& done, Verdict given, Reason failure, uint32_t now);
   void endRun(uint32_t now);
+  void saveAgain(uint32_t now);
   void showKept(bool isKept, const std::string& error, uint32_t now);
 
   ResultBook& book;
@@ -81,6 +83,7 @@ class FactoryTest {
   std::string serial;  // that was entered last
   Patience beginning;  // of its run
   Patience saving;     // of what is not saved yet
+  bool isLeaving = false;  // what is not saved is tried again before the question
   ExitCode earlierUnits = ExitCode::Passed;
   std::optional<Running> running;
   std::optional<PlanRun> run;  // while a plan is performed without the menu

@@ -26,7 +26,7 @@ class UnitPage {
   /// What was entered since the last call; an empty text: the unit has no number. Nothing: not yet.
   std::optional<std::string> takeAnswer();
   /// Why another one is needed.
-  void refuse(const std::string& why) { page.say(tr(why.c_str())); }
+  void refuse(const std::string& why) { page.say(trError(why).c_str()); }
 
  private:
   /// Tells of the enter key, whatever was typed.

@@ -153,10 +153,10 @@ class ExportsTest(unittest.TestCase):
                     (1 << 20, ["export", "--json", "--database", self.store], full, "stdout cannot be written"),
                     (1 << 20, ["report", "--database", self.store, "--output", "/dev/full"], None, "not a regular file"),
                     (33000, ["export", "--json", "--database", self.store, "--output", old], None,
-                     f"{old}: cannot be written: File too large"),
-                    (64, [*screen, "--new-run", "--results", results], None, f"{results}: cannot be written: File too large"),
+                     f"{old}: cannot be written: the file would be too large"),
+                    (64, [*screen, "--new-run", "--results", results], None, f"{results}: cannot be written: the file would be too large"),
                     (4096, [*screen, "--serial", "x", "--database", self.store], None,
-                     f"{self.store}: cannot be read or written: File too large"),
+                     f"{self.store}: cannot be read or written: the file would be too large"),
             ]:
                 with self.subTest(arguments):
                     before = old.read_bytes(), results.read_bytes()
@@ -181,10 +181,10 @@ class ExportsTest(unittest.TestCase):
                 (["report", "--since", "2026-02-30", *store], 2, "--since needs a day"),
                 (["export", "--csv", "--value", "x", *store], 2, "takes no --value"),
                 (["report", "--line", "x"], 2, "--line needs an address"),
-                (["report", "--database", "/none.db"], 1, "/none.db: cannot be opened: No such file"),
+                (["report", "--database", "/none.db"], 1, "/none.db: cannot be opened: it or its folder is missing"),
                 (["report", "--database", __file__], 1, "is not a database"),
                 (["report", "--database", self.folder / "empty.db"], 1, "holds no factory test's records"),
-                (["report", *store, "--output", "/none/x"], 1, "/none/x: cannot be written: No such file"),
+                (["report", *store, "--output", "/none/x"], 1, "/none/x: cannot be written: it or its folder is missing"),
         ]:
             with self.subTest(arguments):
                 out = self.program(*arguments)

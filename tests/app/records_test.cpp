@@ -267,7 +267,7 @@ TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
            {"has lost its version: put it aside, then begin a new one",
             [&] { run("pragma user_version = 0"); }},
            {"is another program's database", [&] { run("pragma application_id = 7"); }},
-           {"is damaged: put it aside, then begin a new one",
+           {"is damaged; put it aside, then begin a new one",
             [&] {
               run("pragma application_id = 1179927618; pragma user_version = 4");
               for (std::streamoff page = 1; page < 30; ++page)
@@ -287,13 +287,13 @@ TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
 
 TEST_F(Records, SayWhereTheyCannotBeWritten) {
   EXPECT_FALSE(ResultBook::open({.database = folder / "none" / "x.db"}, {}, error));
-  EXPECT_THAT(error, testing::EndsWith("/none/x.db: cannot be opened: No such file or directory"));
+  EXPECT_THAT(error, testing::EndsWith("/none/x.db: cannot be opened: it or its folder is missing"));
   const int end = inChild([this] {
     fs::permissions(folder, fs::perms::owner_read | fs::perms::owner_exec);
     if (::setuid(65'534) != 0 && ::getuid() == 0) ::_exit(2);
     const bool isRefused =
         !open(startOf("A1")) &&
-        error == file.native() + ": cannot be made in its folder: Permission denied";
+        error == file.native() + ": cannot be made in its folder: this user has no right to";
     ::_exit(isRefused ? 0 : 1);
   });
   EXPECT_EQ(end, 0) << "a folder that cannot be written";

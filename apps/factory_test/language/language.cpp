@@ -67,6 +67,20 @@ const char* tr(const char* english) {
 // The catalogues of languages that are written so translate the word.
 bool isRightToLeft() { return std::string_view(tr("left-to-right")) == "right-to-left"; }
 
+std::string trError(std::string_view error) {
+  constexpr std::string_view kBetween = ": ";
+  const auto end = [&] { return std::min(error.find(kBetween), error.size()); };
+  if (end() == error.size()) return tr(std::string(error).c_str());
+  std::string shown(error.substr(0, end()));
+  error.remove_prefix(end());
+  while (!error.empty()) {
+    error.remove_prefix(kBetween.size());
+    shown.append(kBetween).append(tr(std::string(error.substr(0, end())).c_str()));
+    error.remove_prefix(end());
+  }
+  return shown;
+}
+
 const char* trn(const char* one, const char* many, unsigned long count) {
   return dngettext(kDomain, one, many, count);
 }

@@ -25,6 +25,10 @@ const char* tr(const char* english);
 /// The text of a number of things, in the form that the language has for so many.
 const char* trn(const char* one, const char* many, unsigned long count);
 
+/// An error's line in the chosen language: a text, or a file's name and texts, with ": " between
+/// them.
+std::string trError(std::string_view error);
+
 /// Whether the language is written from right to left, as its catalogue says.
 bool isRightToLeft();
 

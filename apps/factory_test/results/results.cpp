@@ -89,6 +89,7 @@ bool ResultBook::begin(const RunStart& start, std::string& error) {
   if (database) {
     std::vector<TestResult> resumed;
     if (!database->startRun(wanted, files.resume, resumed, error)) return false;
+    isBegun = false;  // until the files say so, too
     beginAnew();
     for (TestResult& result : resumed) put(std::move(result));
   } else if (!goOn(wanted, error)) {
@@ -130,7 +131,7 @@ bool ResultBook::isComplete(const std::vector<std::string>& tests) const {
 }
 
 bool ResultBook::startUnit(const RunStart& start, std::string& error) {
-  return saveAgain(error) && begin(start, error);
+  return saveAgain(error) && saveFiles(error) && begin(start, error);
 }
 
 bool ResultBook::saveFiles(std::string& error) {
