@@ -120,11 +120,12 @@ void FactoryTest::updateMenu(uint32_t now) {
     if (!book.isAllSaved()) saveAgain(now);
   } else if (isLeaving && !saving.isWaiting()) {
     isLeaving = false;
-    ask(Asked::Leave, {tr("Leave"),
-                       book.isAllSaved() ? tr("End the factory test?")
-                                         : tr("Not all results are saved. End the factory test, and "
-                                              "lose them?"),
-                       tr("OK"), tr("CANCEL")});
+    ask(Asked::Leave,
+        {tr("Leave"),
+         book.isAllSaved() ? tr("End the factory test?")
+                           : tr("Not all results are saved. End the factory test, and "
+                                "lose them?"),
+         tr("OK"), tr("CANCEL")});
   } else if (const auto chosen = menu.takeChosen()) {
     menu.hide();
     start(*chosen, now);
@@ -256,11 +257,13 @@ void FactoryTest::showStanding(uint32_t now) {
   MW::isDisplayUpdate(1);
 }
 
-// `failure`: why, where the outcome is a FAIL.
+// `failure`: why, where the outcome is a FAIL. An attempt that is begun anew is kept, too: retries
+// are to be seen in the records.
 void FactoryTest::finish(Outcome outcome, uint32_t now, Reason failure) {
   const std::size_t entry = running->entry;
   running->test->leave();
   if (outcome == Outcome::Retry) {
+    keep(*running, Verdict::None, Reason::Retry, now);
     running.reset();
     start(entry, now);
     return;
@@ -270,7 +273,9 @@ void FactoryTest::finish(Outcome outcome, uint32_t now, Reason failure) {
                                                    : Verdict::None;
   // Looking at a test without a verdict keeps the one that it had.
   const bool isNew = given != Verdict::None || book.find(running->step.test) == nullptr;
-  const Verdict verdict = isNew ? keep(*running, given, failure, now) : given;
+  const Verdict verdict =
+      isNew ? keep(*running, given, given == Verdict::Fail ? failure : Reason::Unknown, now)
+            : given;
   running.reset();
   if (run) {
     run->finish(verdict);
@@ -285,13 +290,13 @@ int FactoryTest::attemptAt(const std::string& test) const {
   return earlier == nullptr ? 1 : earlier->attempt + 1;
 }
 
-Verdict FactoryTest::keep(const Running& done, Verdict given, Reason failure, uint32_t now) {
+Verdict FactoryTest::keep(const Running& done, Verdict given, Reason reason, uint32_t now) {
   std::vector<Measure> values = done.test->values();
   const PlanStep& step = done.step;
   const Verdict judged = judge(given, values, step);
   const Verdict verdict = task.simulation.rehearsed(judged, step.test, attemptAt(step.test));
-  if (judged != given) failure = Reason::Limit;
-  if (verdict != judged) failure = Reason::Rehearsal;
+  if (judged != given) reason = Reason::Limit;
+  if (verdict != judged) reason = Reason::Rehearsal;
   for (const Measure& each : values) context.log.add(each.name + ": " + measureText(each));
   context.log.add(std::string("Verdict ") + verdictName(verdict));
   std::string error;
@@ -301,7 +306,7 @@ Verdict FactoryTest::keep(const Running& done, Verdict given, Reason failure, ui
                                    .duration = std::chrono::milliseconds(now - done.startTicks),
                                    .screen = screenSize(),
                                    .values = std::move(values),
-                                   .reason = verdict == Verdict::Fail ? failure : Reason::Unknown},
+                                   .reason = reason},
                                   error);
   showKept(isKept, error, now);
   return verdict;
@@ -343,6 +348,7 @@ void FactoryTest::draw() {
   MW::Window::show();
   if (running && !prompt) running->test->drawOver();
   skia_end_frame_c();
+  if (running) running->test->frameShown();
 }
 
 }  // namespace factory_test

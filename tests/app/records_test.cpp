@@ -287,7 +287,8 @@ TEST_F(Records, ThatCannotBeUsedAreNamedAndLeftAsTheyAre) {
 
 TEST_F(Records, SayWhereTheyCannotBeWritten) {
   EXPECT_FALSE(ResultBook::open({.database = folder / "none" / "x.db"}, {}, error));
-  EXPECT_THAT(error, testing::EndsWith("/none/x.db: cannot be opened: it or its folder is missing"));
+  EXPECT_THAT(error,
+              testing::EndsWith("/none/x.db: cannot be opened: it or its folder is missing"));
   const int end = inChild([this] {
     fs::permissions(folder, fs::perms::owner_read | fs::perms::owner_exec);
     if (::setuid(65'534) != 0 && ::getuid() == 0) ::_exit(2);
@@ -383,9 +384,12 @@ RunRecord runOf(const char* unit, RunState state, std::vector<TestResult> result
 
 TEST_F(Records, TellYieldFailsAndValues) {
   const TestResult touched = resultOf("touch", Verdict::Pass);
+  const TestResult anew = {.test = "touch", .reason = Reason::Retry};
   std::vector<RunRecord> runs = {
       runOf("at first", RunState::Finished, {kKeys, touched}),
       runOf("in the end", RunState::Finished, {kKeys, kTouch, touched}),
+      runOf("tried anew", RunState::Finished,
+            {anew, {kKeys.test, Verdict::Pass}, {"touch", Verdict::Pass}}),
       runOf("later", RunState::Aborted, {kTouch}),
       runOf("later", RunState::Finished, {kKeys, touched}),
       runOf("never", RunState::Finished, {kKeys, kTouch}),
@@ -393,12 +397,12 @@ TEST_F(Records, TellYieldFailsAndValues) {
       runOf("unjudged", RunState::Aborted, {kKeys, touched}),
   };
   runs[0].verdicts[0].result.values[0].value = 9.5;
-  runs[5].start.started += std::chrono::days(1);
+  runs[6].start.started += std::chrono::days(1);
   runs.push_back(runOf("rehearsed", RunState::Finished, {kKeys, kTouch}));
   runs.back().start.planName += kRehearsal;
   const Statistics all = statisticsOf(runs);
-  EXPECT_EQ(all.total.units, 5);
-  EXPECT_EQ(all.total.passed, 3);
+  EXPECT_EQ(all.total.units, 6);
+  EXPECT_EQ(all.total.passed, 4);
   EXPECT_EQ(all.total.passedAtFirst, 1);
   EXPECT_EQ(all.days.size(), 2U);
   EXPECT_EQ(all.aborted, 2);

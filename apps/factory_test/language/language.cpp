@@ -64,6 +64,21 @@ const char* tr(const char* english) {
   return *english == '\0' ? english : dgettext(kDomain, english);
 }
 
+std::string filled(std::string_view format, std::initializer_list<std::string_view> words) {
+  std::string text;
+  for (std::size_t i = 0; i < format.size(); ++i) {
+    const bool isPlace = format[i] == '%' && i + 1 < format.size();
+    const auto number = isPlace ? static_cast<std::size_t>(format[i + 1] - '1') : words.size();
+    if (number < words.size()) {
+      text += std::data(words)[number];
+      ++i;
+    } else {
+      text += format[i];
+    }
+  }
+  return text;
+}
+
 // The catalogues of languages that are written so translate the word.
 bool isRightToLeft() { return std::string_view(tr("left-to-right")) == "right-to-left"; }
 

@@ -1,7 +1,9 @@
 // How often the panel reports, and how late its reports reach the screen.
 #include <algorithm>
+#include <cmath>
 #include <memory>
 #include <optional>
+#include <utility>
 #include <vector>
 
 #include <brimol/input.h>
@@ -15,7 +17,9 @@ namespace factory_test {
 
 namespace {
 
-constexpr double kSecond = 1000;  // ms
+constexpr double kSecond = 1000;       // ms
+constexpr double kLongestPause = 200;  // ms; a finger that stands reports nothing
+constexpr double kStandingMm = 2;
 constexpr uint32_t kDotColor = 0xFFE8C040;
 
 /// Counts the reports of one finger while it moves, until it has moved for long enough.
@@ -29,6 +33,13 @@ class TouchRatePage : public MeasurePage {
     return measure({{"event rate", moved > 0 ? reports * kSecond / moved : kNotMeasured},
                     {"longest gap", reports > 0 ? longestGap : kNotMeasured},
                     {"latency", frames > 0 ? late / frames : kNotMeasured}});
+  }
+
+  void frameShown() override {
+    if (!drawn) return;
+    late += GetTicks() - *drawn;
+    frames += 1;
+    drawn.reset();
   }
 
  protected:
@@ -49,24 +60,29 @@ class TouchRatePage : public MeasurePage {
       const int side = 2 * textSize(screen);
       skia_add_roundbox_c({last->x - side / 2, last->y - side / 2, side, side, kDotColor});
     }
-    if (!undrawn) return;
-    late += GetTicks() - *undrawn;
-    frames += 1;
-    undrawn.reset();
+    drawn = std::exchange(undrawn, std::nullopt);
   }
 
  private:
   void count(const Input& input) {
     const double gap = input.ticks - last->ticks;
-    reports += 1;
-    moved += gap;
-    longestGap = std::max(longestGap, gap);
+    if (gap <= kLongestPause || hasTravelled(input)) {
+      reports += 1;
+      moved += gap;
+      longestGap = std::max(longestGap, gap);
+    }
     last = input;
     if (!undrawn) undrawn = input.ticks;
   }
 
+  // Then the panel was silent, not the finger at rest.
+  bool hasTravelled(const Input& to) const {
+    return millimetres(std::hypot(to.x - last->x, to.y - last->y)) > kStandingMm;
+  }
+
   std::optional<Input> last;        // of the finger that is down
-  std::optional<uint32_t> undrawn;  // when the oldest report came that no frame shows yet
+  std::optional<uint32_t> undrawn;  // when the oldest report came that was not drawn yet
+  std::optional<uint32_t> drawn;    // the same of the frame that is on its way
   double reports = 0;
   double moved = 0;  // ms
   double longestGap = 0;

@@ -272,6 +272,7 @@ bool readSteps(const JsonNode& node, Plan& plan, const Reading& reading) {
     }
     const PlanStep usual = usualStep(step.test);
     if (memberOf(item, "limits") == nullptr) step.limits = usual.limits;
+    step.parameters.insert(usual.parameters.begin(), usual.parameters.end());
     if (memberOf(item, "timeout_s") == nullptr) step.timeout = usual.timeout;
     plan.steps.push_back(std::move(step));
   }

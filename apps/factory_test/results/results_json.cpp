@@ -79,8 +79,8 @@ bool readAttempt(const json& value, TestResult& result) {
 
 bool readReason(const json& value, TestResult& result) {
   if (value.is_null()) return true;
-  for (const auto reason : {Reason::Operator, Reason::Limit, Reason::TimeOut, Reason::Rehearsal}) {
-    if (value != reasonName(reason)) continue;
+  for (const Reason reason : kReasons) {
+    if (reason == Reason::Unknown || value != reasonName(reason)) continue;
     result.reason = reason;
     return true;
   }
