@@ -1,6 +1,7 @@
 #include <gtest/gtest.h>
 #include <unistd.h>
 
+#include <cstring>
 #include <filesystem>
 #include <fstream>
 
@@ -155,15 +156,24 @@ struct RunCase {
   const char* name;
   OnFailure onFailure;
   int retries;
-  const char* verdicts;  // p, f or n for each attempt, g, a or s for an answer
-  const char* tests;     // the number of the step before each of these, and how it ends
+  const char* verdicts;      // p, f or n for each attempt, g, a or s for an answer
+  const char* tests;         // the number of the step before each of these, and how it ends
+  const char* earlier = "";  // p, f or n for each step of a run that was aborted, - for none
 };
 
 class PlanRuns : public testing::TestWithParam<RunCase> {};
 
 TEST_P(PlanRuns, TakeTheirSteps) {
   const Plan plan = threeSteps(GetParam().onFailure, GetParam().retries);
-  PlanRun run(plan);
+  std::vector<TestResult> earlier;
+  for (std::size_t i = 0; i < std::strlen(GetParam().earlier); ++i) {
+    const char verdict = GetParam().earlier[i];
+    if (verdict == '-') continue;
+    earlier.push_back({plan.steps[i].test, verdict == 'p'   ? Verdict::Pass
+                                           : verdict == 'f' ? Verdict::Fail
+                                                            : Verdict::None});
+  }
+  PlanRun run(plan, earlier);
   std::string taken;
   for (const char each : std::string(GetParam().verdicts)) {
     const bool isAnswer = each == 'g' || each == 'a' || each == 's';
@@ -193,7 +203,13 @@ INSTANTIATE_TEST_SUITE_P(
                     RunCase{"asks", OnFailure::Ask, 1, "pffafgp", "122?2?3."},
                     RunCase{"asks_and_stops", OnFailure::Ask, 0, "pfs", "12?!"},
                     RunCase{"left_is_asked_for", OnFailure::GoOn, 3, "pnapns", "12?23?!"},
-                    RunCase{"last_fails", OnFailure::Stop, 0, "ppf", "123."}),
+                    RunCase{"last_fails", OnFailure::Stop, 0, "ppf", "123."},
+                    RunCase{"skips_what_is_done", OnFailure::Stop, 0, "pp", "13.", "-f"},
+                    RunCase{"performs_what_was_left", OnFailure::Stop, 0, "p", "1.", "npp"},
+                    RunCase{"was_stopped", OnFailure::Stop, 0, "", "!", "pf"},
+                    RunCase{"has_a_retry_left", OnFailure::Stop, 1, "pf", "23.", "pf"},
+                    RunCase{"was_asking", OnFailure::Ask, 0, "afgp", "?2?3.", "pf"},
+                    RunCase{"was_done", OnFailure::GoOn, 0, "", ".", "pfp"}),
     [](const auto& shown) { return shown.param.name; });
 
 TEST(TimeOuts, EndAtTheirMillisecond) {

@@ -82,17 +82,17 @@ TEST_F(Records, GoOnWithTheUnitsAbortedRunOnly) {
   struct Other {
     const char* name;
     RunStart start;
-    Database::Resume resume;
+    Resume resume;
   };
   RunStart plan = startOf("A1");
   plan.planHash = "other";
   RunStart software = startOf("A1");
   software.software = "1.1";
   for (const auto& [name, start, resume] : std::vector<Other>{
-           {"its run", startOf("A1"), Database::Resume::Yes},
-           {"another unit's", startOf("A2"), Database::Resume::Yes},
-           {"no unit's", startOf(""), Database::Resume::Yes},
-           {"not wanted", startOf("A1"), Database::Resume::No},
+           {"its run", startOf("A1"), Resume::Yes},
+           {"another unit's", startOf("A2"), Resume::Yes},
+           {"no unit's", startOf(""), Resume::Yes},
+           {"not wanted", startOf("A1"), Resume::No},
        }) {
     const auto book = ResultBook::open({.database = file, .resume = resume}, start, error);
     ASSERT_TRUE(book) << error;
