@@ -1,7 +1,6 @@
 #include "value_lines.h"
 
 #include <algorithm>
-#include <cmath>
 
 #include "language/language.h"
 #include "plan/judge.h"
@@ -19,11 +18,9 @@ std::string limitsIn(const Measure& measure) {
   return measure.most ? filled(tr("at most %1"), {numberText(*measure.most)}) : "";
 }
 
-// As measureText(); with a dash for what was not measured yet.
-std::string lineOf(const Measure& measure) {
-  const bool isMeasured = !std::isnan(measure.value);
-  std::string line = std::string(tr(measure.name.c_str())) + ": ";
-  line += isMeasured ? numberText(measure.value) : "-";
+// As measureText().
+std::string lineOf(const Measure& measure, const std::string& number) {
+  std::string line = std::string(tr(measure.name.c_str())) + ": " + number;
   if (!measure.unit.empty()) line.append(" ").append(tr(measure.unit.c_str()));
   const std::string limits = limitsIn(measure);
   return limits.empty() ? line : line + " (" + limits + ")";
@@ -31,21 +28,20 @@ std::string lineOf(const Measure& measure) {
 
 }  // namespace
 
-std::vector<std::string> valueLines(std::vector<Measure> values, const PlanStep& step) {
-  const auto isIn = [&values](const std::string& name) {
-    return std::ranges::find(values, name, &Measure::name) != values.end();
-  };
-  for (const auto& [name, limits] : step.limits) {
-    if (isIn(name)) continue;
-    values.push_back(measured(step.test, name, 0));
-    values.back().value = kNotMeasured;
-  }
+std::vector<ValueLine> valueLines(std::vector<Measure> values, const PlanStep& step) {
   judge(Verdict::Pass, values, step);
-  std::vector<std::string> lines;
-  lines.reserve(values.size());
+  std::vector<ValueLine> lines;
   for (const ValueKind& kind : testKind(step.test).values) {
-    const auto found = std::ranges::find(values, kind.name, &Measure::name);
-    if (found != values.end()) lines.push_back(lineOf(*found));
+    const auto value = std::ranges::find(values, kind.name, &Measure::name);
+    const auto limits = step.limits.find(std::string(kind.name));
+    if (value != values.end()) {
+      lines.push_back({lineOf(*value, numberText(value->value)), value->isWithin()});
+    } else if (limits != step.limits.end()) {
+      Measure missing = measured(step.test, kind.name, 0);
+      missing.least = limits->second.least;
+      missing.most = limits->second.most;
+      lines.push_back({lineOf(missing, "-"), false});
+    }
   }
   return lines;
 }

@@ -1,6 +1,8 @@
 #include <gtest/gtest.h>
+#include <unistd.h>
 
 #include <cstring>
+#include <filesystem>
 #include <fstream>
 
 #include "plan/judge.h"
@@ -13,6 +15,15 @@ namespace factory_test {
 namespace {
 
 const std::vector<KnownTest> kKnown = {{"touch_grid", true}, {"keys", true}, {"shell", false}};
+
+// Goes with it.
+struct PlanFile {
+  PlanFile() = default;
+  ~PlanFile() { std::filesystem::remove(name); }
+  PlanFile(const PlanFile&) = delete;
+  PlanFile& operator=(const PlanFile&) = delete;
+  const std::string name = testing::TempDir() + "plan_test." + std::to_string(::getpid()) + ".json";
+};
 
 Plan threeSteps(OnFailure onFailure, int retries) {
   PlanStep second = {.test = "keys", .retries = retries, .onFailure = onFailure};
@@ -94,7 +105,8 @@ TEST(Plans, TakeTheUsualLimitsWhereTheySayNone) {
 }
 
 TEST(Plans, HaveTheHashOfTheirText) {
-  const std::string file = testing::TempDir() + "plan_hash.json";
+  const PlanFile written;
+  const std::string& file = written.name;
   const Plan plan = {.name = "x", .steps = {{.test = "keys"}}};
   std::ofstream(file) << planJson(plan);
   FILE* const sum = popen(("sha256sum < " + file).c_str(), "r");
@@ -106,7 +118,8 @@ TEST(Plans, HaveTheHashOfTheirText) {
 }
 
 TEST(Plans, AreReadFromSmallFilesOnly) {
-  const std::string file = testing::TempDir() + "plan.json";
+  const PlanFile written;
+  const std::string& file = written.name;
   const std::string text = planJson({.name = "x", .steps = {{.test = "keys"}}});
   std::string error;
   std::ofstream(file) << text;
