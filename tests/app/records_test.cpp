@@ -88,6 +88,13 @@ TEST_F(Records, GoOnWithTheUnitsAbortedRunOnly) {
   plan.planHash = "other";
   RunStart software = startOf("A1");
   software.software = "1.1";
+  RunStart rehearsal = startOf("A1");
+  rehearsal.planName += kRehearsal;
+  rehearsal.planHash = "rehearsed";
+  for (int times = 0; times < 2; ++times) {
+    auto book = open(rehearsal);
+    EXPECT_TRUE(book->results().empty() && book->record(kKeys, error)) << error;
+  }
   for (const auto& [name, start, resume] : std::vector<Other>{
            {"its run", startOf("A1"), Resume::Yes},
            {"another unit's", startOf("A2"), Resume::Yes},
@@ -194,25 +201,31 @@ TEST_F(Records, TakeSeveralProgramsAtOnce) {
   for (const RunRecord& run : history()) EXPECT_EQ(run.verdicts.size(), kVerdicts);
 }
 
-TEST_F(Records, OfAnOlderVersionAreMigratedWithABackup) {
-  std::ifstream dump(RECORDS_V1);
+class OldRecords : public Records, public testing::WithParamInterface<int> {};
+
+TEST_P(OldRecords, AreMigratedWithABackup) {
+  const std::string old = std::to_string(GetParam());
+  std::ifstream dump(RECORDS + old + ".sql");
   const std::string sql((std::istreambuf_iterator<char>(dump)), {});
   Sqlite(file, Sqlite::Mode::Write).runAll(sql.c_str());
-  fs::create_symlink("station.db.v1.bak", file.native() + ".v1.bak");  // in the way, and a loop
+  const std::string backup = file.native() + ".v" + old + ".bak";
+  fs::create_symlink(fs::path(backup).filename(), backup);  // in the way, and a loop
   fs::create_symlink(file, folder / "link.db");
   ASSERT_TRUE(ResultBook::open({.database = folder / "link.db"}, startOf("C1"), error)) << error;
-  for (const auto& [path, version] : {std::pair(file, 4), {file.native() + ".v1.bak.2", 1}}) {
+  for (const auto& [path, version] : {std::pair(file, 4), {backup + ".2", GetParam()}}) {
     Sqlite store(path, Sqlite::Mode::Read);
     EXPECT_EQ(store.number("pragma user_version"), version);
     const auto runs = readHistory(queryOf(store), {.unit = "OLD 1"});
     ASSERT_EQ(runs.size(), 1U);
-    EXPECT_EQ(runs[0].verdicts.at(1).result.operatorName, version == 1 ? "" : "Eve");
+    EXPECT_EQ(runs[0].verdicts.at(1).result.operatorName, version == 4 ? "Eve" : "");
     EXPECT_EQ(runs[0].verdicts.at(1).result.values.at(0), (Measure{"gap", "mm", 0.25, {}, 1.5}));
   }
   Sqlite store(file, Sqlite::Mode::Read);
   EXPECT_EQ(store.number("select count(*) from changes where verdict is not null"), 2);
   EXPECT_EQ(store.number("select revision from runs where unit = 'OLD 1'"), 1);
 }
+
+INSTANTIATE_TEST_SUITE_P(All, OldRecords, testing::Values(1, 2, 3));
 
 TEST_F(Records, AreReadWithoutLeavingAFile) {
   const fs::path odd = folder / "100%?#.db";

@@ -105,7 +105,7 @@ tap "Shell: PASS, not saved"
         refused = self.start("wait 10\n", "--serial", "a1", "--log", self.folder / "none")
         self.assertIn("none: it or its folder is missing", refused.communicate()[1])
         self.assertFalse(self.database.exists())
-        played = self.start("wait 800\ntap \"RETRY\"\nwait 800\ntap \"FAIL\"\nexpect text \"Switches: FAIL\"\n",
+        played = self.start("wait 800\ntap \"RETRY\"\nwait 800\ntap \"FAIL\"\nexpect text \"Slide switches: FAIL\"\n",
                             "--serial", "a1", "--test", "switches")
         self.assertEqual((3, ""), (played.wait(), played.communicate()[1]))
         self.assertEqual([("none", "retry", 1), ("FAIL", "operator", 2)],

@@ -109,8 +109,9 @@ bool ResultBook::goOn(RunStart& wanted, std::string& error) {
             stranger + "; --new-run begins anew";
     return false;
   }
+  const bool isRehearsal = wanted.planName.ends_with(kRehearsal);
   const bool isThrough = state == RunState::Finished || isComplete(wanted.tests);
-  if (isStale || (isThrough && files.resume == Resume::Unfinished)) {
+  if (isStale || isRehearsal || (isThrough && files.resume == Resume::Unfinished)) {
     beginAnew();
   } else if (!kept.empty() && wanted.unit.empty()) {
     wanted.unit = begun.unit;

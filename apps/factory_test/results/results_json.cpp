@@ -170,7 +170,7 @@ constexpr auto kFileMembers = std::to_array<Member<ResultFile>>({
 bool checkVersion(const json& root, std::string& reason) {
   const json& member = memberOf(root, "version");
   int version = kFirstVersion;
-  if (!member.is_null() && !readCount(member, version)) {
+  if (!member.is_null() && (!readCount(member, version) || version < kFirstVersion)) {
     reason = "has no valid \"version\"";
     return false;
   }
