@@ -118,7 +118,7 @@ std::vector<MeasurePage::CardLine> MeasurePage::linesOfCard(int width) const {
   };
   addLine(tr("Hold a finger still, or Back: end."));
   lines.push_back({"", size / 2});
-  for (const std::string& words : valueLines(values(), planStep)) addLine(words);
+  for (const ValueLine& line : valueLines(values(), planStep)) addLine(line.words);
   if (!page.shownStanding().empty()) addLine(page.shownStanding());
   return lines;
 }

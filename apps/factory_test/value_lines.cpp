@@ -26,11 +26,14 @@ std::string lineOf(const Measure& measure) {
 
 }  // namespace
 
-std::vector<std::string> valueLines(std::vector<Measure> values, const PlanStep& step) {
+std::vector<ValueLine> valueLines(std::vector<Measure> values, const PlanStep& step) {
   judge(Verdict::Pass, values, step);
-  std::vector<std::string> lines;
+  std::vector<ValueLine> lines;
   lines.reserve(values.size());
-  for (const Measure& each : values) lines.push_back(lineOf(each));
+  for (const Measure& each : values) {
+    lines.push_back({lineOf(each), {}});
+    if (each.least || each.most) lines.back().isWithin = each.isWithin();
+  }
   return lines;
 }
 

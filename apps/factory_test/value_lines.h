@@ -1,6 +1,7 @@
 /// Measured values in the operator's language.
 #pragma once
 
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -9,8 +10,13 @@
 
 namespace factory_test {
 
-/// "worst distance: 3.5 mm (at most 5)": a line for each value, with the limits that the step gives
-/// it.
-std::vector<std::string> valueLines(std::vector<Measure> values, const PlanStep& step);
+/// "worst distance: 3.5 mm (at most 5)".
+struct ValueLine {
+  std::string words;
+  std::optional<bool> isWithin;  // its limits, where it has any
+};
+
+/// A line for each value, with the limits that the step gives it.
+std::vector<ValueLine> valueLines(std::vector<Measure> values, const PlanStep& step);
 
 }  // namespace factory_test

@@ -4,8 +4,8 @@
 #include <MW/window.h>
 #include <brimol/input.h>
 
-#include <algorithm>
 #include <atomic>
+#include <bit>
 #include <memory>
 #include <optional>
 #include <string>
@@ -25,13 +25,15 @@ namespace factory_test {
 namespace {
 
 constexpr int kColours = MW::FullScreen::kGrey + 1;
+constexpr unsigned kAllColours = (1U << kColours) - 1;
 
 /// What to do stands on the first colour for a while. A tap, or the right key, shows the next
-/// colour. A long press, or the select key, ends the look, and the verdict is asked for.
+/// colour. A long press, or the select key, ends the look, and the verdict is asked for. Each of
+/// them confirms the colour that was there, if that was for half a second.
 class ColourTest : public LookTest {
  public:
   ColourTest()
-      : LookTest(tr("Colours"),
+      : LookTest(tr("Display colours"),
                  tr("Say what you saw: pixels and places\nthat differ are a fault.")) {}
 
   void drawOver() override {
@@ -47,19 +49,20 @@ class ColourTest : public LookTest {
               textSize(screen));
   }
 
-  bool isComplete() const override { return shown >= kColours - 1; }
+  bool isComplete() const override { return confirmed == kAllColours; }
 
   std::vector<Measure> values() const override {
-    return {measured("colours", "colours confirmed", std::min(shown + 1, kColours))};
+    return {measured("colours", "colours confirmed", std::popcount(confirmed.load()))};
   }
 
  protected:
   void beginLook() override {
     began = GetTicks();
+    shownSince = began;
     colour.emplace(MW::FullScreen::kWhite).setActive(1);
     touch.emplace();
     touch->clickCallback = [](MW::mouse_event*) { Current<ColourTest>::get().next(); };
-    touch->longPressCallback = [](MW::mouse_event*) { Current<ColourTest>::get().finishLook(); };
+    touch->longPressCallback = [](MW::mouse_event*) { Current<ColourTest>::get().end(); };
     touch->setActive(1);
     key.emplace();
     key->keyPressCallback = [](MW::kbd_event* event) {
@@ -84,11 +87,26 @@ class ColourTest : public LookTest {
   }
 
  private:
-  void next() { colour->setRect(++shown % kColours); }
+  void next() {
+    confirm();
+    colour->setRect(++shown % kColours);
+  }
+
+  void end() {
+    confirm();
+    finishLook();
+  }
+
+  void confirm() {
+    constexpr uint32_t kSeenMs = 500;
+    const uint32_t now = GetTicks();
+    if (now - shownSince.exchange(now) >= kSeenMs) confirmed |= 1U << (shown % kColours);
+  }
 
   void followKey(unsigned int code) {
     if (code == MW::kKeyRight) next();
-    finishLookOn(code);
+    if (code == MW::kKeySelect) end();
+    if (code == kKeyBack) finishLook();
     MW::isDisplayUpdate(1);
   }
 
@@ -96,6 +114,8 @@ class ColourTest : public LookTest {
   uint32_t began = 0;  // GetTicks() milliseconds
   bool hasWords = true;
   std::atomic<int> shown = 0;  // how often it moved on
+  std::atomic<uint32_t> shownSince = 0;
+  std::atomic<unsigned> confirmed = 0;  // a bit for each colour
   std::optional<MW::FullScreen> colour;
   std::optional<OnTop<MW::Screen>> touch;
   std::optional<OnTop<MW::Key>> key;

@@ -33,7 +33,8 @@ constexpr uint32_t kBarColor = 0xFFC8D2E0;
 constexpr std::size_t kTexts = 5;
 constexpr SKIA_Rect kNoPlace = {0, 0, 0, 0, kBarColor};  // of what places itself
 
-/// PASS, RETRY and FAIL are squares of the page itself; the select key passes, the back key leaves.
+/// PASS, RETRY and FAIL are the page's own: squares, and buttons on a wide screen, where these
+/// squares would be too high. The select key passes, the back key leaves.
 class DescriptorTest : public Test {
  public:
   void prepare(const PlanStep& step) override { plans = step.text; }
@@ -53,7 +54,7 @@ class DescriptorTest : public Test {
   void draw() override {
     MW::WidgetList::show();
     if (plans.empty()) return;
-    const SKIA_Rect area = pixelsOf({1, 11, 8, 13, kBarColor});
+    const SKIA_Rect area = pixelsOf({1, 10, 8, 15, kBarColor});
     skia_add_box_c(area);
     drawWords(within(area, gapOf(screenSize()) / 2), plans, MW::kColorBlack, SKIA_ALIGN_CENTRE,
               textSize(screenSize()));
@@ -66,9 +67,11 @@ class DescriptorTest : public Test {
   }
 
  private:
+  enum class Shown { AtOnce, OnTall, OnWide, Later };
+  using enum Shown;
   struct Entry {
     MW::RcuiKind kind;
-    bool isShown;
+    Shown shown;
     SKIA_Rect place;  // x and w in columns of ten, y and h in per cent of the screen's height
     const char* words;
     MW::ref_cb_t callbacks = {};
@@ -134,12 +137,10 @@ class DescriptorTest : public Test {
     MW::ref_t ref;
     ref.kind = entry.kind;
     ref.dialogKind = MW::Dialog::kRetryTest;
-    // These squares share the screen's width, which on a wide screen makes them too high.
-    const bool isSquare = entry.kind == kRcuiButton3Left || entry.kind == kRcuiButton3Centre ||
-                          entry.kind == kRcuiButton3Right;
+    const Shown here = isLandscape(screenSize()) ? OnWide : OnTall;
     const bool isHint = entry.kind == kRcuiFirstInColumn || entry.kind == kRcuiNextInColumn;
-    const bool isLeftOut = isSquare ? isLandscape(screenSize()) : isHint && !plans.empty();
-    ref.visible = entry.isShown && !isLeftOut ? 1 : 0;
+    const bool isShown = entry.shown == AtOnce || entry.shown == here;
+    ref.visible = isShown && !(isHint && !plans.empty()) ? 1 : 0;
     ref.cbIndex = 1;
     ref.rect = pixelsOf(entry.place);
     ref.lineWidth = kLineWidth;
@@ -159,54 +160,69 @@ class DescriptorTest : public Test {
 
 // Widgets come after the pictures, dialogs last.
 const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
-    {kRcuiTextbox, true, {0, 0, 10, 100, kPageInk.ground}, ""},
-    {kRcuiBox, true, {0, 2, 10, 7, kHeadInk.ground}, ""},
-    {kRcuiLabel, true, {0, 2, 10, 7, 0}, msg("Built from descriptors")},
-    {kRcuiLine, true, {1, 10, 9, 10, kBarColor}, ""},
-    {kRcuiFirstInColumn, true, {1, 11, 8, 4, kBarColor}, msg("Try every button and slide:")},
-    {kRcuiNextInColumn, true, kNoPlace, msg("each of them does something.")},
-    {kRcuiNextInColumn, true, kNoPlace, msg("Then leave, or give a verdict.")},
-    {kRcuiButton, true, {1, 25, 3, 9, kBarColor}, msg("Toast"), {.cbClick = showTimed}},
-    {kRcuiButton, true, {6, 25, 3, 9, kBarColor}, msg("White"), {.cbClick = whiten}},
+    {kRcuiTextbox, AtOnce, {0, 0, 10, 100, kPageInk.ground}, ""},
+    {kRcuiBox, AtOnce, {0, 0, 10, 8, kHeadInk.ground}, ""},
+    {kRcuiLabel, AtOnce, {0, 0, 10, 8, 0}, msg("Built from descriptors")},
+    {kRcuiLine, AtOnce, {1, 9, 9, 9, kBarColor}, ""},
+    {kRcuiFirstInColumn, AtOnce, {1, 10, 8, 5, kBarColor}, msg("Try every button and slide:")},
+    {kRcuiNextInColumn, AtOnce, kNoPlace, msg("each of them does something.")},
+    {kRcuiNextInColumn, AtOnce, kNoPlace, msg("Then leave, or give a verdict.")},
+    {kRcuiButton, AtOnce, {1, 26, 3, 9, kBarColor}, msg("Toast"), {.cbClick = showTimed}},
+    {kRcuiButton, AtOnce, {6, 26, 3, 9, kBarColor}, msg("White"), {.cbClick = whiten}},
     {kRcuiButton,
-     true,
-     {1, 35, 3, 9, kBarColor},
+     AtOnce,
+     {1, 36, 3, 9, kBarColor},
      msg("Dialog"),
      {.cbClick = [](int) { open(kRcuiDialog); }}},
     {kRcuiButton,
-     true,
-     {6, 35, 3, 9, kBarColor},
+     AtOnce,
+     {6, 36, 3, 9, kBarColor},
      msg("Words"),
      {.cbClick = [](int) { open(kRcuiDialogNew); }}},
     {kRcuiSlideFromLeft,
-     true,
-     {1, 46, 8, 6, kBarColor},
+     AtOnce,
+     {1, 47, 8, 6, kBarColor},
      msg("Slide to pass"),
      {.cbTouchRelease = choose<Outcome::Pass>}},
     {kRcuiSlideFromRight,
-     true,
-     {1, 53, 8, 6, kBarColor},
+     AtOnce,
+     {1, 54, 8, 6, kBarColor},
      msg("Slide to leave"),
      {.cbTouchRelease = choose<Outcome::Left>}},
-    {kRcuiButton3Left, true, kNoPlace, msg("PASS"), {.cbClick = choose<Outcome::Pass>}},
-    {kRcuiButton3Centre, true, kNoPlace, msg("RETRY"), {.cbClick = choose<Outcome::Retry>}},
-    {kRcuiButton3Right, true, kNoPlace, msg("FAIL"), {.cbClick = choose<Outcome::Fail>}},
+    {kRcuiButton3Left, OnTall, kNoPlace, msg("PASS"), {.cbClick = choose<Outcome::Pass>}},
+    {kRcuiButton3Centre, OnTall, kNoPlace, msg("RETRY"), {.cbClick = choose<Outcome::Retry>}},
+    {kRcuiButton3Right, OnTall, kNoPlace, msg("FAIL"), {.cbClick = choose<Outcome::Fail>}},
+    {kRcuiButton,
+     OnWide,
+     {1, 83, 2, 12, kPassInk.ground},
+     msg("PASS"),
+     {.cbClick = choose<Outcome::Pass>}},
+    {kRcuiButton,
+     OnWide,
+     {4, 83, 2, 12, kRowInk.ground},
+     msg("RETRY"),
+     {.cbClick = choose<Outcome::Retry>}},
+    {kRcuiButton,
+     OnWide,
+     {7, 83, 2, 12, kFailInk.ground},
+     msg("FAIL"),
+     {.cbClick = choose<Outcome::Fail>}},
     {kRcuiToastbox,
-     false,
-     {1, 60, 8, 8, kHeadInk.ground},
+     Later,
+     {1, 61, 8, 8, kHeadInk.ground},
      msg("A toast"),
      {},
      {msg("with a second line")}},
-    {kRcuiProgressbar, false, {1, 70, 8, 5, kHeadInk.ground}, msg("Two seconds")},
-    {kRcuiKey, true, {}, "", {.cbKeyPress = followKey}},
-    {kRcuiDialog, false, {}, "", {.cbTouchRelease = closeDialogs}},
+    {kRcuiProgressbar, Later, {1, 70, 8, 5, kHeadInk.ground}, msg("Two seconds")},
+    {kRcuiKey, AtOnce, {}, "", {.cbKeyPress = followKey}},
+    {kRcuiDialog, Later, {}, "", {.cbTouchRelease = closeDialogs}},
     {kRcuiDialogNew,
-     false,
+     Later,
      {},
      msg("Words of its own"),
      {.cbTouchRelease = closeDialogs},
      {msg("from a descriptor"), msg("in two lines"), "", msg("OK"), ""}},
-    {kRcuiFullScreen, false, {}, ""},
+    {kRcuiFullScreen, Later, {}, ""},
 };
 
 }  // namespace
