@@ -82,6 +82,7 @@ class Session:
         self.sources = {point.file: (project / point.file).read_bytes() for point in self.points}
         self.objects = {}  # what mutants were compiled to, and the number of the first
         self.lock = threading.Lock()
+        self.stopping = False
 
     def find(self):
         """Reading all sources takes a while: the points are kept until the sources change."""
@@ -111,7 +112,7 @@ class Session:
 
         def work(build):
             build.make()
-            while True:
+            while not self.stopping:
                 with self.lock:
                     number = results.first_missing(order, count, taken)
                     taken.add(number)
@@ -120,7 +121,10 @@ class Session:
                 self.try_one(build, number, results)
 
         with ThreadPoolExecutor(len(self.builds)) as workers:
-            list(workers.map(work, self.builds))
+            try:
+                list(workers.map(work, self.builds))
+            finally:
+                self.stopping = True
 
     def try_one(self, build, number, results):
         point = self.points[number]
@@ -133,6 +137,8 @@ class Session:
                 return self.objects.setdefault(objects, number) != number
 
         status, due_to = build.try_mutant(point, seen)
+        if self.stopping:  # what interrupts this may have killed a test, too
+            return
         place = f'{point.file}:{point.line(self.sources[point.file])}'
         results.add(number, place, status, due_to, objects)
         print(f'#{number} {place} {point.kind}: {status}{f" by {due_to}" if due_to else ""}', flush=True)
@@ -178,7 +184,8 @@ def parse():
                         help='a test program to leave out, for a quick look; --again asks it')
     what = parser.add_mutually_exclusive_group()
     what.add_argument('--list', action='store_true', help='lists all possible mutants with their numbers')
-    what.add_argument('--only', type=number_from(0), metavar='K', help='tries the mutant of this number again')
+    what.add_argument('--only', type=number_from(0), nargs='+', metavar='K',
+                      help='tries the mutants of these numbers again')
     what.add_argument('--again', action='store_true', help='tries those again that survived')
     return parser.parse_args()
 
@@ -189,10 +196,11 @@ def choose(session, wanted, results):
     random.Random(wanted.seed).shuffle(order)
     if wanted.only is None:
         return order, wanted.count
-    if wanted.only >= len(order):
+    if max(wanted.only) >= len(order):
         raise Failure(f'--only: the last mutant is {len(order) - 1}')
-    results.of.pop(wanted.only, None)
-    return [wanted.only], 1
+    for number in wanted.only:
+        results.of.pop(number, None)
+    return wanted.only, len(wanted.only)
 
 
 def run(wanted):

@@ -3,7 +3,6 @@
 #include <MW/window.h>
 #include <brimol/frame.h>
 
-#include <algorithm>
 #include <utility>
 
 #include "complain.h"
@@ -37,14 +36,9 @@ void FactoryTest::open(std::size_t entry, uint32_t now) {
   start(entry, now);
 }
 
-// At the first step that has no verdict yet: a run that was aborted goes on.
+// A run that was aborted goes on.
 void FactoryTest::beginRun() {
-  const auto isOpen = [this](const PlanStep& step) {
-    const TestResult* const result = book.find(step.test);
-    return result == nullptr || result->verdict == Verdict::None;
-  };
-  const auto first = std::ranges::find_if(task.plan.steps, isOpen);
-  run.emplace(task.plan, static_cast<std::size_t>(first - task.plan.steps.begin()));
+  run.emplace(task.plan, book.results());
   isThrough = false;
 }
 

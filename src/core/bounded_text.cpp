@@ -62,14 +62,18 @@ void putNumber(SKIA_Text& record, int number, Padding padding, std::string_view 
   record.string_len = static_cast<int32_t>(next - record.text);
 }
 
-SKIA_Text copyText(const SKIA_Text* given) {
+SKIA_Text makeText(std::string_view bounded, uint32_t color, int align, int size) {
   SKIA_Text record = {};
-  if (given == nullptr) return record;
-  record.color = given->color;
-  record.align = given->align;
-  record.size = given->size;
-  putText(record, boundedText(given->text));
+  record.color = color;
+  record.align = align;
+  record.size = size;
+  putText(record, bounded);
   return record;
+}
+
+SKIA_Text copyText(const SKIA_Text* given) {
+  if (given == nullptr) return {};
+  return makeText(boundedText(given->text), given->color, given->align, given->size);
 }
 
 }  // namespace MW

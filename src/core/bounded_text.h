@@ -4,6 +4,7 @@
 #include <brimol/scene.h>
 
 #include <cstddef>
+#include <cstdint>
 #include <string_view>
 
 namespace MW {
@@ -35,6 +36,9 @@ struct Padding {
 
 /// Puts a number and what stands behind it: a pass over many rows has no time for printf.
 void putNumber(SKIA_Text& record, int number, Padding padding, std::string_view behind);
+
+/// A record of these words, at most kTextMax bytes, and looks; the rest of it is zero.
+SKIA_Text makeText(std::string_view bounded, uint32_t color, int align, int size);
 
 /// A copy of an application's record: its colour, alignment and size, and its text up to the NUL
 /// with the length that this gives. Null: an empty record.

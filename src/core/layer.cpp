@@ -65,8 +65,7 @@ void Layer::freeOlderBlocks() {
 
 // The same registration is the first one of its widget in every block: blocks keep the order, and
 // removals take the first.
-void Layer::clear(std::size_t place) {
-  const Widget* const widget = current.load()->places[place];
+void Layer::clear(const Widget* widget) {
   for (WidgetBlock* block = current; block != nullptr; block = block->older.get()) {
     const auto begin = block->places.get();
     const auto found = std::find(begin, begin + block->used, widget);
@@ -75,12 +74,17 @@ void Layer::clear(std::size_t place) {
   --live;
 }
 
-Widget* Layer::removeFirst(int id) {
+// Of the block that new walks go over.
+std::span<std::atomic<Widget*>> Layer::filledPlaces() const {
   const WidgetBlock* const block = current;
-  for (std::size_t i = 0; block != nullptr && i < block->used; ++i) {
-    Widget* const widget = block->places[i];
+  if (block == nullptr) return {};
+  return {block->places.get(), block->used};
+}
+
+Widget* Layer::removeFirst(int id) {
+  for (Widget* const widget : filledPlaces()) {
     if (widget == nullptr || widget->id() != id) continue;
-    clear(i);
+    clear(widget);
     dropClearedPlaces();
     return widget;
   }
@@ -89,10 +93,9 @@ Widget* Layer::removeFirst(int id) {
 
 int Layer::removeAll(const Widget* widget) {
   int removed = 0;
-  const WidgetBlock* const block = current;
-  for (std::size_t i = 0; block != nullptr && i < block->used; ++i) {
-    if (block->places[i] != widget) continue;
-    clear(i);
+  for (const Widget* const each : filledPlaces()) {
+    if (each != widget) continue;
+    clear(widget);
     ++removed;
   }
   if (removed > 0) dropClearedPlaces();

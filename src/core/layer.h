@@ -4,6 +4,7 @@
 #include <atomic>
 #include <cstddef>
 #include <memory>
+#include <span>
 
 namespace MW {
 
@@ -42,7 +43,8 @@ class Layer {
   friend class LayerWalk;
 
   bool renew();
-  void clear(std::size_t place);
+  std::span<std::atomic<Widget*>> filledPlaces() const;
+  void clear(const Widget* widget);
   void dropClearedPlaces();
   void freeOlderBlocks();
 

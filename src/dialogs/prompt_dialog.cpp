@@ -1,5 +1,7 @@
 #include <MW/prompt_dialog.h>
 
+#include <algorithm>
+
 #include "core/class_log.h"
 
 namespace MW {
@@ -42,8 +44,7 @@ void PromptDialog::updateProgress(unsigned int ticks) {
 // One to ten stars, and one again.
 void PromptDialog::drawProgress(unsigned int ticks) {
   progress.step(ticks);
-  const uint32_t steps = progress.count();
-  putStars(button1.caption, steps == 0 ? 1 : (steps - 1) % kMostStars + 1);
+  putStars(button1.caption, (std::max(progress.count(), 1U) - 1) % kMostStars + 1);
   skia_add_box_c(button1.border);
   skia_add_textbox_c(button1.face, button1.caption);
 }

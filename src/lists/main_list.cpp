@@ -70,8 +70,7 @@ void MainList::setRect(int listMode) {
   for (std::size_t i = 0; i < option.size(); ++i) {
     const StatusRow& row = kStatusRows.at(i);
     option.at(i).rect = statusRect(row, screen.w);
-    option.at(i).text = {{}, 0, kStatusColor, row.align, kStatusSize};
-    putText(option.at(i).text, row.initial);
+    option.at(i).text = makeText(row.initial, kStatusColor, row.align, kStatusSize);
   }
 }
 
@@ -306,7 +305,7 @@ int MainList::move_key_down(int) {
   if (next == kNoItem) return kNotMoved;
   current = next;
   const int64_t below = columnOf(next + 1).nextTop() - listRect.y - listRect.h;
-  if (below > 0) scroll = toPixels(scroll - below);
+  scroll = toPixels(scroll - std::max<int64_t>(below, 0));
   return next;
 }
 
@@ -316,7 +315,7 @@ int MainList::move_key_up(int) {
   if (previous == kNoItem) return kNotMoved;
   current = previous;
   const int64_t above = listRect.y - columnOf(previous).nextTop();
-  if (above > 0) scroll = toPixels(scroll + above);
+  scroll = toPixels(scroll + std::max<int64_t>(above, 0));
   return previous;
 }
 

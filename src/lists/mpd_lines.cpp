@@ -4,6 +4,7 @@
 #include <charconv>
 #include <cstring>
 #include <limits>
+#include <memory>
 
 #include "core/bounded_text.h"
 
@@ -28,7 +29,8 @@ int levelOf(std::string_view line) {
   std::string_view number = tailOf(inside, inside.find_first_not_of(" \t\v\f\r"));
   if (number.starts_with('+') && !number.starts_with("+-")) number.remove_prefix(1);
   int level = 0;
-  const auto result = std::from_chars(number.data(), number.data() + number.size(), level);
+  const auto result =
+      std::from_chars(std::to_address(number.begin()), std::to_address(number.end()), level);
   if (result.ec == std::errc::result_out_of_range) {
     using Limits = std::numeric_limits<int>;
     level = number.starts_with('-') ? Limits::min() : Limits::max();

@@ -32,9 +32,7 @@ constexpr int kAboveHeader = 13;
 constexpr int kHeader = 7;
 
 SKIA_Text rowText(std::string_view words) {
-  SKIA_Text record = {{}, 0, kColorBlack, SKIA_ALIGN_CENTRE, kRowTextSize};
-  putText(record, words);
-  return record;
+  return makeText(words, kColorBlack, SKIA_ALIGN_CENTRE, kRowTextSize);
 }
 
 bool isMarked(const SKIA_Text& text, const Marker& marker) {

@@ -62,9 +62,8 @@ Ime::~Ime() { leaveWindow(); }
 void Ime::layOutKeys() {
   for (std::size_t key = 0; key < kImeKeys.size(); ++key) {
     rectOf(key) = keyRect(kImeKeys.at(key), rect);
-    SKIA_Text& label = key_text.at(key);
-    label = {{}, 0, text.color, SKIA_ALIGN_CENTRE, text.size};
-    putText(label, kImeKeys.at(key).labels.front());
+    key_text.at(key) =
+        makeText(kImeKeys.at(key).labels.front(), text.color, SKIA_ALIGN_CENTRE, text.size);
   }
 }
 

@@ -206,17 +206,11 @@ bool StaticText::jumpTo(const mouse_event& mouse) {
   if (mouse.x < right - int64_t{2} * scroll_bar.w || mouse.x > right) return true;
   const int half = scroll_bar.h / 2;
   const int64_t span = int64_t{rect.h} - half;
+  if (span <= 0) return false;
   const int64_t y = int64_t{mouse.y} - rect.y;
-  int64_t wanted = top_index;
-  if (span > 0 && y >= half) {
-    if (y > span) scroll_bar.y = toPixels(rect.y + span);
-    wanted = rowsBeyondView() * std::min(y, span) / span;
-  } else if (span > 0) {
-    scroll_bar.y = rect.y;
-    wanted = 0;
-  }
+  const int64_t wanted = y < half ? 0 : rowsBeyondView() * std::min(y, span) / span;
   top_index = toPixels(std::max<int64_t>(wanted, 0));
-  return span > 0;
+  return true;
 }
 
 }  // namespace MW

@@ -40,7 +40,7 @@ constexpr int64_t sideOf(const SKIA_Rect& area, const Shape& shape) {
 
 constexpr Cells layOutCells(const SKIA_Rect& area, const Shape& shape) {
   Cells cells = {};
-  if (shape.rows == 0 || shape.cols == 0) return cells;
+  if (shape.rows * shape.cols == 0) return cells;
   const int64_t side = sideOf(area, shape);
   const int64_t gapX = (area.w - side * shape.cols) / (shape.cols + 1);
   const int64_t gapY = (area.h - side * shape.rows) / (shape.rows + 1);
@@ -57,6 +57,7 @@ static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[0].x == 20);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[1].x == 210);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[2].y == 218);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {4, 2})[2].w == 170);
+static_assert(layOutCells({0, 0, 400, 800, 0}, {2, 2})[0].w == 182);
 static_assert(layOutCells({0, 0, 400, 800, 0}, {3, 2})[0].x == -22);  // too narrow: they overlap
 
 template <typename Holders>
@@ -77,9 +78,7 @@ mouse_event withState(mouse_event mouse, unsigned int state) {
 
 Button8::Button8(int layout, const SKIA_Rect* area, const SKIA_Text* caption)
     : ButtonFace("BUTTON8", area, caption) {
-  SKIA_Text mark = {{}, 0, kColorBlue, SKIA_ALIGN_CENTRE, kMarkSize};
-  putText(mark, "*");
-  cellText.fill(mark);
+  cellText.fill(makeText("*", kColorBlue, SKIA_ALIGN_CENTRE, kMarkSize));
   Button8::setRect(layout, &rect);
   buttonType = layout;
   point.width = kFrameWidth;

@@ -14,9 +14,10 @@ bool routeKnobTouch(Slider& slider, KnobHold::Touch touch, event_data* event) {
     case KnobHold::Touch::Grab: slider.onPress(event); return true;
     case KnobHold::Touch::Cancel: return true;
     case KnobHold::Touch::Move: slider.onHover(event->mouse); return true;
-    case KnobHold::Touch::Drop: slider.onRelease(event); return true;
+    case KnobHold::Touch::Drop: break;
   }
-  return false;
+  slider.onRelease(event);
+  return true;
 }
 
 }  // namespace MW

@@ -75,9 +75,10 @@ bool SlideE::onRecvEvent(event_data* event, unsigned int) {
       kLog.print(LogLevel::Debug, "Another touch finger pressed!\nDisabled button selection!");
       return true;
     case KnobHold::Touch::Move: onHover(event->mouse); return true;
-    case KnobHold::Touch::Drop: onRelease(event->mouse); return true;
+    case KnobHold::Touch::Drop: break;
   }
-  return false;
+  onRelease(event->mouse);
+  return true;
 }
 
 void SlideE::onPress(mouse_event mouse) { knobHold.grab(mouse); }

@@ -50,8 +50,7 @@ static_assert(FLT_EVAL_METHOD == 0, "build with -msse2 -mfpmath=sse");
 // Pixels for each step of the value; 0 where the knob cannot move.
 constexpr float pixelsPerStep(int travel, ValueRange range) {
   const int64_t steps = int64_t{range.highest} - range.lowest;
-  if (travel <= 0 || steps <= 0) return 0;
-  return static_cast<float>(travel) / static_cast<float>(steps);
+  return static_cast<float>(std::max(travel, 0)) / static_cast<float>(steps);
 }
 static_assert(pixelsPerStep(400, {0, 100}) == 4 && pixelsPerStep(0, {0, 100}) == 0);
 

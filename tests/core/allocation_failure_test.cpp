@@ -5,10 +5,12 @@
 #include <MW/event_service.h>
 #include <MW/primitives.h>
 #include <MW/static_text.h>
+#include <android/log.h>
 
 #include <utils/AndroidThreads.h>
 
 #include <algorithm>
+#include <string_view>
 
 #include "core/dispatch_thread.h"
 #include "support/failing_malloc.h"
@@ -48,12 +50,17 @@ TEST_F(WidgetTest, ADisplayItemThatFindsNoMemoryTakesNoIndex) {
   EXPECT_EQ(box.add_MWWList(), 1);
 }
 
+int refusalsLogged = 0;
+
 // A layer needs memory now and then as it grows; the button that finds none stays outside, and is a
 // button all the same. Leaving a layer and walking over it need none.
 TEST_F(WidgetTest, AWidgetThatFindsNoMemoryStaysOutside) {
   const SKIA_Rect rect = {0, 0, 10, 10, 5};
   std::vector<std::unique_ptr<MW::Button>> buttons(200);
   platform().records = false;
+  __android_log_set_logger([](const __android_logger_data*, const char* line) {
+    refusalsLogged += std::string_view(line) == "[WINDOW] registerWidget: not registered" ? 1 : 0;
+  });
   int refused = 0;
   for (auto& each : buttons) {
     const FailingAllocation failure(2);  // the button's own block is the first
@@ -64,6 +71,7 @@ TEST_F(WidgetTest, AWidgetThatFindsNoMemoryStaysOutside) {
     EXPECT_TRUE(press(*each, {5, 5}));
   }
   EXPECT_GT(refused, 0);
+  EXPECT_EQ(refusalsLogged, refused);
   EXPECT_EQ(layerSize(1), 200 - refused);
   const FailingAllocation failure(1);
   buttons.clear();

@@ -21,6 +21,7 @@ TEST(BoundedTextTest, CutsAtAWholeCharacter) {
     }
   }
   EXPECT_EQ(boundedText(std::string(200, '\x80').c_str()).size(), 127U) << "no characters";
+  EXPECT_EQ(MW::cutText("\u00e9", 1), "") << "there is no room for the first character";
   EXPECT_EQ(boundedText("abc", 100), "abc");
   EXPECT_EQ(boundedText(nullptr, 5), "");
 }

@@ -125,6 +125,7 @@ TEST_P(EveryClass, StandsInItsLayerAndAnswersThatItDrew) {
   for (const unsigned int ticks : {1U, 2U}) {
     EXPECT_EQ(widget->show(ticks), parts.contains(name) ? 0 : 1);
   }
+  EXPECT_EQ(widget->onRecvEvent(nullptr, 0), name == "StaticText") << "which does not scroll";
 }
 
 TEST_P(EveryClass, DrawsTheSameWhateverThePlatformAnswers) {

@@ -55,6 +55,15 @@ TEST_F(WidgetTest, Blinks) {
   EXPECT_EQ(phases({0xF0000000, 0xA0000000}), "dl.") << "hidden for a month";
 }
 
+TEST_F(WidgetTest, ThePlainOneHasNothingAndAnswersNothing) {
+  W widget;
+  EXPECT_EQ(widget.getText(), nullptr);
+  EXPECT_EQ(widget.getPositionAndSize(), nullptr);
+  EXPECT_EQ(widget.getBgColor() | widget.getTextColor(), 0U);
+  EXPECT_EQ(widget.getFontSize() | widget.show() | widget.show(1) | widget.hide(), 0);
+  EXPECT_EQ(widget.add_MWWList() | widget.setTimer(5), 0);
+}
+
 struct KeyDirWidget : W {
   using W::keyDir;
 };

@@ -8,6 +8,8 @@
 #include <latch>
 #include <thread>
 
+#include <brimol3_widget_test/drawings.h>
+#include "support/allocated_bytes.h"
 #include "support/widget_test.h"
 
 namespace {
@@ -29,6 +31,21 @@ TEST_F(WindowTest, UnregisteringTakesTheFirstOfEqualIds) {
   Window::unregisterWidget(&d);
   Window::show(1);
   EXPECT_EQ(drawn, "ad") << "c left in place of d";
+}
+
+// Places that were cleared cost every walk time, and memory.
+TEST_F(WindowTest, WidgetsThatLeftTakeNoRoom) {
+  platform().records = false;
+  std::vector<std::unique_ptr<ProbeWidget>> all(4000);
+  const std::size_t before = allocatedBytes();
+  for (const bool byNumber : {true, false}) {
+    for (auto& each : all) (each = std::make_unique<ProbeWidget>())->enter();
+    for (auto& each : all) {
+      if (byNumber) Window::unregisterWidget(each.get());
+    }
+    for (auto& each : all) each.reset();
+    EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 13)) << byNumber;
+  }
 }
 
 // Whose numbers are the same goes by itself all the same.
@@ -92,6 +109,9 @@ TEST_F(WindowTest, TheFirstLooksAtTheScreensSizeMayMeet) {
   };
   { const std::array<std::jthread, 2> threads = {std::jthread(look), std::jthread(look)}; }
   EXPECT_EQ(std::pair(Window::width, Window::height), std::pair(1440, 2560)) << "it keeps them";
+  setScreen(7, 0);
+  Window::getwindowsize(nullptr, nullptr);
+  EXPECT_EQ(std::pair(Window::width, Window::height), std::pair(1440, 2560)) << "there is no side";
 }
 
 TEST_F(WindowTest, TurnsMillimetresIntoPixels) {

@@ -60,6 +60,9 @@ const auto kDescriptors = std::to_array<Descriptor>({
     {"Image", MW::kRcuiImage, counted("a.png", 5), "7a.png"},
     {"ANulWithinAnItemsLength", MW::kRcuiTextbox, counted({"ab\0d", 4}, 4), {"1ab\0d", 5}},
     {"NoNul", MW::kRcuiTextbox, counted(kFull, 5), "1xxxxx", "text has no NUL\n"},
+    {"NoNulAndHalfACharacter", MW::kRcuiTextbox, counted(kFull.substr(2) + "\u00e9", 127),
+     '1' + kFull.substr(2) + '\0', "text has no NUL\n"},
+    {"BadLengthOfAnItem", MW::kRcuiTextbox, counted("a", 128), "1a", "text length is bad : 128\n"},
     {"BadLength", MW::kRcuiButton, counted("a", 128), "9,8 70x40|a", "text length is bad : 128\n"},
     {"Dialog", MW::kRcuiDialog, kBad, "0,0 1441x2561|CANCEL"},
     {"DialogNew", MW::kRcuiDialogNew, counted("x", 1), "0,0 1441x2561|x"},
@@ -141,6 +144,7 @@ TEST_F(WidgetRcuiTest, SaysWhatIsMissing) {
   none.registerCallBack(&callbacks, 3, 0);
   none.registerCallBack(nullptr, 4, 0);
   EXPECT_EQ(none.getPointer(), nullptr);
+  EXPECT_EQ(none.makeRcuiWidget(&ref, 0), 0) << "no item";
 }
 
 }  // namespace

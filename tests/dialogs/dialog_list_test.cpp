@@ -27,8 +27,8 @@ const PlayTests kPlays = {
           "<[DIALOGLIST] position2index= [1270,1176], index = 0> click+ press+"),
     kList("WhatWasPressedLocksTheRest",
           {press(172, 1078), release(725, 1514), press(), release(154, 1514), press(),
-           release(725, 1514)},
-          "press r0+ click+ press+ click+ press+ click+"),
+           press(172, 1384), release(725, 1514)},
+          "press r0+ click+ press+ click+ press+ press- click+"),
     kList("OtherFingersAreKeptOut",
           {finger(1), press(172, 1384), finger(0), press(), drag(1, 0), release(), finger(1),
            drag(1, 0), release()},
@@ -53,14 +53,20 @@ TEST_F(DialogListTest, RefusesRowsThatAreTooLongTooManyOrLate) {
   EXPECT_EQ(dialog.addIndex("late"), -1);
 }
 
+struct Open : DialogList {
+  using DialogList::DialogList;
+  using DialogList::rows;
+};
+
 TEST_F(DialogListTest, ReplacesTheTextOfARow) {
-  DialogList dialog("Title");
+  Open dialog("Title");
   EXPECT_EQ(dialog.addIndex("first"), 0);
   dialog.setText(0, kTooLong.c_str() + 2);
   for (const int row : {-1, 1, 2, INT_MAX}) dialog.setText(row, "nowhere");
   for (const int start : {1, 128}) dialog.setText(0, kTooLong.c_str() + start);
   dialog.initFinish(0);
   EXPECT_EQ(words(shown(dialog)), "Title|" + kTooLong.substr(2) + "|CANCEL|OK|");
+  EXPECT_STREQ(dialog.rows[1].text.text, "nowhere") << "behind the last one it is kept unseen";
   EXPECT_EQ(places({shown(dialog).at(8)}), "2,2 96x96|") << "a mark, though there is no layout";
 }
 

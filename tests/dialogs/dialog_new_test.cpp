@@ -14,6 +14,10 @@ const PlayTests kPlays = {
             {call(&MW::Widget::setbutton, "1", "2"), press(722, 1400), release(), lookAtLog(),
              call<DialogNew>(&DialogNew::setProgress, 0U), press(), release()},
             "press+ button2 click+ <[DIALOGNEW] btn2 released!!> press- click+"),
+    kDialog("AButtonThatWentAwayAnswersNoTouch",
+            {call(&MW::Widget::setbutton, "1", "2"), call(&MW::Widget::setbutton, "1", nullptr),
+             press(1285, 1500), release()},
+            "press+ button1 click+"),
     kDialog("OnlyTheHookKeyIsIgnored", {keyDown(323), keyDown(5), keyUp(323)}, "+ down5+ up323+"),
 };
 

@@ -16,6 +16,21 @@ TEST_F(DialogShellTest, OtherFingersNeitherPressNorMoveButMayLift) {
   EXPECT_EQ(played(shell, steps), "press+ - - button1 click+ <held 2> click+ down323+ -");
 }
 
+struct Open : DialogShell {
+  using DialogShell::DialogShell;
+  using DialogShell::twoButtons;
+};
+
+TEST_F(DialogShellTest, StartsOverWithOneButton) {
+  Open shell("Title", 3);
+  const std::string oneButton = places(shown(shell));
+  shell.twoButtons = 1;
+  shell.setRect_static();
+  EXPECT_NE(places(shown(shell)), oneButton);
+  shell.init_DialogShell("Title");
+  EXPECT_EQ(places(shown(shell)), oneButton);
+}
+
 TEST_F(DialogShellTest, DropsTheOldestLine) {
   for (const auto& [asked, room, left] :
        {std::tuple(0, 1, "f|"), {3, 3, "e|f|"}, {26, 25, "a|b|c|e|f|"}}) {

@@ -30,8 +30,8 @@ const PlayTests kPlays = {
         {finger(2), press(154, 1400), lookAtHold(), lookAtFaces(), release(714, 1619), lookAtLog()},
         "press+ <held 3> <lit 1> button1 click+ <[DIALOG] btn1 released!!>"),
     kPrompt("TheRightButtonHidesFirst",
-            {press(1285, 1619), release(), lookAtFaces(), lookAtLog(), lookAtHold()},
-            "press+ button2 click+ <lit 0> <[DIALOG] btn2 released!!> <held 0>"),
+            {press(1285, 1619), lookAtFaces(), release(), lookAtFaces(), lookAtLog(), lookAtHold()},
+            "press+ <lit 1> button2 click+ <lit 0> <[DIALOG] btn2 released!!> <held 0>"),
     kPrompt("BesideTheButtonsNothingAnswers",
             {moveTo(300, 1500), press(720, 1500), release(), longPress(300, 1500), appEvent(1)},
             "hover- press- click+ - -"),
@@ -61,6 +61,8 @@ TEST_F(DialogTest, StarsStartAnewAfterTen) {
     platform().ticks += 101;
     EXPECT_EQ(std::ssize(shown(dialog).back().text.text), stars);
   }
+  dialog.updateProgress(platform().ticks += 101);
+  EXPECT_EQ(platform().takeDrawings().back().text.text, "**");
 }
 
 // A character for each kind from 0 to 40, of which 22 and 40 are none: the number of its layout,

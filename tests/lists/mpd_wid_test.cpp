@@ -38,6 +38,13 @@ Step top() {
   });
 }
 
+// What no event reaches.
+template <int type>
+void byHand(Results& results) {
+  MW::event_data event = pointerEvent(static_cast<MW::EventCode>(type), {30, kTop});
+  type == MW::kEventPress ? results.onMpdPress(&event) : results.onMpdRelease(&event);
+}
+
 Maker resultsOf(const std::string& lines, int listType = MW::MpdWid::kRow) {
   return [=] {
     auto results = std::make_unique<Results>(lines);
@@ -98,6 +105,10 @@ const PlayTests kPlays = {
         {finger(3), press(30, kTop - 1), press(30, kTop), lookAtHold(), finger(1), drag(1, 1),
          longPress(), lookAtLog(), finger(3), longPress(), release(0, 0), lookAtHold()},
         "- press+ <held 4> - - <[MPDWID] onRecvEvent-> T:3, F:1> - click release+ <held 0>"),
+    kClickable("APressByHandHoldsUntilItsRelease",
+               {call<Results>(byHand<MW::kEventPress>), lookAtHold(),
+                call<Results>(byHand<MW::kEventRelease>), lookAtHold()},
+               "<held 1> <held 0>"),
     kClickable("KeysAreTold", {keyDown(9), keyUp(9), plug(9)}, "down9+ up9+ -"),
 };
 
@@ -153,6 +164,11 @@ TEST_F(MpdWidTest, RowsAreChangedByNumber) {
   results.setBGColor(0, 5);
   EXPECT_EQ(words(cells(results)), "[>]|head|[4]|name||");
   EXPECT_EQ(cells(results).at(1).rect.color, 5U);
+  for (const auto& [level, color] :
+       {std::pair(1, 0xFFBFBFBFU), {2, 0xFFFFA873U}, {3, 0xFFFF6600U}}) {
+    results.addIndex(0, false, level, "", "", "");
+    EXPECT_EQ(cells(results).at(1).rect.color, color) << level;
+  }
   EXPECT_EQ(results.position2index({0, 0, 0, 2 * kTop + 1, 0, 0}), 0) << "the top counts twice";
 }
 

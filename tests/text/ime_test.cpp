@@ -51,6 +51,11 @@ TEST_P(ImeTyping, TypesWhatTheTouchedKeysSay) {
 }
 INSTANTIATE_TEST_SUITE_P(, ImeTyping, testing::ValuesIn(kTypings), kRowName);
 
+void noteDouble(int zero, Ime*) { noteZero("double", zero); }
+Step listen(void (*doubleTap)(int, Ime*)) {
+  return call<Keyboard>([=](Keyboard& keyboard) { keyboard.double_tap_cb = doubleTap; });
+}
+
 std::unique_ptr<MW::Widget> keyboard() {
   auto keyboard = std::make_unique<Keyboard>();
   keyboard->press_cb = [](int zero, Ime*) { noteZero("press", zero); };
@@ -58,7 +63,7 @@ std::unique_ptr<MW::Widget> keyboard() {
     noteZero(sender == stage.widget.get() ? "release" : "stranger", zero);
   };
   keyboard->long_press_cb = [](int zero, Ime*) { noteZero("long", zero); };
-  keyboard->double_tap_cb = [](int zero, Ime*) { noteZero("double", zero); };
+  keyboard->double_tap_cb = noteDouble;
   return keyboard;
 }
 // What no event reaches.
@@ -78,6 +83,10 @@ const PlayTests kPlays = {
         "APressByHandHoldsAndCountsTaps",
         {pressByHand(), lookAtHold(), moveTo(900, 900), release(9, 9), pressByHand(), release()},
         "press <held 1> + release+ press release double+"),
+    kKeyboard(
+        "CountsTapsWhileADoubleTapIsWanted",
+        {listen(nullptr), pressByHand(), listen(noteDouble), release(), pressByHand(), release()},
+        "press release+ press release+"),
     kKeyboard("TakesNothingOnceItHasATime", {call(&MW::Widget::onShowTimer, 5), press(9, 150)},
               "-"),
 };

@@ -50,6 +50,10 @@ const auto kSearches = std::to_array<Search>({
      "00001:|!ab|00002:|b|00003:|c|00004:|d|"},
     {"TheLastRowCountsAsTheFirst", "a\nab\nb\nc\nab", "ab", "11100",
      "00001:|a|00002:|!ab|00003:|b|00004:|c|"},
+    {"InAViewOfAllRowsItGoesBackToTheTop", "a\nab\nab\nc", "ab", "10000",
+     "00001:|a|00002:|!ab|00003:|!ab|00004:|c|"},
+    {"NinetyEightBytesAreNotEnough", "b\n" + kLong.substr(902), kLong, "00000",
+     "00001:|b|00002:|xxxxxxxxxx|xxxxxxxxxx|xxxxxxxxxx|"},
     {"WithAnEndNoLineIsCounted", "a\nb\nc\nb", "\nb", "00000",
      "00001:|!a|00002:|b|00003:|c|00004:|b|"},
     {"NinetyNineBytesAreWanted", "b\n" + kLong.substr(901), kLong, "11111",
@@ -63,6 +67,14 @@ TEST_P(StaticTextSearch, FindsAndMarksLines) {
   EXPECT_EQ(viewer.rows(0), GetParam().rows);
 }
 INSTANTIATE_TEST_SUITE_P(, StaticTextSearch, testing::ValuesIn(kSearches), kRowName);
+
+TEST_F(StaticTextTest, FromFurtherDownAViewOfAllRowsGoesBackToTheTop) {
+  Viewer viewer(kFourRows);
+  viewer.found("a\nab\nb\nc", "ab");
+  viewer.top_index = 2;
+  viewer.line_search_point(Viewer::kPrevious);
+  EXPECT_EQ(viewer.top_index, 0);
+}
 
 TEST_F(StaticTextTest, WithoutNumbersTheRedGoesOn) {
   Viewer plain(kFourRows, kLooks, false);
@@ -85,8 +97,16 @@ TEST_F(StaticTextTest, ALongPressOnTheBarScrollsAClock) {
   viewer.setText(std::string(66, '\n').c_str());  // of which 33 are in view
   EXPECT_STREQ(viewer.getText(), "first");
   shown(viewer);
-  for (const auto& [y, top] : {std::pair(224, 50), {225, 166}, {400, 283}, {749, 400}, {60, 50}}) {
-    longPress(viewer, {422, y});
+  const auto kTouches = std::to_array<std::pair<Spot, int>>({{{422, 224}, 50},
+                                                             {{450, 225}, 166},
+                                                             {{422, 400}, 283},
+                                                             {{421, 749}, 283},
+                                                             {{451, 749}, 283},
+                                                             {{422, 749}, 400},
+                                                             {{422, 60}, 50}});
+  for (const auto& [touch, top] : kTouches) {
+    MW::event_data event = pointerEvent(MW::kEventLongPress, touch);
+    viewer.onPressLong(&event);
     EXPECT_EQ(places({shown(viewer).back()}), "429," + std::to_string(top) + " 14x350|");
   }
   viewer.setRect(0, &kFourRows);
@@ -124,13 +144,18 @@ TEST_F(StaticTextTest, InitStartsOver) {
   press(viewer, {5, 5});
 }
 
+void noteDouble(int zero) { noteZero("double", zero); }
+Step listen(void (*doubleTap)(int)) {
+  return call<Viewer>([=](Viewer& viewer) { viewer.double_tap_cb = doubleTap; });
+}
+
 std::unique_ptr<Viewer> sixRows() {
   auto viewer = std::make_unique<Viewer>(kFourRows);
   viewer->setText("1\n2\n3\n4\n5\n6");
   viewer->press_cb = [](int zero) { noteZero("press", zero); };
   viewer->release_cb = [](int zero) { noteZero("release", zero); };
   viewer->long_press_cb = [](int zero) { noteZero("long", zero); };
-  viewer->double_tap_cb = [](int zero) { noteZero("double", zero); };
+  viewer->double_tap_cb = noteDouble;
   return viewer;
 }
 // Its press and its release tell it of a long press.
@@ -165,6 +190,9 @@ const PlayTests kPlays = {
              "press+ + press+ release+ press+ release double+ press+ release+"),
     kCallingOn("CallbacksThatCallOnTakeNoTapAway", {press(5, 5), release(), press(), release()},
                "press long+ release long+ press long+ release long double+"),
+    kSixRows("CountsTapsWhileADoubleTapIsWanted",
+             {listen(nullptr), press(5, 5), listen(noteDouble), release(), press(), release()},
+             "press+ release+ press+ release+"),
     kSixRows("ALongPressIsTold", {longPress(5, 5), moveTo(6, 6)}, "long+ -"),
     kSixRows("TakesNothingOnceItHasATime",
              {call(&MW::Widget::onShowTimer, 100), lookAtRedraw(), press(5, 5), later(100), timer(),

@@ -98,7 +98,6 @@ TEST_P(AnyRecord, WithoutRecordsItIsShownWithoutATimeAsAtZero) {
   const Made made = GetParam().make(nullptr, nullptr);
   made->setRect(0, nullptr);
   made->setText(nullptr);
-  EXPECT_FALSE(made->onRecvEvent(nullptr, 0));
   made->show();
   const std::vector<Drawing> untimed = platform().takeDrawings();
   EXPECT_EQ(untimed, GetParam().isDrawnUntimed ? shown(*made) : std::vector<Drawing>());

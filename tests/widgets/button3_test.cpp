@@ -56,6 +56,15 @@ TEST_F(Button3Test, ANewCaptionKeepsTheLengthOfTheFirst) {
   }
 }
 
+TEST_F(Button3Test, InitStartsOver) {
+  const auto button = makes<Button3, Told::Zero>(Button3::kBottomLeft)();
+  EXPECT_TRUE(button->isActive());
+  static_cast<Button3&>(*button).init(Button3::kTopLeft, nullptr, nullptr, 0);
+  EXPECT_FALSE(button->isActive());
+  EXPECT_FALSE(button->pressCallback);
+  EXPECT_EQ(words(shown(*button)), "|");
+}
+
 TEST_F(Button3Test, IsPressedLikeAnyButton) {
   const Maker make = makes<Button3, Told::Zero>(Button3::kBottomLeft);
   EXPECT_EQ(played(make, {press(28, 2091), lookAtLog(), release(), lookAtLog()}),

@@ -38,6 +38,10 @@ const PlayTests kPlays = {
     from(7)("AnotherStateNeverExits",
             {press(500, 0), drag(INT_MIN, 0), knob(), drag(INT_MAX, 0), knob()},
             "+ + <7 at 0 held> + <7 at 500 held>"),
+    kLeft("InitStartsOver",
+          {call<SlideE>(&SlideE::SlideE_init, SlideE::kFromRight, &kBar, kNoText, ""), knob(),
+           look(&MW::Widget::isActive)},
+          "<1 at 500> <0>"),
     kLeft(
         "ASecondFingerBesideTheKnobCancelsTheDrag",
         {press(0, 0), drag(50, 0), finger(2), press(300, 9), lookAtLog(), knob()},

@@ -26,8 +26,9 @@ Step value() {
 const PlayTests kPlays = {
     slide(SlideMove::kValueKnob, 0, 100, 50)(
         "TruncatesToTheValueAtTheKnob",
-        {value(), press(240, 9), drag(239, 0), value(), drag(1, 0), value(), release(), value()},
-        "<50 at 240> + + <99 at 479> + <100 at 480> + <100 at 480>"),
+        {value(), press(240, 9), drag(239, 0), value(), drag(1, 0), value(), release(), drag(-9, 0),
+         value()},
+        "<50 at 240> + + <99 at 479> + <100 at 480> + - <100 at 480>"),
     slide(80, 0, 200, 80)(
         "ReadsNoMoreThanAHundred",
         {press(120, 9), drag(29, 0), value(), drag(1, 0), value(), drag(900, 0), value()},
@@ -49,6 +50,20 @@ const PlayTests kPlays = {
         {press(240, 0), drag(INT_MAX, 0), value(), drag(INT_MIN, 0), value()},
         "+ + <100 at 480> + <-2147483648 at 0>"),
 };
+
+struct Open : SlideMove {
+  using SlideMove::fill;
+  using SlideMove::SlideMove;
+};
+
+TEST_F(SlideMoveTest, TheFillIsLaidOutUpToAKnob) {
+  Open slide(&kBar, 20, 0, 100, 0);
+  const SKIA_Rect knob = {100, 0, 120, 100, 0};
+  slide.setRect_Slide(&knob);
+  EXPECT_EQ(slide.fill, (SKIA_Rect{0, 10, 103, 80, MW::kColorRed}));
+  slide.setRect_Slide(nullptr);
+  EXPECT_EQ(slide.fill.w, 103);
+}
 
 TEST_F(SlideMoveTest, AKnobWithoutRoomKeepsItsValue) {
   for (const int width : {0, -1, INT_MIN}) {
