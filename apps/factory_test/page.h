@@ -47,6 +47,8 @@ class Page {
   }
 
  private:
+  void drawWhose() const;
+
   RunProgress progress;
   MW::Box ground;
   MW::Box head;

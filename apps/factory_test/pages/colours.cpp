@@ -4,8 +4,8 @@
 #include <MW/window.h>
 #include <brimol/input.h>
 
+#include <algorithm>
 #include <atomic>
-#include <bit>
 #include <memory>
 #include <optional>
 #include <string>
@@ -25,11 +25,11 @@ namespace factory_test {
 namespace {
 
 constexpr int kColours = MW::FullScreen::kGrey + 1;
-constexpr unsigned kAllColours = (1U << kColours) - 1;
+constexpr uint32_t kSeenMs = 500;
 
-/// What to do stands on the first colour for a while. A tap, or the right key, shows the next
-/// colour. A long press, or the select key, ends the look, and the verdict is asked for. Each of
-/// them confirms the colour that was there, if that was for half a second.
+/// What to do stands on the first colour for a while. A tap, or the right key, confirms a colour
+/// and shows the next one, but not before it was there for half a second. A long press, or the
+/// select key, ends the look, and the verdict is asked for.
 class ColourTest : public LookTest {
  public:
   ColourTest()
@@ -49,10 +49,10 @@ class ColourTest : public LookTest {
               textSize(screen));
   }
 
-  bool isComplete() const override { return confirmed == kAllColours; }
+  bool isComplete() const override { return confirmed() == kColours; }
 
   std::vector<Measure> values() const override {
-    return {measured("colours", "colours confirmed", std::popcount(confirmed.load()))};
+    return {measured("colours", "colours confirmed", confirmed())};
   }
 
  protected:
@@ -62,7 +62,7 @@ class ColourTest : public LookTest {
     colour.emplace(MW::FullScreen::kWhite).setActive(1);
     touch.emplace();
     touch->clickCallback = [](MW::mouse_event*) { Current<ColourTest>::get().next(); };
-    touch->longPressCallback = [](MW::mouse_event*) { Current<ColourTest>::get().end(); };
+    touch->longPressCallback = [](MW::mouse_event*) { Current<ColourTest>::get().finishLook(); };
     touch->setActive(1);
     key.emplace();
     key->keyPressCallback = [](MW::kbd_event* event) {
@@ -81,41 +81,36 @@ class ColourTest : public LookTest {
   std::string question() const override { return tr("Was every colour even?"); }
 
   void endLook() override {
+    if (colour && isSeen()) seenLast = 1;
     key.reset();
     touch.reset();
     colour.reset();
   }
 
  private:
+  bool isSeen() const { return GetTicks() - shownSince >= kSeenMs; }
+
+  // Those that were left, and the one at which the look ended.
+  int confirmed() const { return std::min(shown + seenLast, kColours); }
+
   void next() {
-    confirm();
+    if (!isSeen()) return;
+    shownSince = GetTicks();
     colour->setRect(++shown % kColours);
-  }
-
-  void end() {
-    confirm();
-    finishLook();
-  }
-
-  void confirm() {
-    constexpr uint32_t kSeenMs = 500;
-    const uint32_t now = GetTicks();
-    if (now - shownSince.exchange(now) >= kSeenMs) confirmed |= 1U << (shown % kColours);
   }
 
   void followKey(unsigned int code) {
     if (code == MW::kKeyRight) next();
-    if (code == MW::kKeySelect) end();
-    if (code == kKeyBack) finishLook();
+    finishLookOn(code);
     MW::isDisplayUpdate(1);
   }
 
   Current<ColourTest> current{this};
   uint32_t began = 0;  // GetTicks() milliseconds
   bool hasWords = true;
-  std::atomic<int> shown = 0;  // how often it moved on
-  std::atomic<uint32_t> shownSince = 0;
-  std::atomic<unsigned> confirmed = 0;  // a bit for each colour
+  std::atomic<int> shown = 0;            // how often it moved on
+  std::atomic<uint32_t> shownSince = 0;  // GetTicks() milliseconds
+  int seenLast = 0;                      // whether the last one was seen, too
   std::optional<MW::FullScreen> colour;
   std::optional<OnTop<MW::Screen>> touch;
   std::optional<OnTop<MW::Key>> key;
