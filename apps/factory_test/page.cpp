@@ -53,9 +53,18 @@ void Page::drawFront() {
   head.show();
   drawProgress(progress, layOutPage(screenSize()).progress);
   titleText.show();
+  drawWhose();
   drawHint(layOutPage(screenSize()).hint);
   line.show();
   if (bar) bar->draw();
+}
+
+void Page::drawWhose() const {
+  if (progress.whose.empty()) return;
+  const ScreenSize screen = screenSize();
+  const SKIA_Rect area = layOutPage(screen).whose;
+  drawWords(within(area, gapOf(screen) / 4), progress.whose, kHeadInk.text, SKIA_ALIGN_CENTRE,
+            smallTextSize(screen));
 }
 
 void Page::drawHint(const SKIA_Rect& area) const {

@@ -46,6 +46,8 @@ class Page {
   }
 
  private:
+  void drawWhose() const;
+
   RunProgress progress;
   MW::Box ground;
   MW::Box head;

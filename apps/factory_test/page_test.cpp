@@ -19,8 +19,8 @@ void PageTest::prepare(const PlanStep& planned) {
 
 void PageTest::drawValues(const SKIA_Rect& area) const {
   std::string words;
-  for (const std::string& line : valueLines(values(), planStep)) {
-    words.append(words.empty() ? "" : "\n").append(line);
+  for (const ValueLine& line : valueLines(values(), planStep)) {
+    words.append(words.empty() ? "" : "\n").append(line.words);
   }
   if (words.empty()) return;
   drawWords(area, words, kPageInk.text, SKIA_ALIGN_CENTRE, textSize(screenSize()));

@@ -43,6 +43,7 @@ class LookTest : public PageTest {
   void enter() final { beginLook(); }
   void leave() final;
   void update(uint32_t now) final;
+  bool awaitsVerdict() const final { return page.isAsking(); }
   void draw() override;
 
  protected:
