@@ -198,11 +198,11 @@ void FactoryTest::askToLeave(uint32_t now) {
 
 void FactoryTest::warnOfLeaving() {
   isLeaving = false;
-  ask(Asked::Leave, {tr("Leave"),
-                     book.isAllSaved()
-                         ? tr("End the factory test?")
+  ask(Asked::Leave,
+      {tr("Leave"),
+       book.isAllSaved() ? tr("End the factory test?")
                          : tr("Not all results are saved. End the factory test, and lose them?"),
-                     tr("OK"), tr("CANCEL")});
+       tr("OK"), tr("CANCEL")});
 }
 
 void FactoryTest::ask(Asked what, const Question& question) {
