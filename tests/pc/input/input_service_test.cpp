@@ -52,7 +52,8 @@ TEST(InputService, PausesLongerWhereNothingHappensForASecond) {
     EXPECT_EQ(lasts(before + milliseconds(999), 1), milliseconds(1));
     const auto idle = steady_clock::now() + InputService::kIdleAfter;
     EXPECT_EQ(lasts(idle, 1), milliseconds(4));
-    EXPECT_EQ(lasts(idle, 2), milliseconds(2)) << "only who looks for work without end waits longer";
+    EXPECT_EQ(lasts(idle, 2), milliseconds(2))
+        << "only who looks for work without end waits longer";
     draws ? service.hearOfFrame() : service.post(kKeyDown);
     EXPECT_EQ(lasts(idle, 1), milliseconds(1)) << draws;
   }
