@@ -27,7 +27,10 @@ std::vector<Drawing> drawn() {
 
 const Drawing kLineItem = {Call::Item, {}, kLine, {}, SKIA_LINE};
 
+const int isOpenAtStart = List::is_init;
+
 TEST_F(WidgetListTest, NeedsToBeOpen) {
+  EXPECT_EQ(isOpenAtStart, 0);
   EXPECT_EQ(addText("a"), -1024);
   EXPECT_EQ(List::show() + List::show(1) + List::hide(1) + List::hideShadow() + List::remove(1), 0);
   EXPECT_EQ(List::setText(1, "a", 1) + List::setColor(1, 2, 3, 4) + List::setRect(1, kRect), 0);

@@ -38,12 +38,14 @@ Step top() {
   });
 }
 
-// What no event reaches.
-template <int type>
-void byHand(Results& results) {
-  MW::event_data event = pointerEvent(static_cast<MW::EventCode>(type), {30, kTop});
-  type == MW::kEventPress ? results.onMpdPress(&event) : results.onMpdRelease(&event);
+// A part of what an event does, by hand.
+Step byHand(void (*part)(Results& results, MW::event_data* event)) {
+  return call<Results>([part](Results& results) {
+    MW::event_data event = {.type = MW::kEventRelease, .mouse = stage.finger};
+    part(results, &event);
+  });
 }
+const Step kMpdPress = byHand([](Results& results, auto* event) { results.onMpdPress(event); });
 
 Maker resultsOf(const std::string& lines, int listType = MW::MpdWid::kRow) {
   return [=] {
@@ -105,10 +107,13 @@ const PlayTests kPlays = {
         {finger(3), press(30, kTop - 1), press(30, kTop), lookAtHold(), finger(1), drag(1, 1),
          longPress(), lookAtLog(), finger(3), longPress(), release(0, 0), lookAtHold()},
         "- press+ <held 4> - - <[MPDWID] onRecvEvent-> T:3, F:1> - click release+ <held 0>"),
-    kClickable("APressByHandHoldsUntilItsRelease",
-               {call<Results>(byHand<MW::kEventPress>), lookAtHold(),
-                call<Results>(byHand<MW::kEventRelease>), lookAtHold()},
-               "<held 1> <held 0>"),
+    kClickable(
+        "EachPartOfAReleaseLetsTheFingerGo",
+        {kMpdPress, lookAtHold(),
+         byHand([](Results& results, auto* event) { results.onRelease(event->mouse); }),
+         lookAtHold(), kMpdPress,
+         byHand([](Results& results, auto* event) { results.onMpdRelease(event); }), lookAtHold()},
+        "<held 1> release <held 0> <held 0>"),
     kClickable("KeysAreTold", {keyDown(9), keyUp(9), plug(9)}, "down9+ up9+ -"),
 };
 
