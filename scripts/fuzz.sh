@@ -25,14 +25,14 @@ cmake --build --preset fuzz
 export LSAN_OPTIONS="suppressions=$PWD/cmake/lsan.supp:print_suppressions=0"
 export UBSAN_OPTIONS=print_stacktrace=1
 
-# The smallest of the files that together reach all that small files reach.
+# Of the files that together reach all that small files reach the smallest.
 keep_corpus() {
   local merged=build/fuzz/merged/$1
   rm -rf "$merged"
   mkdir -p "$merged"
   "build/fuzz/fuzz/fuzz_$1" -merge=1 -use_value_profile=0 -max_len=$most_bytes "$merged" \
     "build/fuzz/learnt/$1" "fuzz/corpus/$1" 2>/dev/null
-  find "$merged" -type f -printf '%s %p\n' | sort -rn | head -n $most_files | cut -d' ' -f2- |
+  find "$merged" -type f -printf '%s %p\n' | sort -n | head -n $most_files | cut -d' ' -f2- |
     while read -r file; do cp "$file" "fuzz/corpus/$1/"; done
 }
 

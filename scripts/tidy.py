@@ -1,11 +1,14 @@
 #!/usr/bin/env python3
 """Runs clang-tidy over files of the build in one folder: tidy.py BUILD_FOLDER FILE...
 
-clang-tidy spends most of its time on the headers of a file. Files that are built with the same options are
-therefore looked at together, in a source that includes them; the static analyser knows such sources. Two files
-that declare the same name at the outermost level do not meet in one. A finding names the file's own line.
+clang-tidy spends most of its time on the headers of a file. Files are therefore looked at together, in a source
+that includes them; the static analyser knows such sources. Such files may be of several targets: the source sees
+the folders and the macros of all of them. Two files that declare the same name at the outermost level do not meet
+in one, nor do two targets that give a macro two values or a header's name two files. A finding names the file's own
+line.
 """
 
+import glob
 import json
 import os
 import pathlib
@@ -14,6 +17,7 @@ import shlex
 import subprocess
 import sys
 from concurrent.futures import ThreadPoolExecutor
+from functools import cache
 
 from batches import make_batches
 
@@ -43,13 +47,74 @@ def check_all_known(units, files):
         sys.exit(f'tidy.py: not of this build: {", ".join(unknown)}')
 
 
+class Group:
+    """Targets whose files can be looked at together."""
+
+    def __init__(self, options):
+        self.others, self.folders, self.macros = self.split(options)
+        self.headers = headers_of(self.folders)
+        self.paths = []
+
+    @staticmethod
+    def split(options):
+        """What is neither a folder nor a macro; folders in their order; macros with their values."""
+        others, folders, macros = [], {}, {}
+        words = iter(options)
+        for word in words:
+            if word == '-isystem':
+                folders['-isystem' + next(words)] = None
+            elif word.startswith('-I'):
+                folders[word] = None
+            elif word.startswith('-D'):
+                macros[word.split('=')[0]] = word
+            else:
+                others.append(word)
+        return others, folders, macros
+
+    def takes(self, options):
+        """Whether these options fit, which the group has then."""
+        _, folders, macros = self.split(options)
+        headers = headers_of(folders)
+        if any(self.macros.get(name, word) != word for name, word in macros.items()):
+            return False
+        if any(self.headers.get(name, path) != path for name, path in headers.items()):
+            return False
+        self.folders |= folders
+        self.macros |= macros
+        self.headers |= headers
+        return True
+
+    def options(self):
+        return [*self.others, *self.folders, *self.macros.values()]
+
+
+def headers_of(folders):
+    """What '#include "NAME"' finds in them, by name."""
+    headers = {}
+    for folder in reversed(list(folders)):
+        if folder.startswith('-I'):
+            headers |= headers_in(folder.removeprefix('-I'))
+    return headers
+
+
+@cache
+def headers_in(folder):
+    return {os.path.relpath(path, folder): path for path in glob.iglob(folder + '/**/*.h', recursive=True)}
+
+
 def batches_of(units):
-    """Lists of files, each with the options that all of its files have."""
+    """Lists of files, each with options that serve all of its files."""
     paths_by_options = {}
     for path, options in sorted(units.items()):
         paths_by_options.setdefault(options, []).append(path)
-    return [{'options': options, 'files': files}
-            for options, paths in sorted(paths_by_options.items()) for files in make_batches(paths)]
+    groups = []
+    for options, paths in sorted(paths_by_options.items(), key=lambda item: -len(item[1])):
+        group = next((each for each in groups if each.takes(options)), None)
+        if group is None:
+            group = Group(options)
+            groups.append(group)
+        group.paths += paths
+    return [{'options': group.options(), 'files': files} for group in groups for files in make_batches(group.paths)]
 
 
 def write_batches(folder, batches):

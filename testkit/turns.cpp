@@ -9,7 +9,7 @@ namespace brimol::test {
 
 namespace {
 
-constexpr std::chrono::seconds kPatience{10};  // of real time
+constexpr std::chrono::seconds kPatience{60};  // of real time
 
 // Tells the platform of the thread's end, once the thread has had a turn.
 struct Presence {

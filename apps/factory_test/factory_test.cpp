@@ -2,14 +2,15 @@
 
 #include <MW/window.h>
 #include <brimol/frame.h>
+#include <brimol/input.h>
 
-#include <algorithm>
 #include <utility>
 
 #include "complain.h"
 #include "language/language.h"
 #include "layout.h"
 #include "plan/judge.h"
+#include "questions.h"
 #include "records/run.h"
 #include "results/measure_text.h"
 #include "run_progress.h"
@@ -25,7 +26,7 @@ FactoryTest::FactoryTest(ResultBook& results, const Context& program, const Task
       menu(book, chosen.isOwnPlan ? &chosen.plan : nullptr) {
   book.setPatience(Patience::kTry);
   if (task.isRun) {
-    beginRun();
+    beginRun(GetTicks());
   } else {
     menu.show();
   }
@@ -37,15 +38,13 @@ void FactoryTest::open(std::size_t entry, uint32_t now) {
   start(entry, now);
 }
 
-// At the first step that has no verdict yet: a run that was aborted goes on.
-void FactoryTest::beginRun() {
-  const auto isOpen = [this](const PlanStep& step) {
-    const TestResult* const result = book.find(step.test);
-    return result == nullptr || result->verdict == Verdict::None;
-  };
-  const auto first = std::ranges::find_if(task.plan.steps, isOpen);
-  run.emplace(task.plan, static_cast<std::size_t>(first - task.plan.steps.begin()));
+// A run that was aborted goes on.
+void FactoryTest::beginRun(uint32_t now) {
+  run.emplace(task.plan, book.results());
   isThrough = false;
+  const RunProgress progress = progressOf(book);
+  if (progress.done() == 0 || run->state() != PlanRun::State::Performing) return;
+  notice.emplace(tr("The run goes on"), "", kPageInk, progress.allWords(), now);
 }
 
 void FactoryTest::askForUnits() {
@@ -60,6 +59,14 @@ void FactoryTest::askForUnit() {
 }
 
 void FactoryTest::updateUnit(uint32_t now) {
+  switch (unitPage->takeWish()) {
+    case UnitPage::Wish::Leave: askToLeave(); break;
+    case UnitPage::Wish::Without:
+      ask(Asked::Without,
+          {tr("Which unit?"), tr("Test a unit without a serial number?"), tr("OK"), tr("CANCEL")});
+      break;
+    case UnitPage::Wish::None: break;
+  }
   if (auto entered = unitPage->takeAnswer()) {
     serial = *std::move(entered);
     beginning.start(now);
@@ -87,7 +94,7 @@ void FactoryTest::startUnit(uint32_t now) {
   unitPage.reset();
   menu.showVerdicts();
   if (task.isRun) {
-    beginRun();
+    beginRun(now);
   } else {
     menu.show();
   }
@@ -105,8 +112,11 @@ void FactoryTest::update(uint32_t now) {
     const bool isKept = book.saveAgain(error);
     showKept(isKept, error, now);
   }
+  if (running) running->clock.tick(now, !prompt && !running->test->awaitsVerdict());
   if (prompt) {
     updatePrompt(now);
+  } else if (notice) {
+    updateNotice(now);
   } else if (unitPage) {
     updateUnit(now);
   } else if (running) {
@@ -121,7 +131,7 @@ void FactoryTest::update(uint32_t now) {
 void FactoryTest::updateMenu(uint32_t now) {
   menu.update(now);
   if (menu.takeLeave()) {
-    ask(Asked::Leave, {tr("Leave"), tr("End the factory test?"), tr("OK"), tr("CANCEL")});
+    askToLeave();
   } else if (const auto chosen = menu.takeChosen()) {
     menu.hide();
     start(*chosen, now);
@@ -129,29 +139,28 @@ void FactoryTest::updateMenu(uint32_t now) {
 }
 
 void FactoryTest::updateTest(uint32_t now) {
-  showStanding(now);
+  showStanding();
   running->test->update(now);
   const Outcome outcome = running->test->verdict();
-  if (outcome == Outcome::Running && isOverdue(running->step, now - running->startTicks)) {
+  if (outcome == Outcome::Running && isOverdue(running->step, running->clock.used())) {
     context.log.add("Time-out");
     finish(Outcome::Fail, now, Reason::TimeOut);
     return;
   }
   if (outcome == Outcome::Running) return;
-  if (outcome == Outcome::Pass && !running->test->isComplete() && isWithinLimits()) {
-    ask(Asked::IncompletePass,
-        {tr("Not all was tested"),
-         tr("The test has not shown or asked all that it must. Pass anyway?"), tr("PASS"),
-         tr("GO ON")});
-    return;
+  if (outcome == Outcome::Pass && !running->test->isComplete()) {
+    ask(Asked::IncompletePass, incompletePass(*running->test, running->step));
+  } else {
+    finish(outcome, now);
   }
-  finish(outcome, now);
 }
 
-// What is outside them fails, whatever the operator says.
-bool FactoryTest::isWithinLimits() const {
-  std::vector<Measure> values = running->test->values();
-  return judge(Verdict::Pass, values, running->step) == Verdict::Pass;
+// What comes next waits until it was read.
+void FactoryTest::updateNotice(uint32_t now) {
+  if (!notice->isOver(now)) return;
+  notice.reset();
+  if (!run) menu.show();
+  MW::isDisplayUpdate(1);
 }
 
 // Begins the next step, or asks what is to follow.
@@ -175,11 +184,11 @@ void FactoryTest::endRun(uint32_t now) {
     showKept(isKept, error, now);
     if (!isKept) return;  // comes back once that is settled
   }
-  const RunProgress progress = progressOf(book);
-  const bool isPassed = progress.passed == progress.tests;
-  const std::string words = progress.words() + (book.isAllSaved() ? "" : tr(", not saved"));
-  ask(Asked::RunEnd, {isPassed ? tr("PASS") : tr("FAIL"), words, tr("END"),
-                      asksForUnits ? tr("NEXT UNIT") : tr("MENU")});
+  ask(Asked::RunEnd, endOfRun(book, asksForUnits ? tr("NEXT UNIT") : tr("MENU")));
+}
+
+void FactoryTest::askToLeave() {
+  ask(Asked::Leave, {tr("Leave"), tr("End the factory test?"), tr("OK"), tr("CANCEL")});
 }
 
 void FactoryTest::ask(Asked what, const Question& question) {
@@ -201,6 +210,9 @@ void FactoryTest::follow(bool isYes, uint32_t now) {
   using Answer = PlanRun::Answer;
   switch (asked) {
     case Asked::Leave: ended = isYes; break;
+    case Asked::Without:
+      if (isYes) unitPage->goWithout();
+      break;
     case Asked::IncompletePass:
       if (isYes) {
         finish(Outcome::Pass, now);
@@ -239,18 +251,18 @@ void FactoryTest::follow(bool isYes, uint32_t now) {
 void FactoryTest::start(std::size_t entry, uint32_t now) {
   const TestEntry& chosen = testEntries()[entry];
   context.log.add(std::string("Test ") + chosen.id);
-  running =
-      Running{entry, stepOf(context, chosen.id), chosen.make(context), presentTime(), now, ""};
+  running = Running{
+      entry, stepOf(context, chosen.id), chosen.make(context), presentTime(), now, TestClock(now),
+      ""};
   running->test->prepare(running->step);
-  showStanding(now);
+  showStanding();
   running->test->showProgress(progressOf(book));
   running->test->enter();
   MW::isDisplayUpdate(1);
 }
 
-void FactoryTest::showStanding(uint32_t now) {
-  std::string words =
-      standingOf(running->step, run ? run->attempt() : 1, now - running->startTicks);
+void FactoryTest::showStanding() {
+  std::string words = standingOf(running->step, run ? run->attempt() : 1, running->clock.used());
   if (words == running->standing) return;
   running->test->showStanding(words);
   running->standing = std::move(words);
@@ -275,7 +287,7 @@ void FactoryTest::finish(Outcome outcome, uint32_t now, Reason failure) {
   running.reset();
   if (run) {
     run->finish(verdict);
-  } else {
+  } else if (!notice) {
     menu.show();
   }
 }
@@ -295,6 +307,7 @@ Verdict FactoryTest::keep(const Running& done, Verdict given, Reason failure, ui
   if (verdict != judged) failure = Reason::Rehearsal;
   for (const Measure& each : values) context.log.add(each.name + ": " + measureText(each));
   context.log.add(std::string("Verdict ") + verdictName(verdict));
+  if (verdict == Verdict::Fail) notice = whyFailed(step, values, failure, now);
   std::string error;
   const bool isKept = book.record({.test = step.test,
                                    .verdict = verdict,
@@ -324,6 +337,8 @@ void FactoryTest::draw() {
   skia_begin_frame_c();
   if (running) {
     running->test->draw();
+  } else if (notice) {
+    notice->draw();
   } else if (unitPage) {
     unitPage->draw();
   } else {

@@ -9,12 +9,14 @@
 
 #include "exit_code.h"
 #include "menu.h"
+#include "notice.h"
 #include "pages/table.h"
 #include "patience.h"
 #include "plan/plan_run.h"
 #include "prompt.h"
 #include "results/results.h"
 #include "task.h"
+#include "test_clock.h"
 #include "unit_page.h"
 
 namespace factory_test {
@@ -47,19 +49,21 @@ class FactoryTest {
     std::unique_ptr<Test> test;
     std::chrono::sys_seconds started;
     uint32_t startTicks;
+    TestClock clock;
     std::string standing;  // as it is shown
   };
 
-  enum class Asked { Leave, IncompletePass, SaveAgain, Repeat, GoOn, RunEnd };
+  enum class Asked { Leave, Without, IncompletePass, SaveAgain, Repeat, GoOn, RunEnd };
 
-  void beginRun();
+  void beginRun(uint32_t now);
   void askForUnit();
   void updateUnit(uint32_t now);
   void startUnit(uint32_t now);
+  void askToLeave();
   void updateMenu(uint32_t now);
   void updateTest(uint32_t now);
-  void showStanding(uint32_t now);
-  bool isWithinLimits() const;
+  void updateNotice(uint32_t now);
+  void showStanding();
   void updateRun(uint32_t now);
   void updatePrompt(uint32_t now);
   void follow(bool isYes, uint32_t now);
@@ -87,6 +91,7 @@ class FactoryTest {
   bool isThrough = false;      // the book was told that it is
   Asked asked = Asked::Leave;
   std::optional<Prompt> prompt;
+  std::optional<Notice> notice;
 };
 
 }  // namespace factory_test

@@ -127,6 +127,7 @@ struct PageLayout {
   SKIA_Rect leave;                    ///< the way out, in it
   SKIA_Rect progress;                 ///< at its foot
   SKIA_Rect title;                    ///< the same
+  SKIA_Rect whose;                    ///< which unit, behind the title
   SKIA_Rect hint;                     ///< what to do
   SKIA_Rect line;                     ///< what happens
   SKIA_Rect content;                  ///< the page's own
@@ -138,20 +139,21 @@ constexpr PageLayout layOutPage(ScreenSize screen) {
   const SKIA_Rect whole = {0, 0, screen.width, screen.height, kPageInk.ground};
   const bool isWide = isLandscape(screen);
   const auto [head, rest] = rowsOf<2>(whole, 0, isWide ? std::array{10, 90} : std::array{9, 91});
-  const auto [leave, title, nothing] = columnsOf<3>(inColor(head, kHeadInk.ground), gap, {3, 8, 3});
+  const auto [leave, title, whose] = columnsOf<3>(inColor(head, kHeadInk.ground), gap, {3, 8, 3});
   const SKIA_Rect body = within(rest, 2 * gap);
   PageLayout page = {.ground = whole,
                      .head = inColor(head, kHeadInk.ground),
                      .leave = inColor(rowsOf<2>(leave, 0, {11, 1})[0], kButtonInk.ground),
                      .progress = rowsOf<2>(head, 0, {11, 1})[1],
                      .title = title,
+                     .whose = inColor(rowsOf<2>(whose, 0, {11, 1})[0], kHeadInk.ground),
                      .hint = {},
                      .line = {},
                      .content = {},
                      .verdicts = {}};
   if (isWide) {
     const auto [left, right] = columnsOf<2>(body, 2 * gap, {4, 1});
-    const auto [hint, line, content] = rowsOf<3>(left, gap, {12, 8, 80});
+    const auto [hint, line, content] = rowsOf<3>(left, gap, {20, 7, 73});
     page.hint = hint;
     page.line = inColor(line, kPanelInk.ground);
     page.content = content;

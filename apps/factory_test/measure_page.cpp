@@ -116,9 +116,10 @@ std::vector<MeasurePage::CardLine> MeasurePage::linesOfCard(int width) const {
   const auto addLine = [&](const std::string& words) {
     lines.push_back({words, fitted(words, size, width, lineHeight(size)).size});
   };
+  if (!progress.whose.empty()) addLine(progress.whose);
   addLine(tr("Hold a finger still, or Back: end."));
   lines.push_back({"", size / 2});
-  for (const std::string& words : valueLines(values(), planStep)) addLine(words);
+  for (const ValueLine& value : valueLines(values(), planStep)) addLine(value.words);
   if (!page.shownStanding().empty()) addLine(page.shownStanding());
   return lines;
 }

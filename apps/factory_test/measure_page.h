@@ -47,6 +47,7 @@ class MeasurePage : public LookTest {
   /// Whether only the operator can say if what was seen is right: he is asked then.
   virtual bool isForEyes() const { return false; }
   std::string question() const override;
+  void endLook() override { watch.reset(); }
 
   double parameter(std::string_view name) const { return planStep.parameter(name); }
   Measure measure(std::string_view name, double value) const;
@@ -66,7 +67,6 @@ class MeasurePage : public LookTest {
   };
 
   void beginLook() final { watch.emplace(); }
-  void endLook() final { watch.reset(); }
   void updateLook() final;
   void followStill(const Input& input);
   bool isWhereItWas(const Input& input) const;

@@ -16,6 +16,7 @@ namespace {
 struct HeadLayout {
   SKIA_Rect title;
   SKIA_Rect hint;
+  SKIA_Rect whose;
   SKIA_Rect count;
   SKIA_Rect line;
   SKIA_Rect bar;
@@ -23,23 +24,26 @@ struct HeadLayout {
   Grid grid;
 };
 
-enum class LineRow { Shown, LeftOut };
+enum class Row { Shown, LeftOut };
+
+constexpr Row rowFor(bool isThere) { return isThere ? Row::Shown : Row::LeftOut; }
 
 // On a wide screen what is one above the other elsewhere stands side by side.
-HeadLayout layOutHead(const SKIA_Rect& area, ScreenSize screen, LineRow lineRow) {
+HeadLayout layOutHead(const SKIA_Rect& area, ScreenSize screen, Row whoseRow, Row lineRow) {
   const int gap = gapOf(screen);
   const bool isWide = isLandscape(screen);
   const auto [title, rest] = rowsOf<2>(area, 0, {isWide ? 3 : 2, 8});
   const SKIA_Rect body = {rest.x + 2 * gap, rest.y + gap / 2, rest.w - 4 * gap, rest.h - gap, 0};
-  const int line = lineRow == LineRow::Shown ? 4 : 0;
+  const int who = whoseRow == Row::Shown ? 4 : 0;
+  const int line = lineRow == Row::Shown ? 4 : 0;
   const auto [words, bar, figures] =
-      rowsOf<3>(body, gap / 4, {isWide ? 4 : 8 + line, 1, isWide ? 5 : 8});
+      rowsOf<3>(body, gap / 4, {isWide ? 4 : 8 + who + line, 1, isWide ? 5 : 8});
   if (isWide) {
-    const auto [hint, count, sent] = columnsOf<3>(words, gap, {4, 4, line});
-    return {title, hint, count, sent, bar, figures, {2, 3}};
+    const auto [hint, whose, count, sent] = columnsOf<4>(words, gap, {4, who, 4, line});
+    return {title, hint, whose, count, sent, bar, figures, {2, 3}};
   }
-  const auto [hint, count, sent] = rowsOf<3>(words, gap / 4, {4, 4, line});
-  return {title, hint, count, sent, bar, figures, {3, 2}};
+  const auto [hint, whose, count, sent] = rowsOf<4>(words, gap / 4, {4, who, 4, line});
+  return {title, hint, whose, count, sent, bar, figures, {3, 2}};
 }
 
 struct LineWords {
@@ -79,7 +83,8 @@ MenuHead::~MenuHead() { leaveLayers(); }
 int MenuHead::show(unsigned int) {
   const ScreenSize screen = screenSize();
   const int size = textSize(screen);
-  const HeadLayout place = layOutHead(rect, screen, line ? LineRow::Shown : LineRow::LeftOut);
+  const HeadLayout place =
+      layOutHead(rect, screen, rowFor(!progress.whose.empty()), rowFor(line.has_value()));
   skia_add_box_c(rect);
   skia_add_textbox_c(
       inColor(place.title, kHeadInk.ground),
@@ -88,6 +93,7 @@ int MenuHead::show(unsigned int) {
     drawWords(row, words, kPageInk.text, leadingAlign(), size);
   };
   put(place.hint, tr("Choose a test, or Leave at the end."));
+  if (!progress.whose.empty()) put(place.whose, progress.whose);
   put(place.count, progress.words());
   if (line) {
     const auto [words, ink] = wordsOf(*line);

@@ -13,9 +13,9 @@
 
 namespace factory_test {
 
-/// The title, what to do, how far the run has come, what the line has, and figures of the machine,
-/// in the place of the list's own title bar, whose letters are of one size on every screen.
-/// Construct it after the list.
+/// The title, what to do, whose the run is, how far the run has come, what the line has, and
+/// figures of the machine, in the place of the list's own title bar, whose letters are of one size
+/// on every screen. Construct it after the list.
 class MenuHead : public MW::Widget {
  public:
   MenuHead();

@@ -13,9 +13,11 @@ class PressGuard {
   static constexpr uint32_t kDeafMs = 700;
 
   /// `since`: when the button appeared, in GetTicks() milliseconds.
-  explicit PressGuard(uint32_t since) : appeared(since) {}
+  explicit PressGuard(uint32_t since = 0) : appeared(since) {}
 
-  void press(uint32_t now) { pressed = now - appeared >= kDeafMs; }
+  /// Whether it is too early, for keys too.
+  bool isDeaf(uint32_t now) const { return now - appeared < kDeafMs; }
+  void press(uint32_t now) { pressed = !isDeaf(now); }
   /// Whether a click counts.
   bool takeClick() { return std::exchange(pressed, false); }
 

@@ -18,7 +18,9 @@ class Prompt::Panel : public MW::Widget {
     size = textSize(screen);
     place = layOutPrompt(screen);
     ground = {0, 0, screen.width, screen.height, MW::kColorShadow};
-    title = captionIn(place.title, question.title.c_str(), kHeadInk.text, percentOf(size, 120));
+    place.title = inColor(place.title, question.ink.ground);
+    title = captionIn(place.title, question.title.c_str(), question.ink.text,
+                      percentOf(size, question.size == Title::Huge ? 250 : 120));
     setType(MW::kTopLayer);
     setActive(1);
     MW::Window::registerWidget(this);
@@ -42,34 +44,26 @@ class Prompt::Panel : public MW::Widget {
   int size = 0;  // of their letters, pixels
 };
 
-Prompt::Prompt(const Question& question)
-    : guards{PressGuard(GetTicks()), PressGuard(GetTicks())},
-      panel(std::make_unique<Panel>(question)) {
+Prompt::Prompt(const Question& question) : panel(std::make_unique<Panel>(question)) {
   const auto [yes, no] = layOutPrompt(screenSize()).buttons;
-  place<0>(yes, question.yes);
-  place<1>(no, question.no);
+  buttons.place<0>(yes, captionIn(yes, question.yes, kButtonInk.text));
+  buttons.place<1>(no, captionIn(no, question.no, kButtonInk.text));
   veil.emplace(SKIA_Rect{yes.x, yes.y, no.x + no.w - yes.x, yes.h, 0}, MW::kTopLayer,
                GetTicks() + PressGuard::kDeafMs);
   key.emplace().keyPressCallback = [](MW::kbd_event* event) {
-    if (event->code == MW::kKeySelect) Current<Prompt>::get().given = Answer::Yes;
-    if (event->code == kKeyBack) Current<Prompt>::get().given = Answer::No;
+    Current<Prompt>::get().followKey(event->code);
   };
   MW::isDisplayUpdate(1);
 }
 
 Prompt::~Prompt() = default;
 
-template <std::size_t index>
-void Prompt::place(const SKIA_Rect& area, const char* words) {
-  const SKIA_Text caption = captionIn(area, words, kButtonInk.text);
-  MW::Button& button = buttons.at(index).emplace(&area, &caption);
-  button.pressCallback = [](int) { Current<Prompt>::get().guards.at(index).press(GetTicks()); };
-  button.clickCallback = [](int) { Current<Prompt>::get().click(index); };
-  button.setActive(1);
+void Prompt::followKey(unsigned int code) {
+  if (buttons.isDeaf()) return;
+  if (code == MW::kKeySelect) given = Answer::Yes;
+  if (code == kKeyBack) given = Answer::No;
 }
 
-void Prompt::click(std::size_t index) {
-  if (guards.at(index).takeClick()) given = index == 0 ? Answer::Yes : Answer::No;
-}
+void Prompt::choose(std::size_t index) { given = index == 0 ? Answer::Yes : Answer::No; }
 
 }  // namespace factory_test

@@ -11,12 +11,14 @@
 #include <string>
 
 #include "current.h"
+#include "guarded_buttons.h"
 #include "layout.h"
 #include "on_top.h"
-#include "press_guard.h"
 #include "veil.h"
 
 namespace factory_test {
+
+enum class Title { Usual, Huge };
 
 /// What is asked, and what the two buttons say.
 struct Question {
@@ -24,6 +26,8 @@ struct Question {
   std::string words;
   const char* yes;
   const char* no;
+  Ink ink = kHeadInk;  // of the title
+  Title size = Title::Usual;
 };
 
 struct PromptLayout {
@@ -36,7 +40,7 @@ struct PromptLayout {
 constexpr PromptLayout layOutPrompt(ScreenSize screen) {
   const int gap = gapOf(screen);
   const SKIA_Rect whole = {0, 0, screen.width, screen.height, 0};
-  const auto middle = rowsOf<3>(whole, 0, {3, 4, 3})[1];
+  const auto middle = rowsOf<3>(whole, 0, {1, 2, 1})[1];
   const bool isWide = isLandscape(screen);
   const SKIA_Rect frame = isWide ? columnsOf<3>(middle, 0, {1, 2, 1})[1] : within(middle, gap);
   const auto [title, words, buttons] = rowsOf<3>(within(frame, gap), gap, {2, 5, 3});
@@ -45,7 +49,8 @@ constexpr PromptLayout layOutPrompt(ScreenSize screen) {
 }
 
 /// Stands in the top layer from construction to destruction. The left button or the select key says
-/// yes, the right button or the back key no. There is one at a time.
+/// yes, the right button or the back key no, but none of them at first (PressGuard). There is one
+/// at a time.
 class Prompt {
  public:
   enum class Answer { None, Yes, No };
@@ -61,15 +66,16 @@ class Prompt {
   class Panel;
   static constexpr std::size_t kButtons = 2;
 
-  template <std::size_t index>
-  void place(const SKIA_Rect& area, const char* words);
-  void click(std::size_t index);
+  using Buttons = GuardedButtons<Prompt, OnTop<MW::Button>, kButtons>;
+  friend Buttons;
+
+  void choose(std::size_t index);
+  void followKey(unsigned int code);
 
   Current<Prompt> current{this};
   std::atomic<Answer> given = Answer::None;
-  std::array<PressGuard, kButtons> guards;
   std::unique_ptr<Panel> panel;
-  std::array<std::optional<OnTop<MW::Button>>, kButtons> buttons;
+  Buttons buttons;
   std::optional<Veil> veil;
   std::optional<OnTop<MW::Key>> key;
 };

@@ -18,8 +18,30 @@ std::string RunProgress::words() const {
   return words.data();
 }
 
+std::string RunProgress::allWords() const {
+  return whose.empty() ? words() : whose + "\n" + words();
+}
+
+namespace {
+
+std::string whoseIs(const RunStart& run) {
+  std::string words;
+  const auto add = [&](const char* format, const std::string& name) {
+    constexpr std::size_t kMost = 600;  // bytes: a storable name and some words
+    std::array<char, kMost> part = {};
+    std::snprintf(part.data(), part.size(), format, name.c_str());
+    words.append(words.empty() ? "" : " \u00B7 ").append(part.data());
+  };
+  if (!run.unit.empty()) add(tr("Unit %s"), run.unit);
+  if (!run.operatorName.empty()) add(tr("Operator %s"), run.operatorName);
+  if (run.planName.ends_with(kRehearsal)) add("%s", tr("REHEARSAL"));
+  return words;
+}
+
+}  // namespace
+
 RunProgress progressOf(const ResultBook& book) {
-  RunProgress progress;
+  RunProgress progress = {.whose = whoseIs(book.run())};
   for (const std::string& test : book.run().tests) {
     const TestResult* const result = book.find(test);
     ++progress.tests;

@@ -29,6 +29,10 @@ std::string unitOf(const Options& options) {
   return options.serial.empty() ? serialOfSystem() : options.serial;
 }
 
+bool isKept(const Options& options) {
+  return !(options.database.empty() && options.results.empty() && options.junit.empty());
+}
+
 std::string stationName() {
   std::array<char, kHostNameBytes + 1> name = {};  // a name that fills it is not ended
   return ::gethostname(name.data(), kHostNameBytes) == 0 ? name.data() : "";
@@ -40,7 +44,9 @@ Keeping keepingOf(const Options& options) {
   return {.json = options.results,
           .junit = options.junit,
           .database = options.database,
-          .resume = options.newRun ? Database::Resume::No : Database::Resume::Yes,
+          .resume = options.newRun ? Resume::No
+                    : options.run  ? Resume::Unfinished
+                                   : Resume::Yes,
           .first = asksForUnit(options) ? FirstRun::WithUnit : FirstRun::AtOnce,
           .line = options.line,
           .isOnlyShown = !options.shot.empty()};
@@ -69,13 +75,15 @@ std::string wrongRecords(const Options& options) {
     return "--junit: " + options.junit + " holds something else than a report, and stays as it is";
   }
   if (!options.serial.empty() && !isSerial(options.serial, why)) return "--serial: " + why;
-  if (!options.database.empty() && !options.monkey.empty()) {
-    return "--monkey judges nothing: no --database";
+  if (!options.monkey.empty() && isKept(options)) {
+    return "--monkey judges nothing: neither --database, --results nor --junit";
   }
   if (!options.shot.empty() && !(options.database.empty() && options.junit.empty())) {
     return "--shot keeps nothing: neither --database nor --junit";
   }
-  if (options.newRun && options.database.empty()) return "--new-run needs --database";
+  if (options.newRun && options.database.empty() && options.results.empty()) {
+    return "--new-run needs --database or --results";
+  }
   if (options.line.empty()) return "";
   if (options.database.empty()) return "--line needs --database, which always comes first";
   const std::string wrong = wrongPostgresUrl(options.line);

@@ -38,6 +38,9 @@ class Test {
   /// A PASS was not taken: the test goes on.
   virtual void takeBack() {}
 
+  /// Whether it has ended but for the operator's verdict.
+  virtual bool awaitsVerdict() const { return false; }
+
   /// What it measured so far.
   virtual std::vector<Measure> values() const { return {}; }
   /// Whether it has shown and asked all that it must.

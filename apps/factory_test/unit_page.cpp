@@ -1,6 +1,5 @@
 #include "unit_page.h"
 
-#include <array>
 #include <utility>
 
 #include "language/language.h"
@@ -9,21 +8,49 @@
 
 namespace factory_test {
 
+namespace {
+
+// No verdict is asked for.
+SKIA_Rect wholeContent() {
+  const PageLayout page = layOutPage(screenSize());
+  const SKIA_Rect& first = page.content;
+  const SKIA_Rect& last = page.verdicts.back();
+  return {first.x, first.y, last.x + last.w - first.x, last.y + last.h - first.y, 0};
+}
+
+}  // namespace
+
 UnitPage::UnitPage()
     : page(tr("Which unit?"), tr("Type the serial number of the phone,\nthen the enter key.")) {
   using Here = Current<UnitPage>;
-  static constexpr auto kFaces = std::to_array<ButtonRow::Face>(
-      {{msg("Without a number"), [](int) { Here::get().answer(""); }}});
-  const auto [upper, lower] = rowsOf<2>(contentArea(), gapOf(screenSize()), {7, 1});
+  const auto [upper, lower] = rowsOf<2>(wholeContent(), gapOf(screenSize()), {7, 1});
   const SKIA_Rect area = inColor(upper, kPanelInk.ground);
   const SKIA_Text looks = captionOf("");
   keyboard.emplace(&area, &looks);
   keyboard->release_cb = [](int, MW::Ime*) { Here::get().follow(*Here::get().keyboard); };
   keyboard->setActive(1);
-  without.emplace(lower, kFaces);
-  key.emplace().keyPressCallback = [](MW::kbd_event* event) {
-    if (event->code == kKeyBack) Here::get().answer("");
+  const auto caption = [](const SKIA_Rect& face, const char* words) {
+    return captionIn(face, words, kButtonInk.text);
   };
+  const SKIA_Rect without = inColor(lower, kButtonInk.ground);
+  buttons.place<0>(without, caption(without, tr("Without a number")));
+  const SKIA_Rect leave = layOutPage(screenSize()).leave;
+  buttons.place<1>(leave, caption(leave, tr("Leave")));
+  key.emplace().keyPressCallback = [](MW::kbd_event* event) { Here::get().followKey(event->code); };
+}
+
+void UnitPage::choose(std::size_t index) {
+  if (index == 0) {
+    goWithout();
+  } else {
+    wish = Wish::Leave;
+  }
+}
+
+void UnitPage::followKey(unsigned int code) {
+  if (buttons.isDeaf()) return;
+  if (code == MW::kKeySelect) wish = Wish::Without;
+  if (code == kKeyBack) wish = Wish::Leave;
 }
 
 void UnitPage::answer(std::string serial) {
@@ -33,6 +60,10 @@ void UnitPage::answer(std::string serial) {
 
 // What was typed stays in the bar, for a correction.
 void UnitPage::follow(Keyboard& from) {
+  if (from.get_fold_status()) {
+    from.set_fold_status(false);
+    wish = Wish::Leave;
+  }
   if (!from.isEntered()) return;
   const std::string serial = from.getResultString();
   from.setResultString("");

@@ -1,16 +1,21 @@
-/// Measured values in the operator's language.
+/// The values of a test as its screens show them, in the chosen language.
 #pragma once
 
+#include <optional>
 #include <string>
 #include <vector>
 
 #include "plan/plan.h"
-#include "results/test_result.h"
 
 namespace factory_test {
 
-/// "worst distance: 3.5 mm (at most 5)": a line for each value, with the limits that the step gives
-/// it.
-std::vector<std::string> valueLines(std::vector<Measure> values, const PlanStep& step);
+struct ValueLine {
+  std::string words;
+  std::optional<bool> isWithin;  // its limits, where it has any
+};
+
+/// A line for each value, in the catalogue's order, with the step's limits. One that has limits
+/// and is not measured has a line, too.
+std::vector<ValueLine> valueLines(std::vector<Measure> values, const PlanStep& step);
 
 }  // namespace factory_test

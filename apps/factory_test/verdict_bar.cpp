@@ -26,15 +26,16 @@ constexpr auto kLooks = std::to_array<ButtonLook>({
     {msg("Leave"), kButtonInk, 100, Outcome::Left},
 });
 
+constexpr auto kOwnKeys =
+    std::to_array<unsigned int>({MW::kKeyLeft, MW::kKeyRight, MW::kKeySelect, kKeyBack});
+
 SKIA_Rect around(const SKIA_Rect& first, const SKIA_Rect& last) {
   return {first.x, first.y, last.x + last.w - first.x, last.y + last.h - first.y, 0};
 }
 
 }  // namespace
 
-VerdictBar::VerdictBar(Keys keys)
-    : guards{PressGuard(GetTicks()), PressGuard(GetTicks()), PressGuard(GetTicks()),
-             PressGuard(GetTicks())} {
+VerdictBar::VerdictBar(Keys keys) {
   const PageLayout page = layOutPage(screenSize());
   place<0>(page.verdicts[0]);
   place<1>(page.verdicts[1]);
@@ -50,42 +51,41 @@ VerdictBar::VerdictBar(Keys keys)
 
 template <std::size_t index>
 void VerdictBar::place(const SKIA_Rect& area) {
-  using Bar = Current<VerdictBar>;
   const ButtonLook& look = kLooks.at(index);
   const int size = percentOf(textSize(screenSize()), look.textPercent);
   const SKIA_Rect face = inColor(area, look.ink.ground);
-  const SKIA_Text caption = captionIn(area, tr(look.caption), look.ink.text, size);
-  MW::Button& button = buttons.at(index).emplace(&face, &caption);
-  button.pressCallback = [](int) { Bar::get().guards.at(index).press(GetTicks()); };
-  button.clickCallback = [](int) { Bar::get().click(index); };
-  button.setActive(1);
+  buttons.place<index>(face, captionIn(area, tr(look.caption), look.ink.text, size));
 }
 
-void VerdictBar::click(std::size_t index) {
-  if (guards.at(index).takeClick()) chosen = kLooks.at(index).outcome;
-}
+void VerdictBar::choose(std::size_t index) { chosen = kLooks.at(index).outcome; }
 
 void VerdictBar::draw() {
   const int index = marked;
   if (index < 0) return;
-  const SKIA_Rect& face = *buttons.at(static_cast<std::size_t>(index))->getPositionAndSize();
+  const SKIA_Rect& face = buttons.face(static_cast<std::size_t>(index));
   skia_add_box_c(inColor(within(face, -gapOf(screenSize())), kMarkInk.ground));
 }
 
 void VerdictBar::followKey(unsigned int code) {
+  if (std::ranges::count(kOwnKeys, code) == 0) {
+    if (otherKey != nullptr) otherKey(code);
+  } else if (!buttons.isDeaf()) {
+    followOwnKey(code);
+  }
+  MW::isDisplayUpdate(1);
+}
+
+void VerdictBar::followOwnKey(unsigned int code) {
   constexpr int kLast = kVerdicts - 1;
   const int index = marked;
   switch (code) {
     case MW::kKeyLeft: marked = std::max(index - 1, 0); break;
     case MW::kKeyRight: marked = std::min(index + 1, kLast); break;
     case MW::kKeySelect:
-      if (index >= 0) chosen = kLooks.at(static_cast<std::size_t>(index)).outcome;
+      if (index >= 0) choose(static_cast<std::size_t>(index));
       break;
-    case kKeyBack: chosen = Outcome::Left; break;
-    default:
-      if (otherKey != nullptr) otherKey(code);
+    default: chosen = Outcome::Left;
   }
-  MW::isDisplayUpdate(1);
 }
 
 }  // namespace factory_test

@@ -11,15 +11,15 @@
 #include <optional>
 
 #include "current.h"
-#include "press_guard.h"
+#include "guarded_buttons.h"
 #include "test.h"
 #include "veil.h"
 
 namespace factory_test {
 
-/// PASS, RETRY, FAIL, and Leave in the title's bar. Fingers press them, but not at first
-/// (PressGuard), when a veil lies over the verdicts. Of keys left and right move between the
-/// verdicts, select takes one, back leaves the test. They are on the screen from construction to
+/// PASS, RETRY, FAIL, and Leave in the title's bar. Fingers press them. Of keys left and right move
+/// between the verdicts, select takes one, back leaves the test. Neither does anything at first
+/// (PressGuard), when a veil lies over the verdicts. They are on the screen from construction to
 /// destruction; there is one bar at a time.
 class VerdictBar {
  public:
@@ -43,16 +43,19 @@ class VerdictBar {
   static constexpr std::size_t kButtons = 4;
   static constexpr int kVerdicts = 3;  // the first of them
 
+  using Buttons = GuardedButtons<VerdictBar, MW::Button, kButtons>;
+  friend Buttons;
+
   template <std::size_t index>
   void place(const SKIA_Rect& area);
-  void click(std::size_t index);
+  void choose(std::size_t index);
   void followKey(unsigned int code);
+  void followOwnKey(unsigned int code);
 
   Current<VerdictBar> current{this};
   std::atomic<Outcome> chosen = Outcome::Running;
   std::atomic<int> marked = -1;  // -1: no key moved it yet
-  std::array<PressGuard, kButtons> guards;
-  std::array<std::optional<MW::Button>, kButtons> buttons;
+  Buttons buttons;
   std::optional<Veil> veil;
   std::optional<MW::Key> key;
 };

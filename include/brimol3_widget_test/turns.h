@@ -14,11 +14,11 @@ class Turns {
   void hold();
   /// Lets all go on, and holds nobody any more.
   void letGo();
-  /// Waits until at least so many threads are held. Throws Failure after ten seconds of real time.
+  /// Waits until at least so many threads are held. Throws Failure after a minute of real time.
   void await(std::size_t threads);
   /// Gives each held thread one turn, in the order in which they came, if its pause is over at
   /// `now` or is of at most a millisecond, as those of threads are that look for work. A turn goes
-  /// to the thread's next pause or its end. Throws Failure for one of over ten seconds of real
+  /// to the thread's next pause or its end. Throws Failure for one of over a minute of real
   /// time: a handler that does not come back.
   void give(unsigned int now);
 

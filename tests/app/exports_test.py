@@ -154,7 +154,7 @@ class ExportsTest(unittest.TestCase):
                     (1 << 20, ["report", "--database", self.store, "--output", "/dev/full"], None, "not a regular file"),
                     (33000, ["export", "--json", "--database", self.store, "--output", old], None,
                      f"{old}: cannot be written: File too large"),
-                    (512, [*screen, "--results", results], None, f"{results}: cannot be written: File too large"),
+                    (64, [*screen, "--new-run", "--results", results], None, f"{results}: cannot be written: File too large"),
                     (4096, [*screen, "--serial", "x", "--database", self.store], None,
                      f"{self.store}: cannot be read or written: File too large"),
             ]:

@@ -40,7 +40,11 @@ class KillTest(unittest.TestCase):
             store.close()
 
     def verdicts(self):
-        return set(self.ask("select * from verdicts")) if self.store.exists() else set()
+        """Those that were given so far."""
+        try:
+            return set(self.ask("select * from verdicts")) if self.store.exists() else set()
+        except sqlite3.OperationalError:
+            return set()  # it has no tables yet
 
     def test_loses_at_most_the_running_test(self):
         chance = random.Random(SEED)
@@ -49,21 +53,14 @@ class KillTest(unittest.TestCase):
                 before = self.verdicts() if kill else set()
                 app = self.program("--new-run")
                 time.sleep(chance.uniform(0.05, LONGEST))
-                try:
-                    before |= self.verdicts()  # those that were given so far
-                except sqlite3.OperationalError:
-                    pass  # it has no tables yet
+                before |= self.verdicts()
                 app.kill()
                 app.communicate()
                 if not self.store.exists():
                     continue
                 self.assertEqual([("ok",)], self.ask("pragma integrity_check"))
                 self.assertEqual([], self.ask("pragma foreign_key_check"))
-                try:
-                    after = self.verdicts()
-                except sqlite3.OperationalError:
-                    after = set()
-                self.assertEqual(set(), before - after)
+                self.assertEqual(set(), before - self.verdicts())
                 if self.results.exists():
                     json.loads(self.results.read_text())
         self.check_next_start()

@@ -1,5 +1,8 @@
 #include <gtest/gtest.h>
+#include <unistd.h>
 
+#include <cstring>
+#include <filesystem>
 #include <fstream>
 
 #include "plan/judge.h"
@@ -12,6 +15,15 @@ namespace factory_test {
 namespace {
 
 const std::vector<KnownTest> kKnown = {{"touch_grid", true}, {"keys", true}, {"shell", false}};
+
+// Goes with it.
+struct PlanFile {
+  PlanFile() = default;
+  ~PlanFile() { std::filesystem::remove(name); }
+  PlanFile(const PlanFile&) = delete;
+  PlanFile& operator=(const PlanFile&) = delete;
+  const std::string name = testing::TempDir() + "plan_test." + std::to_string(::getpid()) + ".json";
+};
 
 Plan threeSteps(OnFailure onFailure, int retries) {
   PlanStep second = {.test = "keys", .retries = retries, .onFailure = onFailure};
@@ -92,7 +104,8 @@ TEST(Plans, TakeTheUsualLimitsWhereTheySayNone) {
 }
 
 TEST(Plans, HaveTheHashOfTheirText) {
-  const std::string file = testing::TempDir() + "plan_hash.json";
+  const PlanFile written;
+  const std::string& file = written.name;
   const Plan plan = {.name = "x", .steps = {{.test = "keys"}}};
   std::ofstream(file) << planJson(plan);
   FILE* const sum = popen(("sha256sum < " + file).c_str(), "r");
@@ -104,7 +117,8 @@ TEST(Plans, HaveTheHashOfTheirText) {
 }
 
 TEST(Plans, AreReadFromSmallFilesOnly) {
-  const std::string file = testing::TempDir() + "plan.json";
+  const PlanFile written;
+  const std::string& file = written.name;
   const std::string text = planJson({.name = "x", .steps = {{.test = "keys"}}});
   std::string error;
   std::ofstream(file) << text;
@@ -142,15 +156,24 @@ struct RunCase {
   const char* name;
   OnFailure onFailure;
   int retries;
-  const char* verdicts;  // p, f or n for each attempt, g, a or s for an answer
-  const char* tests;     // the number of the step before each of these, and how it ends
+  const char* verdicts;      // p, f or n for each attempt, g, a or s for an answer
+  const char* tests;         // the number of the step before each of these, and how it ends
+  const char* earlier = "";  // p, f or n for each step of a run that was aborted, - for none
 };
 
 class PlanRuns : public testing::TestWithParam<RunCase> {};
 
 TEST_P(PlanRuns, TakeTheirSteps) {
   const Plan plan = threeSteps(GetParam().onFailure, GetParam().retries);
-  PlanRun run(plan);
+  std::vector<TestResult> earlier;
+  for (std::size_t i = 0; i < std::strlen(GetParam().earlier); ++i) {
+    const char verdict = GetParam().earlier[i];
+    if (verdict == '-') continue;
+    earlier.push_back({plan.steps[i].test, verdict == 'p'   ? Verdict::Pass
+                                           : verdict == 'f' ? Verdict::Fail
+                                                            : Verdict::None});
+  }
+  PlanRun run(plan, earlier);
   std::string taken;
   for (const char each : std::string(GetParam().verdicts)) {
     const bool isAnswer = each == 'g' || each == 'a' || each == 's';
@@ -180,7 +203,13 @@ INSTANTIATE_TEST_SUITE_P(
                     RunCase{"asks", OnFailure::Ask, 1, "pffafgp", "122?2?3."},
                     RunCase{"asks_and_stops", OnFailure::Ask, 0, "pfs", "12?!"},
                     RunCase{"left_is_asked_for", OnFailure::GoOn, 3, "pnapns", "12?23?!"},
-                    RunCase{"last_fails", OnFailure::Stop, 0, "ppf", "123."}),
+                    RunCase{"last_fails", OnFailure::Stop, 0, "ppf", "123."},
+                    RunCase{"skips_what_is_done", OnFailure::Stop, 0, "pp", "13.", "-f"},
+                    RunCase{"performs_what_was_left", OnFailure::Stop, 0, "p", "1.", "npp"},
+                    RunCase{"was_stopped", OnFailure::Stop, 0, "", "!", "pf"},
+                    RunCase{"has_a_retry_left", OnFailure::Stop, 1, "pf", "23.", "pf"},
+                    RunCase{"was_asking", OnFailure::Ask, 0, "afgp", "?2?3.", "pf"},
+                    RunCase{"was_done", OnFailure::GoOn, 0, "", ".", "pfp"}),
     [](const auto& shown) { return shown.param.name; });
 
 TEST(TimeOuts, EndAtTheirMillisecond) {

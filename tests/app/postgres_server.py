@@ -2,11 +2,21 @@
 
 import glob
 import os
+import pathlib
 import pwd
 import shutil
 import signal
 import subprocess
 import tempfile
+import time
+
+
+def lives(process):
+    """Not a dead one that nobody has asked for yet."""
+    try:
+        return ") Z " not in pathlib.Path(f"/proc/{process}/stat").read_text()
+    except OSError:
+        return False
 
 
 class Postgres:
@@ -51,9 +61,15 @@ class Postgres:
                 raise RuntimeError(open(self.folder + "/log").read())
 
     def kill(self):
-        """As a power cut does: all of its processes at once."""
-        os.killpg(self.server.pid, signal.SIGKILL)
+        """As a power cut does: all of its processes at once. While one of them is left no server starts again."""
+        self.server.send_signal(signal.SIGSTOP)  # it starts no more
+        server = self.server.pid
+        processes = [server, *map(int, pathlib.Path(f"/proc/{server}/task/{server}/children").read_text().split())]
+        for process in processes:
+            os.kill(process, signal.SIGKILL)
         self.server.wait()
+        while any(map(lives, processes)):
+            time.sleep(0.01)
 
     def ask(self, sql):
         """The rows, as lists of texts."""

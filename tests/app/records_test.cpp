@@ -16,6 +16,7 @@
 #include "records/history.h"
 #include "records/statistics.h"
 #include "results/results.h"
+#include "support/eventually.h"
 
 namespace factory_test {
 namespace {
@@ -81,17 +82,17 @@ TEST_F(Records, GoOnWithTheUnitsAbortedRunOnly) {
   struct Other {
     const char* name;
     RunStart start;
-    Database::Resume resume;
+    Resume resume;
   };
   RunStart plan = startOf("A1");
   plan.planHash = "other";
   RunStart software = startOf("A1");
   software.software = "1.1";
   for (const auto& [name, start, resume] : std::vector<Other>{
-           {"its run", startOf("A1"), Database::Resume::Yes},
-           {"another unit's", startOf("A2"), Database::Resume::Yes},
-           {"no unit's", startOf(""), Database::Resume::Yes},
-           {"not wanted", startOf("A1"), Database::Resume::No},
+           {"its run", startOf("A1"), Resume::Yes},
+           {"another unit's", startOf("A2"), Resume::Yes},
+           {"no unit's", startOf(""), Resume::Yes},
+           {"not wanted", startOf("A1"), Resume::No},
        }) {
     const auto book = ResultBook::open({.database = file, .resume = resume}, start, error);
     ASSERT_TRUE(book) << error;
@@ -368,6 +369,9 @@ TEST_F(Records, SayWhatASilentLineDoesNotTake) {
         std::pair<std::string, const char*>("postgresql://127.0.0.1:1/line", "refused")}) {
     auto book = ResultBook::open({.database = file, .line = url}, startOf("A2"), error);
     ASSERT_TRUE(book && book->record(kKeys, error)) << error;
+    if (url != server.url()) {
+      EXPECT_TRUE(brimol::test::eventually([&] { return !book->lineStatus()->error.empty(); }));
+    }
     EXPECT_TRUE(book->close(error)) << error;
     EXPECT_EQ(book->lineStatus()->waiting, ++waiting);
     EXPECT_THAT(book->lineStatus()->error, testing::HasSubstr(why));

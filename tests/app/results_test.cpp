@@ -85,7 +85,8 @@ TEST_F(Results, KeepWhatWasMeasuredOnOneUnit) {
     ASSERT_TRUE(book->record(result, error)) << error;
   }
   EXPECT_FALSE(ResultBook::open({.json = file}, {.unit = "B2"}, error));
-  EXPECT_EQ(error, file.native() + ": holds the results of unit A1, not of B2");
+  EXPECT_EQ(error,
+            file.native() + ": holds the results of unit A1, not of B2; --new-run begins anew");
   const auto book = ResultBook::open(file, error);
   ASSERT_TRUE(book) << error;
   EXPECT_EQ(book->run().unit, "A1");
@@ -93,6 +94,48 @@ TEST_F(Results, KeepWhatWasMeasuredOnOneUnit) {
   result.attempt = 2;
   result.operatorName = "Bob";
   EXPECT_EQ(book->results(), std::vector{result});
+}
+
+const RunStart kStart = {.unit = "A1", .planName = "P", .planHash = "f00d", .tests = {"a", "b"}};
+
+TEST_F(Results, AreGoneOnWithOnlyForTheirUnitAndPlan) {
+  const RunStart nobody = {.planName = "P", .planHash = "f00d", .tests = {"a", "b"}};
+  const RunStart other = {.unit = "A1", .planName = "P", .planHash = "cafe", .tests = {"a", "b"}};
+  struct Case {
+    RunStart held, wanted;
+    std::string stranger;
+  };
+  for (const auto& [held, wanted, stranger] : std::to_array<Case>({
+           {kStart, kStart, ""},
+           {kStart, nobody, ""},
+           {nobody, kStart, "an unknown unit, not of A1"},
+           {other, kStart, "plan 'P' (cafe), not of plan 'P' (f00d)"},
+           {{.unit = "A1"}, kStart, "an unknown plan, not of plan 'P' (f00d)"},
+       })) {
+    const Keeping anew = {.json = file, .resume = Resume::No};
+    {
+      auto first = ResultBook::open(anew, held, error);
+      ASSERT_TRUE(first && first->results().empty() && first->record(kColours, error)) << error;
+    }
+    error.clear();
+    EXPECT_EQ(ResultBook::open({.json = file}, wanted, error).has_value(), stranger.empty());
+    EXPECT_NE(error.find(stranger), std::string::npos) << error;
+  }
+}
+
+TEST_F(Results, OfAPlanThatIsThroughAreShownButNotGoneOnWith) {
+  const auto opened = [this](Resume resume) {
+    return ResultBook::open({.json = file, .resume = resume}, kStart, error);
+  };
+  for (const bool isStopped : {false, true}) {
+    ASSERT_TRUE(opened(Resume::No)->record({"a", Verdict::Pass}, error)) << error;
+    auto book = opened(Resume::Unfinished);
+    ASSERT_EQ(book->results().size(), 1);
+    ASSERT_TRUE(isStopped ? book->finish(error) : book->record({"b", Verdict::Fail}, error));
+    book.reset();
+    EXPECT_EQ(opened(Resume::Yes)->results().size(), isStopped ? 1 : 2);
+    EXPECT_EQ(opened(Resume::Unfinished)->results().size(), 0);
+  }
 }
 
 TEST_F(Results, BelongToOneProgramAtATime) {

@@ -50,7 +50,7 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
            {{"--results=a", "--database", "a"}, "same file"},
            {{"--results", "a-wal", "--database", "a"}, "--results names the database"},
            {{"--junit=a.lock", "--database", "./a"}, "--junit names the database"},
-           {{"--monkey", "1", "--database", "a"}, "--monkey judges nothing"},
+           {{"--monkey", "1", "--results", "a"}, "--monkey judges nothing"},
            {{"--shot", "a.png", "--database", "b"}, "--shot keeps nothing"},
            {{"--new-run"}, "--new-run needs --database"},
            {{"--line", "postgresql://a/b"}, "--line needs --database"},

@@ -1,6 +1,7 @@
 // The layout lint: a faulty and a good frame for each check, scrolling, keys, accepted findings.
 #include <brimol3_widget_test/lint.h>
 #include <gtest/gtest.h>
+#include <unistd.h>
 
 #include <filesystem>
 #include <fstream>
@@ -85,7 +86,7 @@ TEST(Lint, KnowsWhatKeysReach) {
 
 TEST(Lint, AcceptsWhatIsListed) {
   const std::filesystem::path file =
-      std::filesystem::path(testing::TempDir()) / "findings.accepted";
+      testing::TempDir() + "findings." + std::to_string(::getpid()) + ".accepted";
   const auto judged = [&](const std::string& lines) {
     std::ofstream(file) << lines << std::flush;
     const Frame small = {textbox("Small", {100, 100, 200, 100, kBlack}, 14)};

@@ -69,13 +69,14 @@ class Visit {
     press(kKeyBack);  // the question before the end
     press(kKeyBack);
     program->askForUnits();
-    press(MW::kKeyUp);
+    press(MW::kKeySelect);  // the question for one without a number
     return seen;
   }
 
  private:
   void look() { seen.push_back({screen.frame()}); }
   void press(unsigned int code) {
+    screen.advance(PressGuard::kDeafMs);
     screen.key(code);
     screen.settle();
     look();
@@ -107,7 +108,9 @@ class Visit {
 
   std::vector<Moment> seen;
   std::string error;
-  std::optional<ResultBook> book = ResultBook::open(std::filesystem::path(), error);
+  std::optional<ResultBook> book = ResultBook::open(
+      {}, {.unit = "SN0123456789", .operatorName = "Operator", .planName = "Line (rehearsal)"},
+      error);
   SessionLog log{SessionLog::Echo::None};
   Task task = *chooseTask({}, error);
   Context context = {*book, log, {}, "true", task.plan};

@@ -3,14 +3,13 @@
 #include <gtest/gtest.h>
 #include <unistd.h>
 
-#include <chrono>
 #include <cstdlib>
 #include <fstream>
 #include <nlohmann/json.hpp>
 #include <optional>
-#include <thread>
 
 #include "program.h"
+#include "support/eventually.h"
 
 namespace brimol::test {
 namespace {
@@ -106,13 +105,31 @@ void act(const std::string& actions) {
   EXPECT_EQ(std::system(("xdotool " + actions).c_str()), 0) << actions;
 }
 
-/// What a user does with the mouse and the keys in a window of 720 x 1280 at the middle of the
-/// desktop.
+bool comesToHold(const fs::path& file, const std::string& text) {
+  return eventually([&] { return readAll(file).find(text) != std::string::npos; });
+}
+
+/// Where a point of a window of 720 x 1280 is that stands at the middle of the desktop.
+std::string at(int x, int y) {
+  return "mousemove " + std::to_string(40 + x) + ' ' + std::to_string(60 + y) + ' ';
+}
+
+/// Fails the test of touches by mouse, and looks at the screen before each act.
+void failTheTouchTest(const fs::path& trace, const fs::path& results) {
+  act(at(360, 840) + "click 1");
+  EXPECT_TRUE(comesToHold(trace, "\"Touch and drag"));
+  act(at(160, 600) + "mousedown 1");
+  EXPECT_TRUE(comesToHold(trace, " long 0 "));
+  act("mouseup 1");
+  EXPECT_TRUE(comesToHold(trace, "\"FAIL\""));
+  EXPECT_TRUE(eventually([&] {  // it takes no press at first
+    act(at(600, 1156) + "click 1 sleep 0.3");
+    return readAll(results).find("\"verdict\"") != std::string::npos;
+  }));
+}
+
+/// What a user does who looks at nothing.
 void useTheMenu() {
-  const auto at = [](int x, int y) {
-    return "mousemove " + std::to_string(40 + x) + ' ' + std::to_string(60 + y) + ' ';
-  };
-  act(at(360, 659) + "click 1 sleep 0.3 " + at(160, 400) + "mousedown 1 sleep 0.7 mouseup 1");
   act(at(500, 400) + "click 1 click 1 sleep 1 " + at(124, 1156) + "click 1 sleep 0.3");
   std::string drag = at(300, 900) + "mousedown 1 ";
   for (int y = 890; y > 600; y -= 20) drag += at(300, y);
@@ -128,10 +145,9 @@ TEST_F(SessionReplay, PlaysWhatAUserDidInAWindow) {
         folder,
         {{"BRIMOL_RECORD", trace}, {"BRIMOL_DISPLAY", "window"}, {"BRIMOL_DEVICE", "hd-4.7"}},
         {"--results", results});
-    while (readAll(trace).find(" frame ") == std::string::npos) {
-      std::this_thread::sleep_for(std::chrono::milliseconds(50));
-    }
+    ASSERT_TRUE(comesToHold(trace, " frame "));
     act("search --sync --onlyvisible --name brimol");
+    failTheTouchTest(trace, results);
     useTheMenu();
     // A question may have been shown later than its answer came. Three steps back lead from a page
     // to the question whether to leave, and from any other screen to a page or out.
@@ -156,9 +172,7 @@ TEST_F(SessionReplay, ARecordingOfAKilledSessionIsPlayedUpToThere) {
   const std::string trace = folder / "killed.trace";
   {
     Program program(folder, {{"BRIMOL_RECORD", trace}, {"BRIMOL_DISPLAY", "headless"}}, {});
-    while (readAll(trace).find(" frame ") == std::string::npos) {
-      std::this_thread::sleep_for(std::chrono::milliseconds(50));
-    }
+    ASSERT_TRUE(comesToHold(trace, " frame "));
     program.kill();
   }
   EXPECT_EQ(play(trace), kNotAllPassed) << readAll(folder / "stderr");

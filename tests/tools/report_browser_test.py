@@ -76,7 +76,7 @@ class ReportTest(unittest.TestCase):
         focused = self.browser.run("""return new Promise((told) => {
             const look = () => document.activeElement.ariaLabel === 'Enlarge Frame 3' ? told(true)
                 : requestAnimationFrame(look);
-            setTimeout(() => told(false), 5000);
+            setTimeout(() => told(false), 60000);
             look();
         })""")
         self.assertTrue(focused, "the viewer gives the focus to the picture that it showed last")

@@ -18,7 +18,7 @@ namespace {
 constexpr int kFull = 100;  // per cent
 constexpr auto kSteps = std::to_array<int>({kFull, 75, 50, 25, 10});
 
-/// The screen is bright again behind the page.
+/// The screen is bright again where the steps were judged, and behind the page.
 class BacklightPage : public StepPage {
  public:
   explicit BacklightPage(const Context& program)
@@ -32,6 +32,11 @@ class BacklightPage : public StepPage {
   ~BacklightPage() override { brimol_host_set_brightness(kFull); }
 
  protected:
+  void endLook() override {
+    StepPage::endLook();
+    brimol_host_set_brightness(kFull);
+  }
+
   void beginStep(int picture) override {
     brimol_host_set_brightness(picture < 0 ? kFull : kSteps.at(static_cast<std::size_t>(picture)));
   }

@@ -25,13 +25,15 @@ namespace factory_test {
 namespace {
 
 constexpr int kColours = MW::FullScreen::kGrey + 1;
+constexpr uint32_t kSeenMs = 500;
 
-/// What to do stands on the first colour for a while. A tap, or the right key, shows the next
-/// colour. A long press, or the select key, ends the look, and the verdict is asked for.
+/// What to do stands on the first colour for a while. A tap, or the right key, confirms a colour
+/// and shows the next one, but not before it was there for half a second. A long press, or the
+/// select key, ends the look, and the verdict is asked for.
 class ColourTest : public LookTest {
  public:
   ColourTest()
-      : LookTest(tr("Colours"),
+      : LookTest(tr("Display colours"),
                  tr("Say what you saw: pixels and places\nthat differ are a fault.")) {}
 
   void drawOver() override {
@@ -47,15 +49,16 @@ class ColourTest : public LookTest {
               textSize(screen));
   }
 
-  bool isComplete() const override { return shown >= kColours - 1; }
+  bool isComplete() const override { return confirmed() == kColours; }
 
   std::vector<Measure> values() const override {
-    return {measured("colours", "colours confirmed", std::min(shown + 1, kColours))};
+    return {measured("colours", "colours confirmed", confirmed())};
   }
 
  protected:
   void beginLook() override {
     began = GetTicks();
+    shownSince = began;
     colour.emplace(MW::FullScreen::kWhite).setActive(1);
     touch.emplace();
     touch->clickCallback = [](MW::mouse_event*) { Current<ColourTest>::get().next(); };
@@ -78,13 +81,23 @@ class ColourTest : public LookTest {
   std::string question() const override { return tr("Was every colour even?"); }
 
   void endLook() override {
+    if (colour && isSeen()) seenLast = 1;
     key.reset();
     touch.reset();
     colour.reset();
   }
 
  private:
-  void next() { colour->setRect(++shown % kColours); }
+  bool isSeen() const { return GetTicks() - shownSince >= kSeenMs; }
+
+  // Those that were left, and the one at which the look ended.
+  int confirmed() const { return std::min(shown + seenLast, kColours); }
+
+  void next() {
+    if (!isSeen()) return;
+    shownSince = GetTicks();
+    colour->setRect(++shown % kColours);
+  }
 
   void followKey(unsigned int code) {
     if (code == MW::kKeyRight) next();
@@ -95,7 +108,9 @@ class ColourTest : public LookTest {
   Current<ColourTest> current{this};
   uint32_t began = 0;  // GetTicks() milliseconds
   bool hasWords = true;
-  std::atomic<int> shown = 0;  // how often it moved on
+  std::atomic<int> shown = 0;            // how often it moved on
+  std::atomic<uint32_t> shownSince = 0;  // GetTicks() milliseconds
+  int seenLast = 0;                      // whether the last one was seen, too
   std::optional<MW::FullScreen> colour;
   std::optional<OnTop<MW::Screen>> touch;
   std::optional<OnTop<MW::Key>> key;

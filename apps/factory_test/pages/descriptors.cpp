@@ -1,4 +1,4 @@
-// A page that is nothing but data: every item and widget on it is built from a descriptor.
+// What is nothing but data: every item and widget of the page is built from a descriptor.
 #include <MW/dialog.h>
 #include <MW/widget_list.h>
 #include <MW/widget_rcui.h>
@@ -15,10 +15,8 @@
 #include "current.h"
 #include "language/language.h"
 #include "layout.h"
+#include "page_test.h"
 #include "pages/table.h"
-#include "plan/plan.h"
-#include "test.h"
-#include "verdict_bar.h"
 
 namespace factory_test {
 
@@ -33,12 +31,16 @@ constexpr uint32_t kBarColor = 0xFFC8D2E0;
 constexpr std::size_t kTexts = 5;
 constexpr SKIA_Rect kNoPlace = {0, 0, 0, 0, kBarColor};  // of what places itself
 
-/// PASS, RETRY and FAIL are squares of the page itself; the select key passes, the back key leaves.
-class DescriptorTest : public Test {
+/// Complete once each button was used. A slide passes or leaves, as a verdict does.
+class DescriptorTest : public PageTest {
  public:
-  void prepare(const PlanStep& step) override { plans = step.text; }
+  DescriptorTest()
+      : PageTest(tr("Descriptors"), tr("Try every button and slide.\nKey up shows the toast.")) {}
 
   void enter() override {
+    page.ask().otherKey = [](unsigned int code) {
+      if (code == MW::kKeyUp) showTimed(0);
+    };
     MW::WidgetList::init();
     for (const Entry& entry : kEntries) build(entry);
   }
@@ -46,17 +48,26 @@ class DescriptorTest : public Test {
   void leave() override {
     built.clear();
     MW::WidgetList::destroy();
+    page.endAsking();
   }
 
-  Outcome verdict() const override { return chosen; }
+  Outcome verdict() const override {
+    const Outcome slid = chosen;
+    return slid == Outcome::Running ? PageTest::verdict() : slid;
+  }
+
+  void takeBack() override {
+    chosen = Outcome::Running;
+    PageTest::takeBack();
+  }
+
+  bool isComplete() const override {
+    return std::ranges::all_of(used, [](const auto& each) { return each.load(); });
+  }
 
   void draw() override {
+    PageTest::draw();
     MW::WidgetList::show();
-    if (plans.empty()) return;
-    const SKIA_Rect area = pixelsOf({1, 11, 8, 13, kBarColor});
-    skia_add_box_c(area);
-    drawWords(within(area, gapOf(screenSize()) / 2), plans, MW::kColorBlack, SKIA_ALIGN_CENTRE,
-              textSize(screenSize()));
   }
 
   void update(uint32_t now) override {
@@ -69,7 +80,7 @@ class DescriptorTest : public Test {
   struct Entry {
     MW::RcuiKind kind;
     bool isShown;
-    SKIA_Rect place;  // x and w in columns of ten, y and h in per cent of the screen's height
+    SKIA_Rect place;  // x and w in columns of ten, y and h in per cent of the content's height
     const char* words;
     MW::ref_cb_t callbacks = {};
     std::array<const char*, kTexts> texts = {};
@@ -89,17 +100,25 @@ class DescriptorTest : public Test {
     Self::get().chosen = outcome;
   }
 
+  // What the buttons do.
+  enum Use { kTimed, kWhite, kDialog, kWords, kUses };
+
+  static void note(Use use) { Self::get().used.at(use) = true; }
+
+  template <Use use>
   static void open(MW::RcuiKind kind) {
+    note(use);
     find(kind).setActive(1);
     MW::isDisplayUpdate(1);
   }
 
   static void whiten(int) {
     Self::get().whiteSince = GetTicks();
-    open(kRcuiFullScreen);
+    open<kWhite>(kRcuiFullScreen);
   }
 
   static void showTimed(int) {
+    note(kTimed);
     find(kRcuiToastbox).onHideTimer(kShowMs);
     find(kRcuiProgressbar).onProgressbar(kShowMs);
   }
@@ -111,19 +130,15 @@ class DescriptorTest : public Test {
     MW::isDisplayUpdate(1);
   }
 
-  static void followKey(MW::kbd_event* event) {
-    if (event->code == MW::kKeyUp) showTimed(0);
-    if (event->code == MW::kKeySelect) Self::get().chosen = Outcome::Pass;
-    if (event->code == kKeyBack) Self::get().chosen = Outcome::Left;
-  }
-
-  // Of a place in an entry's units.
-  static SKIA_Rect pixelsOf(const SKIA_Rect& place) {
+  // Of a place in an entry's units; a line has its second end where others have their size.
+  static SKIA_Rect pixelsOf(MW::RcuiKind kind, const SKIA_Rect& place) {
     constexpr int kColumnPercent = 10;
-    const ScreenSize screen = screenSize();
-    return {percentOf(screen.width, place.x * kColumnPercent), percentOf(screen.height, place.y),
-            percentOf(screen.width, place.w * kColumnPercent), percentOf(screen.height, place.h),
-            place.color};
+    const SKIA_Rect area = contentArea();
+    const bool isLine = kind == kRcuiLine;
+    return {area.x + percentOf(area.w, place.x * kColumnPercent),
+            area.y + percentOf(area.h, place.y),
+            percentOf(area.w, place.w * kColumnPercent) + (isLine ? area.x : 0),
+            percentOf(area.h, place.h) + (isLine ? area.y : 0), place.color};
   }
 
   void build(const Entry& entry) {
@@ -134,14 +149,9 @@ class DescriptorTest : public Test {
     MW::ref_t ref;
     ref.kind = entry.kind;
     ref.dialogKind = MW::Dialog::kRetryTest;
-    // These squares share the screen's width, which on a wide screen makes them too high.
-    const bool isSquare = entry.kind == kRcuiButton3Left || entry.kind == kRcuiButton3Centre ||
-                          entry.kind == kRcuiButton3Right;
-    const bool isHint = entry.kind == kRcuiFirstInColumn || entry.kind == kRcuiNextInColumn;
-    const bool isLeftOut = isSquare ? isLandscape(screenSize()) : isHint && !plans.empty();
-    ref.visible = entry.isShown && !isLeftOut ? 1 : 0;
+    ref.visible = entry.isShown ? 1 : 0;
     ref.cbIndex = 1;
-    ref.rect = pixelsOf(entry.place);
+    ref.rect = pixelsOf(entry.kind, entry.place);
     ref.lineWidth = kLineWidth;
     ref.text = captionOf(tr(entry.words),
                          entry.place.color == kBarColor ? MW::kColorBlack : MW::kColorWhite);
@@ -151,54 +161,49 @@ class DescriptorTest : public Test {
   }
 
   Current<DescriptorTest> current{this};
-  std::string plans;  // what the plan tells the operator
   std::atomic<Outcome> chosen = Outcome::Running;
+  std::array<std::atomic<bool>, kUses> used = {};
   std::atomic<uint32_t> whiteSince = 0;  // GetTicks() milliseconds
   std::vector<std::unique_ptr<MW::WidgetRcui>> built;
 };
 
 // Widgets come after the pictures, dialogs last.
 const std::vector<DescriptorTest::Entry> DescriptorTest::kEntries = {
-    {kRcuiTextbox, true, {0, 0, 10, 100, kPageInk.ground}, ""},
-    {kRcuiBox, true, {0, 2, 10, 7, kHeadInk.ground}, ""},
-    {kRcuiLabel, true, {0, 2, 10, 7, 0}, msg("Built from descriptors")},
-    {kRcuiLine, true, {1, 10, 9, 10, kBarColor}, ""},
-    {kRcuiFirstInColumn, true, {1, 11, 8, 4, kBarColor}, msg("Try every button and slide:")},
-    {kRcuiNextInColumn, true, kNoPlace, msg("each of them does something.")},
+    {kRcuiTextbox, true, {0, 0, 10, 100, kPanelInk.ground}, ""},
+    {kRcuiBox, true, {0, 0, 10, 7, kHeadInk.ground}, ""},
+    {kRcuiLabel, true, {0, 0, 10, 7, 0}, msg("Built from descriptors")},
+    {kRcuiLine, true, {1, 8, 9, 8, kBarColor}, ""},
+    {kRcuiFirstInColumn, true, {1, 9, 8, 6, kBarColor}, msg("Each of them does something.")},
     {kRcuiNextInColumn, true, kNoPlace, msg("Then leave, or give a verdict.")},
-    {kRcuiButton, true, {1, 25, 3, 9, kBarColor}, msg("Toast"), {.cbClick = showTimed}},
-    {kRcuiButton, true, {6, 25, 3, 9, kBarColor}, msg("White"), {.cbClick = whiten}},
+    {kRcuiButton, true, {1, 22, 3, 19, kBarColor}, msg("Toast"), {.cbClick = showTimed}},
+    {kRcuiButton, true, {6, 22, 3, 19, kBarColor}, msg("White"), {.cbClick = whiten}},
     {kRcuiButton,
      true,
-     {1, 35, 3, 9, kBarColor},
+     {1, 42, 3, 19, kBarColor},
      msg("Dialog"),
-     {.cbClick = [](int) { open(kRcuiDialog); }}},
+     {.cbClick = [](int) { open<kDialog>(kRcuiDialog); }}},
     {kRcuiButton,
      true,
-     {6, 35, 3, 9, kBarColor},
+     {6, 42, 3, 19, kBarColor},
      msg("Words"),
-     {.cbClick = [](int) { open(kRcuiDialogNew); }}},
+     {.cbClick = [](int) { open<kWords>(kRcuiDialogNew); }}},
     {kRcuiSlideFromLeft,
      true,
-     {1, 46, 8, 6, kBarColor},
+     {1, 62, 8, 10, kBarColor},
      msg("Slide to pass"),
      {.cbTouchRelease = choose<Outcome::Pass>}},
     {kRcuiSlideFromRight,
      true,
-     {1, 53, 8, 6, kBarColor},
+     {1, 73, 8, 10, kBarColor},
      msg("Slide to leave"),
      {.cbTouchRelease = choose<Outcome::Left>}},
-    {kRcuiButton3Left, true, kNoPlace, msg("PASS"), {.cbClick = choose<Outcome::Pass>}},
-    {kRcuiButton3Centre, true, kNoPlace, msg("RETRY"), {.cbClick = choose<Outcome::Retry>}},
-    {kRcuiButton3Right, true, kNoPlace, msg("FAIL"), {.cbClick = choose<Outcome::Fail>}},
     {kRcuiToastbox,
      false,
-     {1, 60, 8, 8, kHeadInk.ground},
+     {1, 84, 8, 7, kHeadInk.ground},
      msg("A toast"),
      {},
      {msg("with a second line")}},
-    {kRcuiProgressbar, false, {1, 70, 8, 5, kHeadInk.ground}, msg("Two seconds")},
-    {kRcuiKey, true, {}, "", {.cbKeyPress = followKey}},
+    {kRcuiProgressbar, false, {1, 92, 8, 4, kHeadInk.ground}, msg("Two seconds")},
     {kRcuiDialog, false, {}, "", {.cbTouchRelease = closeDialogs}},
     {kRcuiDialogNew,
      false,

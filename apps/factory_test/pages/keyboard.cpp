@@ -45,6 +45,7 @@ class KeyboardTest : public PageTest {
     page.endAsking();
   }
 
+  bool isComplete() const override { return wasEntered; }
   Outcome verdict() const override { return folded ? Outcome::Left : PageTest::verdict(); }
 
  private:
@@ -68,11 +69,13 @@ class KeyboardTest : public PageTest {
     const std::string entered = from.getResultString();
     if (entered.empty()) return;
     from.setResultString("");
+    wasEntered = true;
     page.say((tr("Entered: ") + entered).c_str());
   }
 
   Current<KeyboardTest> current{this};
   std::atomic<bool> folded = false;
+  std::atomic<bool> wasEntered = false;
   std::atomic<std::size_t> layout = MW::Ime::kSmall;
   std::optional<MW::Ime> keyboard;
   std::optional<ButtonRow> layouts;

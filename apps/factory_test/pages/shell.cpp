@@ -21,23 +21,26 @@ namespace {
 constexpr std::size_t kLongestLine = 60;   // bytes: what fits the dialog
 constexpr std::size_t kCharacterRest = 3;  // bytes of a character behind its first
 
-/// Runs the command of --shell. OK and the keys select and back end the look, and the command.
+/// Runs the command of --shell, and is complete once that has ended. OK and the keys select and
+/// back end the look, and the command.
 class ShellTest : public LookTest {
  public:
   explicit ShellTest(const Context& program)
       : LookTest(tr("Shell"), tr("Read what the command writes, then OK.")),
         line(program.shellCommand) {}
 
+  bool isComplete() const override { return hasEnded; }
   void drawOver() override { drawHintOverLook(); }
 
  protected:
   void beginLook() override {
-    shell.emplace(line.c_str());
+    shell.emplace(tr("Shell"));
     shell->button1Callback = [](int) { Current<ShellTest>::get().finishLook(); };
     shell->keyPressCallback = [](MW::kbd_event* event) {
       Current<ShellTest>::get().finishLookOn(event->code);
     };
     shell->setActive(1);
+    std::ranges::for_each("$ " + line + "\n", [this](char byte) { take(byte); });
     command.emplace(line);
   }
 
@@ -54,6 +57,7 @@ class ShellTest : public LookTest {
       endLine();
       pending = "[" + *outcome + "]";
       endLine();
+      hasEnded = true;
       command.reset();
     }
     if (!bytes.empty() || !command) MW::isDisplayUpdate(1);
@@ -85,6 +89,7 @@ class ShellTest : public LookTest {
   std::string pending;  // what the command has written of its last line
   std::optional<MW::DialogShell> shell;
   std::optional<Command> command;
+  bool hasEnded = false;  // by itself
 };
 
 }  // namespace

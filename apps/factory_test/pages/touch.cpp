@@ -2,6 +2,7 @@
 #include <MW/key.h>
 #include <MW/screen.h>
 
+#include <algorithm>
 #include <array>
 #include <atomic>
 #include <cstdio>
@@ -22,19 +23,24 @@ namespace {
 constexpr uint32_t kCross = kMarkInk.ground;
 constexpr int kCrossWidth = 3;  // pixels
 
-/// Shows the coordinates of every touch, with a cross through the last one. A long press, or the
-/// select key, ends the look, and the verdict is asked for.
+/// Shows the coordinates of every touch, with a cross through the last one, and is complete once
+/// each quarter of the screen was touched. A long press, or the select key, ends the look, and the
+/// verdict is asked for.
 class TouchTest : public LookTest {
  public:
   TouchTest()
-      : LookTest(tr("Touch"), tr("Touch and drag everywhere.\nHold a finger still to end.")) {}
+      : LookTest(tr("Touch panel"), tr("Touch and drag everywhere.\nHold a finger still to end.")) {
+  }
 
-  bool isComplete() const override { return x >= 0; }
+  bool isComplete() const override {
+    return std::ranges::all_of(touched, [](const auto& each) { return each.load(); });
+  }
 
   void draw() override {
     page.drawGround();
     if (x >= 0) drawCross();
     page.drawFront();
+    if (page.isAsking()) drawQuestion();
   }
 
  protected:
@@ -48,7 +54,7 @@ class TouchTest : public LookTest {
     key.emplace().keyPressCallback = [](MW::kbd_event* event) { self().finishLookOn(event->code); };
   }
 
-  std::string question() const override { return tr("Long press. Was every touch met?"); }
+  std::string question() const override { return tr("Was every touch met?"); }
 
   void endLook() override {
     key.reset();
@@ -69,6 +75,10 @@ class TouchTest : public LookTest {
   void tell(const char* what, const MW::mouse_event& mouse) {
     x = mouse.x;
     y = mouse.y;
+    const ScreenSize screen = screenSize();
+    const std::size_t below = 2 * mouse.y >= screen.height ? 2U : 0U;
+    const std::size_t beside = 2 * mouse.x >= screen.width ? 1U : 0U;
+    touched.at(below + beside) = true;
     std::array<char, SKIA_TEXT_BYTES> words{};
     std::snprintf(words.data(), words.size(), tr("%s: finger %u at %d, %d"), what, mouse.finger,
                   mouse.x, mouse.y);
@@ -78,6 +88,7 @@ class TouchTest : public LookTest {
   Current<TouchTest> current{this};
   std::atomic<int> x = -1;  // pixels; -1: not touched yet
   std::atomic<int> y = -1;
+  std::array<std::atomic<bool>, 4> touched = {};  // the screen's quarters, row by row
   std::optional<MW::Screen> touch;
   std::optional<MW::Key> key;
 };

@@ -1,8 +1,29 @@
 #include "plan/plan_run.h"
 
+#include <algorithm>
 #include <cassert>
 
 namespace factory_test {
+
+PlanRun::PlanRun(const Plan& performed, std::span<const TestResult> earlier) : plan(performed) {
+  const TestResult* last = nullptr;  // of the steps from the first one on that were performed
+  bool isUnbroken = true;
+  for (std::size_t number = 0; number < plan.steps.size(); ++number) {
+    const auto found = std::ranges::find(earlier, plan.steps[number].test, &TestResult::test);
+    const bool isThere = found != earlier.end();
+    if (!isThere || found->verdict == Verdict::None) open.insert(number);
+    isUnbroken = isUnbroken && isThere;
+    if (!isUnbroken) continue;
+    last = &*found;
+    index = number;
+  }
+  if (last != nullptr && last->verdict == Verdict::Fail) {
+    tries = last->attempt;
+    finish(Verdict::Fail);
+  } else {
+    goOn();
+  }
+}
 
 void PlanRun::finish(Verdict verdict) {
   assert(now == State::Performing);
@@ -31,13 +52,11 @@ void PlanRun::answer(Answer said) {
 }
 
 void PlanRun::goOn() {
-  if (index + 1 == plan.steps.size()) {
-    now = State::Done;
-    return;
-  }
-  ++index;
+  now = open.empty() ? State::Done : State::Performing;
+  if (open.empty()) return;
+  index = *open.begin();
+  open.erase(open.begin());
   tries = 1;
-  now = State::Performing;
 }
 
 bool isOverdue(const PlanStep& step, uint32_t milliseconds) {

@@ -3,6 +3,8 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <set>
+#include <span>
 
 #include "plan/plan.h"
 #include "results/test_result.h"
@@ -16,19 +18,16 @@ class PlanRun {
   /// What the operator answers while it is Asking.
   enum class Answer { GoOn, Again, Stop };
 
-  /// `performed` has a step and outlives the run, which begins at step `first`, from 0; behind the
-  /// last one it is Done.
-  explicit PlanRun(const Plan& performed, std::size_t first = 0)
-      : plan(performed),
-        now(first < performed.steps.size() ? State::Performing : State::Done),
-        index(first < performed.steps.size() ? first : performed.steps.size() - 1) {}
+  /// `performed` has a step and outlives the run. `earlier` is what a run left that was aborted: it
+  /// goes on where that one was, also with a retry or the end that its last failure leads to, and
+  /// performs no step that has a verdict.
+  explicit PlanRun(const Plan& performed, std::span<const TestResult> earlier = {});
 
   State state() const { return now; }
   /// The step to perform, or the one that was performed last.
   const PlanStep& step() const { return plan.steps[index]; }
   std::size_t stepNumber() const { return index; }  // from 0
-  std::size_t stepCount() const { return plan.steps.size(); }
-  int attempt() const { return tries; }  // from 1
+  int attempt() const { return tries; }             // from 1
 
   /// An attempt at the step has ended. A FAIL with retries left begins it anew; None (it was left
   /// without a verdict) always asks.
@@ -39,8 +38,9 @@ class PlanRun {
   void goOn();
 
   const Plan& plan;
-  State now;
-  std::size_t index;
+  std::set<std::size_t> open = {};  // steps to perform, by their numbers
+  State now = State::Performing;
+  std::size_t index = 0;
   int tries = 1;
 };
 

@@ -19,16 +19,14 @@ namespace factory_test {
 /// why in one line that begins with the file's name. Nothing here throws.
 class Database {
  public:
-  enum class Resume { Yes, No };
-
   /// Opens or makes it, as prepareDatabase() does.
   static std::unique_ptr<Database> open(const std::filesystem::path& path, std::string& error);
   /// Ends the run as endRun() does, as far as that can be written.
   ~Database();
 
-  /// Ends this program's run, marks those aborted whose programs have died, and begins a run. With
-  /// Resume::Yes it goes on with the unit's newest run instead if that was aborted, under the same
-  /// plan and software; `resumed` gets its verdicts, oldest first. `start` is storable().
+  /// Ends this program's run, marks those aborted whose programs have died, and begins a run.
+  /// Unless `resume` is No it goes on with the unit's newest run instead if that was aborted, under
+  /// the same plan and software; `resumed` gets its verdicts, oldest first. `start` is storable().
   bool startRun(const RunStart& start, Resume resume, std::vector<TestResult>& resumed,
                 std::string& error);
   /// Adds verdicts to the run. It is finished once all tests of its plan have one.

@@ -186,8 +186,8 @@ void bringUpToDate(Sqlite& store) {
   transaction.commit();
 }
 
-// SQLite itself waits for nobody here: of programs that begin one new database at once it refuses all
-// but the first.
+// SQLite itself waits for nobody here: of programs that begin one new database at once it refuses
+// all but the first.
 void keepLogOf(Sqlite& store) {
   constexpr std::chrono::milliseconds kPause{5};
   const auto end = std::chrono::steady_clock::now() + Sqlite::kPatience;

@@ -15,6 +15,10 @@ namespace factory_test {
 /// the plan ended it, Aborted when the program ended before that.
 enum class RunState { Running, Finished, Aborted };
 
+/// Whether a start goes on with what is kept of a unit: also where a plan is through, only where it
+/// is not, or never. A database keeps one run after the other, and goes on with aborted ones alone.
+enum class Resume { Yes, Unfinished, No };
+
 /// "running", "finished", "aborted".
 const char* stateName(RunState state);
 

@@ -17,6 +17,24 @@ bool isBlank(const std::string& text) {
   return text.find_first_not_of(" \t\r\n") == std::string::npos;
 }
 
+std::string unitWords(const std::string& unit) {
+  return unit.empty() ? "an unknown unit" : "unit " + unit;
+}
+
+std::string planWords(const RunStart& run) {
+  constexpr std::size_t kShortHash = 8;
+  if (run.planHash.empty()) return "an unknown plan";
+  return "plan '" + run.planName + "' (" + run.planHash.substr(0, kShortHash) + ")";
+}
+
+// Whose results, held by a file, a run must not take for its own; empty: it may.
+std::string strangerIn(const RunStart& held, const RunStart& wanted) {
+  if (!wanted.unit.empty() && held.unit != wanted.unit)
+    return unitWords(held.unit) + ", not of " + wanted.unit;
+  if (held.planHash != wanted.planHash) return planWords(held) + ", not of " + planWords(wanted);
+  return "";
+}
+
 }  // namespace
 
 std::optional<ResultBook> ResultBook::open(const Keeping& places, const RunStart& start,
@@ -60,7 +78,8 @@ bool ResultBook::resumeFile(std::string& error) {
     return false;
   }
   if (!files.database.empty()) return true;
-  begun.unit = std::move(file->unit);
+  begun = std::move(file->run);
+  state = file->state;
   for (TestResult& result : file->results) put(std::move(result));
   return true;
 }
@@ -70,19 +89,44 @@ bool ResultBook::begin(const RunStart& start, std::string& error) {
   if (database) {
     std::vector<TestResult> resumed;
     if (!database->startRun(wanted, files.resume, resumed, error)) return false;
-    kept.clear();
+    beginAnew();
     for (TestResult& result : resumed) put(std::move(result));
-  } else if (!kept.empty() && !begun.unit.empty() && begun.unit != wanted.unit) {
-    if (!wanted.unit.empty()) {
-      error = (files.json.empty() ? "the program" : files.json.native()) +
-              ": holds the results of unit " + begun.unit + ", not of " + wanted.unit;
-      return false;
-    }
-    wanted.unit = begun.unit;
+  } else if (!goOn(wanted, error)) {
+    return false;
   }
   begun = std::move(wanted);
   isBegun = true;
   return saveFiles(error);
+}
+
+// With the results that are there, or without them.
+bool ResultBook::goOn(RunStart& wanted, std::string& error) {
+  const bool isStale = files.resume == Resume::No;
+  const std::string stranger = kept.empty() || isStale ? "" : strangerIn(begun, wanted);
+  if (!stranger.empty()) {
+    error = (files.json.empty() ? "the program" : files.json.native()) + ": holds the results of " +
+            stranger + "; --new-run begins anew";
+    return false;
+  }
+  const bool isThrough = state == RunState::Finished || isComplete(wanted.tests);
+  if (isStale || (isThrough && files.resume == Resume::Unfinished)) {
+    beginAnew();
+  } else if (!kept.empty() && wanted.unit.empty()) {
+    wanted.unit = begun.unit;
+  }
+  return true;
+}
+
+void ResultBook::beginAnew() {
+  kept.clear();
+  state = RunState::Running;
+}
+
+bool ResultBook::isComplete(const std::vector<std::string>& tests) const {
+  return !tests.empty() && std::ranges::all_of(tests, [this](const std::string& test) {
+    const TestResult* const result = find(test);
+    return result != nullptr && result->verdict != Verdict::None;
+  });
 }
 
 bool ResultBook::startUnit(const RunStart& start, std::string& error) {
@@ -92,12 +136,14 @@ bool ResultBook::startUnit(const RunStart& start, std::string& error) {
 bool ResultBook::saveFiles(std::string& error) {
   if (files.isOnlyShown) return true;
   const bool isKept =
-      files.json.empty() || replaceFile(files.json, resultsJson(begun, kept), error);
+      files.json.empty() || replaceFile(files.json, resultsJson(begun, state, kept), error);
   const JunitSuite suite = {.run = begun, .results = kept};
   const bool isReported =
       files.junit.empty() || replaceFile(files.junit, junitXml({&suite, 1}), error);
-  if (isKept && isReported) unsavedTests.clear();
-  return isKept && isReported;
+  if (!isKept || !isReported) return false;
+  unsavedTests.clear();
+  isEndUnsaved = false;
+  return true;
 }
 
 bool ResultBook::saveDatabase(std::string& error) {
@@ -123,6 +169,7 @@ bool ResultBook::record(TestResult result, std::string& error) {
   if (database) unsavedVerdicts.push_back(result);
   unsavedTests.push_back(result.test);
   put(std::move(result));
+  if (isComplete(begun.tests)) state = RunState::Finished;
   return saveAgain(error);
 }
 
@@ -133,11 +180,13 @@ bool ResultBook::isSaved(std::string_view test) const {
 
 bool ResultBook::saveAgain(std::string& error) {
   const bool isStored = saveDatabase(error);
-  return (unsavedTests.empty() || saveFiles(error)) && isStored;
+  return (areFilesSaved() || saveFiles(error)) && isStored;
 }
 
 bool ResultBook::finish(std::string& error) {
   isFinishing = database != nullptr;
+  isEndUnsaved = state != RunState::Finished;
+  state = RunState::Finished;
   return saveAgain(error);
 }
 

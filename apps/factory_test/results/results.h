@@ -26,7 +26,7 @@ struct Keeping {
   std::filesystem::path json = {};      // the newest results, see results_json.h
   std::filesystem::path junit = {};     // a report for a CI system, see junit.h
   std::filesystem::path database = {};  // all verdicts of all units, see records/database.h
-  Database::Resume resume = Database::Resume::Yes;
+  Resume resume = Resume::Yes;
   FirstRun first = FirstRun::AtOnce;
   std::string line = {};     // the address of the line's database, see records/line.h; empty: none
   bool isOnlyShown = false;  // the JSON file is read, and nothing is written
@@ -39,10 +39,12 @@ struct Keeping {
 class ResultBook {
  public:
   /// Begins a run, unless the unit is to be told first: with a database as Database::startRun()
-  /// does, else with what the file at `places.json` holds, which must be of the same unit or of
-  /// none. All files are written at once, so that one that cannot be is found before the first
-  /// test. Nothing is returned for that, for a file that another program keeps its results in, and
-  /// for one that cannot be read; `error` then says why, and what is there stays as it is.
+  /// does, else with what the file at `places.json` holds, as `places.resume` says. Results of
+  /// another unit, unless `start` names none, or of another plan are not gone on with. All files
+  /// are written at once, so that one that cannot be is found before the first test. Nothing is
+  /// returned for that, for a file that holds such results or that another program keeps its
+  /// results in, and for one that cannot be read; `error` then says why, and what is there stays as
+  /// it is.
   static std::optional<ResultBook> open(const Keeping& places, const RunStart& start,
                                         std::string& error);
   /// A file alone, or none: the results stay in memory.
@@ -64,9 +66,7 @@ class ResultBook {
 
   /// Whether the test has a result, and all that it is kept in holds it.
   bool isSaved(std::string_view test) const;
-  bool isAllSaved() const {
-    return unsavedTests.empty() && unsavedVerdicts.empty() && !isFinishing;
-  }
+  bool isAllSaved() const { return areFilesSaved() && unsavedVerdicts.empty() && !isFinishing; }
   /// Tries again to write what could not be written. True: nothing is left unsaved, or was.
   bool saveAgain(std::string& error);
 
@@ -99,6 +99,10 @@ class ResultBook {
   bool lockFiles(std::string& error);
   bool resumeFile(std::string& error);
   bool begin(const RunStart& start, std::string& error);
+  bool goOn(RunStart& wanted, std::string& error);
+  void beginAnew();
+  bool isComplete(const std::vector<std::string>& tests) const;
+  bool areFilesSaved() const { return unsavedTests.empty() && !isEndUnsaved; }
   bool saveDatabase(std::string& error);
   bool saveFiles(std::string& error);
   void put(TestResult result);
@@ -109,7 +113,9 @@ class ResultBook {
   std::unique_ptr<Database> database = {};  // ends its run before the line does
   RunStart begun = {};
   bool isBegun = false;
-  bool isFinishing = false;  // the database has yet to take that the plan is through
+  RunState state = RunState::Running;  // as the files say
+  bool isFinishing = false;            // the database has yet to take that the plan is through
+  bool isEndUnsaved = false;           // the files have
   std::vector<TestResult> kept = {};
   std::vector<TestResult> unsavedVerdicts = {};  // the database has yet to take them, oldest first
   std::vector<std::string> unsavedTests = {};    // the files do not hold their newest result

@@ -113,11 +113,12 @@ bool readValues(const json& value, TestResult& result) {
   return std::ranges::equal(value, result.values, readMeasure);
 }
 
+template <typename Owner>
 struct Member {
   const char* name;
-  bool (*read)(const json& value, TestResult& result);
+  bool (*read)(const json& value, Owner& owner);
 };
-constexpr auto kMembers = std::to_array<Member>({
+constexpr auto kMembers = std::to_array<Member<TestResult>>({
     {"test", readTest},
     {"verdict", readVerdict},
     {"reason", readReason},
@@ -130,9 +131,10 @@ constexpr auto kMembers = std::to_array<Member>({
 });
 
 // The name of the first member that is missing or wrong. Null: none is.
-const char* readResult(const json& entry, TestResult& result) {
-  for (const auto& [name, read] : kMembers) {
-    if (!read(memberOf(entry, name), result)) return name;
+template <typename Owner>
+const char* readMembers(const json& entry, std::span<const Member<Owner>> members, Owner& owner) {
+  for (const auto& [name, read] : members) {
+    if (!read(memberOf(entry, name), owner)) return name;
   }
   return nullptr;
 }
@@ -143,6 +145,26 @@ ordered_json measureEntry(const Measure& measure) {
   if (measure.most) entry["most"] = *measure.most;
   return entry;
 }
+
+bool readUnit(const json& value, ResultFile& file) {
+  return value.is_null() || readText(value, file.run.unit);
+}
+
+bool readPlan(const json& value, ResultFile& file) {
+  return value.is_null() || (readText(memberOf(value, "name"), file.run.planName) &&
+                             readText(memberOf(value, "hash"), file.run.planHash));
+}
+
+bool readState(const json& value, ResultFile& file) {
+  if (value == stateName(RunState::Finished)) file.state = RunState::Finished;
+  return value.is_null() || file.state == RunState::Finished;
+}
+
+constexpr auto kFileMembers = std::to_array<Member<ResultFile>>({
+    {"unit", readUnit},
+    {"plan", readPlan},
+    {"state", readState},
+});
 
 // Nothing but a version that is known may be read; a newer program's file would lose by it.
 bool checkVersion(const json& root, std::string& reason) {
@@ -162,7 +184,7 @@ bool checkVersion(const json& root, std::string& reason) {
 bool readResults(const json& list, std::vector<TestResult>& results, std::string& reason) {
   results.resize(list.size());
   for (std::size_t i = 0; i < results.size(); ++i) {
-    if (const char* const wrong = readResult(list[i], results[i])) {
+    if (const char* const wrong = readMembers<TestResult>(list[i], kMembers, results[i])) {
       reason = "result " + std::to_string(i + 1) + " has no valid \"" + wrong + "\"";
       return false;
     }
@@ -190,10 +212,11 @@ std::string jsonText(const ordered_json& root) {
   return root.dump(kIndent, ' ', false, json::error_handler_t::replace) + "\n";
 }
 
-std::string resultsJson(const RunStart& run, std::span<const TestResult> results) {
+std::string resultsJson(const RunStart& run, RunState state, std::span<const TestResult> results) {
   ordered_json root = {{"version", kVersion}};
   if (!run.unit.empty()) root["unit"] = run.unit;
   if (!run.planHash.empty()) root["plan"] = {{"name", run.planName}, {"hash", run.planHash}};
+  if (state == RunState::Finished) root["state"] = stateName(state);
   ordered_json& list = root["results"] = ordered_json::array();
   for (const TestResult& result : results) list.push_back(resultEntry(result));
   return jsonText(root);
@@ -212,10 +235,11 @@ std::optional<ResultFile> parseResults(std::string_view text, std::string& reaso
   }
   ResultFile file;
   if (!checkVersion(root, reason) || !readResults(list, file.results, reason)) return {};
-  const json& unit = memberOf(root, "unit");
-  if (unit.is_null() || readText(unit, file.unit)) return file;
-  reason = "has no valid \"unit\"";
-  return {};
+  if (const char* const wrong = readMembers<ResultFile>(root, kFileMembers, file)) {
+    reason = std::string("has no valid \"") + wrong + "\"";
+    return {};
+  }
+  return file;
 }
 
 }  // namespace factory_test

@@ -44,6 +44,13 @@ TurnClock::TurnClock(uint32_t firstTicks, Speed wantedSpeed)
   keeper = std::thread([this] { keep(); });
 }
 
+// The lock orders this behind a look at the agent that the keeper has begun and does not sleep
+// after yet.
+void TurnClock::lookAtAgent() {
+  const std::lock_guard lock(mutex);
+  keeperWakes.notify_one();
+}
+
 TurnClock::~TurnClock() {
   {
     const std::lock_guard lock(mutex);

@@ -82,7 +82,7 @@ class TurnClock {
   /// Ends the pause of the polling thread now. By the agent.
   void wakePoller();
   /// The agent may be due earlier than it said.
-  void lookAtAgent() { keeperWakes.notify_one(); }
+  void lookAtAgent();
   /// The calling thread does not take part and may run on any processor.
   void stayOutside() const { cpus.leave(); }
 

@@ -74,16 +74,20 @@ void InputService::delay(uint32_t ms) {
   if (clock.isByHand()) {
     pauseByHand(lock, ms);
   } else if (poller == std::this_thread::get_id()) {
-    pausePoller(lock, endOf(ms));
+    pausePoller(lock, endOf(steady_clock::now(), ms));
   } else {
-    pauseOther(lock, ms, endOf(ms));
+    pauseOther(lock, ms, endOf(steady_clock::now(), ms));
   }
 }
 
-InputService::Time InputService::endOf(uint32_t ms) const {
-  const Time now = steady_clock::now();
-  const bool isIdle = now - lastActivity >= kIdleAfter;
-  return now + milliseconds(isIdle && ms == 1 ? kIdlePauseMs : ms);
+InputService::Time InputService::endOf(Time start, uint32_t ms) const {
+  const bool isIdle = start - lastActivity >= kIdleAfter;
+  return start + milliseconds(isIdle && ms == 1 ? kIdlePauseMs : ms);
+}
+
+steady_clock::time_point InputService::endOfPause(Time start, uint32_t ms) const {
+  const std::lock_guard lock(mutex);
+  return endOf(start, ms);
 }
 
 void InputService::pauseByHand(Lock& lock, uint32_t ms) {

@@ -53,6 +53,9 @@ class InputService {
   /// time is real, input ends pauses of other threads, too (see EarlyEnds), and those of a
   /// millisecond last kIdlePauseMs when nothing has come in or was drawn for kIdleAfter.
   void delay(uint32_t ms);
+  /// When a pause of `ms` milliseconds ends that begins at `start`, if nothing ends it early.
+  std::chrono::steady_clock::time_point endOfPause(std::chrono::steady_clock::time_point start,
+                                                   uint32_t ms) const;
   /// Something was drawn.
   void hearOfFrame();
 
@@ -76,7 +79,7 @@ class InputService {
   void pauseByHand(Lock& lock, uint32_t ms);
   void pausePoller(Lock& lock, Time end);
   void pauseOther(Lock& lock, uint32_t ms, Time end);
-  Time endOf(uint32_t ms) const;
+  Time endOf(Time start, uint32_t ms) const;
 
   mutable std::mutex mutex;      // guards all up to watcherMutex
   std::condition_variable wake;  // a record arrived for the polling thread, or the hand moved

@@ -41,6 +41,24 @@ void takeOne(InputService& service) {
   for (Event record = {}; !service.poll(record);) service.delay(kForeverMs);
 }
 
+TEST(InputService, PausesLongerWhereNothingHappensForASecond) {
+  InputService service;
+  const auto lasts = [&service](steady_clock::time_point start, uint32_t ms) {
+    return service.endOfPause(start, ms) - start;
+  };
+  const auto before = steady_clock::now();
+  service.open();
+  for (const bool draws : {true, false}) {
+    EXPECT_EQ(lasts(before + milliseconds(999), 1), milliseconds(1));
+    const auto idle = steady_clock::now() + InputService::kIdleAfter;
+    EXPECT_EQ(lasts(idle, 1), milliseconds(4));
+    EXPECT_EQ(lasts(idle, 2), milliseconds(2))
+        << "only who looks for work without end waits longer";
+    draws ? service.hearOfFrame() : service.post(kKeyDown);
+    EXPECT_EQ(lasts(idle, 1), milliseconds(1)) << draws;
+  }
+}
+
 TEST(InputService, LosesNoWakeUp) {
   InputService service;
   service.open();

@@ -6,10 +6,10 @@
 
 namespace brimol::test {
 
-/// True as soon as `holds` is; false when it is not within half a minute.
+/// True as soon as `holds` is; false when it is not within a minute.
 template <typename Condition>
 bool eventually(Condition holds) {
-  constexpr std::chrono::seconds kBound{30};
+  constexpr std::chrono::seconds kBound{60};
   constexpr std::chrono::milliseconds kPause{5};
   const auto end = std::chrono::steady_clock::now() + kBound;
   while (!holds()) {
