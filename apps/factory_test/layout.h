@@ -153,7 +153,7 @@ constexpr PageLayout layOutPage(ScreenSize screen) {
                      .verdicts = {}};
   if (isWide) {
     const auto [left, right] = columnsOf<2>(body, 2 * gap, {4, 1});
-    const auto [hint, line, content] = rowsOf<3>(left, gap, {12, 8, 80});
+    const auto [hint, line, content] = rowsOf<3>(left, gap, {20, 7, 73});
     page.hint = hint;
     page.line = inColor(line, kPanelInk.ground);
     page.content = content;

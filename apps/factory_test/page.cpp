@@ -2,6 +2,8 @@
 
 #include <MW/window.h>
 
+#include <algorithm>
+
 #include "layout.h"
 
 namespace factory_test {
@@ -55,7 +57,7 @@ void Page::drawFront() {
   titleText.show();
   drawWhose();
   drawHint(layOutPage(screenSize()).hint);
-  line.show();
+  if (hasLine) line.show();
   if (bar) bar->draw();
 }
 
@@ -68,14 +70,19 @@ void Page::drawWhose() const {
 }
 
 void Page::drawHint(const SKIA_Rect& area) const {
-  drawWords(area, standing.empty() ? hint : hint + "\n" + standing, kPageInk.text, leadingAlign(),
-            textSize(screenSize()));
+  const ScreenSize screen = screenSize();
+  std::string words = hint;
+  // Its lines are as long as a tall screen is wide.
+  if (isLandscape(screen)) std::ranges::replace(words, '\n', ' ');
+  if (!standing.empty()) words.append("\n").append(standing);
+  drawWords(area, words, kPageInk.text, leadingAlign(), textSize(screen));
 }
 
 void Page::say(const char* words) {
   const SKIA_Text text = captionIn(layOutPage(screenSize()).line, words, kPanelInk.text);
   line.setFontSize(text.size);
   line.setText(text.text);
+  hasLine = *words != '\0';
   MW::isDisplayUpdate(1);
 }
 

@@ -3,6 +3,7 @@
 
 #include <MW/primitives.h>
 
+#include <atomic>
 #include <optional>
 #include <string>
 
@@ -30,7 +31,7 @@ class Page {
   /// Changes the instructions.
   void instruct(const std::string& words) { hint = words; }
   void drawHint(const SKIA_Rect& area) const;
-  /// Changes the line; the next frame shows it. Any thread.
+  /// Changes the line, which is not there while it is empty; the next frame shows it. Any thread.
   void say(const char* words);
 
   /// Puts the verdicts on the screen, on the main thread.
@@ -55,6 +56,7 @@ class Page {
   std::string hint;
   std::string standing;
   MW::Textbox line;
+  std::atomic<bool> hasLine = false;
   std::optional<VerdictBar> bar;
 };
 

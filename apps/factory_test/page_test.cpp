@@ -12,6 +12,26 @@
 
 namespace factory_test {
 
+namespace {
+
+Ink inkOf(const ValueLine& value) {
+  if (!value.isWithin) return kRowInk;
+  return *value.isWithin ? kPassInk : kFailInk;
+}
+
+void drawValueRow(const SKIA_Rect& row, const ValueLine& value) {
+  const ScreenSize screen = screenSize();
+  const Ink ink = inkOf(value);
+  std::string words = value.words;
+  if (value.isWithin) {
+    words.append("\n").append(*value.isWithin ? tr("within its limits") : tr("outside its limits"));
+  }
+  skia_add_box_c(inColor(row, ink.ground));
+  drawWords(within(row, gapOf(screen) / 2), words, ink.text, SKIA_ALIGN_CENTRE, textSize(screen));
+}
+
+}  // namespace
+
 void PageTest::prepare(const PlanStep& planned) {
   planStep = planned;
   if (!planStep.text.empty()) page.instruct(planStep.text);
@@ -28,16 +48,42 @@ void PageTest::drawValues(const SKIA_Rect& area) const {
 
 void LookTest::draw() {
   page.draw();
-  if (page.isAsking()) drawValues(contentArea());
+  if (page.isAsking()) drawQuestion();
+}
+
+// In large letters, below the values, which so stand apart from the verdicts' buttons. In one line
+// if that is not smaller than other texts.
+void LookTest::drawQuestion() const {
+  constexpr int kLargePercent = 150;
+  const ScreenSize screen = screenSize();
+  const PageLayout place = layOutPage(screen);
+  const int gap = gapOf(screen);
+  const int size = textSize(screen);
+  SKIA_Rect row = {place.line.x, place.line.y, place.line.w, 2 * lineHeight(size) + gap, 0};
+  for (const ValueLine& line : valueLines(values(), planStep)) {
+    drawValueRow(row, line);
+    row.y += row.h + gap;
+  }
+  row.h = place.content.y + place.content.h - row.y;
+  const int large = percentOf(size, kLargePercent);
+  const int inOneLine = fitted(asked, large, row.w, lineHeight(large)).size;
+  drawWords(row, asked, kPageInk.text, SKIA_ALIGN_CENTRE, inOneLine >= size ? inOneLine : large);
 }
 
 void LookTest::drawHintOverLook() const {
   if (page.isAsking()) return;
   const ScreenSize screen = screenSize();
   const int margin = 2 * gapOf(screen);
-  const int height = 3 * lineHeight(textSize(screen));
-  page.drawHint(
-      {margin, screen.height - entryHeight(screen) - height, screen.width - 2 * margin, height, 0});
+  const int foot = screen.height - entryHeight(screen);
+  // Beside the dialogs, which take the middle of a wide screen, or below them.
+  if (isLandscape(screen)) {
+    constexpr int kWidth = 24;  // per cent
+    const int height = foot / 2;
+    page.drawHint({margin, foot - height, percentOf(screen.width, kWidth), height, 0});
+  } else {
+    const int height = 3 * lineHeight(textSize(screen));
+    page.drawHint({margin, foot - height, screen.width - 2 * margin, height, 0});
+  }
 }
 
 void LookTest::leave() {
@@ -52,8 +98,9 @@ void LookTest::update(uint32_t) {
     return;
   }
   endLook();
+  asked = question();
+  page.say("");
   page.ask();
-  page.say(question().c_str());
 }
 
 void LookTest::finishLookOn(unsigned int code) {

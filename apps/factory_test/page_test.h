@@ -59,6 +59,8 @@ class LookTest : public PageTest {
   virtual void updateLook() {}
   /// What the verdict is asked with.
   virtual std::string question() const = 0;
+  /// Draws it, with the values, once the verdict is asked for.
+  void drawQuestion() const;
 
   /// Ends the look with the next round. Any thread.
   void finishLook() { looked = true; }
@@ -67,6 +69,7 @@ class LookTest : public PageTest {
 
  private:
   std::atomic<bool> looked = false;
+  std::string asked;
 };
 
 /// A look at one thing after another. The right, down and select keys show the next one, the left

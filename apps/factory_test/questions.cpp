@@ -66,7 +66,7 @@ std::optional<Notice> whyFailed(const PlanStep& step, const std::vector<Measure>
   if (why == nullptr) return {};
   std::string words = why;
   for (const ValueLine& line : valueLines(values, step)) {
-    if (!line.isWithin) words.append("\n").append(line.words);
+    if (line.isWithin == false) words.append("\n").append(line.words);
   }
   return Notice(nameOf(step.test), tr("FAIL"), kFailInk, words, now);
 }

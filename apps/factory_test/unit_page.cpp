@@ -8,10 +8,22 @@
 
 namespace factory_test {
 
+namespace {
+
+// No verdict is asked for.
+SKIA_Rect wholeContent() {
+  const PageLayout page = layOutPage(screenSize());
+  const SKIA_Rect& first = page.content;
+  const SKIA_Rect& last = page.verdicts.back();
+  return {first.x, first.y, last.x + last.w - first.x, last.y + last.h - first.y, 0};
+}
+
+}  // namespace
+
 UnitPage::UnitPage()
     : page(tr("Which unit?"), tr("Type the serial number of the phone,\nthen the enter key.")) {
   using Here = Current<UnitPage>;
-  const auto [upper, lower] = rowsOf<2>(contentArea(), gapOf(screenSize()), {7, 1});
+  const auto [upper, lower] = rowsOf<2>(wholeContent(), gapOf(screenSize()), {7, 1});
   const SKIA_Rect area = inColor(upper, kPanelInk.ground);
   const SKIA_Text looks = captionOf("");
   keyboard.emplace(&area, &looks);

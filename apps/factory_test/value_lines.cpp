@@ -35,7 +35,8 @@ std::vector<ValueLine> valueLines(std::vector<Measure> values, const PlanStep& s
     const auto value = std::ranges::find(values, kind.name, &Measure::name);
     const auto limits = step.limits.find(std::string(kind.name));
     if (value != values.end()) {
-      lines.push_back({lineOf(*value, numberText(value->value)), value->isWithin()});
+      lines.push_back({lineOf(*value, numberText(value->value)), {}});
+      if (value->least || value->most) lines.back().isWithin = value->isWithin();
     } else if (limits != step.limits.end()) {
       Measure missing = measured(step.test, kind.name, 0);
       missing.least = limits->second.least;

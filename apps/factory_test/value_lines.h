@@ -1,6 +1,7 @@
 /// The values of a test as its screens show them, in the chosen language.
 #pragma once
 
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -10,7 +11,7 @@ namespace factory_test {
 
 struct ValueLine {
   std::string words;
-  bool isWithin;  // its limits
+  std::optional<bool> isWithin;  // its limits, where it has any
 };
 
 /// A line for each value, in the catalogue's order, with the step's limits. One that has limits

@@ -3,6 +3,7 @@
 import json
 import os
 import pathlib
+import shutil
 import sqlite3
 import subprocess
 import sys
@@ -29,12 +30,14 @@ class SessionTest(unittest.TestCase):
         self.folder = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
         self.database = self.folder / "station.db"
 
-    def start(self, trace, *options):
+    def start(self, trace, *options, program=FACTORY_TEST):
         file = self.folder / "played.trace"
         file.write_text("brimol-trace 1\n" + trace)
-        return subprocess.Popen([FACTORY_TEST, "--headless", "--database", self.database, *options],
+        return subprocess.Popen([program, "--headless", "--database", self.database, *options],
                                 stderr=subprocess.PIPE, text=True,
-                                env=os.environ | {"BRIMOL_TRACE": str(file), "BRIMOL_SCREEN": "480x800"})
+                                env=os.environ | {"BRIMOL_TRACE": str(file), "BRIMOL_SCREEN": "480x800",
+                                                  "BRIMOL_REPORT_DIR": str(self.folder),
+                                                  "BRIMOL_REPORT_PICTURES": "none"})
 
     def ask(self, sql):
         store = sqlite3.connect(self.database)
@@ -69,6 +72,30 @@ expect text "*1 of 1 done: *" within 6000
 """
         self.assertNotIn("played.trace", self.start(trace, "--plan", plan, "--run").communicate()[1])
         self.assertEqual([("a",)], self.ask("select serial from units"))
+
+    def test_the_menu_has_the_plans_order_and_the_lines_state(self):
+        plan = self.folder / "plan.json"
+        plan.write_text(json.dumps(PLAN | {"steps": [*PLAN["steps"], {"test": "pinch"}, {"test": "colours"}]}))
+        trace = """wait until text "Line out of reach: 0 verdicts wait" within 86400000
+tap "Stuck touch"
+wait until text "Line out of reach: 1 verdict waits" within 86400000
+"""
+        played = self.start(trace, "--plan", plan, "--serial", "a1", "--line", "postgresql://nobody@127.0.0.1:1/none")
+        self.assertNotIn("played.trace", played.communicate()[1])
+        records = map(json.loads, (self.folder / "session.jsonl").read_text().splitlines())
+        *_, last = (record for record in records if record["kind"] == "frame")
+        rows = [each["text"].strip() for each in sorted(last["texts"], key=lambda each: each["y"])]
+        first = rows.index("Plan: Short")
+        self.assertEqual(["Stuck touch: PASS", "Pinch", "Display colours", "Display, not in the plan"],
+                         rows[first + 1:first + 5])
+
+    def test_a_language_without_its_catalogue_is_english(self):
+        """The catalogues are found beside the program."""
+        lonely = shutil.copy(FACTORY_TEST, self.folder / "lonely")
+        played = self.start("expect text \"Which unit?\"\n", "--language", "de", program=lonely)
+        says = played.communicate()[1]
+        self.assertIn("no catalogue of the language 'de': texts are English", says)
+        self.assertNotIn("played.trace", says)
 
     def test_one_unit_after_another(self):
         """The second one fails; the exit code tells of it, though the third one passes."""

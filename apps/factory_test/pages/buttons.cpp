@@ -77,8 +77,8 @@ class ButtonTest : public PageTest {
     const SKIA_Rect box = inColor(plain, kPassInk.ground);
     const SKIA_Point ruler = {under.x, under.y,          under.x + under.w,
                               under.y, kPanelInk.ground, kRulerWidth};
-    const SKIA_Text caption =
-        textOf(tr("Label,\npicture,\nbox, line"), kPageInk.text, SKIA_ALIGN_LEFT, textSize(screen));
+    SKIA_Text caption = captionIn(words, tr("Label,\npicture,\nbox, line"), kPageInk.text);
+    caption.align = SKIA_ALIGN_LEFT;
     const SKIA_Text name =
         textOf(picturePath("test_card.png").c_str(), MW::kUnused, MW::kUnused, MW::kUnused);
     MW::WidgetList::init();

@@ -33,7 +33,7 @@ constexpr uint32_t kSeenMs = 500;
 class ColourTest : public LookTest {
  public:
   ColourTest()
-      : LookTest(tr("Colours"),
+      : LookTest(tr("Display colours"),
                  tr("Say what you saw: pixels and places\nthat differ are a fault.")) {}
 
   void drawOver() override {

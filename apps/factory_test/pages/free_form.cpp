@@ -50,16 +50,16 @@ class FreeFormTest : public StepTest {
     return kept;
   }
 
-  void putWords() { put(tr("Words alone")).setDesc(tr("One line"), nullptr, nullptr); }
+  void putWords() { put(tr("Words")).setDesc(tr("One line"), nullptr, nullptr); }
 
   void putOneButton() {
-    MW::DialogNew& made = put(tr("One button"));
+    MW::DialogNew& made = put(tr("Button"));
     made.setDesc(tr("Two lines,"), tr("one above the other"), nullptr);
     made.setbutton(tr("OK"), nullptr);
   }
 
   void putTwoButtons() {
-    MW::DialogNew& made = put(tr("Two buttons"));
+    MW::DialogNew& made = put(tr("Buttons"));
     made.setDesc(tr("Three lines"), tr("in the middle"), tr("of the dialog"), SKIA_ALIGN_CENTRE);
     made.setbutton(tr("YES"), tr("NO"));
   }

@@ -18,7 +18,7 @@ namespace {
 class PromptTest : public StepTest {
  public:
   PromptTest()
-      : StepTest(tr("Prompts"),
+      : StepTest(tr("Built-in dialogs"),
                  tr("Tap through all dialogs, then say\nwhether each of them looked right.")) {}
 
  protected:

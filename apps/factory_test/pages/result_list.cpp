@@ -94,7 +94,7 @@ class ResultListTest : public LookTest {
     if (list) {
       page.drawGround();
     } else {
-      page.draw();
+      LookTest::draw();
     }
   }
 

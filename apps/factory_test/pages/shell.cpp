@@ -34,12 +34,13 @@ class ShellTest : public LookTest {
 
  protected:
   void beginLook() override {
-    shell.emplace(line.c_str());
+    shell.emplace(tr("Shell"));
     shell->button1Callback = [](int) { Current<ShellTest>::get().finishLook(); };
     shell->keyPressCallback = [](MW::kbd_event* event) {
       Current<ShellTest>::get().finishLookOn(event->code);
     };
     shell->setActive(1);
+    std::ranges::for_each("$ " + line + "\n", [this](char byte) { take(byte); });
     command.emplace(line);
   }
 

@@ -17,7 +17,7 @@ namespace factory_test {
 
 namespace {
 
-constexpr auto kChoices = std::to_array<const char*>({"2G", "3G", "4G", "5G", "BT", "NFC"});
+constexpr auto kChoices = std::to_array<const char*>({"2G", "3G", "4G", "5G", "BT", "FM"});
 
 /// A choice, and the keys select and back, end the look.
 class SixChoiceTest : public LookTest {
@@ -34,7 +34,7 @@ class SixChoiceTest : public LookTest {
 
  protected:
   void beginLook() override {
-    dialog.emplace(MW::kUnused).setTitle(tr("Which radio?"));
+    dialog.emplace(MW::kUnused).setTitle(tr("Radio?"));
     for (std::size_t i = 0; i < kChoices.size(); ++i) {
       dialog->setText_str(static_cast<unsigned int>(i), kChoices.at(i));
     }

@@ -24,7 +24,9 @@ class StuckTouchPage : public MeasurePage {
       : MeasurePage(program, "stuck_touch", tr("Stuck touch"),
                     tr("Put the phone down\nand do not touch it.")) {}
 
-  std::vector<Measure> values() const override { return {measure("touches seen", touches)}; }
+  std::vector<Measure> values() const override {
+    return measure({{"touches seen", touches}, {"time watched", watched}});
+  }
 
  protected:
   void follow(const Input& input) override {
@@ -40,14 +42,13 @@ class StuckTouchPage : public MeasurePage {
   void updateAt(uint32_t now) override {
     constexpr uint32_t kSecond = 1000;
     if (!began) began = now;
-    const int rest =
-        static_cast<int>(parameter("seconds")) - static_cast<int>((now - *began) / kSecond);
-    if (rest == secondsLeft) return;
-    secondsLeft = rest;
+    const uint32_t seconds = (now - *began) / kSecond;
+    if (seconds == watched) return;
+    watched = seconds;
     MW::isDisplayUpdate(1);
   }
 
-  bool isDone() const override { return began && secondsLeft <= 0; }
+  bool isDone() const override { return watched >= parameter("seconds"); }
 
   bool waitsForLift() const override { return false; }
   bool followsOldTouches() const override { return true; }
@@ -55,7 +56,8 @@ class StuckTouchPage : public MeasurePage {
   void drawLook() override {
     const ScreenSize screen = screenSize();
     skia_add_box_c({0, 0, screen.width, screen.height, kPageInk.ground});
-    const std::string words = std::to_string(secondsLeft) + " s";
+    const std::string words =
+        std::to_string(static_cast<int>(parameter("seconds")) - static_cast<int>(watched)) + " s";
     const int size = 4 * textSize(screen);
     skia_add_label_c({0, percentOf(screen.height, 15), screen.width, 2 * size, 0},
                      textOf(words.c_str(), kPageInk.text, SKIA_ALIGN_CENTRE, size));
@@ -65,7 +67,7 @@ class StuckTouchPage : public MeasurePage {
   static constexpr uint32_t kLiftMs = 2000;
 
   std::optional<uint32_t> began;  // GetTicks() milliseconds
-  int secondsLeft = static_cast<int>(parameter("seconds"));
+  uint32_t watched = 0;           // seconds
   double touches = 0;
 };
 

@@ -24,7 +24,7 @@ constexpr int kRightBit = MW::Slide::kFullLeft ^ MW::Slide::kFullRight;
 class SwitchTest : public PageTest {
  public:
   SwitchTest()
-      : PageTest(tr("Switches"),
+      : PageTest(tr("Slide switches"),
                  tr("Drag the switches to and fro.\nTap the locked one twice to unlock it.\n"
                     "Key up moves the first two.")) {}
 

@@ -29,7 +29,8 @@ constexpr int kCrossWidth = 3;  // pixels
 class TouchTest : public LookTest {
  public:
   TouchTest()
-      : LookTest(tr("Touch"), tr("Touch and drag everywhere.\nHold a finger still to end.")) {}
+      : LookTest(tr("Touch panel"), tr("Touch and drag everywhere.\nHold a finger still to end.")) {
+  }
 
   bool isComplete() const override {
     return std::ranges::all_of(touched, [](const auto& each) { return each.load(); });
@@ -39,6 +40,7 @@ class TouchTest : public LookTest {
     page.drawGround();
     if (x >= 0) drawCross();
     page.drawFront();
+    if (page.isAsking()) drawQuestion();
   }
 
  protected:
@@ -52,7 +54,7 @@ class TouchTest : public LookTest {
     key.emplace().keyPressCallback = [](MW::kbd_event* event) { self().finishLookOn(event->code); };
   }
 
-  std::string question() const override { return tr("Long press. Was every touch met?"); }
+  std::string question() const override { return tr("Was every touch met?"); }
 
   void endLook() override {
     key.reset();

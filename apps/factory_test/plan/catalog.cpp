@@ -44,7 +44,10 @@ constexpr auto kPinch = std::to_array<ValueKind>({
     {msg("narrowest"), "mm", none()},
     {msg("widest"), "mm", none()},
 });
-constexpr auto kStuck = std::to_array<ValueKind>({{msg("touches seen"), "", most(0)}});
+constexpr auto kStuck = std::to_array<ValueKind>({
+    {msg("touches seen"), "", most(0)},
+    {msg("time watched"), msg("s"), none()},
+});
 constexpr auto kStuckParameters = std::to_array<ParameterKind>({{"seconds", 1, 600, 60, true}});
 constexpr auto kKeys = std::to_array<ValueKind>({
     {msg("keys seen"), "", none()},
