@@ -373,7 +373,7 @@ void FactoryTest::draw() {
   MW::Window::show();
   if (running && !prompt) running->test->drawOver();
   skia_end_frame_c();
-  if (running) running->test->frameShown();
+  if (running) running->test->endFrame();
 }
 
 }  // namespace factory_test

@@ -15,9 +15,7 @@ namespace MW {
 namespace {
 
 // What threads are told apart by. A std::thread::id is not there before the program runs.
-struct ThreadMark {
-  char place = 0;
-};
+struct ThreadMark {};
 using ThreadId = const ThreadMark*;
 
 thread_local constinit ThreadMark ownMark;

@@ -42,7 +42,6 @@ void MainList::init_MainList(int listMode) {
   setActive(0);
   setType(kBaseLayer);
   initIndex();
-  setSelect(0);
   {
     const std::lock_guard guard(stateLock);
     mode = listMode;
@@ -160,7 +159,6 @@ void MainList::drawStatus() const {
 
 int MainList::hide() {
   setActive(0);
-  setSelect(0);
   const bool wasShown = [this] {
     const std::lock_guard guard(stateLock);
     return std::exchange(shown, 0) == 1;
@@ -262,7 +260,7 @@ void MainList::onRelease(mouse_event mouse) {
 
 bool MainList::isClicked(int item) const {
   const std::lock_guard guard(stateLock);
-  return item >= 0 && item < count && item == click.row() &&
+  return item >= 0 && item == click.row() &&
          items.at(static_cast<std::size_t>(item)).kind == kSelectable;
 }
 

@@ -65,7 +65,9 @@ void Screen::onPress(event_data* event) {
   kLog.print(LogLevel::Debug, "pressed!!");
   rect.color = kColorHighlight;
   hold.press(mouse);
-  const SKIA_Rect center = {mouse.x, mouse.y, 0, 0, 0};
+  SKIA_Rect center = {};
+  center.x = mouse.x;
+  center.y = mouse.y;
   setRect(kSquare, &center);
   const LifeGuard self(this);
   pressCallback(&event->mouse);

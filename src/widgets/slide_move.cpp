@@ -41,7 +41,7 @@ constexpr ValueRange rangeOf(int a, int b) {
 // Goes by the bounds as they were given: with the higher one first, every start is a bound.
 constexpr int startOf(int a, int b, int initial) {
   if (initial >= b) return b;
-  return initial <= a ? a : initial;
+  return std::max(initial, a);
 }
 
 // What is cut off below tells wider numbers from those of the other machines.

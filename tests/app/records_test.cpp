@@ -14,7 +14,6 @@
 
 #include "records/database_schema.h"
 #include "records/history.h"
-#include "records/statistics.h"
 #include "results/results.h"
 #include "support/eventually.h"
 
@@ -391,49 +390,6 @@ TEST_F(Records, SayWhatASilentLineDoesNotTake) {
     EXPECT_THAT(book->lineStatus()->error, testing::HasSubstr(why));
   }
   EXPECT_THAT(states(), ElementsAre("aborted", "aborted"));
-}
-
-RunRecord runOf(const char* unit, RunState state, std::vector<TestResult> results) {
-  RunRecord run = {.id = unit, .start = startOf(unit), .state = state};
-  for (TestResult& each : results) run.verdicts.push_back({"", std::move(each)});
-  return run;
-}
-
-TEST_F(Records, TellYieldFailsAndValues) {
-  const TestResult touched = resultOf("touch", Verdict::Pass);
-  const TestResult anew = {.test = "touch", .reason = Reason::Retry};
-  std::vector<RunRecord> runs = {
-      runOf("at first", RunState::Finished, {kKeys, touched}),
-      runOf("in the end", RunState::Finished, {kKeys, kTouch, touched}),
-      runOf("tried anew", RunState::Finished,
-            {anew, {kKeys.test, Verdict::Pass}, {"touch", Verdict::Pass}}),
-      runOf("later", RunState::Aborted, {kTouch}),
-      runOf("later", RunState::Finished, {kKeys, touched}),
-      runOf("never", RunState::Finished, {kKeys, kTouch}),
-      runOf("stopped", RunState::Finished, {kKeys}),
-      runOf("unjudged", RunState::Aborted, {kKeys, touched}),
-  };
-  runs[0].verdicts[0].result.values[0].value = 9.5;
-  runs[6].start.started += std::chrono::days(1);
-  runs.push_back(runOf("rehearsed", RunState::Finished, {kKeys, kTouch}));
-  runs.back().start.planName += kRehearsal;
-  const Statistics all = statisticsOf(runs);
-  EXPECT_EQ(all.total.units, 6);
-  EXPECT_EQ(all.total.passed, 4);
-  EXPECT_EQ(all.total.passedAtFirst, 1);
-  EXPECT_EQ(all.days.size(), 2U);
-  EXPECT_EQ(all.aborted, 2);
-  EXPECT_EQ(all.rehearsals, 1);
-  ASSERT_EQ(all.tests.size(), 2U);
-  EXPECT_EQ(all.tests[0].test, "touch");
-  EXPECT_EQ(all.tests[0].fails, 3);
-  ASSERT_EQ(all.values.size(), 2U);
-  const Spread spread = spreadOf(all.values[0]);
-  EXPECT_EQ(spread.outside, 1);
-  EXPECT_EQ(spread.most, 9.5);
-  EXPECT_EQ(spread.median, 0.1);
-  EXPECT_NEAR(spread.deviation, 3.837, 0.001);
-  EXPECT_NEAR(*spread.capability, (2.5 - spread.mean) / 3 / spread.deviation, 1e-9);
 }
 
 }  // namespace

@@ -3,6 +3,7 @@
 
 #include <MW/event_service.h>
 
+#include <algorithm>
 #include <array>
 #include <memory_resource>
 #include <random>
@@ -112,20 +113,29 @@ TEST_P(EveryClass, DrawsTheSameWhicheverCallFails) {
 }
 
 // What a menu or a dialog is made of stands in no layer of its own, and answers 0 when it draws.
-TEST_P(EveryClass, StandsInItsLayerAndAnswersThatItDrew) {
+TEST_P(EveryClass, StandsInItsLayerAnswersThatItDrewAndIsCountedAsItGoes) {
   const std::set<std::string> parts = {"Box", "Image", "Label", "Line", "Textbox", "WidgetRcui"};
   const std::set<std::string> covers = {"AutoCapScreen", "FullScreen"};
   const std::string name = GetParam().name;
   Arguments from({});
-  const auto widget = GetParam().make(from);
+  auto widget = GetParam().make(from);
   if (!parts.contains(name)) {
     const bool isOnTop = covers.contains(name) || name.starts_with("Dialog");
     EXPECT_EQ(widget->type(), isOnTop ? MW::kTopLayer : MW::kBaseLayer);
   }
-  for (const unsigned int ticks : {1U, 2U}) {
-    EXPECT_EQ(widget->show(ticks), parts.contains(name) ? 0 : 1);
+  for (const int delayMs : {0, 0, 9}) {
+    if (delayMs != 0) widget->onShowTimer(delayMs);
+    EXPECT_EQ(widget->show(++platform().ticks), parts.contains(name) ? 0 : 1);
   }
   EXPECT_EQ(widget->onRecvEvent(nullptr, 0), name == "StaticText") << "which does not scroll";
+  platform().records = true;
+  widget.reset();
+  const std::set<std::string> counted = {"AutoCapScreen", "Ime",        "MainList", "MpdWid",
+                                         "Progressbar",   "StaticText", "Toastbox"};
+  const bool isCounted = std::ranges::any_of(platform().takeLog(), [](const LogLine& line) {
+    return line.message.starts_with("[WINDOW] unregisterWidget: num_widget=");
+  });
+  EXPECT_EQ(isCounted, counted.contains(name) || name.starts_with("Dialog"));
 }
 
 TEST_P(EveryClass, DrawsTheSameWhateverThePlatformAnswers) {

@@ -2,6 +2,7 @@
 
 #include <climits>
 
+#include "support/allocated_bytes.h"
 #include "support/widget_test.h"
 
 namespace {
@@ -27,7 +28,10 @@ std::vector<Drawing> drawn() {
 
 const Drawing kLineItem = {Call::Item, {}, kLine, {}, SKIA_LINE};
 
+const int numbersAtStart = List::is_init + List::index_num;
+
 TEST_F(WidgetListTest, NeedsToBeOpen) {
+  EXPECT_EQ(numbersAtStart, 0);
   EXPECT_EQ(addText("a"), -1024);
   EXPECT_EQ(List::show() + List::show(1) + List::hide(1) + List::hideShadow() + List::remove(1), 0);
   EXPECT_EQ(List::setText(1, "a", 1) + List::setColor(1, 2, 3, 4) + List::setRect(1, kRect), 0);
@@ -72,6 +76,9 @@ TEST_F(WidgetListTest, AFullTableReplacesSlot100) {
   EXPECT_EQ(items.size(), 128U);
   EXPECT_EQ(items.at(99).text.text, "100");
   EXPECT_EQ(items.at(100), kLineItem);
+  const std::size_t full = allocatedBytes();
+  List::destroy();
+  EXPECT_LT(allocatedBytes(), full - 128 * sizeof(SKIA_Item));
 }
 
 TEST_F(WidgetListTest, ChangesAnItemWithinItsRecord) {

@@ -114,7 +114,10 @@ TEST_F(WindowTest, TheFirstLooksAtTheScreensSizeMayMeet) {
   EXPECT_EQ(std::pair(Window::width, Window::height), std::pair(1440, 2560)) << "there is no side";
 }
 
+const float densitiesAtStart = Window::xdpi + Window::ydpi;
+
 TEST_F(WindowTest, TurnsMillimetresIntoPixels) {
+  EXPECT_EQ(densitiesAtStart, 0) << "nobody has asked";
   using Pixels = std::pair<float, int>;  // the density as it is kept, and the length
   const auto pixels = [](float dpi, float mm) {
     Window::xdpi = 0;

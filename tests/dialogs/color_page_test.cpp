@@ -40,6 +40,7 @@ TEST_F(ColorPageTest, TakesTextsThatFitItsFourBoxes) {
 
 TEST_F(ColorPageTest, AnAutoCapScreenChangesAtOnceAndWithItsLayout) {
   MW::AutoCapScreen page(7);
+  EXPECT_EQ(shown(page).front().rect.color, 0U) << "transparent";
   page.setBgColor(1);
   page.setBg_title(2);
   EXPECT_EQ(shown(page).front().rect.color, 1U);

@@ -38,6 +38,13 @@ const PlayTests kPlays = {
           "press- click+ press r2+ hover-"),
 };
 
+TEST_F(DialogListTest, IsLaidOutAnew) {
+  const auto list = threeRows();
+  setScreen(1920, 1080);
+  static_cast<DialogList&>(*list).setRect_static(3, 1);
+  EXPECT_EQ(shown(*list), shown(*threeRows()));
+}
+
 TEST_F(DialogListTest, TakesTheReleaseThatDeletesIt) {
   EXPECT_EQ(played(threeRows, {release(725, 1514)}, 1), "hidden o1+");
 }

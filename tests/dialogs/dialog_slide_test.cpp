@@ -45,13 +45,21 @@ const PlayTests kPlays = {
             "touch+ hover- lift- touch- touch+"),
 };
 
+struct Open : DialogSlide {
+  using DialogSlide::DialogSlide;
+  using DialogSlide::second;
+};
+
 TEST_F(DialogSlideTest, TakesTextsThatFitAndTheThumbsWidth) {
-  DialogSlide slide(5);
+  Open slide(5);
   slide.setTitle(kTooLong.c_str());
   slide.setDesc(kTooLong.c_str() + 1);
+  slide.setDesc2("two");
+  EXPECT_STREQ(slide.second.text, "two") << "undrawn";
   slide.setLeft(nullptr);
+  slide.setRight("Go");
   slide.setSlide("<>", 100);
-  EXPECT_EQ(words(shown(slide)), '|' + kTooLong.substr(1) + "||OK|<>|");
+  EXPECT_EQ(words(shown(slide)), '|' + kTooLong.substr(1) + "||Go|<>|");
   EXPECT_EQ(shown(slide).back().rect.w, 380);
   slide.setRect(5);
   EXPECT_EQ(shown(slide).back().rect.w, 100) << "once the thumb is at home";

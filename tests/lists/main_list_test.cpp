@@ -158,12 +158,12 @@ TEST_F(MainListTest, TextsAreChangedByNumber) {
     menu.setText(item, "Keys and more", 4);
     menu.setTextOption(item, "8 bit and more", 5);
   }
-  menu.setText(0, "First", 5);
+  menu.setText(0, "F", 1);
   menu.setText(1, "Led", 3);
   for (const unsigned int length : {0U, 127U, UINT_MAX}) menu.setText(1, "never", length);
   menu.setText(1, nullptr, 3);
   menu.setTextBattery("80 %", 4);
-  EXPECT_STREQ(menu.items[0].text.text, "First");
+  EXPECT_STREQ(menu.items[0].text.text, "F");
   EXPECT_STREQ(menu.items[1].text.text, "Leds") << "the old tail";
   EXPECT_EQ(words(shown(menu)).substr(0, 26), "Led|Menu||80 %|8 bit|8 bit");
 }

@@ -38,12 +38,14 @@ Step top() {
   });
 }
 
-// What no event reaches.
-template <int type>
-void byHand(Results& results) {
-  MW::event_data event = pointerEvent(static_cast<MW::EventCode>(type), {30, kTop});
-  type == MW::kEventPress ? results.onMpdPress(&event) : results.onMpdRelease(&event);
+// A part of what an event does, by hand.
+Step byHand(void (*part)(Results& results, MW::event_data* event)) {
+  return call<Results>([part](Results& results) {
+    MW::event_data event = {.type = MW::kEventRelease, .mouse = stage.finger};
+    part(results, &event);
+  });
 }
+const Step kMpdPress = byHand([](Results& results, auto* event) { results.onMpdPress(event); });
 
 Maker resultsOf(const std::string& lines, int listType = MW::MpdWid::kRow) {
   return [=] {
@@ -76,7 +78,7 @@ struct Tap {
 Play tapped(const char* name, std::initializer_list<Tap> taps, const char* journal) {
   Steps steps;
   for (const auto& [ms, y] : taps) {
-    steps.insert(steps.end(), {at(startTicks() + ms), press(30, kTop + y), release()});
+    steps.insert(steps.end(), {at(startTicks() + ms), press(30, kTop + y), release(), draw()});
   }
   steps.push_back(markers());
   return {name, kTree, steps, journal};
@@ -85,6 +87,8 @@ Play tapped(const char* name, std::initializer_list<Tap> taps, const char* journ
 const PlayTests kPlays = {
     tapped("ADoubleTapOpensARow", {{0, 1}, {499, 141}}, "+ + + + <[V][>][*][>][*]>"),
     tapped("TheSecondTapSaysWhichRow", {{0, 1}, {1, 143}}, "+ + + + <[>][V][>][*]>"),
+    tapped("AnOpenRowsChildOpensAlone", {{0, 1}, {1, 1}, {999, 143}, {1000, 143}},
+           "+ + + + + + + + <[V][V][*][*][>][*]>"),
     tapped("AnEdgeIsNoRows", {{0, 142}, {1, 142}}, "+ + + + <[>][>][*]>"),
     tapped("TheLastRowDoesNotChange", {{0, 285}, {1, 285}}, "+ + + + <[>][>][*]>"),
     kTwenty("ScrollsBetweenItsEnds",
@@ -105,11 +109,19 @@ const PlayTests kPlays = {
         {finger(3), press(30, kTop - 1), press(30, kTop), lookAtHold(), finger(1), drag(1, 1),
          longPress(), lookAtLog(), finger(3), longPress(), release(0, 0), lookAtHold()},
         "- press+ <held 4> - - <[MPDWID] onRecvEvent-> T:3, F:1> - click release+ <held 0>"),
-    kClickable("APressByHandHoldsUntilItsRelease",
-               {call<Results>(byHand<MW::kEventPress>), lookAtHold(),
-                call<Results>(byHand<MW::kEventRelease>), lookAtHold()},
-               "<held 1> <held 0>"),
-    kClickable("KeysAreTold", {keyDown(9), keyUp(9), plug(9)}, "down9+ up9+ -"),
+    kClickable(
+        "EachPartOfAReleaseLetsTheFingerGo",
+        {kMpdPress, lookAtHold(),
+         byHand([](Results& results, auto* event) { results.onRelease(event->mouse); }),
+         lookAtHold(), kMpdPress,
+         byHand([](Results& results, auto* event) { results.onMpdRelease(event); }), lookAtHold()},
+        "<held 1> release <held 0> <held 0>"),
+    kClickable("InitStartsOver",
+               {press(30, kTop), lookAtHold(), call<Results>(&Results::init_MpdWid), lookAtHold(),
+                look(&MW::Widget::isActive)},
+               "press+ <held 1> <held 0> <1>"),
+    kClickable("KeysAreTold", {keyDown(9), lookAtLog(), keyUp(9), lookAtLog(), plug(9)},
+               "down9+ <[MPDWID] key pressed sym = 9> up9+ <[MPDWID] key onReleaseKey sym = 9> -"),
 };
 
 const std::string kWide = "\u00e4\u00e4\u00e4\u00e4\u00e4\u00e4\u00e4";
@@ -150,6 +162,8 @@ TEST_F(MpdWidTest, CountsLinesUpToTheNulOrTheLength) {
   results.cal_line(nullptr, 9);
   results.read(std::string(99, '\n'));
   EXPECT_EQ(platform().takeLog().back().message, "[MPDWID] addIndex, index : 63");
+  results.setListType(64, MW::MpdWid::kHitEnd);
+  results.setBGColor(64, 5);
 }
 
 TEST_F(MpdWidTest, RowsAreChangedByNumber) {

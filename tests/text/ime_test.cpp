@@ -105,6 +105,25 @@ TEST_F(ImeTest, DigitsAloneGreyTheRest) {
   EXPECT_EQ(platform().properties["brimol.info_1.ime_flag"], "true");
 }
 
+TEST_F(ImeTest, EachLayoutTypesByHand) {
+  Keyboard keyboard;
+  const SKIA_Rect key = placeOf(shown(keyboard), "q");
+  MW::event_data event = pointerEvent(MW::kEventPress, {key.x + 9, key.y + 9});
+  keyboard.onPressKey_small(&event);
+  keyboard.onPressKey_big(&event);
+  keyboard.onPressKey_special(&event);
+  keyboard.onPressKey_only_num(&event);
+  EXPECT_EQ(keyboard.bar(), "qQ[");
+}
+
+TEST_F(ImeTest, AResultIsKeptUntilTypingStartsOver) {
+  Keyboard keyboard;
+  keyboard.setResultString("abc");
+  EXPECT_STREQ(keyboard.getResultString(), "abc");
+  keyboard.typing_reset();
+  EXPECT_STREQ(keyboard.getResultString(), "");
+}
+
 TEST_F(ImeTest, RowsOfKeysAreStaggered) {
   struct KeyRow {
     int left;

@@ -182,8 +182,9 @@ const PlaysOn kWithoutScroll = {withoutScroll};
 const PlayTests kPlays = {
     kSixRows("EveryFourthMotionScrolls",
              {press(5, 5), drag(0, -9), drag(0, -9), drag(0, -9), top(), drag(0, -9), top(),
-              drag(0, -9), drag(0, -9), drag(0, -9), drag(0, 1), top()},
-             "press+ + + + <0> + <1> + + + + <0>"),
+              drag(0, 9), drag(0, 9), drag(0, 9), drag(1, 0), top(), drag(0, -9), drag(0, -9),
+              drag(0, -9), drag(0, 1), top()},
+             "press+ + + + <0> + <1> + + + + <1> + + + + <0>"),
     kSixRows("TellsTheSecondOfTwoTaps",
              {press(5, 5), release(90, 90), press(5, 5), release(), press(), release(), press(),
               release()},
@@ -193,6 +194,10 @@ const PlayTests kPlays = {
     kSixRows("CountsTapsWhileADoubleTapIsWanted",
              {listen(nullptr), press(5, 5), listen(noteDouble), release(), press(), release()},
              "press+ release+ press+ release+"),
+    kSixRows("AsksForARedrawWhenItsColourComesBack",
+             {call(&MW::Widget::restoreColor), lookAtRedraw(), call(&MW::Widget::setBgColor, 9),
+              call(&MW::Widget::restoreColor), lookAtRedraw(), look(&MW::Widget::getBgColor)},
+             "<still> <redraw> <3>"),
     kSixRows("ALongPressIsTold", {longPress(5, 5), moveTo(6, 6)}, "long+ -"),
     kSixRows("TakesNothingOnceItHasATime",
              {call(&MW::Widget::onShowTimer, 100), lookAtRedraw(), press(5, 5), later(100), timer(),
@@ -211,7 +216,10 @@ TEST_F(StaticTextTest, NoSizeLeadsOutOfBounds) {
       Viewer viewer({INT_MAX, INT_MIN, length, length, 0}, looks);
       viewer.line_search(nullptr);
       viewer.found(std::string(10'000, 'y'), "yyy");
-      for (const int y : {INT_MIN, INT_MAX}) longPress(viewer, {INT_MAX, y});
+      for (const int y : {INT_MIN, INT_MAX}) {
+        MW::event_data event = pointerEvent(MW::kEventLongPress, {INT_MAX, y});
+        viewer.onPressLong(&event);
+      }
       EXPECT_EQ(shown(viewer).front().rect.h, length);
     }
   }

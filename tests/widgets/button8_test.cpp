@@ -40,6 +40,19 @@ const PlayTests kPlays = {
          "held4+ <0> held8+"),
 };
 
+struct Open : Button8 {
+  using Button8::Button8;
+  using Button8::point;
+};
+
+TEST_F(Button8Test, KeepsTheBorderThatItIsGiven) {
+  Open pad(Button8::kOneCell, &kArea, nullptr);
+  EXPECT_EQ(pad.point.width, 1);
+  pad.setBdWidth(7);
+  pad.setBdColor(9);
+  EXPECT_EQ(std::pair(pad.point.width, pad.point.color), std::pair(7, 9U));
+}
+
 TEST_F(Button8Test, AnUnknownLayoutKeepsTheShape) {
   Button8 pad(6, &kArea, nullptr);
   EXPECT_TRUE(shown(pad).empty()) << "no cells at first";

@@ -71,4 +71,12 @@ const PlayTests kPlays = {
             "<0> <0> <1> <1>"),
 };
 
+TEST_F(WidgetTest, AButtonsCaptionChangesItsLooks) {
+  MW::Button button(&kArea, &kCaption);
+  button.setFontSize(33);
+  button.setTextColor(7);
+  EXPECT_EQ(shown(button).at(0).text, (DrawnText{"Start", 7, 5, 33}));
+  EXPECT_EQ(std::pair(button.getFontSize(), button.getTextColor()), std::pair(33, 7U));
+}
+
 }  // namespace

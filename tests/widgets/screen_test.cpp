@@ -21,7 +21,7 @@ const PlayTests kPlays = {
     kScreen("ATapThatReachesItTwiceIsADoubleTap", {passOn(), press(500, 500), release(), release()},
             "press- click- click double-"),
     kScreen("TapsOfADoubleTapMayLieApart",
-            {press(500, 500), release(475, 524), press(60, 2500), release(), press(), release(),
+            {press(50, 50), release(25, 74), press(1390, 2510), release(), press(), release(),
              lookAtLog()},
             "press+ click+ press+ click double+ press+ click+ <[BUTTON] onTouchClickCount!! 3>"),
     kScreen("AReleaseBesideTheSquareEndsTheTap",

@@ -37,6 +37,7 @@ const PlayTests kPlays = {
     slide(50, 100, 0, 50)("TheHigherBoundFirstMakesEveryStartABound",
                           {value(), press(0, 0), drag(-9, 0), drag(150, 0), value()},
                           "<0 at 0> + + + <50 at 150>"),
+    slide(50, 100, 0, 0)("TheHigherBoundFirstMakesTheLowerOneItself", {value()}, "<0 at 0>"),
     slide(50, 150, 250, 0)("StartsAtTheLowerBound", {value()}, "<150 at 0>"),
     slide(20, 0, 100, 100)(
         "StaysWhereTheDragIsCancelled",

@@ -18,8 +18,9 @@ const PlaysOn kNew = {makes<ButtonNew, Told::Zero>(ButtonNew::kTextBox, &kArea, 
 
 const PlayTests kPlays = {
     kTaking("TakesItsEvents",
-            {press(10, 20), look(&MW::Widget::getBgColor), moveTo(112, 20), release(), lookAtLog()},
-            "press+ <5> + + <[BUTTONS] released!!>"),
+            {press(10, 20), look(&MW::Widget::getBgColor), moveTo(112, 20), lookAtHold(), release(),
+             lookAtHold(), lookAtLog()},
+            "press+ <5> + <held 1> + <held 0> <[BUTTONS] released!!>"),
     kPassing("PassesItsEventsOn", {press(50, 40), moveTo(60, 40), longPress(), release()},
              "press- - long- click-"),
     kPassing("IsDoubleClickedByAReleaseThatReachesItTwice",
@@ -40,6 +41,10 @@ const PlayTests kPlays = {
 };
 
 TEST_F(ButtonNewTest, AStyleOfNoNameHasNoFrame) {
+  ButtonNew framed(ButtonNew::kFramed, &kArea, nullptr);
+  EXPECT_EQ(shown(framed).size(), 5U);
+  framed.onShowTimer(100);
+  EXPECT_TRUE(shown(framed).empty()) << "its frame waits with it";
   EXPECT_EQ(shown(*std::make_unique<ButtonNew>(3, &kArea, nullptr)).size(), 1U);
 }
 

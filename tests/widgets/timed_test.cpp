@@ -24,7 +24,8 @@ Step seen() {
     MW::isDisplayUpdate(0);
     widget.updateTimer(platform().ticks);
     const std::string asked = MW::isDisplayUpdate(0) == 1 ? "!" : "";
-    const std::vector<Drawing> drawn = shown(widget);
+    EXPECT_EQ(widget.show(platform().ticks), 1);
+    const std::vector<Drawing> drawn = platform().takeDrawings();
     if (!drawn.empty()) return asked + drawn.back().text.text;
     return asked + (widget.isActive() ? "nothing" : "gone");
   });

@@ -17,9 +17,7 @@ namespace factory_test {
 
 namespace {
 
-constexpr double kSecond = 1000;       // ms
-constexpr double kLongestPause = 200;  // ms; a finger that stands reports nothing
-constexpr double kStandingMm = 2;
+constexpr double kSecond = 1000;  // ms
 constexpr uint32_t kDotColor = 0xFFE8C040;
 
 /// Counts the reports of one finger while it moves, until it has moved for long enough.
@@ -35,11 +33,11 @@ class TouchRatePage : public MeasurePage {
                     {"latency", frames > 0 ? late / frames : kNotMeasured}});
   }
 
-  void frameShown() override {
-    if (!drawn) return;
-    late += GetTicks() - *drawn;
+  void endFrame() override {
+    if (!std::exchange(isDrawn, false)) return;
+    late += GetTicks() - *undrawn;
     frames += 1;
-    drawn.reset();
+    undrawn.reset();
   }
 
  protected:
@@ -60,29 +58,34 @@ class TouchRatePage : public MeasurePage {
       const int side = 2 * textSize(screen);
       skia_add_roundbox_c({last->x - side / 2, last->y - side / 2, side, side, kDotColor});
     }
-    drawn = std::exchange(undrawn, std::nullopt);
+    isDrawn = undrawn.has_value();
   }
 
  private:
-  void count(const Input& input) {
-    const double gap = input.ticks - last->ticks;
-    if (gap <= kLongestPause || hasTravelled(input)) {
-      reports += 1;
-      moved += gap;
-      longestGap = std::max(longestGap, gap);
-    }
-    last = input;
-    if (!undrawn) undrawn = input.ticks;
+  // A finger that stands reports nothing; a panel that stalls while it moves has a jump behind it.
+  static bool isStanding(const Input& from, const Input& to) {
+    constexpr double kStandsMs = 200;
+    constexpr double kStandsMm = 3;
+    return to.ticks - from.ticks > kStandsMs &&
+           isWithinMm(std::hypot(to.x - from.x, to.y - from.y), kStandsMm);
   }
 
-  // Then the panel was silent, not the finger at rest.
-  bool hasTravelled(const Input& to) const {
-    return millimetres(std::hypot(to.x - last->x, to.y - last->y)) > kStandingMm;
+  void count(const Input& input) {
+    if (!undrawn) undrawn = input.ticks;
+    if (isStanding(*last, input)) {
+      last = input;
+      return;
+    }
+    const double gap = input.ticks - last->ticks;
+    reports += 1;
+    moved += gap;
+    longestGap = std::max(longestGap, gap);
+    last = input;
   }
 
   std::optional<Input> last;        // of the finger that is down
-  std::optional<uint32_t> undrawn;  // when the oldest report came that was not drawn yet
-  std::optional<uint32_t> drawn;    // the same of the frame that is on its way
+  std::optional<uint32_t> undrawn;  // when the oldest report came that no frame shows yet
+  bool isDrawn = false;             // in the frame that is not ended yet
   double reports = 0;
   double moved = 0;  // ms
   double longestGap = 0;
