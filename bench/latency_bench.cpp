@@ -155,29 +155,45 @@ void pressBehindTenFingers(benchmark::State& state) {
   report(state, times);
 }
 
-void idle(benchmark::State& state) {
-  const Application application;
-  std::this_thread::sleep_for(std::chrono::seconds(2));
-  const auto usage = [] {
+constexpr std::chrono::seconds kIdleTime{5};
+
+struct Usage {
+  double seconds;  // of a processor
+  double wakeups;
+};
+
+template <typename Work>
+Usage usageOf(const Work& work) {
+  const auto now = [] {
     rusage used = {};
     ::getrusage(RUSAGE_SELF, &used);
-    return used;
+    const auto seconds = [](const timeval& time) {
+      constexpr double kMicro = 1e-6;
+      return static_cast<double>(time.tv_sec) + kMicro * static_cast<double>(time.tv_usec);
+    };
+    return Usage{seconds(used.ru_utime) + seconds(used.ru_stime),
+                 static_cast<double>(used.ru_nvcsw)};
   };
-  const auto seconds = [](const timeval& time) {
-    constexpr double kMicro = 1e-6;
-    return static_cast<double>(time.tv_sec) + kMicro * static_cast<double>(time.tv_usec);
-  };
-  constexpr int kSeconds = 5;
+  const Usage before = now();
+  work();
+  const Usage after = now();
+  return {after.seconds - before.seconds, after.wakeups - before.wakeups};
+}
+
+// Beside it, what as many wakeups cost that do nothing.
+void idle(benchmark::State& state) {
+  const Usage bare = usageOf([] {
+    for (int i = 0; i < 500; ++i) std::this_thread::sleep_for(std::chrono::milliseconds(4));
+  });
+  const Application application;
+  std::this_thread::sleep_for(std::chrono::seconds(2));
   for ([[maybe_unused]] auto round : state) {
-    const rusage before = usage();
-    std::this_thread::sleep_for(std::chrono::seconds(kSeconds));
-    const rusage after = usage();
-    const double used = seconds(after.ru_utime) + seconds(after.ru_stime) -
-                        seconds(before.ru_utime) - seconds(before.ru_stime);
+    const Usage used = usageOf([] { std::this_thread::sleep_for(kIdleTime); });
     constexpr double kPercent = 100;
-    state.counters["core_percent"] = kPercent * used / kSeconds;
-    state.counters["wakeups_per_s"] =
-        static_cast<double>(after.ru_nvcsw - before.ru_nvcsw) / kSeconds;
+    state.counters["core_percent"] = kPercent * used.seconds / kIdleTime.count();
+    state.counters["wakeups_per_s"] = used.wakeups / kIdleTime.count();
+    state.counters["bare_percent"] =
+        kPercent * used.wakeups * bare.seconds / bare.wakeups / kIdleTime.count();
   }
 }
 

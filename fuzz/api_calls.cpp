@@ -13,7 +13,7 @@
 
 namespace {
 
-using brimol::fuzz::Stage;
+using brimol::fuzz::FuzzStage;
 using brimol::test::Arguments;
 using MW::WidgetList;
 using MW::Window;
@@ -43,8 +43,8 @@ void callItems(Arguments& from) {
 }
 
 // One thing that an application does to its widgets, in its loop or in a callback.
-void changeWidgets(Stage& stage, Arguments& from) {
-  const std::size_t place = from.below(Stage::kPlaces);
+void changeWidgets(FuzzStage& stage, Arguments& from) {
+  const std::size_t place = from.below(FuzzStage::kPlaces);
   switch (from.below(6)) {
     case 0: stage.make(place); break;
     case 1: stage.remove(place); break;
@@ -56,11 +56,11 @@ void changeWidgets(Stage& stage, Arguments& from) {
   }
 }
 
-void step(Stage& stage, Arguments& from) {
+void step(FuzzStage& stage, Arguments& from) {
   switch (from.below(8)) {
     case 0: changeWidgets(stage, from); break;
     case 1:
-    case 2: stage.operate(from.below(Stage::kPlaces)); break;
+    case 2: stage.operate(from.below(FuzzStage::kPlaces)); break;
     case 3: stage.dispatchRecord(); break;
     case 4: stage.dispatchTouch(); break;
     case 5: stage.wait(); break;
@@ -73,7 +73,7 @@ void step(Stage& stage, Arguments& from) {
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, std::size_t count) {
   Arguments from({bytes, count});
-  Stage stage(from);
+  FuzzStage stage(from);
   brimol::test::whenTold = [&] {
     if (from.byte() % 2 != 0) changeWidgets(stage, from);
   };

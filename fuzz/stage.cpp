@@ -56,7 +56,7 @@ extern "C" int LLVMFuzzerInitialize(int*, char***) {
   return std::atexit(endToolkit);
 }
 
-Stage::Stage(test::Arguments& given) : from(given) {
+FuzzStage::FuzzStage(test::Arguments& given) : from(given) {
   const ScreenSize& screen = kScreens.at(from.below(kScreens.size()));
   MW::Window::width = screen.width;
   MW::Window::height = screen.height;
@@ -66,7 +66,7 @@ Stage::Stage(test::Arguments& given) : from(given) {
   MW::WidgetList::index_num = 0;
 }
 
-Stage::~Stage() {
+FuzzStage::~FuzzStage() {
   test::whenTold = nullptr;
   for (Occupant& each : occupants) each.reset();
   while (MW::EventService::recvEvent() != nullptr) continue;
@@ -74,7 +74,7 @@ Stage::~Stage() {
   MW::isDisplayUpdate(0);
 }
 
-void Stage::make(std::size_t place) {
+void FuzzStage::make(std::size_t place) {
   const auto& classes = test::widgetClasses();
   const test::WidgetClass& chosen = classes.at(from.below(classes.size()));
   auto made = chosen.make(from);
@@ -83,7 +83,7 @@ void Stage::make(std::size_t place) {
   occupants.at(place) = {std::move(made), &chosen};
 }
 
-void Stage::operate(std::size_t place) {
+void FuzzStage::operate(std::size_t place) {
   const Occupant& occupant = occupants.at(place);
   if (occupant.widget == nullptr) return;
   const auto& own = occupant.itsClass->operations;
@@ -94,12 +94,12 @@ void Stage::operate(std::size_t place) {
   chosen(*occupant.widget, from);
 }
 
-void Stage::dispatch(const Event& event) {
+void FuzzStage::dispatch(const Event& event) {
   MW::EventService::sendEvent(&event);
   dispatcher().threadLoop();
 }
 
-void Stage::dispatchTouch() {
+void FuzzStage::dispatchTouch() {
   constexpr auto kTypes = std::to_array<BrimolEventType>(
       {BRIMOL_POINTER_DOWN, BRIMOL_POINTER_MOTION, BRIMOL_POINTER_UP, BRIMOL_LONG_PRESS});
   constexpr int64_t kSteps = 256;
@@ -117,13 +117,13 @@ void Stage::dispatchTouch() {
   dispatch(event);
 }
 
-void Stage::wait() {
+void FuzzStage::wait() {
   constexpr unsigned int kStepMs = 8;
   const unsigned int steps = from.byte();
   platform().ticks += steps < UINT8_MAX ? steps * kStepMs : from.take<unsigned int>();
 }
 
-void Stage::round() {
+void FuzzStage::round() {
   MW::Window::updateTimer(platform().ticks);
   platform().records = true;
   MW::Window::show(platform().ticks);

@@ -15,14 +15,14 @@ namespace brimol::fuzz {
 
 /// A screen of some size, a clock that begins at some time, and widgets in a few places. One at a
 /// time; it leaves the toolkit as it found it.
-class Stage {
+class FuzzStage {
  public:
   static constexpr std::size_t kPlaces = 6;
 
-  explicit Stage(test::Arguments& given);
-  ~Stage();
-  Stage(const Stage&) = delete;
-  Stage& operator=(const Stage&) = delete;
+  explicit FuzzStage(test::Arguments& given);
+  ~FuzzStage();
+  FuzzStage(const FuzzStage&) = delete;
+  FuzzStage& operator=(const FuzzStage&) = delete;
 
   /// Makes a widget that is active and told of in callbacks, in place of the one that was there.
   void make(std::size_t place);

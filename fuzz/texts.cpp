@@ -10,7 +10,7 @@
 
 namespace {
 
-using brimol::fuzz::Stage;
+using brimol::fuzz::FuzzStage;
 
 // Gives a widget a long text, where its class takes long ones.
 void giveLong(MW::Widget& widget, const std::string& text) {
@@ -33,7 +33,7 @@ void giveLong(MW::Widget& widget, const std::string& text) {
 
 extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, std::size_t count) {
   brimol::test::Arguments from({bytes, count});
-  Stage stage(from);
+  FuzzStage stage(from);
   stage.make(0);
   for (std::size_t left = from.below(16); left > 0; --left) {
     stage.operate(0);

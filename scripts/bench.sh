@@ -116,8 +116,8 @@ write_latency_tables() {
       pressBehindTenFingers: "behind ten fingers that moved 120 times a second for 5 s"}[.] // .),
       .median_ms, .p99_ms] | @tsv' <<<"$found" |
     table latency '| | median, ms | 99 %, ms |' '| %s | %.2f | %.2f |'
-  jq -r '.benchmarks[] | select(.core_percent) | [.core_percent, .wakeups_per_s] | @tsv' <<<"$found" |
-    table idle '| of a core | wakeups a second |' '| %.1f %% | %.0f |'
+  jq -r '.benchmarks[] | select(.core_percent) | [.core_percent, .bare_percent, .wakeups_per_s] | @tsv' <<<"$found" |
+    table idle '| of a core | wakeups alone | wakeups a second |' '| %.1f %% | %.1f %% | %.0f |'
 }
 
 write_tables() {

@@ -23,12 +23,31 @@ ScreenSize screenSize() {
   return screen;
 }
 
-int pixelsOf(double millimetres, int least, int most) {
-  constexpr double kInch = 25.4;  // mm
+namespace {
+
+// Dots per inch; 0: unknown.
+float density() {
   float across = 0;
   float down = 0;
   getDpi(&across, &down);
-  return std::clamp(static_cast<int>(std::ceil(millimetres * across / kInch)), least, most);
+  return across;
+}
+
+}  // namespace
+
+bool isDensityKnown() { return density() > 0; }
+
+double pixelsPerMillimetre() {
+  constexpr double kInch = 25.4;   // mm
+  constexpr double kUsualMm = 65;  // a phone's shorter side
+  const float dpi = density();
+  if (dpi > 0) return dpi / kInch;
+  const ScreenSize screen = screenSize();
+  return std::min(screen.width, screen.height) / kUsualMm;
+}
+
+int pixelsOf(double millimetres, int least, int most) {
+  return std::clamp(static_cast<int>(std::ceil(millimetres * pixelsPerMillimetre())), least, most);
 }
 
 int textSize(ScreenSize screen) {

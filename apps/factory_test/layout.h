@@ -23,6 +23,12 @@ constexpr int percentOf(int length, int percent) {
 /// The screen as the toolkit knows it.
 ScreenSize screenSize();
 
+/// Whether the platform knows the density of its display.
+bool isDensityKnown();
+
+/// Of the display; of a usual phone where the density is unknown.
+double pixelsPerMillimetre();
+
 /// Pixels of so many millimetres, at least `least` and at most `most`.
 int pixelsOf(double millimetres, int least, int most);
 

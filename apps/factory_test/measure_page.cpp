@@ -1,11 +1,12 @@
 #include "measure_page.h"
 
 #include <MW/window.h>
-#include <brimol/display.h>
 #include <brimol/input.h>
 
 #include <algorithm>
+#include <array>
 #include <cmath>
+#include <cstdio>
 #include <utility>
 
 #include "language/language.h"
@@ -21,12 +22,23 @@ constexpr uint32_t kStillMs = 2000;
 constexpr double kStillMm = 2;
 constexpr uint32_t kCardColor = 0xA8000000 | (kPanelInk.ground & 0x00FFFFFF);
 
+bool measuresMm(std::string_view test) {
+  return std::ranges::count(testKind(test).values, "mm", &ValueKind::unit) > 0;
+}
+
 }  // namespace
 
 MeasurePage::MeasurePage(const Context& program, const char* test, const char* title,
-                         const char* usualWords)
-    : LookTest(title, usualWords), instructions(usualWords) {
+                         const std::string& usualWords)
+    : LookTest(title, usualWords.c_str()), instructions(usualWords) {
   planStep = stepOf(program, test);
+}
+
+std::string MeasurePage::counted(const char* words, double count) {
+  constexpr std::size_t kMostBytes = 300;
+  std::array<char, kMostBytes> text = {};
+  std::snprintf(text.data(), text.size(), words, static_cast<int>(count));
+  return text.data();
 }
 
 std::string MeasurePage::question() const {
@@ -47,11 +59,11 @@ std::vector<Measure> MeasurePage::measure(std::initializer_list<Figure> figures)
 }
 
 double MeasurePage::millimetres(double pixels) {
-  constexpr double kInch = 25.4;
-  float across = 0;
-  float down = 0;
-  getDpi(&across, &down);
-  return across > 0 ? pixels * kInch / across : kNotMeasured;
+  return isDensityKnown() ? pixels / pixelsPerMillimetre() : kNotMeasured;
+}
+
+bool MeasurePage::isWithinMm(double pixels, double most) {
+  return pixels <= most * pixelsPerMillimetre();
 }
 
 void MeasurePage::updateLook() {
@@ -91,7 +103,7 @@ void MeasurePage::followStill(const Input& input) {
 }
 
 bool MeasurePage::isWhereItWas(const Input& input) const {
-  return millimetres(std::hypot(input.x - still->x, input.y - still->y)) <= kStillMm;
+  return isWithinMm(std::hypot(input.x - still->x, input.y - still->y), kStillMm);
 }
 
 void MeasurePage::prepare(const PlanStep& planned) {
@@ -120,6 +132,9 @@ std::vector<MeasurePage::CardLine> MeasurePage::linesOfCard(int width) const {
   addLine(tr("Hold a finger still, or Back: end."));
   lines.push_back({"", size / 2});
   for (const ValueLine& value : valueLines(values(), planStep)) addLine(value.words);
+  if (!isDensityKnown() && measuresMm(planStep.test)) {
+    addLine(tr("The screen's density is unknown: no distances in mm."));
+  }
   if (!page.shownStanding().empty()) addLine(page.shownStanding());
   return lines;
 }

@@ -26,7 +26,8 @@ class MeasurePage : public LookTest {
 
  protected:
   /// `usualWords`: what to do, unless the plan says it.
-  MeasurePage(const Context& program, const char* test, const char* title, const char* usualWords);
+  MeasurePage(const Context& program, const char* test, const char* title,
+              const std::string& usualWords);
 
   /// Tells of an input, at the moment that it names.
   virtual void follow(const Input& input) = 0;
@@ -46,14 +47,18 @@ class MeasurePage : public LookTest {
   virtual bool followsOldTouches() const { return false; }
   /// Whether only the operator can say if what was seen is right: he is asked then.
   virtual bool isForEyes() const { return false; }
+  /// Words with a "%d" in them, which becomes the count.
+  static std::string counted(const char* words, double count);
   std::string question() const override;
   void endLook() override { watch.reset(); }
 
   double parameter(std::string_view name) const { return planStep.parameter(name); }
   Measure measure(std::string_view name, double value) const;
   std::vector<Measure> measure(std::initializer_list<Figure> figures) const;
-  /// Not measured where the panel's density is unknown.
+  /// Not measured where the display's density is unknown.
   static double millimetres(double pixels);
+  /// Whether two places lie no farther apart, by the density of a usual phone where it is unknown.
+  static bool isWithinMm(double pixels, double most);
   /// Of a finger that came down before the page.
   bool isOfAnOldTouch(const Input& input) const;
 

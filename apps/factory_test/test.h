@@ -50,6 +50,8 @@ class Test {
   virtual void draw() = 0;
   /// Draws what stands over them.
   virtual void drawOver() {}
+  /// The frame is on its way to the screen.
+  virtual void endFrame() {}
   /// Comes in every round of the main loop, at GetTicks() milliseconds.
   virtual void update(uint32_t now) { static_cast<void>(now); }
 };

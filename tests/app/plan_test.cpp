@@ -14,7 +14,8 @@
 namespace factory_test {
 namespace {
 
-const std::vector<KnownTest> kKnown = {{"touch_grid", true}, {"keys", true}, {"shell", false}};
+const std::vector<KnownTest> kKnown = {
+    {"touch_grid", true}, {"keys", true}, {"shell", false}, {"pinch", false}};
 
 // Goes with it.
 struct PlanFile {
@@ -95,12 +96,16 @@ TEST(Plans, ThatArePrintedAreReadAgain) {
 TEST(Plans, TakeTheUsualLimitsWhereTheySayNone) {
   Complaint complaint;
   const auto plan = parsePlan(
-      R"({"version":1,"name":"x","steps":[{"test":"touch_grid"},{"test":"keys","limits":{}}]})",
+      R"({"version":1,"name":"x","steps":[{"test":"touch_grid"},{"test":"keys","limits":{}},
+          {"test":"pinch","parameters":{"fingers":7}}]})",
       kKnown, complaint);
   ASSERT_TRUE(plan) << complaint.what;
   EXPECT_EQ(plan->steps[0].limits.at("cells missed").most, 0);
   EXPECT_EQ(plan->steps[0].timeout, usualStep("touch_grid").timeout);
   EXPECT_TRUE(plan->steps[1].limits.empty());
+  EXPECT_EQ(plan->steps[0].parameters, usualStep("touch_grid").parameters);
+  EXPECT_EQ(plan->steps[1].keys, usualStep("keys").keys);
+  EXPECT_EQ(plan->steps[2].limits.at("fingers counted").least, 7) << "as many as are asked for";
 }
 
 TEST(Plans, HaveTheHashOfTheirText) {

@@ -41,7 +41,8 @@ void show(const gallery::Example& example) {
 
 Case caseOf(const gallery::Example& example) {
   const auto& [width, height] = example.screen;
-  const View view = {height * example.view.top / kHundred, height * example.view.bottom / kHundred};
+  const ShownRows view = {height * example.view.top / kHundred,
+                          height * example.view.bottom / kHundred};
   return {example.name, {width, height}, [&example] { show(example); }, view};
 }
 

@@ -11,7 +11,7 @@
 namespace brimol::test {
 
 /// A part of a screen: from one row of pixels up to, without it, another one.
-struct View {
+struct ShownRows {
   int top = 0;
   int bottom = INT_MAX;
 };
@@ -20,7 +20,7 @@ struct Case {
   const char* name;            // of its files
   ScreenSize screen;           // pixels
   std::function<void()> draw;  // into the frame that is recorded; GetTicks() is kNow at first
-  View view = {};              // what the picture shows
+  ShownRows view = {};         // what the picture shows
 };
 inline std::ostream& operator<<(std::ostream& out, const Case& drawn) { return out << drawn.name; }
 inline constexpr unsigned int kNow = 1000;  // milliseconds

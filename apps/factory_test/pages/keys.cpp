@@ -10,6 +10,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "current.h"
@@ -28,28 +29,29 @@ namespace {
 struct KeyName {
   unsigned int code;
   const char* name;
+  std::string_view id = {};  // in plans
 };
 
-// What is asked for; the last two are no keys.
+// What can be asked for; the last two are no keys, and always are.
 constexpr unsigned int kTwice = 1;
 constexpr unsigned int kThreeTimes = 2;
 constexpr auto kAsked = std::to_array<KeyName>({
-    {MW::kKeyUp, msg("Up")},
-    {MW::kKeyDown, msg("Down")},
-    {MW::kKeyLeft, msg("Left")},
-    {MW::kKeyRight, msg("Right")},
-    {MW::kKeySelect, msg("Select")},
-    {MW::kKeyHook, msg("Hook")},
-    {BRIMOL_CODE_VOLUME_UP, msg("Volume up")},
-    {BRIMOL_CODE_VOLUME_DOWN, msg("Volume down")},
-    {BRIMOL_CODE_POWER, msg("Power")},
-    {BRIMOL_CODE_HOME, msg("Home")},
+    {MW::kKeyUp, msg("Up"), "up"},
+    {MW::kKeyDown, msg("Down"), "down"},
+    {MW::kKeyLeft, msg("Left"), "left"},
+    {MW::kKeyRight, msg("Right"), "right"},
+    {MW::kKeySelect, msg("Select"), "select"},
+    {MW::kKeyHook, msg("Hook"), "hook"},
+    {BRIMOL_CODE_VOLUME_UP, msg("Volume up"), "volume up"},
+    {BRIMOL_CODE_VOLUME_DOWN, msg("Volume down"), "volume down"},
+    {BRIMOL_CODE_POWER, msg("Power"), "power"},
+    {BRIMOL_CODE_HOME, msg("Home"), "home"},
     {kTwice, msg("Twice")},
     {kThreeTimes, msg("Three times")},
 });
-constexpr auto kKeys = static_cast<std::ptrdiff_t>(kAsked.size()) - 2;
 
-/// All that was asked for passes by itself. The back key three times in a row fails.
+/// The plan says which keys. All that was asked for passes by itself. The back key three times in a
+/// row fails.
 class KeyTest : public PageTest {
  public:
   KeyTest()
@@ -78,8 +80,17 @@ class KeyTest : public PageTest {
     page.endAsking();
   }
 
+  void prepare(const PlanStep& planned) override {
+    PageTest::prepare(planned);
+    for (std::size_t row = 0; row < kAsked.size(); ++row) {
+      if (kAsked.at(row).id.empty() || std::ranges::count(planned.keys, kAsked.at(row).id) > 0) {
+        asked.push_back(row);
+      }
+    }
+  }
+
   bool isComplete() const override {
-    return std::ranges::all_of(pressed, [](const auto& each) { return each.load(); });
+    return std::ranges::all_of(asked, [this](std::size_t row) { return pressed.at(row).load(); });
   }
 
   Outcome verdict() const override {
@@ -89,12 +100,13 @@ class KeyTest : public PageTest {
 
   void draw() override {
     page.draw();
-    for (std::size_t i = 0; i < kAsked.size(); ++i) drawKey(static_cast<int>(i), pressed.at(i));
+    for (std::size_t place = 0; place < asked.size(); ++place) drawKey(place);
     drawValues(areas().back());
   }
 
   std::vector<Measure> values() const override {
-    const auto seen = std::count(pressed.begin(), pressed.begin() + kKeys, true);
+    const auto seen = std::ranges::count_if(
+        asked, [this](std::size_t row) { return !kAsked.at(row).id.empty() && pressed.at(row); });
     return measured("keys",
                     {{"keys seen", static_cast<double>(seen)},
                      {"bounces", bounce.count()},
@@ -120,18 +132,23 @@ class KeyTest : public PageTest {
     return rowsOf<2>(contentArea(), gapOf(screenSize()), {4, 1});
   }
 
-  static void drawKey(int index, bool isPressed) {
+  void drawKey(std::size_t place) const {
     const ScreenSize screen = screenSize();
-    const Grid grid = isLandscape(screen) ? Grid{3, 4} : Grid{4, 3};
-    const std::string words = std::string(tr(kAsked.at(static_cast<std::size_t>(index)).name)) +
-                              (isPressed ? "\nOK" : "");
+    const int columns = isLandscape(screen) ? 4 : 3;
+    const auto count = static_cast<int>(asked.size());
+    const Grid grid = {(count + columns - 1) / columns, columns};
+    const std::size_t row = asked.at(place);
+    const bool isPressed = pressed.at(row);
+    const std::string words = std::string(tr(kAsked.at(row).name)) + (isPressed ? "\nOK" : "");
     const Ink ink = isPressed ? kPassInk : kButtonInk;
-    const SKIA_Rect cell = inColor(cellOf(areas().front(), gapOf(screen), grid, index), ink.ground);
+    const SKIA_Rect cell =
+        inColor(cellOf(areas().front(), gapOf(screen), grid, static_cast<int>(place)), ink.ground);
     skia_add_textbox_c(cell, captionIn(cell, words.c_str(), ink.text));
   }
 
   Current<KeyTest> current{this};
   std::atomic<bool> failed = false;
+  std::vector<std::size_t> asked;  // rows of kAsked
   std::array<std::atomic<bool>, kAsked.size()> pressed = {};
   KeyBounce bounce;  // told on the dispatch thread
   std::optional<MW::Key> key;

@@ -3,6 +3,7 @@
 #include <cmath>
 #include <map>
 #include <memory>
+#include <string>
 #include <vector>
 
 #include "language/language.h"
@@ -23,7 +24,7 @@ class PinchPage : public MeasurePage {
  public:
   explicit PinchPage(const Context& program)
       : MeasurePage(program, "pinch", tr("Pinch"),
-                    tr("Put the fingers down together,\nthen spread them.")) {}
+                    wordsFor(stepOf(program, "pinch").parameter("fingers"))) {}
 
   std::vector<Measure> values() const override {
     const bool isMeasured = most >= wanted();
@@ -66,6 +67,13 @@ class PinchPage : public MeasurePage {
     double x = 0;
     double y = 0;
   };
+
+  static std::string wordsFor(double fingers) {
+    return counted(trn("Put %d finger down,\nthen spread it.",
+                       "Put %d fingers down together,\nthen spread them.",
+                       static_cast<unsigned long>(fingers)),
+                   fingers);
+  }
 
   double wanted() const { return parameter("fingers"); }
 

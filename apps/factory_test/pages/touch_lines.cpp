@@ -44,7 +44,8 @@ double distance(Point point, const Line& line) {
   return std::hypot(point.x - line.from.x - part * across, point.y - line.from.y - part * down);
 }
 
-/// A line counts once a finger has gone from one of its ends to the other without lifting.
+/// A line counts once a finger has gone from one of its ends to the other without lifting. Where
+/// the panel is dead on the way, its reports leave a gap.
 class TouchLinesPage : public MeasurePage {
  public:
   explicit TouchLinesPage(const Context& program)
@@ -59,7 +60,8 @@ class TouchLinesPage : public MeasurePage {
   std::vector<Measure> values() const override {
     const auto count = std::ranges::count(lines, true, &Line::isFollowed);
     return measure({{"lines followed", static_cast<double>(count)},
-                    {"worst distance", count > 0 ? millimetres(worst) : kNotMeasured}});
+                    {"worst distance", count > 0 ? millimetres(worst) : kNotMeasured},
+                    {"longest gap", count > 0 ? millimetres(longest) : kNotMeasured}});
   }
 
  protected:
@@ -91,7 +93,7 @@ class TouchLinesPage : public MeasurePage {
   int wordsAt() const override { return 3; }
 
  private:
-  static bool isNear(Point point, Point end) { return millimetres(distance(point, end)) <= kEndMm; }
+  static bool isNear(Point point, Point end) { return isWithinMm(distance(point, end), kEndMm); }
 
   void begin(Point point, uint32_t byFinger) {
     for (Line& line : lines) {
@@ -102,16 +104,19 @@ class TouchLinesPage : public MeasurePage {
       followed = &line;
       trace = {point};
       farthest = distance(point, line);
+      gap = 0;
       return;
     }
   }
 
   void goOn(Point point) {
+    gap = std::max(gap, distance(trace.back(), point));
     trace.push_back(point);
     farthest = std::max(farthest, distance(point, *followed));
     if (!isNear(point, followed->to)) return;
     followed->isFollowed = true;
     worst = std::max(worst, farthest);
+    longest = std::max(longest, gap);
     finger.reset();
   }
 
@@ -121,6 +126,8 @@ class TouchLinesPage : public MeasurePage {
   Line* followed = nullptr;
   double farthest = 0;  // pixels, from the line that is followed
   double worst = 0;     // from all that were
+  double gap = 0;       // pixels, the longest between two reports on the line that is followed
+  double longest = 0;   // on all that were
 };
 
 }  // namespace

@@ -1,7 +1,9 @@
 // How often the panel reports, and how late its reports reach the screen.
 #include <algorithm>
+#include <cmath>
 #include <memory>
 #include <optional>
+#include <utility>
 #include <vector>
 
 #include <brimol/input.h>
@@ -31,6 +33,13 @@ class TouchRatePage : public MeasurePage {
                     {"latency", frames > 0 ? late / frames : kNotMeasured}});
   }
 
+  void endFrame() override {
+    if (!std::exchange(isDrawn, false)) return;
+    late += GetTicks() - *undrawn;
+    frames += 1;
+    undrawn.reset();
+  }
+
  protected:
   void follow(const Input& input) override {
     using enum Input::Kind;
@@ -49,24 +58,34 @@ class TouchRatePage : public MeasurePage {
       const int side = 2 * textSize(screen);
       skia_add_roundbox_c({last->x - side / 2, last->y - side / 2, side, side, kDotColor});
     }
-    if (!undrawn) return;
-    late += GetTicks() - *undrawn;
-    frames += 1;
-    undrawn.reset();
+    isDrawn = undrawn.has_value();
   }
 
  private:
+  // A finger that stands reports nothing; a panel that stalls while it moves has a jump behind it.
+  static bool isStanding(const Input& from, const Input& to) {
+    constexpr double kStandsMs = 200;
+    constexpr double kStandsMm = 3;
+    return to.ticks - from.ticks > kStandsMs &&
+           isWithinMm(std::hypot(to.x - from.x, to.y - from.y), kStandsMm);
+  }
+
   void count(const Input& input) {
+    if (!undrawn) undrawn = input.ticks;
+    if (isStanding(*last, input)) {
+      last = input;
+      return;
+    }
     const double gap = input.ticks - last->ticks;
     reports += 1;
     moved += gap;
     longestGap = std::max(longestGap, gap);
     last = input;
-    if (!undrawn) undrawn = input.ticks;
   }
 
   std::optional<Input> last;        // of the finger that is down
   std::optional<uint32_t> undrawn;  // when the oldest report came that no frame shows yet
+  bool isDrawn = false;             // in the frame that is not ended yet
   double reports = 0;
   double moved = 0;  // ms
   double longestGap = 0;

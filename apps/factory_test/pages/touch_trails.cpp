@@ -36,7 +36,7 @@ class TouchTrailsPage : public MeasurePage {
  public:
   explicit TouchTrailsPage(const Context& program)
       : MeasurePage(program, "touch_trails", tr("Touch trails"),
-                    tr("Draw with several fingers at once:\nthe numbers stay with the fingers.")) {}
+                    wordsFor(stepOf(program, "touch_trails").parameter("fingers"))) {}
 
   std::vector<Measure> values() const override {
     return measure({{"fingers counted", mostDrawing},
@@ -79,9 +79,16 @@ class TouchTrailsPage : public MeasurePage {
   }
 
  private:
+  static std::string wordsFor(double fingers) {
+    return counted(trn("Draw with %d finger:\nthe number stays with the finger.",
+                       "Draw with %d fingers at once:\nthe numbers stay with the fingers.",
+                       static_cast<unsigned long>(fingers)),
+                   fingers);
+  }
+
   int drawing() const {
     return static_cast<int>(std::ranges::count_if(trails, [](const Trail& trail) {
-      return trail.isDown && millimetres(trail.length) >= kTrailMm;
+      return trail.isDown && !isWithinMm(trail.length, kTrailMm);
     }));
   }
 

@@ -27,9 +27,10 @@ constexpr auto kGridParameters = std::to_array<ParameterKind>({{"cell mm", 3, 30
 constexpr auto kLines = std::to_array<ValueKind>({
     {msg("lines followed"), "", least(2)},
     {msg("worst distance"), msg("mm"), most(5)},
+    {msg("longest gap"), "mm", most(10)},
 });
 constexpr auto kTrails = std::to_array<ValueKind>({
-    {msg("fingers counted"), "", least(2)},
+    {msg("fingers counted"), "", none(), "fingers"},
     {msg("longest trail"), "mm", none()},
 });
 constexpr auto kFingers = std::to_array<ParameterKind>({{"fingers", 2, 10, 2, true}});
@@ -40,7 +41,7 @@ constexpr auto kRate = std::to_array<ValueKind>({
 });
 constexpr auto kRateParameters = std::to_array<ParameterKind>({{"seconds", 1, 30, 3}});
 constexpr auto kPinch = std::to_array<ValueKind>({
-    {msg("fingers counted"), "", least(2)},
+    {msg("fingers counted"), "", none(), "fingers"},
     {msg("narrowest"), "mm", none()},
     {msg("widest"), "mm", none()},
 });
@@ -65,11 +66,16 @@ constexpr auto kTests = std::to_array<TestKind>({
     {"touch_rate", 60, kRate, kRateParameters},
     {"pinch", 60, kPinch, kFingers},
     {"stuck_touch", 0, kStuck, kStuckParameters},
-    {"keys", 120, kKeys},
+    {"keys", 120, kKeys, {}, true},
 });
 constexpr TestKind kMeasuresNothing = {""};
 
+constexpr auto kKeyNames = std::to_array<std::string_view>(
+    {"up", "down", "left", "right", "select", "hook", "volume up", "volume down", "power", "home"});
+
 }  // namespace
+
+std::span<const std::string_view> keyNames() { return kKeyNames; }
 
 const TestKind& testKind(std::string_view test) {
   const auto* const found = std::ranges::find(kTests, test, &TestKind::test);

@@ -22,8 +22,9 @@ struct Limits {
 
 struct ValueKind {
   std::string_view name;
-  std::string_view unit;  // empty: a count
-  Limits usual = {};      // in the default plan
+  std::string_view unit;          // empty: a count
+  Limits usual = {};              // in the default plan
+  std::string_view leastOf = {};  // the parameter that is the usual least; empty: none
 };
 
 struct ParameterKind {
@@ -40,7 +41,11 @@ struct TestKind {
   int timeout = 0;  // seconds, in the default plan; 0: none
   std::span<const ValueKind> values = {};
   std::span<const ParameterKind> parameters = {};
+  bool asksForKeys = false;
 };
+
+/// The keys that a test can ask for: "up", "volume down", "power" and so on.
+std::span<const std::string_view> keyNames();
 
 const TestKind& testKind(std::string_view test);
 

@@ -19,15 +19,18 @@ const PlanStep* Plan::find(std::string_view test) const {
   return found == steps.end() ? nullptr : &*found;
 }
 
-PlanStep usualStep(std::string_view test) {
+PlanStep usualStep(std::string_view test, const std::map<std::string, double>& parameters) {
   const TestKind& kind = testKind(test);
-  PlanStep step = {.test = std::string(test)};
-  for (const ValueKind& value : kind.values) {
-    if (value.usual.least || value.usual.most) step.limits.emplace(value.name, value.usual);
-  }
+  PlanStep step = {.test = std::string(test), .parameters = parameters};
   for (const ParameterKind& parameter : kind.parameters) {
     step.parameters.emplace(parameter.name, parameter.usual);
   }
+  for (const ValueKind& value : kind.values) {
+    Limits limits = value.usual;
+    if (!value.leastOf.empty()) limits.least = step.parameter(value.leastOf);
+    if (limits.least || limits.most) step.limits.emplace(value.name, limits);
+  }
+  if (kind.asksForKeys) step.keys.assign(keyNames().begin(), keyNames().end());
   step.timeout = kind.timeout;
   return step;
 }

@@ -18,6 +18,7 @@ struct PlanStep {
   std::string text = {};                          // for the operator; empty: the page's own
   std::map<std::string, Limits> limits = {};      // by the value's name
   std::map<std::string, double> parameters = {};  // by name; one that is missing has its usual
+  std::vector<std::string> keys = {};             // that a test of keys asks for, by keyNames()
   int retries = 0;                                // how often a failed test is begun anew
   int timeout = 0;                                // seconds until it fails by itself; 0: never
   OnFailure onFailure = OnFailure::GoOn;
@@ -42,8 +43,9 @@ struct KnownTest {
   bool isUsual;  // it is in the default plan
 };
 
-/// The limits, retries and time-out that a test has without a plan.
-PlanStep usualStep(std::string_view test);
+/// The limits, retries and time-out that a test has without a plan; with some of its parameters, by
+/// name, where these are not the usual ones.
+PlanStep usualStep(std::string_view test, const std::map<std::string, double>& parameters = {});
 
 /// The built-in menu's.
 Plan defaultPlan(const std::vector<KnownTest>& known);

@@ -44,13 +44,15 @@ ordered_json parametersOf(const PlanStep& step) {
 }
 
 ordered_json entryOf(const PlanStep& step) {
-  return {{"test", step.test},
-          {"text", step.text},
-          {"limits", limitsOf(step)},
-          {"parameters", parametersOf(step)},
-          {"retries", step.retries},
-          {"timeout_s", step.timeout},
-          {"on_failure", onFailureName(step.onFailure)}};
+  ordered_json entry = {{"test", step.test},
+                        {"text", step.text},
+                        {"limits", limitsOf(step)},
+                        {"parameters", parametersOf(step)},
+                        {"retries", step.retries},
+                        {"timeout_s", step.timeout},
+                        {"on_failure", onFailureName(step.onFailure)}};
+  if (!step.keys.empty()) entry["keys"] = step.keys;
+  return entry;
 }
 
 }  // namespace

@@ -143,6 +143,12 @@ bool readTest(const JsonNode& node, PlanStep& step, const Reading& reading) {
   return reading.refuse(node, what);
 }
 
+std::string listOf(std::span<const std::string_view> names) {
+  std::string words = names.empty() ? " none" : "";
+  for (const std::string_view name : names) words.append(words.empty() ? " " : ", ").append(name);
+  return words;
+}
+
 bool readLeast(const JsonNode& node, Limits& limits, const Reading& reading) {
   return readNumber(node, {-kFarthest, kFarthest}, limits.least.emplace(), reading);
 }
@@ -186,6 +192,22 @@ bool readParameters(const JsonNode& node, PlanStep& step, const Reading& reading
   return true;
 }
 
+bool readKeys(const JsonNode& node, PlanStep& step, const Reading& reading) {
+  if (node.kind != Kind::List || node.items.empty()) {
+    return reading.refuse(node, "'keys' is no list with a key in it");
+  }
+  for (const JsonNode& key : node.items) {
+    if (key.kind != Kind::Text || std::ranges::count(keyNames(), key.text) == 0) {
+      return reading.refuse(key, "'keys' has one that is none of:" + listOf(keyNames()));
+    }
+    if (std::ranges::count(step.keys, key.text) > 0) {
+      return reading.refuse(key, "the key " + inQuotes(key.text) + " is there twice");
+    }
+    step.keys.push_back(key.text);
+  }
+  return true;
+}
+
 bool readRetries(const JsonNode& node, PlanStep& step, const Reading& reading) {
   return readCount(node, kMostRetries, step.retries, reading);
 }
@@ -213,6 +235,7 @@ constexpr auto kStepFields = std::to_array<Field<PlanStep>>({
     {"text", false, readStepText},
     {"limits", false, readLimits},
     {"parameters", false, readParameters},
+    {"keys", false, readKeys},
     {"retries", false, readRetries},
     {"timeout_s", false, readTimeout},
     {"on_failure", false, readOnFailure},
@@ -224,9 +247,9 @@ const JsonNode* memberOf(const JsonNode& node, std::string_view name) {
 }
 
 std::string namesOf(const auto& kinds) {
-  std::string words = kinds.empty() ? " none" : "";
-  for (const auto& kind : kinds) words.append(words.empty() ? " " : ", ").append(kind.name);
-  return words;
+  std::vector<std::string_view> names;
+  for (const auto& kind : kinds) names.push_back(kind.name);
+  return listOf(names);
 }
 
 // Whether the test has all values and parameters that the step names; these may stand before the
@@ -240,6 +263,10 @@ bool checkNames(const JsonNode& node, const PlanStep& step, const Reading& readi
       return reading.refuse(limit, inQuotes(step.test) + " has no value " + inQuotes(limit.name) +
                                        ", it has:" + namesOf(kind.values));
     }
+  }
+  const JsonNode* const keys = memberOf(node, "keys");
+  if (keys != nullptr && !kind.asksForKeys) {
+    return reading.refuse(*keys, inQuotes(step.test) + " asks for no keys");
   }
   const JsonNode* const parameters = memberOf(node, "parameters");
   if (parameters == nullptr) return true;
@@ -270,8 +297,10 @@ bool readSteps(const JsonNode& node, Plan& plan, const Reading& reading) {
     if (plan.find(step.test) != nullptr) {
       return reading.refuse(item, "the test " + inQuotes(step.test) + " is there twice");
     }
-    const PlanStep usual = usualStep(step.test);
+    const PlanStep usual = usualStep(step.test, step.parameters);
     if (memberOf(item, "limits") == nullptr) step.limits = usual.limits;
+    if (step.keys.empty()) step.keys = usual.keys;
+    step.parameters = usual.parameters;
     if (memberOf(item, "timeout_s") == nullptr) step.timeout = usual.timeout;
     plan.steps.push_back(std::move(step));
   }

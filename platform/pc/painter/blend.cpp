@@ -19,11 +19,11 @@ inline uint8_t byteOver(uint8_t old, uint16_t keep, uint16_t add) {
 
 }  // namespace
 
-Overlay overlayOf(uint32_t color, int alpha) {
+BlendedColor overlayOf(uint32_t color, int alpha) {
   const auto bytes = std::bit_cast<std::array<uint8_t, kPixelBytes>>(color | kOpaqueByte);
-  Overlay overlay = {};
+  BlendedColor overlay = {};
   overlay.keep = static_cast<uint16_t>(kFull - alpha);
-  for (std::size_t i = 0; i < Overlay::kBytes; ++i) {
+  for (std::size_t i = 0; i < BlendedColor::kBytes; ++i) {
     overlay.add[i] = static_cast<uint16_t>(bytes[i % kPixelBytes] * alpha + kHalf);
   }
   return overlay;
@@ -33,11 +33,11 @@ Overlay overlayOf(uint32_t color, int alpha) {
 #ifdef BRIMOL_WIDE_LOOPS
 [[gnu::target_clones("avx2", "default")]]
 #endif
-void layOver(uint8_t* bytes, std::size_t count, const Overlay& overlay) {
-  const Overlay constants = overlay;
+void layOver(uint8_t* bytes, std::size_t count, const BlendedColor& overlay) {
+  const BlendedColor constants = overlay;
   std::size_t at = 0;
-  for (; at + Overlay::kBytes <= count; at += Overlay::kBytes) {
-    for (std::size_t i = 0; i < Overlay::kBytes; ++i) {
+  for (; at + BlendedColor::kBytes <= count; at += BlendedColor::kBytes) {
+    for (std::size_t i = 0; i < BlendedColor::kBytes; ++i) {
       bytes[at + i] = byteOver(bytes[at + i], constants.keep, constants.add[i]);
     }
   }

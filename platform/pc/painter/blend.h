@@ -15,17 +15,17 @@ constexpr uint8_t overFull(uint16_t sum) {
 }
 
 /// A colour with an alpha, made ready for laying it over many pixels.
-struct Overlay {
+struct BlendedColor {
   static constexpr std::size_t kBytes = 32;  // of pixels at a time
   std::array<uint16_t, kBytes> add;
   uint16_t keep;
 };
 
 /// `color` is 0xRRGGBB, its fourth byte counts as opaque; `alpha` is 0 to 255.
-Overlay overlayOf(uint32_t color, int alpha);
+BlendedColor overlayOf(uint32_t color, int alpha);
 
 /// Makes each of `count` bytes, which begin with a pixel, (byte * keep + add) / 255. The same bytes
 /// on every processor.
-void layOver(uint8_t* bytes, std::size_t count, const Overlay& overlay);
+void layOver(uint8_t* bytes, std::size_t count, const BlendedColor& overlay);
 
 }  // namespace brimol::pc

@@ -58,7 +58,7 @@ void Canvas::fill(const Pixels& area, uint32_t color) const {
     for (int y = area.y; y < area.y + runs; ++y) work(row(y) + area.x);
   };
   if (alpha == kOpaque) return eachRun([&](uint32_t* run) { fillRun(run, count, color); });
-  const Overlay overlay = overlayOf(color, static_cast<int>(alpha));
+  const BlendedColor overlay = overlayOf(color, static_cast<int>(alpha));
   eachRun([&](uint32_t* run) { layOver(bytesOf(run), count * kPixelBytes, overlay); });
 }
 

@@ -107,7 +107,8 @@ GlyphImage::GlyphImage(std::span<const uint8_t> coverage, const Pixels& bounds)
   rows.shrink_to_fit();
 }
 
-void GlyphImage::draw(const Canvas& canvas, const Place& corner, Ink& ink, const Pixels& clip) {
+void GlyphImage::draw(const Canvas& canvas, const PixelPlace& corner, Ink& ink,
+                      const Pixels& clip) {
   const int first = std::max(clip.y - corner.y, 0);
   const int last = std::min(clip.y + clip.height - corner.y, box.height);
   const int right = corner.x + box.width + kGroup;

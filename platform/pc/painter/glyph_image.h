@@ -12,7 +12,7 @@
 namespace brimol::pc {
 
 /// A pixel of the canvas, or beyond its edges.
-struct Place {
+struct PixelPlace {
   int x;
   int y;
 };
@@ -35,7 +35,7 @@ class GlyphImage {
   }
 
   /// Draws with the area's corner at `corner` the pixels in `clip`, which lies within the canvas.
-  void draw(const Canvas& canvas, const Place& corner, Ink& ink, const Pixels& clip);
+  void draw(const Canvas& canvas, const PixelPlace& corner, Ink& ink, const Pixels& clip);
 
   /// With the tint, which comes later.
   std::size_t bytes() const {
@@ -55,7 +55,7 @@ class GlyphImage {
 /// An image, and where its corner stands from a line's left end and baseline.
 struct PlacedImage {
   GlyphImage* image;
-  Place corner;
+  PixelPlace corner;
 
   Pixels area() const { return {corner.x, corner.y, image->area().width, image->area().height}; }
 };

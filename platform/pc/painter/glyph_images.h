@@ -29,8 +29,8 @@ class GlyphImages {
   struct Pair {
     const GlyphImage* one;
     const GlyphImage* other;
-    Place pixels;
-    Place steps;
+    PixelPlace pixels;
+    PixelPlace steps;
     friend bool operator<(const Pair& left, const Pair& right) {
       const auto words = [](const Pair& pair) {
         const auto& [first, second, away, stepsAway] = pair;

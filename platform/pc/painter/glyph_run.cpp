@@ -20,7 +20,9 @@ int nearestStep(int units) {
   return static_cast<int>(std::lrint(units / kStep));
 }
 
-Place operator-(const Place& one, const Place& other) { return {one.x - other.x, one.y - other.y}; }
+PixelPlace operator-(const PixelPlace& one, const PixelPlace& other) {
+  return {one.x - other.x, one.y - other.y};
+}
 
 Pixels around(const Pixels& one, const Pixels& other) {
   const int left = std::min(one.x, other.x);
@@ -83,7 +85,7 @@ void GlyphRun::add(PangoGlyph glyph, int x, int y) {
   GlyphImage& image = known.of(face, glyph);
   const Pixels& area = image.area();
   if (isEmpty(area)) return;
-  const Place corner = {area.x + nearestPixel(x), area.y + nearestPixel(y)};
+  const PixelPlace corner = {area.x + nearestPixel(x), area.y + nearestPixel(y)};
   parts.push_back({{&image, corner}, glyphs.size(), {nearestStep(x), nearestStep(y)}});
   owners.push_back(glyphs.size());
   glyphs.push_back(
@@ -145,7 +147,7 @@ GlyphImages::Sum GlyphRun::addUp(const Part& part, const Part& other) const {
     if (owners[i] == part.number) both.push_back(glyphs[i]);
   }
   if (coverageOf(face, both, area) != sheet.sum) return std::nullopt;
-  const Place& corner = part.placed.corner;
+  const PixelPlace& corner = part.placed.corner;
   return GlyphImage(sheet.sum, {area.x - corner.x, area.y - corner.y, area.width, area.height});
 }
 

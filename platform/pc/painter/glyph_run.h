@@ -37,7 +37,7 @@ class GlyphRun {
   struct Part {
     PlacedImage placed;
     std::size_t number;  // of the first glyph
-    Place steps;         // where that one's origin lies
+    PixelPlace steps;    // where that one's origin lies
   };
 
   static GlyphImages::Pair pairOf(const Part& part, const Part& other);

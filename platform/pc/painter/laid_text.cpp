@@ -147,7 +147,7 @@ bool LaidText::visit(const Edges& box, int align, Visit each) const {
     const bool isInBox = middle >= box.top && middle <= box.bottom;
     isWhole = isWhole && isInBox;
     if (isInBox && isNear(x) && isNear(y)) {
-      each(i, Place{static_cast<int>(x), static_cast<int>(y)});
+      each(i, PixelPlace{static_cast<int>(x), static_cast<int>(y)});
     }
   }
   return isWhole;
@@ -155,7 +155,7 @@ bool LaidText::visit(const Edges& box, int align, Visit each) const {
 
 void LaidText::draw(const Canvas& canvas, const Edges& box, int align, Ink& ink,
                     const Pixels& clip) const {
-  visit(box, align, [&](std::size_t i, const Place& place) {
+  visit(box, align, [&](std::size_t i, const PixelPlace& place) {
     if (lines[i].isByPango) return drawByPango(canvas, i, place, ink.color(), clip);
     for (const auto& [image, corner] : imagesOf(i)) {
       image->draw(canvas, {place.x + corner.x, place.y + corner.y}, ink, clip);
@@ -166,7 +166,7 @@ void LaidText::draw(const Canvas& canvas, const Edges& box, int align, Ink& ink,
 std::optional<Edges> LaidText::drawnArea(const Edges& box, int align) const {
   if (std::ranges::any_of(lines, &Line::isByPango)) return std::nullopt;
   Edges area = {0, 0, 0, 0};
-  visit(box, align, [&](std::size_t i, const Place& place) {
+  visit(box, align, [&](std::size_t i, const PixelPlace& place) {
     for (const PlacedImage& placed : imagesOf(i)) {
       Pixels letter = placed.area();
       letter.x += place.x;
@@ -184,7 +184,7 @@ std::span<const PlacedImage> LaidText::imagesOf(std::size_t line) const {
 
 TextInk LaidText::ink(const Edges& box, int align) const {
   TextInk found;
-  found.isWhole = visit(box, align, [&](std::size_t i, const Place& place) {
+  found.isWhole = visit(box, align, [&](std::size_t i, const PixelPlace& place) {
     Pixels letters = lines[i].letters;
     if (letters.width == 0) return;
     letters.x += place.x;
@@ -194,7 +194,7 @@ TextInk LaidText::ink(const Edges& box, int align) const {
   return found;
 }
 
-void LaidText::drawByPango(const Canvas& canvas, std::size_t line, const Place& place,
+void LaidText::drawByPango(const Canvas& canvas, std::size_t line, const PixelPlace& place,
                            uint32_t color, const Pixels& clip) const {
   constexpr double kFull = 255;
   const auto part = [color](int shift) { return (color >> shift & 0xFF) / kFull; };

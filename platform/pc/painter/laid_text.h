@@ -58,7 +58,7 @@ class LaidText {
   void addLine(PangoLayoutIter* iter, GlyphRun& run);
   bool addImages(const PangoLayoutLine& line, GlyphRun& run);
   std::span<const PlacedImage> imagesOf(std::size_t line) const;
-  void drawByPango(const Canvas& canvas, std::size_t line, const Place& place, uint32_t color,
+  void drawByPango(const Canvas& canvas, std::size_t line, const PixelPlace& place, uint32_t color,
                    const Pixels& clip) const;
 
   TextLayout layout;  // null where no line needs it

@@ -42,7 +42,7 @@ void Handover::give(cairo_surface_t* picture, const Region& changed) {
   if (waiting.size() > kMaxParts) waiting = {around(waiting)};
 }
 
-Region Handover::take(Picture& shown) {
+Region Handover::take(ServedPicture& shown) {
   const std::lock_guard lock(mutex);
   for (const cairo_rectangle_int_t& part : waiting) {
     for (int y = part.y; y < part.y + part.height; ++y) {

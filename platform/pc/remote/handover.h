@@ -11,9 +11,9 @@
 namespace brimol::pc {
 
 /// A picture in screen pixels, four bytes each.
-class Picture {
+class ServedPicture {
  public:
-  explicit Picture(Size size)
+  explicit ServedPicture(Size size)
       : width(size.w),
         pixels(static_cast<std::size_t>(size.w) * static_cast<std::size_t>(size.h)) {}
   uint32_t* row(int x, int y) {
@@ -34,11 +34,11 @@ class Handover {
   /// Takes what changed. On the platform's thread.
   void give(cairo_surface_t* picture, const Region& changed);
   /// Brings `shown` up to date and returns what of it changed.
-  Region take(Picture& shown);
+  Region take(ServedPicture& shown);
 
  private:
   std::mutex mutex;  // guards all
-  Picture latest;
+  ServedPicture latest;
   Region waiting;  // what of it was not taken; its parts may overlap
 };
 

@@ -80,7 +80,7 @@ class VncServer {
   std::vector<char*> passwords;  // as LibVNCServer wants it: a list that ends with a null
   ActionQueue& actions;
   Handover handover;
-  Picture shown;
+  ServedPicture shown;
   std::unique_ptr<rfbCursor, VncCursorDeleter> arrow;
   std::unique_ptr<rfbScreenInfo, VncScreenDeleter> server;
   std::list<Guest> guests;  // the thread's own
