@@ -111,6 +111,8 @@ TEST_F(StaticTextTest, ALongPressOnTheBarScrollsAClock) {
   }
   viewer.setRect(0, &kFourRows);
   EXPECT_EQ(viewer.w_count, 0) << "it knows of its numbers by now";
+  viewer.setText("ab");
+  EXPECT_EQ(viewer.rows(0), "00001:|a|") << "at least a byte";
 }
 
 TEST_F(StaticTextTest, AViewOfFiguresLogsAllRowsUpToItsEnd) {
@@ -206,6 +208,13 @@ const PlayTests kPlays = {
     kWithoutScroll("WithoutScrollItTakesAllAndDoesNothing",
                    {press(900, 900), lookAtHold(), keyDown(5)}, "+ <held 0> +"),
 };
+
+TEST_F(StaticTextTest, ALongPressWhereNoBarHasRoomIsLogged) {
+  Viewer viewer({});
+  MW::event_data event = pointerEvent(MW::kEventLongPress, {0, 0});
+  viewer.onPressLong(&event);
+  EXPECT_EQ(platform().takeLog().back().message, "[STATICTEXT] onPressLong is not correct!!");
+}
 
 TEST_F(StaticTextTest, NoSizeLeadsOutOfBounds) {
   SKIA_Text looks = {};
