@@ -130,15 +130,17 @@ ExitCode runApplication(const Options& options) {
     complain(error);
     return ExitCode::WrongUse;
   }
-  auto book = ResultBook::open(keepingOf(options), runStartOf(options, task->plan), error);
-  if (!book) return fail(error);
-  Context context = {*book, log, {}, options.shell, task->plan};
+  std::optional<std::string> logText;
   if (!options.log.empty()) {
-    context.logText = readLog(options.log, error);
-    if (!context.logText) return fail(error);
+    logText = readLog(options.log, error);
+    if (!logText) return fail(error);
   }
   if (brimol_host_open() == 0) return ExitCode::Trouble;
   if (const std::string wrong = wrongScreen(); !wrong.empty()) return fail(wrong);
+  // Last of all: a start that is refused leaves no run.
+  auto book = ResultBook::open(keepingOf(options), runStartOf(options, task->plan), error);
+  if (!book) return fail(error);
+  const Context context = {*book, log, std::move(logText), options.shell, task->plan};
   brimol_host_screen_size(&MW::Window::width, &MW::Window::height);
   endOnSignals();
   const bool started = MW::Window::init() == 1;

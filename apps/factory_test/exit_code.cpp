@@ -11,7 +11,7 @@ constexpr auto kRows = std::to_array<ExitRow>({
     {ExitCode::Passed,
      "all tests passed, or none was to be done (--help, --shot, --monkey and the like)"},
     {ExitCode::Trouble, "the screen cannot be opened, or a file not read or written"},
-    {ExitCode::WrongUse, "a wrong option"},
+    {ExitCode::WrongUse, "a wrong option or a wrong plan"},
     {ExitCode::Failed, "a test failed, of whichever unit"},
     {ExitCode::Incomplete, "no test failed, but not all tests of each unit have a verdict"},
     {ExitCode::NotSaved, "a result, or the end of a run, could not be kept"},

@@ -60,7 +60,7 @@ void FactoryTest::askForUnit() {
 
 void FactoryTest::updateUnit(uint32_t now) {
   switch (unitPage->takeWish()) {
-    case UnitPage::Wish::Leave: askToLeave(); break;
+    case UnitPage::Wish::Leave: askToLeave(now); break;
     case UnitPage::Wish::Without:
       ask(Asked::Without,
           {tr("Which unit?"), tr("Test a unit without a serial number?"), tr("OK"), tr("CANCEL")});
@@ -81,16 +81,14 @@ void FactoryTest::startUnit(uint32_t now) {
   RunStart next = book.run();
   next.unit = serial;
   next.started = presentTime();
-  const ExitCode last = book.hasBegun() ? judgeRun(book, next.tests) : ExitCode::Passed;
   const bool isFit = serial.empty() || isSerial(serial, error);
-  if (!isFit || !book.startUnit(next, error)) {
+  if (!isFit || !leaveUnit(error) || !book.startUnit(next, error)) {
     const bool waits = isFit && book.isBusy() && !beginning.isOver(now);
     if (!waits) beginning.end();
     unitPage->refuse(waits ? tr("Saving...") : error);
     return;
   }
   beginning.end();
-  earlierUnits = worse(earlierUnits, last);
   unitPage.reset();
   menu.showVerdicts();
   if (task.isRun) {
@@ -101,22 +99,27 @@ void FactoryTest::startUnit(uint32_t now) {
   MW::isDisplayUpdate(1);
 }
 
+// Before the next one begins, of which a first try may fail half way.
+bool FactoryTest::leaveUnit(std::string& error) {
+  if (!book.saveAgain(error)) return false;
+  if (book.hasBegun()) earlierUnits = worse(earlierUnits, judgeRun(book, book.run().tests));
+  return true;
+}
+
 void FactoryTest::stay() {
   ended = false;
   if (asksForUnits) askForUnit();
 }
 
 void FactoryTest::update(uint32_t now) {
-  if (saving.takeTry(now)) {
-    std::string error;
-    const bool isKept = book.saveAgain(error);
-    showKept(isKept, error, now);
-  }
+  if (saving.takeTry(now)) saveAgain(now);
   if (running) running->clock.tick(now, !prompt && !running->test->awaitsVerdict());
   if (prompt) {
     updatePrompt(now);
   } else if (notice) {
     updateNotice(now);
+  } else if (isLeaving) {
+    if (!saving.isWaiting()) warnOfLeaving();
   } else if (unitPage) {
     updateUnit(now);
   } else if (running) {
@@ -131,7 +134,7 @@ void FactoryTest::update(uint32_t now) {
 void FactoryTest::updateMenu(uint32_t now) {
   menu.update(now);
   if (menu.takeLeave()) {
-    askToLeave();
+    askToLeave(now);
   } else if (const auto chosen = menu.takeChosen()) {
     menu.hide();
     start(*chosen, now);
@@ -187,8 +190,19 @@ void FactoryTest::endRun(uint32_t now) {
   ask(Asked::RunEnd, endOfRun(book, asksForUnits ? tr("NEXT UNIT") : tr("MENU")));
 }
 
-void FactoryTest::askToLeave() {
-  ask(Asked::Leave, {tr("Leave"), tr("End the factory test?"), tr("OK"), tr("CANCEL")});
+// What is not saved is tried again first.
+void FactoryTest::askToLeave(uint32_t now) {
+  isLeaving = true;
+  if (!book.isAllSaved()) saveAgain(now);
+}
+
+void FactoryTest::warnOfLeaving() {
+  isLeaving = false;
+  ask(Asked::Leave,
+      {tr("Leave"),
+       book.isAllSaved() ? tr("End the factory test?")
+                         : tr("Not all results are saved. End the factory test, and lose them?"),
+       tr("OK"), tr("CANCEL")});
 }
 
 void FactoryTest::ask(Asked what, const Question& question) {
@@ -221,11 +235,7 @@ void FactoryTest::follow(bool isYes, uint32_t now) {
       }
       break;
     case Asked::SaveAgain:
-      if (isYes) {
-        std::string error;
-        const bool isKept = book.saveAgain(error);
-        showKept(isKept, error, now);
-      }
+      if (isYes) saveAgain(now);
       break;
     case Asked::Repeat:
       if (isYes) {
@@ -269,11 +279,13 @@ void FactoryTest::showStanding() {
   MW::isDisplayUpdate(1);
 }
 
-// `failure`: why, where the outcome is a FAIL.
+// `failure`: why, where the outcome is a FAIL. An attempt that is begun anew is kept, too: retries
+// are to be seen in the records.
 void FactoryTest::finish(Outcome outcome, uint32_t now, Reason failure) {
   const std::size_t entry = running->entry;
   running->test->leave();
   if (outcome == Outcome::Retry) {
+    keep(*running, Verdict::None, Reason::Retry, now);
     running.reset();
     start(entry, now);
     return;
@@ -283,7 +295,9 @@ void FactoryTest::finish(Outcome outcome, uint32_t now, Reason failure) {
                                                    : Verdict::None;
   // Looking at a test without a verdict keeps the one that it had.
   const bool isNew = given != Verdict::None || book.find(running->step.test) == nullptr;
-  const Verdict verdict = isNew ? keep(*running, given, failure, now) : given;
+  const Verdict verdict =
+      isNew ? keep(*running, given, given == Verdict::Fail ? failure : Reason::Unknown, now)
+            : given;
   running.reset();
   if (run) {
     run->finish(verdict);
@@ -298,16 +312,16 @@ int FactoryTest::attemptAt(const std::string& test) const {
   return earlier == nullptr ? 1 : earlier->attempt + 1;
 }
 
-Verdict FactoryTest::keep(const Running& done, Verdict given, Reason failure, uint32_t now) {
+Verdict FactoryTest::keep(const Running& done, Verdict given, Reason reason, uint32_t now) {
   std::vector<Measure> values = done.test->values();
   const PlanStep& step = done.step;
   const Verdict judged = judge(given, values, step);
   const Verdict verdict = task.simulation.rehearsed(judged, step.test, attemptAt(step.test));
-  if (judged != given) failure = Reason::Limit;
-  if (verdict != judged) failure = Reason::Rehearsal;
+  if (judged != given) reason = Reason::Limit;
+  if (verdict != judged) reason = Reason::Rehearsal;
   for (const Measure& each : values) context.log.add(each.name + ": " + measureText(each));
   context.log.add(std::string("Verdict ") + verdictName(verdict));
-  if (verdict == Verdict::Fail) notice = whyFailed(step, values, failure, now);
+  if (verdict == Verdict::Fail) notice = whyFailed(step, values, reason, now);
   std::string error;
   const bool isKept = book.record({.test = step.test,
                                    .verdict = verdict,
@@ -315,10 +329,16 @@ Verdict FactoryTest::keep(const Running& done, Verdict given, Reason failure, ui
                                    .duration = std::chrono::milliseconds(now - done.startTicks),
                                    .screen = screenSize(),
                                    .values = std::move(values),
-                                   .reason = verdict == Verdict::Fail ? failure : Reason::Unknown},
+                                   .reason = reason},
                                   error);
   showKept(isKept, error, now);
   return verdict;
+}
+
+void FactoryTest::saveAgain(uint32_t now) {
+  std::string error;
+  const bool isKept = book.saveAgain(error);
+  showKept(isKept, error, now);
 }
 
 // Another program that writes into the database is waited for, while the screen goes on.
@@ -330,7 +350,7 @@ void FactoryTest::showKept(bool isKept, const std::string& error, uint32_t now) 
   MW::isDisplayUpdate(1);
   if (isKept || saving.isWaiting()) return;
   complain(error);
-  ask(Asked::SaveAgain, {tr("Not saved"), error, tr("TRY AGAIN"), tr("LATER")});
+  ask(Asked::SaveAgain, {tr("Not saved"), trError(error), tr("TRY AGAIN"), tr("LATER")});
 }
 
 void FactoryTest::draw() {

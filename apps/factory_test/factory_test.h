@@ -59,7 +59,9 @@ class FactoryTest {
   void askForUnit();
   void updateUnit(uint32_t now);
   void startUnit(uint32_t now);
-  void askToLeave();
+  bool leaveUnit(std::string& error);
+  void askToLeave(uint32_t now);
+  void warnOfLeaving();
   void updateMenu(uint32_t now);
   void updateTest(uint32_t now);
   void updateNotice(uint32_t now);
@@ -71,8 +73,9 @@ class FactoryTest {
   void start(std::size_t entry, uint32_t now);
   void finish(Outcome outcome, uint32_t now, Reason failure = Reason::Operator);
   int attemptAt(const std::string& test) const;
-  Verdict keep(const Running& done, Verdict given, Reason failure, uint32_t now);
+  Verdict keep(const Running& done, Verdict given, Reason reason, uint32_t now);
   void endRun(uint32_t now);
+  void saveAgain(uint32_t now);
   void showKept(bool isKept, const std::string& error, uint32_t now);
 
   ResultBook& book;
@@ -82,9 +85,10 @@ class FactoryTest {
   bool asksForUnits = false;
   Menu menu;
   std::optional<UnitPage> unitPage;
-  std::string serial;  // that was entered last
-  Patience beginning;  // of its run
-  Patience saving;     // of what is not saved yet
+  std::string serial;      // that was entered last
+  Patience beginning;      // of its run
+  Patience saving;         // of what is not saved yet
+  bool isLeaving = false;  // what is not saved is tried again before the question
   ExitCode earlierUnits = ExitCode::Passed;
   std::optional<Running> running;
   std::optional<PlanRun> run;  // while a plan is performed without the menu

@@ -32,14 +32,17 @@ constexpr Row rowFor(bool isThere) { return isThere ? Row::Shown : Row::LeftOut;
 HeadLayout layOutHead(const SKIA_Rect& area, ScreenSize screen, Row whoseRow, Row lineRow) {
   const int gap = gapOf(screen);
   const bool isWide = isLandscape(screen);
-  const auto [title, rest] = rowsOf<2>(area, 0, {isWide ? 3 : 2, 8});
+  const auto [title, rest] = rowsOf<2>(area, 0, {2, 8});
   const SKIA_Rect body = {rest.x + 2 * gap, rest.y + gap / 2, rest.w - 4 * gap, rest.h - gap, 0};
   const int who = whoseRow == Row::Shown ? 4 : 0;
   const int line = lineRow == Row::Shown ? 4 : 0;
+  const int second = std::max(who, line);  // row of a wide screen
   const auto [words, bar, figures] =
-      rowsOf<3>(body, gap / 4, {isWide ? 4 : 8 + who + line, 1, isWide ? 5 : 8});
+      rowsOf<3>(body, gap / 4, {isWide ? 4 + second : 8 + who + line, 1, isWide ? 6 : 8});
   if (isWide) {
-    const auto [hint, whose, count, sent] = columnsOf<4>(words, gap, {4, who, 4, line});
+    const auto [upper, lower] = rowsOf<2>(words, gap / 4, {4, second});
+    const auto [hint, count] = columnsOf<2>(upper, gap, {1, 1});
+    const auto [whose, sent] = columnsOf<2>(lower, gap, {1, 1});
     return {title, hint, whose, count, sent, bar, figures, {2, 3}};
   }
   const auto [hint, whose, count, sent] = rowsOf<4>(words, gap / 4, {4, who, 4, line});

@@ -130,14 +130,15 @@ std::string takeOne(Arguments& arguments, Options& options) {
 // not.
 std::string sameFiles(const Options& options) {
   using Named = std::pair<const char*, std::string>;
-  const auto files = std::to_array<Named>({{"--results", options.results},
+  const auto files = std::to_array<Named>({{"--plan", options.plan},
+                                           {"--log", options.log},
+                                           {"--results", options.results},
                                            {"--junit", options.junit},
                                            {"--database", options.database},
                                            {"--shot", options.shot},
-                                           {"--monkey-trace", options.monkeyTrace},
-                                           {"--plan", options.plan},
-                                           {"--log", options.log}});
-  for (const auto& [name, file] : files) {
+                                           {"--monkey-trace", options.monkeyTrace}});
+  constexpr std::size_t kOnlyRead = 2;  // the first ones
+  for (const auto& [name, file] : std::span(files).subspan(kOnlyRead)) {
     for (const auto& [other, its] : files) {
       if (name == other || file.empty() || its.empty() || !isSameFile(file, its)) continue;
       return std::string(name) + " and " + other + " name the same file";

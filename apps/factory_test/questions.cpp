@@ -18,6 +18,7 @@ const char* wordsOf(Reason failure) {
     case Reason::Limit: return tr("A value is outside its limits, or missing.");
     case Reason::TimeOut: return tr("The time is over.");
     case Reason::Rehearsal: return tr("This failure is a rehearsal.");
+    case Reason::Retry:
     case Reason::Unknown:
     case Reason::Operator: break;
   }

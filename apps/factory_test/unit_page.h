@@ -33,7 +33,7 @@ class UnitPage {
   /// The unit has no number.
   void goWithout() { answer(""); }
   /// Why another one is needed.
-  void refuse(const std::string& why) { page.say(tr(why.c_str())); }
+  void refuse(const std::string& why) { page.say(trError(why).c_str()); }
 
  private:
   /// Tells of the enter key, whatever was typed.

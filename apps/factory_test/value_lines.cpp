@@ -12,10 +12,10 @@ namespace {
 
 std::string limitsIn(const Measure& measure) {
   if (measure.least && measure.most) {
-    return numberText(*measure.least) + tr(" to ") + numberText(*measure.most);
+    return filled(tr("%1 to %2"), {numberText(*measure.least), numberText(*measure.most)});
   }
-  if (measure.least) return tr("at least ") + numberText(*measure.least);
-  return measure.most ? tr("at most ") + numberText(*measure.most) : "";
+  if (measure.least) return filled(tr("at least %1"), {numberText(*measure.least)});
+  return measure.most ? filled(tr("at most %1"), {numberText(*measure.most)}) : "";
 }
 
 // As measureText().

@@ -16,6 +16,7 @@ import tempfile
 import unittest
 
 import jsonschema
+import junitparser
 
 from browser import LOW_CONTRAST, NAMELESS, Browser
 
@@ -83,10 +84,37 @@ class ExportsTest(unittest.TestCase):
             del result["id"]
         self.validate("results", {"version": 2, "unit": run["unit"], "results": run["results"]})
 
+    def test_results_files_are_judged_alike(self):
+        """By the schema and by the program."""
+        result = {"test": "a", "verdict": "PASS", "started": "2026-11-21T07:00:00Z", "duration_ms": 1,
+                  "screen": {"width": 1, "height": 2}}
+        good = [{}, {"version": 1}, {"version": 2, "more": 1}, {"state": "finished"}], [
+            {"more": 1}, {"reason": "retry", "attempt": 2}]
+        bad = [{"version": 0}, {"version": 3}, {"unit": 7}, {"plan": {"name": "x"}}, {"state": "running"}], [
+            {"test": 7}, {"verdict": "pass"}, {"attempt": 0}, {"duration_ms": -1}, {"screen": {"width": 1}},
+            {"values": [{"name": "a"}]}, {"reason": "x"}, {"reason": ""}, {"started": "now"}]
+        file = self.folder / "judged.json"
+        for code, (of_files, of_results) in ((0, good), (1, bad)):
+            for document in [{"results": [result]} | each for each in of_files] + [
+                    {"results": [result | each]} for each in of_results]:
+                with self.subTest(document):
+                    file.write_text(json.dumps(document))
+                    out = self.program("--headless", "--new-run", "--results", file, "--shot", self.folder / "a.png")
+                    self.assertEqual(code, out.returncode, out.stderr)
+                    if code == 0:
+                        self.validate("results", document)
+                    else:
+                        self.assertRaises(jsonschema.ValidationError, self.validate, "results", document)
+
     def test_junit_fits_its_schema(self):
         file = self.folder / "junit.xml"
         self.assertEqual("", self.export("export", "--junit", "--output", file))
         subprocess.run([XMLLINT, "--noout", "--schema", JUNIT_XSD, file], check=True, stderr=subprocess.DEVNULL)
+        suites = junitparser.JUnitXml.fromfile(str(file))
+        self.assertEqual((UNITS, UNITS * TESTS), (len(list(suites)), sum(len(list(suite)) for suite in suites)))
+        fails = sum(isinstance(what, junitparser.Failure) for suite in suites for case in suite for what in case.result)
+        runs = json.loads(self.export("export", "--json"))["runs"]
+        self.assertEqual(sum(result["verdict"] == "FAIL" for run in runs for result in run["results"]), fails)
         text = file.read_text()
         self.assertEqual(UNITS, text.count("<testsuite "))
         self.assertIn("worst distance", text)
@@ -153,10 +181,10 @@ class ExportsTest(unittest.TestCase):
                     (1 << 20, ["export", "--json", "--database", self.store], full, "stdout cannot be written"),
                     (1 << 20, ["report", "--database", self.store, "--output", "/dev/full"], None, "not a regular file"),
                     (33000, ["export", "--json", "--database", self.store, "--output", old], None,
-                     f"{old}: cannot be written: File too large"),
-                    (64, [*screen, "--new-run", "--results", results], None, f"{results}: cannot be written: File too large"),
+                     f"{old}: cannot be written: the file would be too large"),
+                    (64, [*screen, "--new-run", "--results", results], None, f"{results}: cannot be written: the file would be too large"),
                     (4096, [*screen, "--serial", "x", "--database", self.store], None,
-                     f"{self.store}: cannot be read or written: File too large"),
+                     f"{self.store}: cannot be read or written: the file would be too large"),
             ]:
                 with self.subTest(arguments):
                     before = old.read_bytes(), results.read_bytes()
@@ -181,10 +209,10 @@ class ExportsTest(unittest.TestCase):
                 (["report", "--since", "2026-02-30", *store], 2, "--since needs a day"),
                 (["export", "--csv", "--value", "x", *store], 2, "takes no --value"),
                 (["report", "--line", "x"], 2, "--line needs an address"),
-                (["report", "--database", "/none.db"], 1, "/none.db: cannot be opened: No such file"),
+                (["report", "--database", "/none.db"], 1, "/none.db: cannot be opened: it or its folder is missing"),
                 (["report", "--database", __file__], 1, "is not a database"),
                 (["report", "--database", self.folder / "empty.db"], 1, "holds no factory test's records"),
-                (["report", *store, "--output", "/none/x"], 1, "/none/x: cannot be written: No such file"),
+                (["report", *store, "--output", "/none/x"], 1, "/none/x: cannot be written: it or its folder is missing"),
         ]:
             with self.subTest(arguments):
                 out = self.program(*arguments)

@@ -12,7 +12,7 @@ import time
 import unittest
 
 FACTORY_TEST, TRACE = sys.argv[1:3]
-KILLS = int(sys.argv[3]) if len(sys.argv) > 3 else 4
+KILLS = int(sys.argv[3]) if len(sys.argv) > 3 else 8
 SEED = int(sys.argv[4]) if len(sys.argv) > 4 else random.getrandbits(30)
 LONGEST = 2.5  # seconds: a run under load takes longer
 
@@ -52,7 +52,13 @@ class KillTest(unittest.TestCase):
             with self.subTest(kill=kill, seed=SEED):
                 before = self.verdicts() if kill else set()
                 app = self.program("--new-run")
-                time.sleep(chance.uniform(0.05, LONGEST))
+                if kill % 4 == 1:  # among its verdicts
+                    while app.poll() is None and not self.verdicts() - before:
+                        time.sleep(0.01)
+                    time.sleep(chance.uniform(0, 0.5))
+                    self.assertLess(before, self.verdicts())
+                else:
+                    time.sleep(chance.uniform(0.05, LONGEST))
                 before |= self.verdicts()
                 app.kill()
                 app.communicate()

@@ -103,6 +103,7 @@ TEST(Plans, TakeTheUsualLimitsWhereTheySayNone) {
   EXPECT_EQ(plan->steps[0].limits.at("cells missed").most, 0);
   EXPECT_EQ(plan->steps[0].timeout, usualStep("touch_grid").timeout);
   EXPECT_TRUE(plan->steps[1].limits.empty());
+  EXPECT_EQ(plan->steps[0].parameters, usualStep("touch_grid").parameters);
   EXPECT_EQ(plan->steps[1].keys, usualStep("keys").keys);
   EXPECT_EQ(plan->steps[2].limits.at("fingers counted").least, 7) << "as many as are asked for";
 }

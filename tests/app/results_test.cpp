@@ -138,6 +138,19 @@ TEST_F(Results, OfAPlanThatIsThroughAreShownButNotGoneOnWith) {
   }
 }
 
+TEST_F(Results, OfAUnitStayUntilTheNextOneCanBegin) {
+  auto book =
+      ResultBook::open({.json = file, .database = folder / "station.db"}, {.unit = "A1"}, error);
+  ASSERT_TRUE(book && book->record(kColours, error)) << error;
+  fs::remove(file);
+  fs::create_directory(file);
+  EXPECT_FALSE(book->startUnit({.unit = "B2"}, error));
+  EXPECT_TRUE(book->hasBegun() && book->find(kColours.test) != nullptr);
+  fs::remove(file);
+  EXPECT_TRUE(book->startUnit({.unit = "B2"}, error)) << error;
+  EXPECT_EQ(book->find(kColours.test), nullptr);
+}
+
 TEST_F(Results, BelongToOneProgramAtATime) {
   const fs::path link = folder / "link";
   fs::create_symlink(file, link);
@@ -197,7 +210,7 @@ TEST_F(Results, GoOnlyWhereTheyCanBeKept) {
     EXPECT_EQ(error, unfit.native() + ": is not a regular file");
   }
   EXPECT_FALSE(ResultBook::open(folder / "missing" / "file", error));
-  EXPECT_TRUE(error.ends_with("/missing/file: cannot be written: No such file or directory"));
+  EXPECT_TRUE(error.ends_with("/missing/file: cannot be written: it or its folder is missing"));
   EXPECT_TRUE(ResultBook::open("", error)->record(kColours, error)) << "in memory";
 }
 
@@ -229,7 +242,7 @@ TEST_F(Results, SurviveAFullDiskBehindALink) {
   const bool isWritten = book->record(kKeys, error);
   ::setrlimit(RLIMIT_FSIZE, &former);
   EXPECT_FALSE(isWritten);
-  EXPECT_EQ(error, file.native() + ": cannot be written: File too large");
+  EXPECT_EQ(error, file.native() + ": cannot be written: the file would be too large");
   EXPECT_EQ(textOf(file), before);
   EXPECT_FALSE(fs::exists(folder / "far.tmp"));
   EXPECT_FALSE(book->isSaved(kKeys.test));

@@ -128,6 +128,16 @@ tap "Shell: PASS, not saved"
         self.assertEqual((0, 1), (played.returncode, says.count("\n")), says)
         self.assertEqual([("PASS", 1), ("PASS", 2)], self.ask("select verdict, attempt from verdicts order by number"))
 
+    def test_a_retry_is_kept_and_a_refused_start_is_not(self):
+        refused = self.start("wait 10\n", "--serial", "a1", "--log", self.folder / "none")
+        self.assertIn("none: it or its folder is missing", refused.communicate()[1])
+        self.assertFalse(self.database.exists())
+        played = self.start("wait 800\ntap \"RETRY\"\nwait 800\ntap \"FAIL\"\nexpect text \"Slide switches: FAIL\"\n",
+                            "--serial", "a1", "--test", "switches")
+        self.assertEqual((3, ""), (played.wait(), played.communicate()[1]))
+        self.assertEqual([("none", "retry", 1), ("FAIL", "operator", 2)],
+                         self.ask("select verdict, reason, attempt from verdicts order by number"))
+
 
 if __name__ == "__main__":
     unittest.main(argv=sys.argv[:1])

@@ -64,8 +64,37 @@ const char* tr(const char* english) {
   return *english == '\0' ? english : dgettext(kDomain, english);
 }
 
+std::string filled(std::string_view format, std::initializer_list<std::string_view> words) {
+  std::string text;
+  for (std::size_t i = 0; i < format.size(); ++i) {
+    const bool isPlace = format[i] == '%' && i + 1 < format.size();
+    const auto number = isPlace ? static_cast<std::size_t>(format[i + 1] - '1') : words.size();
+    if (number < words.size()) {
+      text += std::data(words)[number];
+      ++i;
+    } else {
+      text += format[i];
+    }
+  }
+  return text;
+}
+
 // The catalogues of languages that are written so translate the word.
 bool isRightToLeft() { return std::string_view(tr("left-to-right")) == "right-to-left"; }
+
+std::string trError(std::string_view error) {
+  constexpr std::string_view kBetween = ": ";
+  const auto end = [&] { return std::min(error.find(kBetween), error.size()); };
+  if (end() == error.size()) return tr(std::string(error).c_str());
+  std::string shown(error.substr(0, end()));
+  error.remove_prefix(end());
+  while (!error.empty()) {
+    error.remove_prefix(kBetween.size());
+    shown.append(kBetween).append(tr(std::string(error.substr(0, end())).c_str()));
+    error.remove_prefix(end());
+  }
+  return shown;
+}
 
 const char* trn(const char* one, const char* many, unsigned long count) {
   return dngettext(kDomain, one, many, count);

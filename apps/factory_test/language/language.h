@@ -2,6 +2,7 @@
 /// folder.
 #pragma once
 
+#include <initializer_list>
 #include <span>
 #include <string>
 #include <string_view>
@@ -24,6 +25,13 @@ bool hasCatalogue(const std::string& code);
 const char* tr(const char* english);
 /// The text of a number of things, in the form that the language has for so many.
 const char* trn(const char* one, const char* many, unsigned long count);
+
+/// An error's line in the chosen language: a text, or a file's name and texts, with ": " between
+/// them.
+std::string trError(std::string_view error);
+
+/// `format` with words in the places of %1 to %9, in whichever order the language has them.
+std::string filled(std::string_view format, std::initializer_list<std::string_view> words);
 
 /// Whether the language is written from right to left, as its catalogue says.
 bool isRightToLeft();

@@ -79,7 +79,11 @@ class LogTest : public PageTest {
     placeViewer();
     placeKeyboard();
     buttons.emplace(layOutLog().buttons, kFaces);
-    if (leftOut > 0) page.say((std::to_string(leftOut) + tr(" older lines are left out")).c_str());
+    if (leftOut > 0) {
+      const char* const words = trn("%1 older line is left out", "%1 older lines are left out",
+                                    static_cast<unsigned long>(leftOut));
+      page.say(filled(words, {std::to_string(leftOut)}).c_str());
+    }
   }
 
   void leave() override {

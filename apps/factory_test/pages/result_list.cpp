@@ -60,7 +60,7 @@ std::string wordsOf(Group group, const ResultBook& book, Details details) {
     if (result->verdict != Verdict::None) ++done;
     words += wordsOf(entry, *result, details);
   }
-  const std::string count = std::to_string(done) + tr(" of ") + std::to_string(tests);
+  const std::string count = filled(tr("%1 of %2"), {std::to_string(done), std::to_string(tests)});
   return lineOf(kGroup, count, tr("done"), nameOf(group)) + words;
 }
 

@@ -100,13 +100,14 @@ void Database::addPlan(const RunStart& start) {
             {start.unit, utcText(start.started)});
 }
 
-// Runs of units without a number are of different ones.
+// Runs of units without a number are of different ones. Rehearsals are no part of a unit's way.
 bool Database::takeAborted(const RunStart& start) {
-  if (start.unit.empty()) return false;
+  if (start.unit.empty() || start.planName.ends_with(kRehearsal)) return false;
   store.run(
       "select number, id, state = 'aborted' and plan = ? and software = ? from runs "
-      "where unit is ? order by number desc limit 1",
-      {start.planHash, start.software, orNull(start.unit)}, [&](const Cells& row) {
+      "where unit is ? and (select name not like '%' || ? from plans where hash = plan) "
+      "order by number desc limit 1",
+      {start.planHash, start.software, orNull(start.unit), std::string(kRehearsal)}, [&](const Cells& row) {
         const std::int64_t newest = std::stoll(row[0].value_or("0"));
         if (row[2] != "1" || !locks.take(newest)) return;
         number = newest;

@@ -7,9 +7,9 @@
 #include <cerrno>
 #include <chrono>
 #include <string>
-#include <system_error>
 #include <thread>
 
+#include "results/system_words.h"
 #include "results/whole_file.h"
 
 namespace factory_test {
@@ -142,7 +142,7 @@ void refuseOthers(Sqlite& store, const fs::path& path) {
 void refuseDamaged(Sqlite& store, const fs::path& path) {
   const std::int64_t bytes = store.number("pragma page_count") * store.number("pragma page_size");
   if (bytes > kMostCheckedBytes || store.cell("pragma quick_check(1)") == "ok") return;
-  throw StoreError(named(path, "is damaged: put it aside, then begin a new one"));
+  throw StoreError(named(path, "is damaged; put it aside, then begin a new one"));
 }
 
 // An empty file of a name that no other file has, nor gets meanwhile.
@@ -156,7 +156,7 @@ fs::path reserve(const fs::path& wanted) {
       return copy;
     }
     if (errno != EEXIST) {
-      throw StoreError(named(copy, "cannot be written: " + std::generic_category().message(errno)));
+      throw StoreError(named(copy, "cannot be written: " + systemWords(errno)));
     }
     copy = fs::path(wanted).concat(".").concat(std::to_string(number));
   }

@@ -1,6 +1,7 @@
 #include "records/history.h"
 
 #include <algorithm>
+#include <array>
 #include <charconv>
 #include <map>
 #include <unordered_map>
@@ -45,11 +46,11 @@ class Columns {
   std::size_t next = 0;
 };
 
-template <typename Kind>
-Kind kindNamed(const std::string& name, std::initializer_list<Kind> kinds,
+template <typename Kind, std::size_t Count>
+Kind kindNamed(const std::string& name, const std::array<Kind, Count>& kinds,
                const char* (*nameOf)(Kind)) {
   const auto found = std::ranges::find_if(kinds, [&](Kind kind) { return nameOf(kind) == name; });
-  return found == kinds.end() ? *kinds.begin() : *found;
+  return found == kinds.end() ? kinds.front() : *found;
 }
 
 struct Choice {
@@ -76,8 +77,9 @@ RunRecord runOf(const Cells& row) {
   run.start.station = columns.text();
   run.start.started = columns.time().value_or(run.start.started);
   run.ended = columns.time();
-  run.state = kindNamed(columns.text(), {RunState::Running, RunState::Finished, RunState::Aborted},
-                        stateName);
+  run.state =
+      kindNamed(columns.text(),
+                std::array{RunState::Running, RunState::Finished, RunState::Aborted}, stateName);
   return run;
 }
 
@@ -92,17 +94,14 @@ VerdictRecord verdictOf(const Cells& row) {
   columns.text();  // its number in the run
   result.test = columns.text();
   result.attempt = columns.count();
-  result.verdict =
-      kindNamed(columns.text(), {Verdict::None, Verdict::Pass, Verdict::Fail}, verdictName);
+  result.verdict = kindNamed(columns.text(),
+                             std::array{Verdict::None, Verdict::Pass, Verdict::Fail}, verdictName);
   result.started = columns.time().value_or(result.started);
   result.duration = std::chrono::milliseconds(columns.count());
   result.screen.width = columns.count();
   result.screen.height = columns.count();
   result.operatorName = columns.text();
-  result.reason = kindNamed(
-      columns.text(),
-      {Reason::Unknown, Reason::Operator, Reason::Limit, Reason::TimeOut, Reason::Rehearsal},
-      reasonName);
+  result.reason = kindNamed(columns.text(), kReasons, reasonName);
   return record;
 }
 

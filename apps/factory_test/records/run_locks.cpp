@@ -4,9 +4,9 @@
 #include <unistd.h>
 
 #include <cerrno>
-#include <system_error>
 
 #include "records/sqlite.h"
+#include "results/system_words.h"
 #include "results/whole_file.h"
 
 namespace factory_test {
@@ -31,7 +31,7 @@ RunLocks::RunLocks(const std::filesystem::path& database) {
   descriptor = ::open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kMode);
   if (descriptor >= 0) return;
   throw StoreError(file.native() +
-                   ": cannot be written: " + std::generic_category().message(errno));
+                   ": cannot be written: " + systemWords(errno));
 }
 
 RunLocks::~RunLocks() { ::close(descriptor); }

@@ -10,7 +10,9 @@
 #include <system_error>
 #include <utility>
 
+#include "language/language.h"
 #include "results/measure_text.h"
+#include "results/system_words.h"
 #include "results/whole_file.h"
 
 namespace factory_test {
@@ -21,7 +23,7 @@ namespace fs = std::filesystem;
 
 std::string systemText(sqlite3* handle) {
   const int number = handle == nullptr ? 0 : sqlite3_system_errno(handle);
-  return number == 0 ? "" : ": " + std::generic_category().message(number);
+  return number == 0 ? "" : ": " + systemWords(number);
 }
 
 constexpr int kPrimary = 0xff;  // of a code, the part without details
@@ -32,14 +34,14 @@ bool isBusy(int code) {
 
 // What the last call on `handle` failed with, in the words of who uses the program.
 std::string explain(sqlite3* handle, int code) {
-  if (isBusy(code)) return "is locked by another program";
+  if (isBusy(code)) return msg("is locked by another program");
   switch (code & kPrimary) {
-    case SQLITE_FULL: return "cannot be written: the disk is full";
-    case SQLITE_READONLY: return "cannot be used: it or its folder is read-only";
-    case SQLITE_CANTOPEN: return "cannot be opened" + systemText(handle);
-    case SQLITE_IOERR: return "cannot be read or written" + systemText(handle);
-    case SQLITE_NOTADB: return "is not a database";
-    case SQLITE_CORRUPT: return "is damaged: put it aside, then begin a new one";
+    case SQLITE_FULL: return "cannot be written: " + systemWords(ENOSPC);
+    case SQLITE_READONLY: return msg("it or its folder is read-only");
+    case SQLITE_CANTOPEN: return msg("cannot be opened") + systemText(handle);
+    case SQLITE_IOERR: return msg("cannot be read or written") + systemText(handle);
+    case SQLITE_NOTADB: return msg("is not a database");
+    case SQLITE_CORRUPT: return msg("is damaged; put it aside, then begin a new one");
     default: return handle == nullptr ? "no memory" : sqlite3_errmsg(handle);
   }
 }
@@ -152,7 +154,7 @@ Sqlite::Sqlite(const std::filesystem::path& path, Mode mode) : file(path) {
   if (code == SQLITE_CANTOPEN && writes && ::access(folderOf(path).c_str(), W_OK) != 0 &&
       errno != ENOENT) {
     throw StoreError(path.native() +
-                     ": cannot be made in its folder: " + std::generic_category().message(errno));
+                     ": cannot be made in its folder: " + systemWords(errno));
   }
   check(code);
   sqlite3_extended_result_codes(opened, 1);

@@ -14,9 +14,11 @@ namespace {
 
 constexpr std::size_t kDayLetters = 10;  // of "2026-11-21T07:00:00Z"
 
-bool hasFail(const RunRecord& run) {
-  return std::ranges::any_of(
-      run.verdicts, [](const VerdictRecord& each) { return each.result.verdict == Verdict::Fail; });
+// A test that failed, or that the operator began anew.
+bool hasSecondTry(const RunRecord& run) {
+  return std::ranges::any_of(run.verdicts, [](const VerdictRecord& each) {
+    return each.result.verdict == Verdict::Fail || each.result.reason == Reason::Retry;
+  });
 }
 
 // Of all its tests the newest verdict is PASS, and no test of the plan is without one.
@@ -30,7 +32,7 @@ bool isPassed(const RunRecord& run) {
 // The runs of a unit.
 struct Unit {
   const RunRecord* finished = nullptr;  // the newest
-  bool everFailed = false;
+  bool hadSecondTry = false;
 };
 
 std::vector<Unit> unitsOf(std::span<const RunRecord> runs) {
@@ -39,7 +41,7 @@ std::vector<Unit> unitsOf(std::span<const RunRecord> runs) {
     const bool isKnown = !run.start.unit.empty();
     Unit& unit = units[isKnown ? "unit " + run.start.unit : "run " + run.id];
     if (run.state == RunState::Finished) unit.finished = &run;
-    unit.everFailed = unit.everFailed || hasFail(run);
+    unit.hadSecondTry = unit.hadSecondTry || hasSecondTry(run);
   }
   std::vector<Unit> judged;
   for (const auto& [name, unit] : units) {
@@ -49,9 +51,9 @@ std::vector<Unit> unitsOf(std::span<const RunRecord> runs) {
 }
 
 void countUnits(std::span<const RunRecord> runs, Statistics& all) {
-  for (const auto& [run, everFailed] : unitsOf(runs)) {
+  for (const auto& [run, hadSecondTry] : unitsOf(runs)) {
     const bool isGood = isPassed(*run);
-    const Yield one = {1, isGood ? 1 : 0, isGood && !everFailed ? 1 : 0};
+    const Yield one = {1, isGood ? 1 : 0, isGood && !hadSecondTry ? 1 : 0};
     all.total.add(one);
     all.days[utcText(run->start.started).substr(0, kDayLetters)].add(one);
     all.stations[run->start.station].add(one);

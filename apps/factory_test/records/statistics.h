@@ -13,7 +13,8 @@
 namespace factory_test {
 
 /// Units are counted by their newest finished run. One passed when that run gave every test of its
-/// plan a PASS in the end; at first, when no run ever gave it a FAIL. A run without a serial number
+/// plan a PASS in the end; at first, when no run ever gave it a FAIL, nor was a
+/// test begun anew. A run without a serial number
 /// is a unit of its own.
 struct Yield {
   int units = 0;

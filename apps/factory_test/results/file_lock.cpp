@@ -7,9 +7,9 @@
 
 #include <array>
 #include <cerrno>
-#include <system_error>
 #include <utility>
 
+#include "results/system_words.h"
 #include "results/whole_file.h"
 
 namespace factory_test {
@@ -48,7 +48,7 @@ int lock(const fs::path& path, std::string& reason) {
   for (;;) {
     const int descriptor = ::open(path.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kMode);
     if (descriptor < 0) {
-      reason = "cannot be written: " + std::generic_category().message(errno);
+      reason = "cannot be written: " + systemWords(errno);
       return descriptor;
     }
     if (::flock(descriptor, LOCK_EX | LOCK_NB) == 0) {
@@ -57,7 +57,7 @@ int lock(const fs::path& path, std::string& reason) {
       continue;
     }
     reason = errno == EWOULDBLOCK ? "is in use by another program" + holderOf(descriptor)
-                                  : "cannot be locked: " + std::generic_category().message(errno);
+                                  : "cannot be locked: " + systemWords(errno);
     ::close(descriptor);
     return -1;
   }

@@ -89,6 +89,7 @@ bool ResultBook::begin(const RunStart& start, std::string& error) {
   if (database) {
     std::vector<TestResult> resumed;
     if (!database->startRun(wanted, files.resume, resumed, error)) return false;
+    isBegun = false;  // until the files say so, too
     beginAnew();
     for (TestResult& result : resumed) put(std::move(result));
   } else if (!goOn(wanted, error)) {
@@ -108,8 +109,9 @@ bool ResultBook::goOn(RunStart& wanted, std::string& error) {
             stranger + "; --new-run begins anew";
     return false;
   }
+  const bool isRehearsal = wanted.planName.ends_with(kRehearsal);
   const bool isThrough = state == RunState::Finished || isComplete(wanted.tests);
-  if (isStale || (isThrough && files.resume == Resume::Unfinished)) {
+  if (isStale || isRehearsal || (isThrough && files.resume == Resume::Unfinished)) {
     beginAnew();
   } else if (!kept.empty() && wanted.unit.empty()) {
     wanted.unit = begun.unit;
@@ -130,7 +132,7 @@ bool ResultBook::isComplete(const std::vector<std::string>& tests) const {
 }
 
 bool ResultBook::startUnit(const RunStart& start, std::string& error) {
-  return saveAgain(error) && begin(start, error);
+  return saveAgain(error) && saveFiles(error) && begin(start, error);
 }
 
 bool ResultBook::saveFiles(std::string& error) {

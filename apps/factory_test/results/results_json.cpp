@@ -79,8 +79,8 @@ bool readAttempt(const json& value, TestResult& result) {
 
 bool readReason(const json& value, TestResult& result) {
   if (value.is_null()) return true;
-  for (const auto reason : {Reason::Operator, Reason::Limit, Reason::TimeOut, Reason::Rehearsal}) {
-    if (value != reasonName(reason)) continue;
+  for (const Reason reason : kReasons) {
+    if (reason == Reason::Unknown || value != reasonName(reason)) continue;
     result.reason = reason;
     return true;
   }
@@ -170,7 +170,7 @@ constexpr auto kFileMembers = std::to_array<Member<ResultFile>>({
 bool checkVersion(const json& root, std::string& reason) {
   const json& member = memberOf(root, "version");
   int version = kFirstVersion;
-  if (!member.is_null() && !readCount(member, version)) {
+  if (!member.is_null() && (!readCount(member, version) || version < kFirstVersion)) {
     reason = "has no valid \"version\"";
     return false;
   }

@@ -21,8 +21,8 @@
 ///     }
 ///
 /// Members may come in any order; unknown ones are passed over. "verdict" is "PASS", "FAIL" or
-/// "none", "started" UTC, a figure 0 to INT_MAX, "attempt" 1 or more. Of a FAIL "reason" may say
-/// why, of any verdict "operator" who gave it. "unit" is the serial number
+/// "none", "started" UTC, a figure 0 to INT_MAX, "attempt" 1 or more. Of a FAIL, or of
+/// "none", "reason" may say why, of any verdict "operator" who gave it. "unit" is the serial number
 /// of what was tested, left out where nobody said one; "plan" is the one by which it was tested, by
 /// its name and its hash; "state" is "finished" once the plan is through, and left out before;
 /// "least" and "most" are left out where there is no limit. Version 1, which says no version, has

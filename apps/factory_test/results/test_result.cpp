@@ -32,6 +32,7 @@ const char* reasonName(Reason reason) {
     case Reason::Limit: return "limit";
     case Reason::TimeOut: return "time-out";
     case Reason::Rehearsal: return "rehearsal";
+    case Reason::Retry: return "retry";
     default: return "";
   }
 }

@@ -1,6 +1,7 @@
 /// What a finished test leaves behind.
 #pragma once
 
+#include <array>
 #include <chrono>
 #include <optional>
 #include <string>
@@ -16,11 +17,16 @@ enum class Verdict { None, Pass, Fail };
 const char* verdictName(Verdict verdict);
 
 /// Why a test failed: the operator said so, a value was outside its limits or missing, its time was
-/// over, or the failure was rehearsed. Unknown for every other verdict, and for results of older
-/// programs.
-enum class Reason { Unknown, Operator, Limit, TimeOut, Rehearsal };
+/// over, or the failure was rehearsed. Retry is why it has no verdict: the operator began it anew.
+/// Unknown for every other verdict, and for results of older programs.
+enum class Reason { Unknown, Operator, Limit, TimeOut, Rehearsal, Retry };
 
-/// The word of the files for it: "operator", "limit", "time-out" or "rehearsal"; empty for Unknown.
+/// All of them.
+inline constexpr std::array kReasons = {Reason::Unknown, Reason::Operator,  Reason::Limit,
+                                        Reason::TimeOut, Reason::Rehearsal, Reason::Retry};
+
+/// The word of the files for it: "operator", "limit", "time-out", "rehearsal" or "retry"; empty for
+/// Unknown.
 const char* reasonName(Reason reason);
 
 /// A value that a test delivered.

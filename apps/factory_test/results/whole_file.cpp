@@ -11,6 +11,9 @@
 #include <fstream>
 #include <system_error>
 
+#include "language/language.h"
+#include "results/system_words.h"
+
 namespace factory_test {
 
 namespace fs = std::filesystem;
@@ -22,7 +25,7 @@ std::string readInto(std::string& bytes, const fs::path& file, std::size_t mostM
   constexpr uintmax_t kMiB = uintmax_t{1} << 20;
   std::error_code failure;
   const auto status = fs::status(file, failure);
-  if (failure) return failure.message();
+  if (failure) return systemWords(failure.value());
   if (!fs::is_regular_file(status)) return "is not a regular file";
   const uintmax_t size = fs::file_size(file, failure);
   if (size > mostMiB * kMiB) {
@@ -75,7 +78,7 @@ bool replaceFile(const fs::path& file, std::string_view bytes, std::string& erro
   std::error_code failure;
   const bool exists = fs::exists(file, failure);
   if (exists && !fs::is_regular_file(file, failure)) {  // a device must not give way to a file
-    error = file.native() + ": is not a regular file";
+    error = file.native() + ": " + msg("is not a regular file");
     return false;
   }
   const fs::path target = placeOfFile(file);
@@ -85,7 +88,7 @@ bool replaceFile(const fs::path& file, std::string_view bytes, std::string& erro
       ::rename(temporary.c_str(), target.c_str()) == 0) {
     return true;
   }
-  error = file.native() + ": cannot be written: " + std::generic_category().message(errno);
+  error = file.native() + ": " + msg("cannot be written") + ": " + systemWords(errno);
   ::unlink(temporary.c_str());
   return false;
 }
