@@ -76,7 +76,6 @@ void Widget::setActive(int on) {
 unsigned int Widget::setBlink(int on, unsigned int color) {
   blink = on != 0 ? 1 : 0;
   if (blink == 0) return 0;
-  blinkNext = 0;
   blinkRuns = false;
   blinkCount = 0;
   blinkColor = color;

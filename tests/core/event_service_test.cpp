@@ -107,7 +107,7 @@ TEST(EventHitTest, TestsThePoint) {
   EXPECT_EQ(hits({{165, 275}, {85, 185}}), "..") << "beside a corner";
   EXPECT_EQ(hits({{100, 230}, {80, 230}}, {100, 200, 0, 60, 0}), "..");
   EXPECT_EQ(hits({{100, 230}, {80, 230}}, {100, 200, -50, 60, 0}), "..");
-  EXPECT_EQ(hits({{120, 230}, {121, 230}, {120, 231}}, {120, 230, 1, 1, 0}), "#..");
+  EXPECT_EQ(hits({{120, 230}, {121, 230}, {120, 229}}, {120, 230, 1, 1, 0}), "#..");
   constexpr int kMin = INT_MIN;
   constexpr int kMax = INT_MAX;
   EXPECT_EQ(hits({{kMin, kMin}, {-2, -2}, {0, kMax}}, {kMin, kMin, kMax, kMax, 0}), "##.");

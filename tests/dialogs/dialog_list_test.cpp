@@ -54,6 +54,7 @@ TEST_F(DialogListTest, RefusesRowsThatAreTooLongTooManyOrLate) {
   EXPECT_EQ(dialog.addIndex(nullptr), -1);
   EXPECT_EQ(dialog.addIndex(kTooLong.c_str() + 1), -1);
   for (const int row : {0, 1, 2, 3, 4, 5, 6, 7, -1}) EXPECT_EQ(dialog.addIndex("row"), row);
+  dialog.setText(8, "no row");
   EXPECT_TRUE(shown(dialog).empty()) << "not finished";
   dialog.initIndex();
   EXPECT_EQ(dialog.initFinish(0), 0);
@@ -73,6 +74,7 @@ TEST_F(DialogListTest, ReplacesTheTextOfARow) {
   for (const int start : {1, 128}) dialog.setText(0, kTooLong.c_str() + start);
   dialog.initFinish(0);
   EXPECT_EQ(words(shown(dialog)), "Title|" + kTooLong.substr(2) + "|CANCEL|OK|");
+  EXPECT_STREQ(dialog.rows[2].text.text, "");
   EXPECT_STREQ(dialog.rows[1].text.text, "nowhere") << "behind the last one it is kept unseen";
   EXPECT_EQ(places({shown(dialog).at(8)}), "2,2 96x96|") << "a mark, though there is no layout";
 }

@@ -29,6 +29,15 @@ TEST_F(DialogNewTest, TextsEndAtTheFirstNull) {
   EXPECT_EQ(shown(dialog).at(5).text, (DrawnText{kTooLong.substr(1), 7, 5, 70}));
 }
 
+TEST_F(DialogNewTest, InitStartsOverWithOneStar) {
+  DialogNew dialog("Title", 5, 7);
+  for (const char* const stars : {"*", "**", "*"}) {
+    dialog.updateProgress(platform().ticks += 101);
+    EXPECT_EQ(platform().takeDrawings().back().text.text, stars);
+    if (std::string_view(stars) == "**") dialog.DialogNew_init();
+  }
+}
+
 TEST_F(DialogNewTest, TheBodyBlinks) {
   DialogNew dialog("Title", 5, 7);
   dialog.setBlink(1, 9);

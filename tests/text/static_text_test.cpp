@@ -18,6 +18,11 @@ struct Viewer : MW::StaticText {
   using StaticText::top_index, StaticText::w_count;
   explicit Viewer(SKIA_Rect area, SKIA_Text looks = kLooks, bool numbers = true)
       : StaticText(&area, &looks, numbers, true, true) {}
+  // By hand, which reaches places that no event does.
+  void pressLongAt(Spot spot) {
+    MW::event_data event = pointerEvent(MW::kEventLongPress, spot);
+    onPressLong(&event);
+  }
   std::string rows(int top) {
     top_index = top;
     return words(shown(*this));
@@ -105,12 +110,13 @@ TEST_F(StaticTextTest, ALongPressOnTheBarScrollsAClock) {
                                                              {{422, 749}, 400},
                                                              {{422, 60}, 50}});
   for (const auto& [touch, top] : kTouches) {
-    MW::event_data event = pointerEvent(MW::kEventLongPress, touch);
-    viewer.onPressLong(&event);
+    viewer.pressLongAt(touch);
     EXPECT_EQ(places({shown(viewer).back()}), "429," + std::to_string(top) + " 14x350|");
   }
   viewer.setRect(0, &kFourRows);
   EXPECT_EQ(viewer.w_count, 0) << "it knows of its numbers by now";
+  viewer.setText("ab");
+  EXPECT_EQ(viewer.rows(0), "00001:|a|") << "at least a byte";
 }
 
 TEST_F(StaticTextTest, AViewOfFiguresLogsAllRowsUpToItsEnd) {
@@ -207,6 +213,12 @@ const PlayTests kPlays = {
                    {press(900, 900), lookAtHold(), keyDown(5)}, "+ <held 0> +"),
 };
 
+TEST_F(StaticTextTest, ALongPressWhereNoBarHasRoomIsLogged) {
+  Viewer viewer({});
+  viewer.pressLongAt({0, 0});
+  EXPECT_EQ(platform().takeLog().back().message, "[STATICTEXT] onPressLong is not correct!!");
+}
+
 TEST_F(StaticTextTest, NoSizeLeadsOutOfBounds) {
   SKIA_Text looks = {};
   std::ranges::fill(looks.text, 'x');  // no NUL
@@ -216,10 +228,7 @@ TEST_F(StaticTextTest, NoSizeLeadsOutOfBounds) {
       Viewer viewer({INT_MAX, INT_MIN, length, length, 0}, looks);
       viewer.line_search(nullptr);
       viewer.found(std::string(10'000, 'y'), "yyy");
-      for (const int y : {INT_MIN, INT_MAX}) {
-        MW::event_data event = pointerEvent(MW::kEventLongPress, {INT_MAX, y});
-        viewer.onPressLong(&event);
-      }
+      for (const int y : {INT_MIN, INT_MAX}) viewer.pressLongAt({INT_MAX, y});
       EXPECT_EQ(shown(viewer).front().rect.h, length);
     }
   }

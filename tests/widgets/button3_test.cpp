@@ -39,6 +39,8 @@ TEST_F(Button3Test, VerdictsGoByThePosition) {
       {Button3::kBottomLeft, "|PASS|"}, {Button3::kBottomCentre, "|RETRY|"}, {3, "|FAIL|"}};
   for (const auto& [position, drawn] : verdicts)
     EXPECT_EQ(words(shown(*std::make_unique<Button3>(position))), drawn);
+  Button3 button(Button3::kBottomLeft);
+  EXPECT_EQ(shown(button).front().text, (DrawnText{"", MW::kColorBlue, 0, 0}));
 }
 
 // The new length goes to the button box's own text, which stays empty.

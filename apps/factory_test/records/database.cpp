@@ -107,7 +107,8 @@ bool Database::takeAborted(const RunStart& start) {
       "select number, id, state = 'aborted' and plan = ? and software = ? from runs "
       "where unit is ? and (select name not like '%' || ? from plans where hash = plan) "
       "order by number desc limit 1",
-      {start.planHash, start.software, orNull(start.unit), std::string(kRehearsal)}, [&](const Cells& row) {
+      {start.planHash, start.software, orNull(start.unit), std::string(kRehearsal)},
+      [&](const Cells& row) {
         const std::int64_t newest = std::stoll(row[0].value_or("0"));
         if (row[2] != "1" || !locks.take(newest)) return;
         number = newest;
