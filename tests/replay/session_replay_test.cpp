@@ -196,7 +196,7 @@ TEST_F(SessionReplay, EndsWithTheReasonOfAFailure) {
   EXPECT_EQ(readAll(folder / "stderr"), writeTrace("") + ":2: unknown step 'dance'\n");
   EXPECT_EQ(play(folder / "gone.trace"), 2);
   EXPECT_EQ(play(writeTrace("screen 10x10\n"), {{"BRIMOL_SCREEN", "20x20"}}), 2);
-  EXPECT_EQ(play(writeTrace("key back\nkey select\nwait 5000\n")), 1);
+  EXPECT_EQ(play(writeTrace("key back\nwait 800\nkey select\nwait 5000\n")), 1);
   EXPECT_NE(readAll(folder / "stderr").find("ended before this step"), std::string::npos);
 }
 

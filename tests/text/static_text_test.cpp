@@ -18,6 +18,11 @@ struct Viewer : MW::StaticText {
   using StaticText::top_index, StaticText::w_count;
   explicit Viewer(SKIA_Rect area, SKIA_Text looks = kLooks, bool numbers = true)
       : StaticText(&area, &looks, numbers, true, true) {}
+  // By hand, which reaches places that no event does.
+  void pressLongAt(Spot spot) {
+    MW::event_data event = pointerEvent(MW::kEventLongPress, spot);
+    onPressLong(&event);
+  }
   std::string rows(int top) {
     top_index = top;
     return words(shown(*this));
@@ -105,8 +110,7 @@ TEST_F(StaticTextTest, ALongPressOnTheBarScrollsAClock) {
                                                              {{422, 749}, 400},
                                                              {{422, 60}, 50}});
   for (const auto& [touch, top] : kTouches) {
-    MW::event_data event = pointerEvent(MW::kEventLongPress, touch);
-    viewer.onPressLong(&event);
+    viewer.pressLongAt(touch);
     EXPECT_EQ(places({shown(viewer).back()}), "429," + std::to_string(top) + " 14x350|");
   }
   viewer.setRect(0, &kFourRows);
@@ -211,8 +215,7 @@ const PlayTests kPlays = {
 
 TEST_F(StaticTextTest, ALongPressWhereNoBarHasRoomIsLogged) {
   Viewer viewer({});
-  MW::event_data event = pointerEvent(MW::kEventLongPress, {0, 0});
-  viewer.onPressLong(&event);
+  viewer.pressLongAt({0, 0});
   EXPECT_EQ(platform().takeLog().back().message, "[STATICTEXT] onPressLong is not correct!!");
 }
 
@@ -225,10 +228,7 @@ TEST_F(StaticTextTest, NoSizeLeadsOutOfBounds) {
       Viewer viewer({INT_MAX, INT_MIN, length, length, 0}, looks);
       viewer.line_search(nullptr);
       viewer.found(std::string(10'000, 'y'), "yyy");
-      for (const int y : {INT_MIN, INT_MAX}) {
-        MW::event_data event = pointerEvent(MW::kEventLongPress, {INT_MAX, y});
-        viewer.onPressLong(&event);
-      }
+      for (const int y : {INT_MIN, INT_MAX}) viewer.pressLongAt({INT_MAX, y});
       EXPECT_EQ(shown(viewer).front().rect.h, length);
     }
   }

@@ -30,13 +30,13 @@ class StuckTouchPage : public MeasurePage {
 
  protected:
   void follow(const Input& input) override {
-    if (input.kind != Input::Kind::Move) {
-      if (input.kind == Input::Kind::Press) touches += 1;
-      return;
-    }
-    // One that was there before the page: the finger that chose it has been lifted by now.
-    if (isOfAnOldTouch(input) && began && input.ticks - *began >= kLiftMs)
+    const bool isLate = began && input.ticks - *began >= kLiftMs;
+    if (input.kind == Input::Kind::Press) {
+      touches += 1;
+    } else if (isOfAnOldTouch(input) && isLate) {
+      // It was there before the page: the finger that chose it has been lifted by now.
       touches = std::max(touches, 1.0);
+    }
   }
 
   void updateAt(uint32_t now) override {
