@@ -30,8 +30,7 @@ RunLocks::RunLocks(const std::filesystem::path& database) {
   const std::filesystem::path file = placeOfFile(database).concat(".lock");
   descriptor = ::open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kMode);
   if (descriptor >= 0) return;
-  throw StoreError(file.native() +
-                   ": cannot be written: " + systemWords(errno));
+  throw StoreError(file.native() + ": cannot be written: " + systemWords(errno));
 }
 
 RunLocks::~RunLocks() { ::close(descriptor); }

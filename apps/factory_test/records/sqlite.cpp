@@ -153,8 +153,7 @@ Sqlite::Sqlite(const std::filesystem::path& path, Mode mode) : file(path) {
   // SQLite then says that there is no such file.
   if (code == SQLITE_CANTOPEN && writes && ::access(folderOf(path).c_str(), W_OK) != 0 &&
       errno != ENOENT) {
-    throw StoreError(path.native() +
-                     ": cannot be made in its folder: " + systemWords(errno));
+    throw StoreError(path.native() + ": cannot be made in its folder: " + systemWords(errno));
   }
   check(code);
   sqlite3_extended_result_codes(opened, 1);

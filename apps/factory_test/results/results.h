@@ -52,8 +52,9 @@ class ResultBook {
     return open(Keeping{.json = json}, {}, error);
   }
 
-  /// Saves what is left, ends the run, and begins one of another unit or by another operator, as open() does. Without a
-  /// database that works as long as there is no result, since a file holds those of one unit.
+  /// Saves what is left, ends the run, and begins one of another unit or by another operator, as
+  /// open() does. Without a database that works as long as there is no result, since a file holds
+  /// those of one unit.
   bool startUnit(const RunStart& start, std::string& error);
   const RunStart& run() const { return begun; }
   /// False while the first unit is still to be told, and once a startUnit() ended the run before,
