@@ -8,12 +8,12 @@
 
 #include "paths.h"
 #include "runs.h"
+#include "support/eventually.h"
 
 namespace brimol::replay {
 namespace {
 
 using testing::HasSubstr;
-using testing::Not;
 namespace fs = std::filesystem;
 
 class Program : public InFolder {
@@ -32,14 +32,11 @@ class Program : public InFolder {
   }
   // The process whose number the application wrote: one that was killed takes a moment to go.
   bool comesToItsEnd(const fs::path& output) const {
-    constexpr int kMostLooks = 6000;
     const std::string process = "/proc/" + std::to_string(std::stoi(bytesOf(folder / output)));
-    for (int look = 0; look < kMostLooks; ++look) {
+    return test::eventually([&] {
       const std::string state = bytesOf(process + "/stat");
-      if (state.empty() || state.find(") Z ") != std::string::npos) return true;
-      ::usleep(10'000);
-    }
-    return false;
+      return state.empty() || state.find(") Z ") != std::string::npos;
+    });
   }
 
   const fs::path trace = write("menu.trace", "brimol-trace 1\n");
