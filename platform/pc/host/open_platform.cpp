@@ -16,12 +16,26 @@ namespace {
 // Held while the platform opens or closes, so that one does not meet the other half-way.
 constinit std::mutex turnMutex;
 constinit std::mutex openedMutex;  // guards opened; held for no more than a copy
-constinit std::shared_ptr<Platform> opened;
+// Never deleted: an application may leave its threads drawing while the process ends.
+std::shared_ptr<Platform>& opened = *new std::shared_ptr<Platform>;
 
 void setOpened(std::shared_ptr<Platform> platform) {
   const std::lock_guard<std::mutex> lock(openedMutex);
   opened = std::move(platform);
 }
+
+// Closes what the application left open.
+struct ProcessEnd {
+  ProcessEnd() = default;
+  ProcessEnd(const ProcessEnd&) = delete;
+  ProcessEnd& operator=(const ProcessEnd&) = delete;
+  ~ProcessEnd() {
+    const std::shared_ptr<Platform> left = openedPlatform();
+    setOpened(nullptr);
+    if (left) left->close();
+  }
+};
+const ProcessEnd processEnd;
 
 }  // namespace
 

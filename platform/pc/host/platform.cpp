@@ -4,6 +4,7 @@
 #include <cstdlib>
 #include <ctime>
 #include <filesystem>
+#include <system_error>
 #include <utility>
 
 #include "clock/process_clock.h"
@@ -43,12 +44,18 @@ SKIA_Item veilOver(Size screen, int percent) {
   return {SKIA_BOX, {0, 0, screen.w, screen.h, alpha << kAlphaShift}, {}, {}};
 }
 
+std::string threadProblem(const std::system_error& failure) {
+  return std::string("a thread cannot be started: ") + failure.code().message();
+}
+
 OpenedDisplay openChosen(const Settings& settings, InputTranslator& input,
-                         const InputService& service) {
+                         const InputService& service) try {
   if (settings.display == DisplayChoice::Browser) {
     return BrowserDisplay::open(settings.screen, settings.listen, input, service);
   }
   return openDisplay(settings.display, settings.screen, input, service);
+} catch (const std::system_error& failure) {
+  return {nullptr, threadProblem(failure)};
 }
 
 constinit thread_local bool isPlatformThread = false;
@@ -72,9 +79,14 @@ std::shared_ptr<Platform> Platform::open(const Settings& settings, InputService&
   std::shared_ptr<Platform> platform(new Platform(settings, service));
   std::promise<std::string> opened;
   std::future<std::string> outcome = opened.get_future();
-  platform->thread = std::thread([raw = platform.get(), answer = std::move(opened)]() mutable {
-    raw->run(std::move(answer));
-  });
+  try {
+    platform->thread = std::thread([raw = platform.get(), answer = std::move(opened)]() mutable {
+      raw->run(std::move(answer));
+    });
+  } catch (const std::system_error& failure) {
+    error = threadProblem(failure);
+    return nullptr;
+  }
   error = outcome.get();
   return error.empty() ? platform : nullptr;
 }
