@@ -161,7 +161,7 @@ std::string sameFiles(const Options& options) {
     }
   }
   for (const NamedFile& named : files) {
-    const std::string wrong = named.second.empty() ? "" : besideOthers(named, options);
+    std::string wrong = named.second.empty() ? "" : besideOthers(named, options);
     if (!wrong.empty()) return wrong;
   }
   return "";
