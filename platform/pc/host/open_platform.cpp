@@ -1,6 +1,7 @@
 #include "host/open_platform.h"
 
 #include <mutex>
+#include <system_error>
 #include <utility>
 
 #include "clock/inside_wait.h"
@@ -37,9 +38,26 @@ struct ProcessEnd {
 };
 const ProcessEnd processEnd;
 
+std::string threadProblem(const std::system_error& failure) {
+  return "a thread cannot be started: " + failure.code().message();
+}
+
+// Null, with the reason in `error`, and neither is open.
+std::shared_ptr<Platform> openDisplayAndInput(const Settings& settings, std::string& error) {
+  InputService& input = inputService();
+  input.open();
+  try {
+    if (auto platform = Platform::open(settings, input, error)) return platform;
+  } catch (const std::system_error& failure) {
+    error = threadProblem(failure);
+  }
+  input.close();
+  return nullptr;
+}
+
 }  // namespace
 
-std::string openPlatform() {
+std::string openPlatform() try {
   if (auto* const clock = turnClock()) clock->takePart();
   const InsideWait wait(turnClock());
   const std::lock_guard<std::mutex> turn(turnMutex);
@@ -53,16 +71,14 @@ std::string openPlatform() {
     wanted.settings.density = played->dotsPerInch();
   }
   if (!wanted.error.empty()) return wanted.error;
-  InputService& input = inputService();
-  input.open();
   std::string error;
-  if (auto platform = Platform::open(wanted.settings, input, error)) {
-    if (played != nullptr) played->begin(*platform);
-    setOpened(std::move(platform));
-  } else {
-    input.close();
-  }
-  return error;
+  const std::shared_ptr<Platform> platform = openDisplayAndInput(wanted.settings, error);
+  if (!platform) return error;
+  if (played != nullptr) played->begin(*platform);
+  setOpened(platform);
+  return {};
+} catch (const std::system_error& failure) {
+  return threadProblem(failure);  // the clock's
 }
 
 void closePlatform() {

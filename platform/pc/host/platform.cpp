@@ -3,6 +3,7 @@
 #include <cstdio>
 #include <cstdlib>
 #include <ctime>
+#include <exception>
 #include <filesystem>
 #include <system_error>
 #include <utility>
@@ -44,18 +45,12 @@ SKIA_Item veilOver(Size screen, int percent) {
   return {SKIA_BOX, {0, 0, screen.w, screen.h, alpha << kAlphaShift}, {}, {}};
 }
 
-std::string threadProblem(const std::system_error& failure) {
-  return std::string("a thread cannot be started: ") + failure.code().message();
-}
-
 OpenedDisplay openChosen(const Settings& settings, InputTranslator& input,
-                         const InputService& service) try {
+                         const InputService& service) {
   if (settings.display == DisplayChoice::Browser) {
     return BrowserDisplay::open(settings.screen, settings.listen, input, service);
   }
   return openDisplay(settings.display, settings.screen, input, service);
-} catch (const std::system_error& failure) {
-  return {nullptr, threadProblem(failure)};
 }
 
 constinit thread_local bool isPlatformThread = false;
@@ -79,14 +74,9 @@ std::shared_ptr<Platform> Platform::open(const Settings& settings, InputService&
   std::shared_ptr<Platform> platform(new Platform(settings, service));
   std::promise<std::string> opened;
   std::future<std::string> outcome = opened.get_future();
-  try {
-    platform->thread = std::thread([raw = platform.get(), answer = std::move(opened)]() mutable {
-      raw->run(std::move(answer));
-    });
-  } catch (const std::system_error& failure) {
-    error = threadProblem(failure);
-    return nullptr;
-  }
+  platform->thread = std::thread([raw = platform.get(), answer = std::move(opened)]() mutable {
+    raw->run(std::move(answer));
+  });
   error = outcome.get();
   return error.empty() ? platform : nullptr;
 }
@@ -151,7 +141,13 @@ void Platform::run(std::promise<std::string> opened) {
   isPlatformThread = true;
   if (auto* const clock = turnClock()) clock->stayOutside();
   InputTranslator input(settings.screen, service);
-  const OpenedDisplay outcome = openChosen(settings, input, service);
+  OpenedDisplay outcome;
+  try {
+    outcome = openChosen(settings, input, service);
+  } catch (const std::system_error&) {
+    opened.set_exception(std::current_exception());
+    return;
+  }
   if (!outcome.display) {
     opened.set_value(outcome.error);
     return;
