@@ -35,7 +35,7 @@ Toastbox::~Toastbox() { leaveWindow(); }
 void Toastbox::init(const SKIA_Rect* area, const SKIA_Text* line, const SKIA_Text* message) {
   setActive(0);
   setType(kBaseLayer);
-  setRect(lines, area);
+  Toastbox::setRect(lines, area);
   {
     const std::lock_guard guard(stateLock);
     hideAt = 0;

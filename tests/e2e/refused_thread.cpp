@@ -16,6 +16,7 @@ bool isRefused() {
 
 }  // namespace
 
+// NOLINTNEXTLINE(readability-inconsistent-declaration-parameter-name): the system's are reserved
 extern "C" [[gnu::visibility("default")]] int pthread_create(pthread_t* thread,
                                                              const pthread_attr_t* attributes,
                                                              void* (*routine)(void*),
