@@ -46,6 +46,7 @@ std::string openPlatform() {
     if (played != nullptr) played->begin(*platform);
     setOpened(std::move(platform));
   } else {
+    if (played != nullptr) played->giveUp();
     input.close();
   }
   return error;
