@@ -76,10 +76,10 @@ std::string wrongRecords(const Options& options) {
   }
   if (!options.serial.empty() && !isSerial(options.serial, why)) return "--serial: " + why;
   if (!options.monkey.empty() && isKept(options)) {
-    return "--monkey judges nothing: neither --database, --results nor --junit";
+    return "--monkey judges nothing, so it takes none of --database, --results and --junit";
   }
   if (!options.shot.empty() && !(options.database.empty() && options.junit.empty())) {
-    return "--shot keeps nothing: neither --database nor --junit";
+    return "--shot keeps nothing, so it takes neither --database nor --junit";
   }
   if (options.newRun && options.database.empty() && options.results.empty()) {
     return "--new-run needs --database or --results";
