@@ -21,7 +21,7 @@ using MW::Window;
 // A call of the table of display items.
 void callItems(Arguments& from) {
   const int index = from.take<int>();
-  switch (from.below(10)) {
+  switch (from.below(12)) {
     case 0: WidgetList::init(); break;
     case 1: WidgetList::destroy(); break;
     case 2:
@@ -38,6 +38,13 @@ void callItems(Arguments& from) {
       break;
     }
     case 8: WidgetList::setRect(index, from.take<SKIA_Rect>()); break;
+    case 9: {
+      const auto text = from.take<unsigned int>();
+      const auto fill = from.take<unsigned int>();
+      WidgetList::setColor(index, text, fill, from.take<unsigned int>());
+      break;
+    }
+    case 10: WidgetList::setFontSize(index, from.take<int>()); break;
     default: WidgetList::hideShadow(); break;
   }
 }

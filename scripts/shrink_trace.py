@@ -1,9 +1,10 @@
 #!/usr/bin/env python3
-"""Makes a trace that crashes a program as short as it goes: shrink_trace.py TRACE SHORT -- PROGRAM [ARGUMENT...]
+"""Makes a trace that crashes or hangs a program as short as it goes: shrink_trace.py TRACE SHORT -- PROGRAM [ARGUMENT...]
 
 The program is run under ever shorter traces (BRIMOL_TRACE, without a window). A run counts as the same failure
-if it ends by the same signal, or, with --exit CODE before the names, with that exit code. What is left goes to
-SHORT: without any line of it the failure does not come.
+if it ends by the same signal, or, before the names, with --exit CODE, with that exit code, or, with --hangs, if it has
+not ended after --seconds. What is left goes to SHORT: without any line of it the failure does not come. What a monkey
+judges of a session that it plays itself, such as that nothing new is shown, a trace does not bring back.
 """
 
 import argparse
@@ -20,8 +21,8 @@ FEW = 8  # steps of one gesture
 
 
 class Shrinker:
-    def __init__(self, program, code, seconds):
-        self.program, self.code, self.seconds = program, code, seconds
+    def __init__(self, program, wanted):
+        self.program, self.code, self.hangs, self.seconds = program, wanted.exit, wanted.hangs, wanted.seconds
         self.folder = tempfile.TemporaryDirectory()
         self.trace = pathlib.Path(self.folder.name, "try.trace")
         self.runs = 0
@@ -35,6 +36,8 @@ class Shrinker:
             ended = subprocess.run(self.program, env=environment, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL,
                                    stdin=subprocess.DEVNULL, timeout=self.seconds, check=False).returncode
         except subprocess.TimeoutExpired:
+            return self.hangs
+        if self.hangs:
             return False
         if self.code is None and ended < 0:
             self.code = ended  # from here on the same signal
@@ -95,8 +98,10 @@ def read(path):
 
 def main():
     parser = argparse.ArgumentParser(description=__doc__.split(":")[0], usage=__doc__.splitlines()[0].split(": ")[1])
-    parser.add_argument("--exit", type=int, help="the exit code of the failure, instead of a signal")
-    parser.add_argument("--seconds", type=float, default=60, help="how long a run may take")
+    failure = parser.add_mutually_exclusive_group()
+    failure.add_argument("--exit", type=int, help="the exit code of the failure, instead of a signal")
+    failure.add_argument("--hangs", action="store_true", help="the failure is that a run takes longer than --seconds")
+    parser.add_argument("--seconds", type=float, default=60, help="how long a run may take; 60")
     parser.add_argument("trace", type=pathlib.Path)
     parser.add_argument("short", type=pathlib.Path)
     parser.add_argument("program", nargs="+")
@@ -105,7 +110,7 @@ def main():
         head, steps = read(wanted.trace)
     except (OSError, UnicodeDecodeError) as error:
         sys.exit(f"shrink_trace.py: {wanted.trace}: {getattr(error, 'strerror', None) or error}")
-    shrinker = Shrinker(wanted.program, wanted.exit, wanted.seconds)
+    shrinker = Shrinker(wanted.program, wanted)
     if not shrinker.fails(head, steps):
         sys.exit(f"shrink_trace.py: {wanted.trace}: the program does not fail under it")
     head = shrinker.shorten_end(head, steps)

@@ -3,59 +3,20 @@
 #include <MW/MW.h>
 
 #include <array>
-#include <tuple>
 #include <utility>
 
-#include "listeners.h"
+#include "widget_operations.h"
 
 namespace brimol::test {
+
+std::function<void()> whenTold;
 
 namespace {
 
 using Made = std::unique_ptr<MW::Widget>;
-using Operations = std::vector<Operation>;
 using Area = const SKIA_Rect*;
 using Text = const SKIA_Text*;
 using Chars = const char*;
-
-template <typename Callee, typename... Parameters>
-void callWith(Arguments& from, const Callee& callee) {
-  std::tuple<std::remove_cvref_t<Parameters>...> values{from.take<Parameters>()...};
-  std::apply(callee, std::move(values));
-}
-
-template <typename Class, typename Result, typename... Parameters>
-Operation operation(Result (Class::*member)(Parameters...)) {
-  return [member](MW::Widget& widget, Arguments& from) {
-    auto& own = static_cast<Class&>(widget);
-    const auto call = [&](auto... values) { (void)(own.*member)(values...); };
-    callWith<decltype(call), Parameters...>(from, call);
-  };
-}
-template <typename Class, typename Result, typename... Parameters>
-Operation operation(Result (Class::*member)(Parameters...) const) {
-  return [member](MW::Widget& widget, Arguments& from) {
-    auto& own = static_cast<const Class&>(widget);
-    const auto call = [&](auto... values) { (void)(own.*member)(values...); };
-    callWith<decltype(call), Parameters...>(from, call);
-  };
-}
-// One of several of a name, told by its parameters.
-template <typename... Parameters>
-struct With {
-  template <typename Class, typename Result>
-  static Operation call(Result (Class::*member)(Parameters...)) {
-    return operation(member);
-  }
-};
-// A text with the number of its bytes, in which the callee trusts.
-template <typename Class>
-Operation counted(void (Class::*member)(Chars, int)) {
-  return [member](MW::Widget& widget, Arguments& from) {
-    const std::string text = from.bytes();
-    (static_cast<Class&>(widget).*member)(text.c_str(), from.take<int>());
-  };
-}
 
 template <typename Class, typename... Parameters>
 Made construct(Arguments& from) {
@@ -63,6 +24,87 @@ Made construct(Arguments& from) {
   const auto call = [&](auto... values) { made = std::make_unique<Class>(values...); };
   callWith<decltype(call), Parameters...>(from, call);
   return made;
+}
+
+// Callbacks.
+
+template <typename... Told>
+void told(Told...) {
+  if (whenTold) whenTold();
+}
+// Becomes a function of whatever type a callback has.
+struct Teller {
+  template <typename... Told>
+  using Function = void (*)(Told...);
+  template <typename... Told>
+  operator Function<Told...>() const {  // NOLINT(google-explicit-constructor): assigned
+    return told<Told...>;
+  }
+};
+constexpr Teller kTeller;
+
+// The words that do not mean the same in all classes.
+template <typename Touched>
+void listenToTouches(MW::Widget& widget) {
+  widget.pressCallback = widget.clickCallback = widget.longPressCallback = told<Touched>;
+}
+
+void listenToBase(MW::Widget& widget) {
+  listenToTouches<MW::mouse_event*>(widget);
+  widget.hoverCallback = widget.touchPressCallback = widget.touchReleaseCallback =
+      told<MW::mouse_event*>;
+  widget.doubleClickCallback = widget.button1Callback = widget.button2Callback =
+      widget.hookKeyCallback = widget.leftCallback = widget.rightCallback = widget.exitCallback =
+          told<int>;
+  widget.keyPressCallback = widget.keyReleaseCallback = widget.plugCallback =
+      widget.doubleKeyCallback = widget.tripleKeyCallback = told<MW::kbd_event*>;
+  widget.rowPressCallback = told<int*>;
+}
+
+void listenToButton(MW::Widget& widget) {
+  listenToBase(widget);
+  listenToTouches<int>(widget);
+}
+void listenToSlide(MW::Widget& widget) {
+  listenToBase(widget);
+  widget.doubleClickCallback = told<MW::mouse_event*>;
+}
+void listenToDialogList(MW::Widget& widget) {
+  listenToBase(widget);
+  widget.button1Callback = widget.button2Callback = told<int*>;
+}
+void listenToDialogSlide(MW::Widget& widget) {
+  auto& own = static_cast<MW::DialogSlide&>(widget);
+  own.leftCallback = own.rightCallback = kTeller;
+  own.keyPressCallback = own.keyReleaseCallback = kTeller;
+  own.touchPressCallback = own.touchReleaseCallback = own.hoverCallback = kTeller;
+}
+void listenToDialogSelect(MW::Widget& widget) {
+  listenToBase(widget);
+  auto& own = static_cast<MW::DialogSelect&>(widget);
+  own.choiceCallback = own.touchPressCallback = own.touchReleaseCallback = kTeller;
+  own.keyPressCallback = own.keyReleaseCallback = kTeller;
+}
+void listenToColorPage(MW::Widget& widget) {
+  auto& own = static_cast<MW::ColorPage&>(widget);
+  own.touchPressCallback = own.touchReleaseCallback = kTeller;
+  own.keyPressCallback = own.keyReleaseCallback = kTeller;
+  own.doubleKeyCallback = own.tripleKeyCallback = kTeller;
+}
+void listenToMainList(MW::Widget& widget) {
+  auto& own = static_cast<MW::MainList&>(widget);
+  own.clickCallback = own.pressCallback = own.releaseCallback = own.scrollCallback = kTeller;
+  own.keyPressCallback = own.keyReleaseCallback = kTeller;
+}
+void listenToMpdWid(MW::Widget& widget) {
+  auto& own = static_cast<MW::MpdWid&>(widget);
+  own.click_cb = own.press_cb = own.release_cb = own.hover_cb = kTeller;
+  own.key_press_cb = own.key_release_cb = kTeller;
+}
+template <typename Panel>
+void listenToPanel(MW::Widget& widget) {
+  auto& own = static_cast<Panel&>(widget);
+  own.press_cb = own.release_cb = own.long_press_cb = own.double_tap_cb = kTeller;
 }
 
 // A descriptor and what it makes, which has its callbacks from it.
@@ -99,23 +141,40 @@ class Described : public MW::WidgetRcui {
   explicit Described(Parts&& parts) : WidgetRcui(&parts.ref, &parts.callbacks, 0) {}
 };
 
-const Operations kOfStyled = {operation(&MW::ButtonNew::setBdWidth)};
-const Operations kOfFramed = {
-    operation(&MW::FramedDialog::onBtn1Pressed), operation(&MW::FramedDialog::onBtn2Pressed),
-    operation(&MW::FramedDialog::onBtn1Released), operation(&MW::FramedDialog::onBtn2Released)};
-const Operations kOfPrompt = {operation(&MW::PromptDialog::onHookKeyPressed),
-                              operation(&MW::PromptDialog::updateProgress)};
-const Operations kOfPage = {operation(&MW::ColorPage::setBg_title),
-                            With<unsigned int, SKIA_Rect, SKIA_Text>::call(&MW::ColorPage::setText),
-                            With<MW::kbd_event>::call(&MW::ColorPage::onReleaseKey),
-                            operation(&MW::ColorPage::onKeyClickCount)};
-const Operations kOfSlide = {With<MW::mouse_event>::call(&MW::Slide::onHover),
-                             With<MW::mouse_event>::call(&MW::Slide::onTouchClickCount)};
+// What a class has of its own beside the base's handlers.
+template <typename Class>
+Operations keysOf() {
+  return {With<MW::kbd_event>::call(&Class::onPressKey),
+          With<MW::kbd_event>::call(&Class::onReleaseKey)};
+}
+template <typename Class>
+Operations touchesOf() {
+  return {With<MW::mouse_event>::call(&Class::onPress),
+          With<MW::mouse_event>::call(&Class::onRelease),
+          With<MW::mouse_event>::call(&Class::onHover)};
+}
 
 Operations operator+(Operations left, const Operations& right) {
   left.insert(left.end(), right.begin(), right.end());
   return left;
 }
+
+const Operations kOfStyled = {operation(&MW::ButtonNew::setBdWidth)};
+const Operations kOfButtons = {operation(&MW::FramedDialog::onBtn1Pressed),
+                               operation(&MW::FramedDialog::onBtn2Pressed)};
+const Operations kOfFramed = kOfButtons + keysOf<MW::FramedDialog>() +
+                             Operations{operation(&MW::FramedDialog::onBtn1Released),
+                                        operation(&MW::FramedDialog::onBtn2Released)};
+const Operations kOfPrompt = {operation(&MW::PromptDialog::onHookKeyPressed),
+                              operation(&MW::PromptDialog::updateProgress)};
+const Operations kOfPage =
+    Operations{operation(&MW::ColorPage::setBg_title),
+               With<unsigned int, SKIA_Rect, SKIA_Text>::call(&MW::ColorPage::setText),
+               With<int, int>::call(&MW::ColorPage::setRect),
+               operation(&MW::ColorPage::onKeyClickCount)} +
+    keysOf<MW::ColorPage>();
+const Operations kOfSlide = {With<MW::mouse_event>::call(&MW::Slide::onHover),
+                             With<MW::mouse_event>::call(&MW::Slide::onTouchClickCount)};
 
 const std::vector<WidgetClass> kClasses = {
     {"AutoCapScreen",
@@ -142,15 +201,14 @@ const std::vector<WidgetClass> kClasses = {
     {"Dialog",
      construct<MW::Dialog, int>,
      listenToBase,
-     kOfFramed + kOfPrompt +
-         Operations{With<int>::call(&MW::Dialog::setRect), operation(&MW::Dialog::setTitle),
+     kOfFramed + kOfPrompt + keysOf<MW::Dialog>() +
+         Operations{operation(&MW::Dialog::onKeyClickCount), With<int>::call(&MW::Dialog::setRect), operation(&MW::Dialog::setTitle),
                     With<Chars>::call(&MW::Dialog::setDesc)}},
     {"DialogList",
      construct<MW::DialogList, Chars>,
      listenToDialogList,
-     Operations{operation(&MW::FramedDialog::onBtn1Pressed),
-                            operation(&MW::FramedDialog::onBtn2Pressed),
-                            operation(&MW::DialogList::onBtn1Released),
+     kOfButtons + keysOf<MW::FramedDialog>() +
+         Operations{operation(&MW::DialogList::onBtn1Released),
                             operation(&MW::DialogList::onBtn2Released),
                             operation(&MW::DialogList::init_DialogList),
                             operation(&MW::DialogList::initIndex),
@@ -164,7 +222,8 @@ const std::vector<WidgetClass> kClasses = {
      construct<MW::DialogNew, Chars, int, int, int>,
      listenToBase,
      kOfFramed + kOfPrompt +
-         Operations{operation(&MW::DialogNew::DialogNew_init), With<>::call(&MW::DialogNew::setRect),
+         Operations{operation(&MW::DialogNew::DialogNew_init),
+                    With<MW::kbd_event>::call(&MW::DialogNew::onPressKey), With<>::call(&MW::DialogNew::setRect),
                     With<Chars, Chars, Chars>::call(&MW::DialogNew::setDesc),
                     operation(&MW::DialogNew::setProgress),
                     operation(&MW::DialogNew::setBackGroundColor),
@@ -173,7 +232,7 @@ const std::vector<WidgetClass> kClasses = {
     {"DialogSelect",
      construct<MW::DialogSelect, unsigned int>,
      listenToDialogSelect,
-     {With<int, int>::call(&MW::DialogSelect::setRect), operation(&MW::DialogSelect::setTitle),
+     keysOf<MW::DialogSelect>() + Operations{With<int, int>::call(&MW::DialogSelect::setRect), operation(&MW::DialogSelect::setTitle),
       operation(&MW::DialogSelect::setText_str), operation(&MW::DialogSelect::onBtnPressed),
       operation(&MW::DialogSelect::onBtnReleased), operation(&MW::DialogSelect::onHookKeyPressed)}},
     {"DialogShell",
@@ -186,7 +245,7 @@ const std::vector<WidgetClass> kClasses = {
     {"DialogSlide",
      construct<MW::DialogSlide, int>,
      listenToDialogSlide,
-     {operation(&MW::DialogSlide::setRect_init), With<int>::call(&MW::DialogSlide::setRect),
+     keysOf<MW::DialogSlide>() + Operations{operation(&MW::DialogSlide::setRect_init), With<int>::call(&MW::DialogSlide::setRect),
       operation(&MW::DialogSlide::setTitle), With<Chars>::call(&MW::DialogSlide::setDesc),
       operation(&MW::DialogSlide::setDesc2), operation(&MW::DialogSlide::setLeft),
       operation(&MW::DialogSlide::setRight), operation(&MW::DialogSlide::setSlide),
@@ -201,20 +260,20 @@ const std::vector<WidgetClass> kClasses = {
     {"Image", construct<MW::Image, Area, Text>, listenToBase, {}},
     {"Ime",
      construct<MW::Ime, Area, Text>,
-     listenToIme,
+     listenToPanel<MW::Ime>,
      {operation(&MW::Ime::getResultString), operation(&MW::Ime::setResultString),
       operation(&MW::Ime::typing_reset), operation(&MW::Ime::presskey_set),
       operation(&MW::Ime::keyboard_change), operation(&MW::Ime::get_fold_status),
       operation(&MW::Ime::set_fold_status), operation(&MW::Ime::onPressKey_small),
       operation(&MW::Ime::onPressKey_big), operation(&MW::Ime::onPressKey_special),
       operation(&MW::Ime::onPressKey_only_num), With<MW::mouse_event>::call(&MW::Ime::onHover)}},
-    {"Key", construct<MW::Key>, listenToBase, {operation(&MW::Key::onKeyClickCount)}},
+    {"Key", construct<MW::Key>, listenToBase, keysOf<MW::Key>() + Operations{operation(&MW::Key::onKeyClickCount), With<MW::mouse_event>::call(&MW::Key::onPressLong)}},
     {"Label", construct<MW::Label, Area, Text>, listenToBase, {}},
     {"Line", construct<MW::Line, const SKIA_Point*>, listenToBase, {}},
     {"MainList",
      construct<MW::MainList, Chars, int>,
      listenToMainList,
-     {operation(&MW::MainList::init_MainList), With<int>::call(&MW::MainList::setRect),
+     keysOf<MW::MainList>() + touchesOf<MW::MainList>() + Operations{operation(&MW::MainList::init_MainList), With<int>::call(&MW::MainList::setRect),
       operation(&MW::MainList::initIndex), operation(&MW::MainList::addIndex),
       operation(&MW::MainList::initFinish), operation(&MW::MainList::Max_height),
       With<int, Chars, unsigned int>::call(&MW::MainList::setText),
@@ -229,14 +288,19 @@ const std::vector<WidgetClass> kClasses = {
     {"MpdWid",
      construct<MW::MpdWid, Chars>,
      listenToMpdWid,
-     {operation(&MW::MpdWid::init_MpdWid), With<>::call(&MW::MpdWid::setRect),
+     keysOf<MW::MpdWid>() + touchesOf<MW::MpdWid>() + Operations{operation(&MW::MpdWid::init_MpdWid), With<>::call(&MW::MpdWid::setRect),
       operation(&MW::MpdWid::initIndex), counted(&MW::MpdWid::cal_line),
       operation(&MW::MpdWid::addIndex), operation(&MW::MpdWid::init_mpd_buf),
       operation(&MW::MpdWid::setBGColor), operation(&MW::MpdWid::setListType),
       operation(&MW::MpdWid::Max_height), operation(&MW::MpdWid::onHover_temp),
       operation(&MW::MpdWid::inClick), operation(&MW::MpdWid::depth_cal),
       operation(&MW::MpdWid::onMpdPress), operation(&MW::MpdWid::onMpdRelease),
-      operation(&MW::MpdWid::position2index)}},
+      operation(&MW::MpdWid::position2index),
+      With<MW::event_data*>::call(&MW::MpdWid::onTouchClickCount),
+      operation(&MW::MpdWid::control_context),
+      With<int, Chars, unsigned int>::call(&MW::MpdWid::setText),
+      With<int, int>::call(&MW::MpdWid::setFontSize),
+      With<int, int>::call(&MW::MpdWid::setTextColor)}},
     {"Progressbar", construct<MW::Progressbar, int, Area, Text>, listenToBase, {}},
     {"Screen", construct<MW::Screen>, listenToBase, {}},
     {"Slide", construct<MW::Slide, int, Area, Text, Text>, listenToSlide, kOfSlide},
@@ -247,17 +311,17 @@ const std::vector<WidgetClass> kClasses = {
        return std::make_unique<MW::SlideE>(state, area, from.take<Text>(), nullptr);
      },
      listenToBase,
-     {operation(&MW::SlideE::SlideE_init)}},
+     touchesOf<MW::SlideE>() + Operations{operation(&MW::SlideE::SlideE_init)}},
     {"SlideMove",
      construct<MW::SlideMove, Area, int, int, int, int>,
      listenToBase,
-     {With<Area>::call(&MW::SlideMove::setRect), operation(&MW::SlideMove::setRect_Slide),
+     {With<MW::mouse_event>::call(&MW::SlideMove::onHover), With<Area>::call(&MW::SlideMove::setRect), operation(&MW::SlideMove::setRect_Slide),
       operation(&MW::SlideMove::getValue), operation(&MW::SlideMove::setValue),
       operation(&MW::SlideMove::setMove2Value), operation(&MW::SlideMove::setValue2Move)}},
     {"SlideV", construct<MW::SlideV, int, Area, Text, Text>, listenToSlide, kOfSlide},
     {"StaticText",
      construct<MW::StaticText, Area, Text, bool, bool, bool>,
-     listenToStaticText,
+     listenToPanel<MW::StaticText>,
      {operation(&MW::StaticText::init), operation(&MW::StaticText::get_ime_result),
       operation(&MW::StaticText::line_search), operation(&MW::StaticText::line_search_point),
       operation(&MW::StaticText::find_real_num),
@@ -273,53 +337,8 @@ const std::vector<WidgetClass> kClasses = {
      {operation(&MW::WidgetRcui::getPointer)}},
 };
 
-using MW::Widget;
-const Operations kBase = {
-    operation(&Widget::onRecvEvent),
-    With<>::call(&Widget::show),
-    With<unsigned int>::call(&Widget::show),
-    operation(&Widget::updateTimer),
-    operation(&Widget::hide),
-    operation(&Widget::setActive),
-    operation(&Widget::getText),
-    operation(&Widget::getBgColor),
-    operation(&Widget::getTextColor),
-    operation(&Widget::getFontSize),
-    operation(&Widget::getPositionAndSize),
-    operation(&Widget::setFontSize),
-    operation(&Widget::setText),
-    operation(&Widget::setTextAlign),
-    operation(&Widget::setTextColor),
-    operation(&Widget::setBgColor),
-    operation(&Widget::setBdColor),
-    operation(&Widget::setLnColor),
-    operation(&Widget::onShowTimer),
-    operation(&Widget::add_MWWList),
-    operation(&Widget::lcdOn),
-    operation(&Widget::onHideTimer),
-    operation(&Widget::setRect),
-    operation(&Widget::setMsg),
-    operation(&Widget::onTouchClickCount),
-    operation(&Widget::setTimer),
-    operation(&Widget::onProgressbar),
-    operation(&Widget::restoreColor),
-    operation(&Widget::Lock),
-    operation(&Widget::unLock),
-    operation(&Widget::setDesc),
-    operation(&Widget::setbutton),
-    operation(&Widget::setSelect),
-    operation(&Widget::setType),
-    operation(&Widget::setId),
-    operation(&Widget::setButtonType),
-    operation(&Widget::setOwnerFinger),
-    operation(&Widget::setBlink),
-    operation(&Widget::updateBlink),
-    operation(&Widget::move_key_select),
-};
-
 }  // namespace
 
 const std::vector<WidgetClass>& widgetClasses() { return kClasses; }
-const std::vector<Operation>& baseOperations() { return kBase; }
 
 }  // namespace brimol::test

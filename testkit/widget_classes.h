@@ -25,7 +25,7 @@ struct WidgetClass {
 
 /// All classes of which there can be widgets, by name.
 const std::vector<WidgetClass>& widgetClasses();
-/// What every widget has, onRecvEvent() among it.
+/// What every widget has, onRecvEvent() and its parts among it.
 const std::vector<Operation>& baseOperations();
 
 /// What the callbacks do. It may delete widgets. Empty: nothing.

@@ -126,17 +126,33 @@ std::string takeOne(Arguments& arguments, Options& options) {
   return "";
 }
 
+using NamedFile = std::pair<const char*, std::string>;
+
+// What is wrong with a file that the program also makes for itself, beside another; empty: nothing.
+std::string besideOthers(const NamedFile& named, const Options& options) {
+  const auto& [name, file] = named;
+  const std::string wrong = std::string(name) + " names ";
+  if (!options.database.empty() && file != options.database &&
+      isOfDatabase(file, options.database)) {
+    return wrong + "the database";
+  }
+  for (const auto& [owner, kept] :
+       {NamedFile("--results", options.results), NamedFile("--junit", options.junit)}) {
+    if (!kept.empty() && isBeside(file, kept)) return wrong + "a file that " + owner + " makes";
+  }
+  return "";
+}
+
 // What two options say that must not name one file, as one of the two is written; empty: they do
 // not.
 std::string sameFiles(const Options& options) {
-  using Named = std::pair<const char*, std::string>;
-  const auto files = std::to_array<Named>({{"--plan", options.plan},
-                                           {"--log", options.log},
-                                           {"--results", options.results},
-                                           {"--junit", options.junit},
-                                           {"--database", options.database},
-                                           {"--shot", options.shot},
-                                           {"--monkey-trace", options.monkeyTrace}});
+  const auto files = std::to_array<NamedFile>({{"--plan", options.plan},
+                                               {"--log", options.log},
+                                               {"--results", options.results},
+                                               {"--junit", options.junit},
+                                               {"--database", options.database},
+                                               {"--shot", options.shot},
+                                               {"--monkey-trace", options.monkeyTrace}});
   constexpr std::size_t kOnlyRead = 2;  // the first ones
   for (const auto& [name, file] : std::span(files).subspan(kOnlyRead)) {
     for (const auto& [other, its] : files) {
@@ -144,10 +160,9 @@ std::string sameFiles(const Options& options) {
       return std::string(name) + " and " + other + " name the same file";
     }
   }
-  for (const auto& [name, file] : files) {
-    if (options.database.empty() || file.empty() || name == std::string_view("--database"))
-      continue;
-    if (isOfDatabase(file, options.database)) return std::string(name) + " names the database";
+  for (const NamedFile& named : files) {
+    std::string wrong = named.second.empty() ? "" : besideOthers(named, options);
+    if (!wrong.empty()) return wrong;
   }
   return "";
 }

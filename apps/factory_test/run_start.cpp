@@ -4,6 +4,9 @@
 #include <unistd.h>
 
 #include <array>
+#include <cstdlib>
+#include <filesystem>
+#include <system_error>
 
 #include "plan/plan_json.h"
 #include "records/postgres.h"
@@ -31,6 +34,27 @@ std::string unitOf(const Options& options) {
 
 bool isKept(const Options& options) {
   return !(options.database.empty() && options.results.empty() && options.junit.empty());
+}
+
+// With the platform's variable, verdicts of a monkey are kept in a new file, for who looks at what
+// it did: never among those of people.
+std::string wrongMonkeyRecords(const Options& options) {
+  if (!options.monkey.empty()) {
+    return isKept(options) ? "--monkey judges nothing: neither --database, --results nor --junit"
+                           : "";
+  }
+  const char* const asked = std::getenv("BRIMOL_MONKEY");
+  if (asked == nullptr || *asked == '\0') return "";
+  std::error_code failure;
+  const auto isThere = [&](const std::string& file) {
+    return !file.empty() && std::filesystem::exists(file, failure);
+  };
+  const bool isAmongOthers =
+      !options.database.empty() || isThere(options.results) || isThere(options.junit);
+  return isAmongOthers
+             ? "BRIMOL_MONKEY judges nothing: no --database, and --results and --junit only as new "
+               "files"
+             : "";
 }
 
 std::string stationName() {
@@ -75,9 +99,7 @@ std::string wrongRecords(const Options& options) {
     return "--junit: " + options.junit + " holds something else than a report, and stays as it is";
   }
   if (!options.serial.empty() && !isSerial(options.serial, why)) return "--serial: " + why;
-  if (!options.monkey.empty() && isKept(options)) {
-    return "--monkey judges nothing, so it takes none of --database, --results and --junit";
-  }
+  if (std::string wrong = wrongMonkeyRecords(options); !wrong.empty()) return wrong;
   if (!options.shot.empty() && !(options.database.empty() && options.junit.empty())) {
     return "--shot keeps nothing, so it takes neither --database nor --junit";
   }

@@ -167,6 +167,32 @@ TEST_F(Results, BelongToOneProgramAtATime) {
   EXPECT_TRUE(ResultBook::open(link, error)) << error;
 }
 
+TEST_F(Results, LeaveWhatHasTheNameOfTheirLockAndIsNone) {
+  const fs::path lock = file.native() + ".lock";
+  const fs::path victim = folder / "victim";
+  for (const std::string held : {"", "12"}) {  // even what may pass for a lock, behind a link
+    std::ofstream(victim, std::ios::trunc) << held;
+    fs::create_symlink(victim, lock);
+    EXPECT_FALSE(ResultBook::open(file, error));
+    EXPECT_TRUE(error.ends_with("results.json.lock is no lock file, and stays as it is")) << error;
+    EXPECT_EQ(textOf(victim), held);
+    EXPECT_TRUE(fs::remove(lock)) << "the link is still there";
+  }
+  for (const std::string own : {"<testsuites/>", "1234567890123456", "-1"}) {
+    std::ofstream(lock) << own;
+    EXPECT_FALSE(ResultBook::open(file, error));
+    EXPECT_EQ(textOf(lock), own);
+    fs::remove(lock);
+  }
+  std::ofstream(lock) << "999999";  // what a killed program left
+  auto book = ResultBook::open(file, error);
+  EXPECT_TRUE(book) << error;
+  fs::remove(lock);
+  std::ofstream(lock) << "12";  // another's by now
+  book.reset();
+  EXPECT_EQ(textOf(lock), "12");
+}
+
 TEST_F(Results, ThatAreDamagedAreNamedAndLeftAsTheyAre) {
   const std::string deep = std::string(500'000, '[') + std::string(500'000, ']');
   for (const auto& [from, to, reason] : std::to_array<std::array<std::string, 3>>({

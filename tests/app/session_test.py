@@ -34,7 +34,7 @@ class SessionTest(unittest.TestCase):
         file = self.folder / "played.trace"
         file.write_text("brimol-trace 1\n" + trace)
         return subprocess.Popen([program, "--headless", "--database", self.database, *options],
-                                stderr=subprocess.PIPE, text=True,
+                                stderr=subprocess.PIPE, text=True, cwd=self.folder,
                                 env=os.environ | {"BRIMOL_TRACE": str(file), "BRIMOL_SCREEN": "480x800",
                                                   "BRIMOL_REPORT_DIR": str(self.folder),
                                                   "BRIMOL_REPORT_PICTURES": "none"})
@@ -109,6 +109,13 @@ wait until text "Line out of reach: 1 verdict waits" within 86400000
         self.assertEqual((3, ""), (played.returncode, says))
         self.assertEqual([("a1", "finished", "PASS"), ("b2", "finished", "FAIL"), ("c3", "finished", "PASS")],
                          self.ask("select unit, state, verdict from runs r join verdicts on run = r.id order by r.number"))
+
+    def test_the_shell_runs_its_option_alone(self):
+        played = self.start(PASS + "expect text \"Shell: PASS\"\n", "--serial", "$(>unit)", "--operator", "`>operator`",
+                            "--test", "shell", "--shell", "echo ran >> ran")
+        self.assertEqual((0, ""), (played.wait(), played.communicate()[1]))
+        self.assertEqual("ran\n", (self.folder / "ran").read_text())
+        self.assertEqual([], [name for name in ("unit", "operator") if (self.folder / name).exists()])
 
     def test_a_locked_database_holds_up_no_screen(self):
         played = self.start(PASS + """expect text "Shell: PASS, saving..."

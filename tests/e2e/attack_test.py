@@ -27,7 +27,7 @@ class Application:
         self.process = subprocess.Popen([PROGRAM], stderr=subprocess.PIPE, text=True, env=settings)
         said = self.process.stderr.readline() + self.process.stderr.readline()
         self.web, self.vnc, self.password = re.search(
-            r"http://127.0.0.1:(\d+)/.*\n.*127.0.0.1::(\d+), password (\w+)", said).groups()
+            r"http://127.0.0.1:(\d+)/.*\n.*127.0.0.1::(\d+), password (\S+)", said).groups()
 
     def figures(self):
         """Threads, descriptors, and memory in MiB."""

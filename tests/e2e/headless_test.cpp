@@ -1,7 +1,9 @@
 // What the application refuses before its menu opens.
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
+#include <array>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
@@ -32,7 +34,13 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
   EXPECT_EQ(runApplication({.headless = true, .shot = folder / "none" / "shot.png"}),
             ExitCode::Trouble);
   EXPECT_EQ(runApplication({.headless = true, .log = folder / "none"}), ExitCode::Trouble);
-  EXPECT_EQ(runApplication({.headless = true, .log = folder}), ExitCode::Trouble);
+  const std::filesystem::path pipe = folder / "pipe";
+  const std::filesystem::path huge = folder / "huge";
+  ASSERT_EQ(mkfifo(pipe.c_str(), 0600), 0);
+  std::ofstream(huge) << 'a';
+  std::filesystem::resize_file(huge, 17 << 20);
+  for (const std::filesystem::path& log : {folder, pipe, huge, std::filesystem::path("/dev/zero")})
+    EXPECT_EQ(runApplication({.headless = true, .log = log}), ExitCode::Trouble) << log;
 
   struct WrongLine {
     std::vector<const char*> arguments;
@@ -50,6 +58,8 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
            {{"--results=a", "--database", "a"}, "same file"},
            {{"--results", "a-wal", "--database", "a"}, "--results names the database"},
            {{"--junit=a.lock", "--database", "./a"}, "--junit names the database"},
+           {{"--junit=a.lock", "--results", "./a"}, "--junit names a file that --results makes"},
+           {{"--log=a.tmp", "--junit", "./a"}, "--log names a file that --junit makes"},
            {{"--monkey", "1", "--results", "a"}, "--monkey judges nothing"},
            {{"--shot", "a.png", "--database", "b"}, "--shot keeps nothing"},
            {{"--new-run"}, "--new-run needs --database"},
@@ -66,6 +76,20 @@ TEST_F(HeadlessApplication, RefusesWhatItCannotUse) {
     asking.insert(asking.begin(), "--help");
     EXPECT_TRUE(parseOptions(asking, error)) << word;
   }
+}
+
+TEST_F(HeadlessApplication, KeepsNoMonkeysVerdictsAmongOthers) {
+  setenv("BRIMOL_MONKEY", "1:300", 1);
+  std::string error;
+  const std::string database = folder / "d.db";
+  EXPECT_FALSE(parseOptions(std::array{"--stay", "--database", database.c_str()}, error));
+  EXPECT_TRUE(error.starts_with("BRIMOL_MONKEY judges nothing")) << error;
+  const std::array keeping = {"--stay", "--results", results.c_str()};
+  EXPECT_TRUE(parseOptions(keeping, error)) << "a new file";
+  std::ofstream(results) << "{}";
+  EXPECT_FALSE(parseOptions(keeping, error));
+  unsetenv("BRIMOL_MONKEY");
+  EXPECT_TRUE(parseOptions(keeping, error)) << error;
 }
 
 }  // namespace

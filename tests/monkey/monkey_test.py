@@ -47,6 +47,15 @@ class MonkeyTest(unittest.TestCase):
         trace.write_text("brimol-trace 1\n100 down 0 1 1\n200 up 0 1 1\n")
         self.assertIn("does not fail", self.run_program(SHRINK, str(trace), "short", "--", PLANTED).stderr)
 
+    def test_a_hang_is_made_short_where_it_is_asked_for(self):
+        trace, short = self.folder / "hang.trace", self.folder / "short.trace"
+        trace.write_text("brimol-trace 1\n100 down 0 1 1\n200 up 0 1 1\n300 down 0 7 7\n400 up 0 7 7\n")
+        program = "sh", "-c", 'grep -q "down 0 7 7" "$BRIMOL_TRACE" || exit 0; exec sleep 100'
+        for wish, says in ("--exit=7", "does not fail"), ("--hangs", "1 steps after"):
+            told = self.run_program(SHRINK, wish, "--seconds", "2", str(trace), str(short), "--", *program)
+            self.assertIn(says, told.stdout + told.stderr)
+        self.assertIn(" down 0 7 7\n", short.read_text())
+
     def test_the_factory_test_holds_and_does_the_same_again(self):
         traces = []
         for name in "one", "other":

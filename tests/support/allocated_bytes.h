@@ -12,10 +12,10 @@ extern "C" std::size_t __sanitizer_get_current_allocated_bytes() __attribute__((
 
 namespace brimol::test {
 
+inline bool hasSanitizer() { return __sanitizer_get_current_allocated_bytes != nullptr; }
+
 inline std::size_t allocatedBytes() {
-  return __sanitizer_get_current_allocated_bytes != nullptr
-             ? __sanitizer_get_current_allocated_bytes()
-             : mallinfo2().uordblks;
+  return hasSanitizer() ? __sanitizer_get_current_allocated_bytes() : mallinfo2().uordblks;
 }
 
 }  // namespace brimol::test

@@ -25,14 +25,21 @@ constexpr std::size_t kHolderBytes = 16;
 bool isStill(int descriptor, const fs::path& path) {
   struct stat held = {};
   struct stat there = {};
-  return ::fstat(descriptor, &held) == 0 && ::stat(path.c_str(), &there) == 0 &&
+  return ::fstat(descriptor, &held) == 0 && ::lstat(path.c_str(), &there) == 0 &&
          held.st_ino == there.st_ino && held.st_dev == there.st_dev;
 }
 
-std::string holderOf(int descriptor) {
+// The number of the process that holds it, or held it; empty as long as none is written. Nothing
+// for a file that holds anything else: it is no lock file, whatever its name.
+std::optional<std::string> holderIn(int descriptor) {
+  struct stat held = {};
+  if (::fstat(descriptor, &held) != 0 || !S_ISREG(held.st_mode)) return {};
   std::array<char, kHolderBytes> text = {};
-  const ssize_t length = ::pread(descriptor, text.data(), text.size() - 1, 0);
-  return length > 0 ? " (process " + std::string(text.data()) + ")" : "";
+  const ssize_t length = ::pread(descriptor, text.data(), text.size(), 0);
+  if (length < 0 || static_cast<std::size_t>(length) == text.size()) return {};
+  std::string holder(text.data(), static_cast<std::size_t>(length));
+  if (holder.find_first_not_of("0123456789") != std::string::npos) return {};
+  return holder;
 }
 
 void writeHolder(int descriptor) {
@@ -43,23 +50,37 @@ void writeHolder(int descriptor) {
   static_cast<void>(written);
 }
 
+// Why the file that is there is not taken.
+std::string whyForeign(const fs::path& path) {
+  return "cannot be locked: " + path.filename().native() + " is no lock file, and stays as it is";
+}
+
+// Why it was not locked.
+std::string whyNot(int failure, int descriptor, const fs::path& path) {
+  if (failure != EWOULDBLOCK) return "cannot be locked: " + systemWords(failure);
+  const auto holder = holderIn(descriptor);
+  if (!holder) return whyForeign(path);
+  const std::string process = holder->empty() ? "" : " (process " + *holder + ")";
+  return "is in use by another program" + process;
+}
+
 // The open, locked file; negative, with why in `reason`.
 int lock(const fs::path& path, std::string& reason) {
   for (;;) {
-    const int descriptor = ::open(path.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kMode);
+    const int descriptor = ::open(path.c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW, kMode);
     if (descriptor < 0) {
-      reason = "cannot be written: " + systemWords(errno);
+      reason = errno == ELOOP ? whyForeign(path) : "cannot be written: " + systemWords(errno);
       return descriptor;
     }
-    if (::flock(descriptor, LOCK_EX | LOCK_NB) == 0) {
-      if (isStill(descriptor, path)) return descriptor;
-      ::close(descriptor);
-      continue;
+    const bool isLocked = ::flock(descriptor, LOCK_EX | LOCK_NB) == 0;
+    if (!isLocked) {
+      reason = whyNot(errno, descriptor, path);
+    } else if (isStill(descriptor, path)) {
+      if (holderIn(descriptor)) return descriptor;
+      reason = whyForeign(path);
     }
-    reason = errno == EWOULDBLOCK ? "is in use by another program" + holderOf(descriptor)
-                                  : "cannot be locked: " + systemWords(errno);
     ::close(descriptor);
-    return -1;
+    if (!reason.empty()) return -1;
   }
 }
 
@@ -85,7 +106,8 @@ FileLock::FileLock(FileLock&& other) noexcept
 
 FileLock::~FileLock() {
   if (descriptor < 0) return;
-  ::unlink(path.c_str());  // while it is held: nobody else can have taken it
+  // While it is held nobody else can have taken it, but its name may lead to another file by now.
+  if (isStill(descriptor, path) && holderIn(descriptor)) ::unlink(path.c_str());
   ::close(descriptor);
 }
 

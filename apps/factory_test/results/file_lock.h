@@ -13,7 +13,8 @@ namespace factory_test {
 class FileLock {
  public:
   /// The lock of `file`, of the file that it leads to for a symbolic link. Nothing, with `error` in
-  /// one line, where another program holds it or no lock file can be made.
+  /// one line, where another program holds it or no lock file can be made. A symbolic link of that
+  /// name, and a file that holds more than a process's number, stay as they are: nothing, too.
   static std::optional<FileLock> take(const std::filesystem::path& file, std::string& error);
 
   FileLock(FileLock&& other) noexcept;

@@ -119,4 +119,11 @@ bool isSameFile(const fs::path& one, const fs::path& other) {
   return fs::equivalent(one, other, failure) || placeOfFile(one) == placeOfFile(other);
 }
 
+bool isBeside(const fs::path& file, const fs::path& kept) {
+  const auto isIt = [&](const char* ending) {
+    return isSameFile(file, placeOfFile(kept).concat(ending));
+  };
+  return isIt(".tmp") || isIt(".lock");
+}
+
 }  // namespace factory_test

@@ -22,6 +22,9 @@ std::filesystem::path placeOfFile(const std::filesystem::path& file);
 /// Whatever they are called: by what they are if both are there, else by where they would be.
 bool isSameFile(const std::filesystem::path& one, const std::filesystem::path& other);
 
+/// Whether `file` is what replaceFile() or a FileLock makes beside `kept`: FILE.tmp or FILE.lock.
+bool isBeside(const std::filesystem::path& file, const std::filesystem::path& kept);
+
 /// Puts `bytes` in the place of what the file holds, if there is one, on the disk too: at every
 /// moment the old or the new bytes stand there whole. A symbolic link is followed, also one to a
 /// file that is not there yet. The file keeps its mode. False: it is as it was, and `error` says

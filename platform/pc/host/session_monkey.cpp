@@ -10,7 +10,7 @@ namespace {
 
 constexpr uint64_t kMostWithoutNews = 5'000;  // records
 constexpr uint64_t kCloseMs = 10'000;
-constexpr uint64_t kToldEach = 1'000'000;  // records
+constexpr uint64_t kToldEach = 250'000;  // records
 constexpr uint64_t kToldEachMs = 86'400'000;
 constexpr uint64_t kLookEach = 10'000;  // records
 
