@@ -40,8 +40,9 @@ bool isKept(const Options& options) {
 // it did: never among those of people.
 std::string wrongMonkeyRecords(const Options& options) {
   if (!options.monkey.empty()) {
-    return isKept(options) ? "--monkey judges nothing: neither --database, --results nor --junit"
-                           : "";
+    return isKept(options)
+               ? "--monkey judges nothing, so it takes none of --database, --results and --junit"
+               : "";
   }
   const char* const asked = std::getenv("BRIMOL_MONKEY");
   if (asked == nullptr || *asked == '\0') return "";
