@@ -1,5 +1,6 @@
 # Which of our sources start programs or load libraries: the command of `--shell`, the application that
-# brimol-replay was given, and the libraries of a display. So no file that is read can do either.
+# brimol-replay was given and the shell that ends it with brimol-replay, and the libraries of a display. So no
+# file that is read can do either.
 . "$SOURCE/tests/install/common.sh"
 wanted="apps/factory_test/command.cpp posix_spawn
 platform/pc/libraries/on_demand.cpp dlopen

@@ -3,6 +3,7 @@
 #include <archive.h>
 #include <archive_entry.h>
 #include <gmock/gmock.h>
+#include <sys/stat.h>
 
 #include "runs.h"
 #include "trace_files.h"
@@ -41,17 +42,17 @@ class Bundle : public InFolder {
 
 TEST_F(Bundle, BringsEverythingBack) {
   write("traces/deep/a.trace",
-        "brimol-trace 1\ninclude ../common.trace # shared\n+5 include b.trace\n");
-  write("traces/common.trace", "brimol-trace 1\ninclude deep/a.trace\n");
-  write("traces/deep/b.trace", "brimol-trace 1\n");
+        "brimol-trace 1\ninclude ../common.trace #\ninclude \"b\\x20\\\"c.trace\"\n");
+  write("traces/common.trace", "brimol-trace 1\n# include none.trace\n");
+  write("traces/deep/b \"c.trace", "brimol-trace 1\n");
   write("traces/other.trace", "not included");
   write("run/session.jsonl", "{}\n");
   write("run/bundle/old", "of an earlier one");
   const std::string bytes("\0\xff\n", 3);
   write("run/shots/x.png", bytes);
   const fs::path file = folder / "run" / "b.tar.gz";
-  ASSERT_TRUE(writeBundle(file, kRecord, folder / "traces/deep/a.trace", folder / "run", error))
-      << error;
+  const TraceFiles packed = traceFiles(folder / "traces/deep/a.trace", folder / "traces");
+  ASSERT_TRUE(writeBundle(file, kRecord, packed, folder / "run", error)) << error;
   const auto unpacked = unpackBundle(file, folder / "new", error);
   ASSERT_TRUE(unpacked) << error;
   RunRecord expected = kRecord;
@@ -61,24 +62,23 @@ TEST_F(Bundle, BringsEverythingBack) {
   EXPECT_FALSE(fs::exists(unpacked->run / "bundle"));
   EXPECT_FALSE(fs::exists(unpacked->run / "b.tar.gz"));
   EXPECT_FALSE(fs::exists(folder / "new/trace/other.trace"));
-  EXPECT_EQ(traceFiles(expected.trace, error)->files.size(), 3) << error;
+  EXPECT_EQ(traceFiles(expected.trace, folder / "new").files.size(), 3);
+  EXPECT_FALSE(unpackBundle(file, folder / "new", error)) << "over what is there";
 }
 
 TEST_F(Bundle, RefusesWhatItCannotUse) {
   const std::string valid = jsonOf(kRecord);
-  struct Odd {
-    fs::path file;
-    const char* says;
-  };
   const auto refuses = [&](const fs::path& file, const char* says) {
     EXPECT_FALSE(unpackBundle(file, folder / "new", error)) << says;
     EXPECT_THAT(error, HasSubstr(file.native() + ": ")) << says;
     EXPECT_THAT(error, HasSubstr(says));
+    EXPECT_FALSE(fs::exists(folder / "new")) << says;
   };
   refuses(folder / "none", "cannot be read");
   refuses(write("text", "no archive at all"), "");
   refuses(archiveWith("bundle.json", AE_IFREG, "{}"), "no valid bundle.json");
   refuses(archiveWith("bundle.json", AE_IFREG, valid), "no valid");  // its trace is elsewhere
+  refuses(archiveWith("mine.txt", AE_IFREG, "x"), "holds what no bundle does: mine.txt");
   refuses(archiveWith("../outside", AE_IFREG, "x"), "holds what no bundle does: ../outside");
   refuses(archiveWith("/tmp/outside", AE_IFREG, "x"), "holds what no bundle does");
   refuses(archiveWith("run/link", AE_IFLNK, ""), "holds what no bundle does: run/link");
@@ -88,22 +88,25 @@ TEST_F(Bundle, RefusesWhatItCannotUse) {
   refuses(whole, "");
 }
 
-TEST_F(Bundle, IsNotMadeOfWhatIsMissing) {
-  write("a.trace", "brimol-trace 1\ninclude none.trace\n");
-  EXPECT_FALSE(writeBundle(folder / "b", kRecord, folder / "a.trace", folder, error));
-  EXPECT_THAT(error, HasSubstr("none.trace: cannot be read"));
-  write("a.trace", "brimol-trace 1\n");
-  EXPECT_FALSE(writeBundle(folder / "no/b", kRecord, folder / "a.trace", folder, error));
+TEST_F(Bundle, HoldsNothingThatThePlatformWouldNotPlay) {
+  const auto refuses = [&](const char* include, const char* says) {
+    const fs::path trace = write("t/a.trace", std::string("brimol-trace 1\n") + include + "\n");
+    EXPECT_FALSE(writeBundle(folder / "b", kRecord, traceFiles(trace, {}), folder / "run", error));
+    EXPECT_THAT(error, HasSubstr(says));
+  };
+  write("secret.trace", "brimol-trace 1\n");
+  fs::create_directory(folder / "t");
+  ASSERT_EQ(::mkfifo((folder / "t/pipe").c_str(), 0600), 0);
+  fs::create_symlink("../secret.trace", folder / "t/link");
+  refuses("include none.trace", "a.trace:2: ");
+  refuses("include pipe", "pipe' cannot be read");
+  refuses("include ../secret.trace", "secret.trace' cannot be read");
+  refuses("include link", "link' cannot be read");
+  refuses("+5 include a.trace", "a.trace:2: ");
+  EXPECT_FALSE(fs::exists(folder / "b"));
+  const TraceFiles fit = traceFiles(folder / "secret.trace", {});
+  EXPECT_FALSE(writeBundle(folder / "no/b", kRecord, fit, folder / "t", error));
   EXPECT_THAT(error, HasSubstr("cannot be written"));
-}
-
-TEST(IncludedBy, ReadsTheNameAlone) {
-  EXPECT_EQ(includedBy("include a b.trace"), "a b.trace");
-  EXPECT_EQ(includedBy("  1500\tinclude  x.trace   # why"), "x.trace");
-  EXPECT_EQ(includedBy("+20 include \"x y.trace\""), "x y.trace");
-  EXPECT_EQ(includedBy("# include x"), std::nullopt);
-  EXPECT_EQ(includedBy("include"), std::nullopt);
-  EXPECT_EQ(includedBy("expect text \"include x\""), std::nullopt);
 }
 
 }  // namespace

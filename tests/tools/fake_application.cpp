@@ -35,7 +35,8 @@ void say(const json& line) {
 
 void start() {
   json environment = json::object();
-  for (const char* const name : {"BRIMOL_DISPLAY", "BRIMOL_CLOCK", "BRIMOL_SCREEN"}) {
+  for (const char* const name :
+       {"BRIMOL_DISPLAY", "BRIMOL_CLOCK", "BRIMOL_CLOCK_STEP", "BRIMOL_SCREEN"}) {
     if (!setting(name).empty()) environment[name] = setting(name);
   }
   say({{"kind", "start"},

@@ -59,7 +59,6 @@ INSTANTIATE_TEST_SUITE_P(
                   {"--from-bundle", "b", "--against", "d", "--", "a"},
                   "--against does not go"},
         WrongLine{"SameFiles", {"--junit=f", "--report=./f", "t", "--", "a"}, "written over"},
-        WrongLine{"OwnTrace", {"--report=t", "./t", "--", "a"}, "written over"},
         WrongLine{"FileOfTheApplication", {"--bundle=p", "t", "--", "a", "p"}, "written over"}),
     [](const auto& given) { return given.param.name; });
 

@@ -2,8 +2,10 @@
 #include <gmock/gmock.h>
 #include <sys/wait.h>
 
+#include <algorithm>
 #include <csignal>
 #include <cstdlib>
+#include <random>
 #include <thread>
 
 #include "paths.h"
@@ -78,29 +80,41 @@ TEST_F(Program, EndsAHungApplicationWithAllThatItStarted) {
   EXPECT_TRUE(comesToItsEnd("d/output.txt")) << "the application left a process behind";
 }
 
-TEST_F(Program, EndsTheApplicationWhenItIsInterrupted) {
+class Signals : public Program, public testing::WithParamInterface<int> {};
+
+TEST_P(Signals, EndTheApplicationToo) {
   std::thread killer([this] {
     while (bytesOf(folder / "d/output.txt").empty()) ::usleep(10'000);
     // The shell became the program, whose number it wrote first.
-    ::kill(std::stoi(bytesOf(folder / "pid.txt")), SIGTERM);
+    ::kill(std::stoi(bytesOf(folder / "pid.txt")), GetParam());
   });
   const std::string command = "cd " + folder.native() + " && echo $$ >pid.txt && exec " +
                               kReplayProgram + " --dir d menu.trace -- " + kFakeApplication +
                               " hang >said.txt 2>&1";
   const int status = std::system(command.c_str());
   killer.join();
-  EXPECT_EQ(WEXITSTATUS(status), 130);
   EXPECT_TRUE(comesToItsEnd("d/output.txt"));
-  EXPECT_THAT(bytesOf(folder / "d/report.html"), HasSubstr("interrupted"));
+  const bool isWatched = GetParam() != SIGKILL;
+  EXPECT_TRUE(isWatched ? WEXITSTATUS(status) == 130 : WIFSIGNALED(status)) << status;
+  EXPECT_THAT(bytesOf(folder / (isWatched ? "d/report.html" : "d/run.json")),
+              HasSubstr(isWatched ? "interrupted" : "unfinished"));
 }
+
+INSTANTIATE_TEST_SUITE_P(All, Signals, testing::Values(SIGTERM, SIGQUIT, SIGKILL));
 
 TEST_F(Program, SaysWhatItCannotUse) {
   write("full/file", "of the user");
+  write("session/session.jsonl", "{}");
+  write("main.trace", "brimol-trace 1\ninclude menu.trace\n");
   for (const auto& [arguments, says] : std::vector<std::pair<std::string, std::string>>{
            {"none.trace -- APP pass", "none.trace: cannot be read"},
            {". -- APP pass", "is a folder"},
            {"menu.trace -- ./none", "cannot start ./none: No such file"},
            {"--dir full menu.trace -- APP pass", "holds other things"},
+           {"--dir session menu.trace -- APP pass", "holds other things"},
+           {"--report menu.trace ./menu.trace -- APP pass", "would be written over"},
+           {"--junit menu.trace main.trace -- APP pass", "would be written over"},
+           {"--lint --accepted full/file --report full/file menu.trace -- APP", "written over"},
            {"--dir menu.trace/d menu.trace -- APP pass", "cannot make this folder"},
            {"--against none menu.trace -- APP pass", "none: holds no run"},
            {"--junit no/j.xml menu.trace -- APP pass", "no/j.xml: cannot be written there"},
@@ -130,7 +144,13 @@ TEST_F(Program, ReplacesAnEarlierRunAndNothingElse) {
   EXPECT_EQ(replay("--dir d menu.trace -- APP pass-otherwise"), 0);
   EXPECT_FALSE(fs::exists(folder / "d/frame-400.png")) << "of the earlier run";
   EXPECT_TRUE(fs::exists(folder / "d/frame-420.png"));
+  EXPECT_EQ(replay("--dir d menu.trace -- APP silent"), 1);
+  EXPECT_EQ(replay("--dir d menu.trace -- APP silent"), 1) << "there is no session";
+  write("d/session.jsonl", R"({"kind":"shot","time":0,"picture":"notes.txt"})");
+  write("d/bundle/mine.txt", "of the user");
+  EXPECT_EQ(replay("--dir d menu.trace -- APP pass"), 0);
   EXPECT_TRUE(fs::exists(folder / "d/notes.txt"));
+  EXPECT_TRUE(fs::exists(folder / "d/bundle/mine.txt"));
   EXPECT_EQ(replay("menu.trace -- APP pass"), 0);
   EXPECT_EQ(replay("menu.trace -- APP pass"), 0);
   EXPECT_TRUE(fs::exists(folder / "replay-menu/report.html"));
@@ -145,24 +165,50 @@ TEST_F(Program, ComparesWithAnEarlierRun) {
   EXPECT_EQ(replay("--dir first --against first menu.trace -- APP pass"), 2);
 }
 
-TEST_F(Program, KeepsAnEarlierReportWhereTheDiskIsFull) {
-  EXPECT_EQ(replay("--dir d --report r.html menu.trace -- APP pass"), 0);
-  const std::string before = bytesOf(folder / "r.html");
+TEST_F(Program, KeepsWhatWasWrittenBeforeWhereTheDiskIsFull) {
+  EXPECT_EQ(replay("--dir d --report r.html --bundle b.tgz menu.trace -- APP pass"), 0);
+  std::string noise(1 << 16, '\0');
+  std::ranges::generate(noise, std::minstd_rand());
+  write("d/noise", noise);
   const std::string full = "trap '' XFSZ; ulimit -f 8;";  // no file grows beyond 4 KiB
-  EXPECT_EQ(replay("--dir d --report r.html menu.trace -- APP pass", full), 2);
-  EXPECT_THAT(said, HasSubstr("r.html: cannot be written"));
-  EXPECT_EQ(bytesOf(folder / "r.html"), before);
-  EXPECT_FALSE(fs::exists(folder / "r.html.tmp"));
+  for (const auto& [file, options] : {std::pair("r.html", "--report r.html"),
+                                      std::pair("b.tgz", "--report /dev/null --bundle b.tgz")}) {
+    const std::string before = bytesOf(folder / file);
+    EXPECT_EQ(replay(std::string("--dir d ") + options + " menu.trace -- APP pass", full), 2);
+    EXPECT_THAT(said, HasSubstr(std::string(file) + ": cannot be written"));
+    EXPECT_EQ(bytesOf(folder / file), before);
+    EXPECT_FALSE(fs::exists(folder / (std::string(file) + ".tmp")));
+  }
+}
+
+TEST_F(Program, ShowsTheEndOfWhatTheApplicationWrote) {
+  EXPECT_EQ(replay(R"(menu.trace -- sh -c "yes x | tr -d '\n' | head -c 9000000; exit 1")"), 1);
+  EXPECT_LT(said.size(), 70'000);
+  EXPECT_LT(fs::file_size(folder / "replay-menu/report.html"), 500'000);
 }
 
 TEST_F(Program, RepeatsWhatItPacked) {
-  EXPECT_EQ(replay("--bundle b.tgz --screen 480x800 menu.trace -- APP pass"), 0) << said;
+  EXPECT_EQ(replay("--bundle b.tgz menu.trace -- APP refuse"), 2);
+  EXPECT_FALSE(fs::exists(folder / "b.tgz")) << "no run";
+  EXPECT_EQ(replay("--bundle b.tgz --screen 480x800 menu.trace -- APP pass",
+                   "BRIMOL_CLOCK_STEP=10 BRIMOL_MONKEY=1"),
+            0)
+      << said;
   fs::remove(trace);
   EXPECT_EQ(replay("--dir d --from-bundle b.tgz -- APP"), 2) << "arguments that nobody saw";
   EXPECT_THAT(said, HasSubstr("with the arguments pass: give"));
-  fs::remove_all(folder / "d");
   EXPECT_EQ(replay("--dir d --packed-arguments --from-bundle b.tgz -- APP"), 0) << said;
-  EXPECT_THAT(bytesOf(folder / "d/session.jsonl"), HasSubstr(R"("BRIMOL_SCREEN":"480x800")"));
+  EXPECT_THAT(
+      bytesOf(folder / "d/session.jsonl"),
+      HasSubstr(
+          R"("BRIMOL_CLOCK_STEP":"10","BRIMOL_DISPLAY":"headless","BRIMOL_SCREEN":"480x800")"));
+  write("again.trace", "brimol-trace 1\n");
+  for (const char* const arguments :
+       {"d/bundle/trace/menu.trace", "--against d/bundle/run again.trace",
+        "--lint --accepted d/run.json again.trace"}) {
+    EXPECT_EQ(replay(std::string("--dir d ") + arguments + " -- APP pass"), 2);
+    EXPECT_THAT(said, HasSubstr("would be removed with the earlier run in d"));
+  }
   EXPECT_EQ(replay("--dir d --from-bundle b.tgz -- APP pass-otherwise"), 1);
   EXPECT_THAT(said, HasSubstr("1 frame differs"));
 }

@@ -9,9 +9,9 @@
 #include <memory>
 #include <nlohmann/json.hpp>
 
+#include "files.h"
 #include "picture.h"
 #include "run_directory.h"
-#include "trace_files.h"
 
 namespace brimol::replay {
 
@@ -22,7 +22,10 @@ namespace {
 using nlohmann::json;
 
 constexpr auto kRecordName = "bundle.json";
+constexpr auto kTraceName = "trace";  // folders
+constexpr auto kRunName = "run";
 constexpr int kFormat = 1;
+constexpr std::size_t kBlockBytes = std::size_t{1} << 16;
 constexpr int64_t kMostBytes = int64_t{4} << 30;  // unpacked
 
 struct WriterDeleter {
@@ -44,28 +47,48 @@ std::string reasonOf(archive* source) {
 }
 
 // Files have no times and owners, so that equal runs give equal archives.
-bool addFile(const Writer& writer, const fs::path& name, const std::string& bytes) {
+bool addHeader(const Writer& writer, const fs::path& name, uintmax_t size) {
   constexpr mode_t kMode = 0644;
   const Entry entry(archive_entry_new());
   archive_entry_set_pathname(entry.get(), name.generic_string().c_str());
-  archive_entry_set_size(entry.get(), static_cast<la_int64_t>(bytes.size()));
+  archive_entry_set_size(entry.get(), static_cast<la_int64_t>(size));
   archive_entry_set_filetype(entry.get(), AE_IFREG);
   archive_entry_set_perm(entry.get(), kMode);
   archive_entry_set_mtime(entry.get(), 0, 0);
-  return archive_write_header(writer.get(), entry.get()) == ARCHIVE_OK &&
-         archive_write_data(writer.get(), bytes.data(), bytes.size()) ==
-             static_cast<la_ssize_t>(bytes.size());
+  return archive_write_header(writer.get(), entry.get()) == ARCHIVE_OK;
 }
 
-// The files below a folder, by their names from there. What an earlier bundle left is none of it.
-std::vector<fs::path> filesBelow(const fs::path& folder) {
+bool addBytes(const Writer& writer, std::string_view bytes) {
+  return archive_write_data(writer.get(), bytes.data(), bytes.size()) ==
+         static_cast<la_ssize_t>(bytes.size());
+}
+
+bool addFile(const Writer& writer, const fs::path& name, const fs::path& file) {
+  std::error_code failure;
+  uintmax_t left = fs::file_size(file, failure);
+  std::ifstream stream(file, std::ios::binary);
+  if (failure || !stream || !addHeader(writer, name, left)) return false;
+  std::array<char, kBlockBytes> bytes{};
+  while (left > 0) {
+    stream.read(bytes.data(), static_cast<std::streamsize>(std::min(left, kBlockBytes)));
+    const auto count = static_cast<std::size_t>(stream.gcount());
+    if (count == 0 || !addBytes(writer, {bytes.data(), count})) return false;
+    left -= count;
+  }
+  return true;
+}
+
+// The files of a run, by their names from its folder. What was unpacked is none of it, nor is an
+// earlier bundle that the new one replaces.
+std::vector<fs::path> filesOfRun(const fs::path& folder, const fs::path& bundle) {
   std::vector<fs::path> files;
   std::error_code failure;
+  std::error_code ignored;
   for (fs::recursive_directory_iterator entry(folder, failure), end; !failure && entry != end;
        entry.increment(failure)) {
     if (entry.depth() == 0 && entry->path().filename() == kUnpackedName) {
       entry.disable_recursion_pending();
-    } else if (entry->is_regular_file()) {
+    } else if (entry->is_regular_file() && !fs::equivalent(entry->path(), bundle, ignored)) {
       files.push_back(entry->path().lexically_relative(folder));
     }
   }
@@ -73,29 +96,50 @@ std::vector<fs::path> filesBelow(const fs::path& folder) {
   return files;
 }
 
-bool addAll(const Writer& writer, const RunRecord& record, const TraceFiles& trace,
-            const fs::path& run, const fs::path& bundle) {
-  RunRecord packed = record;
-  packed.trace = ("trace" / trace.files.front()).generic_string();
-  if (!addFile(writer, kRecordName, jsonOf(packed))) return false;
-  for (const fs::path& file : trace.files) {
-    if (!addFile(writer, "trace" / file, bytesOf(trace.root / file))) return false;
-  }
-  std::error_code failure;
-  for (const fs::path& file : filesBelow(run)) {
-    if (fs::equivalent(run / file, bundle, failure)) continue;  // it stands in the run's folder
-    if (!addFile(writer, "run" / file, bytesOf(run / file))) return false;
-  }
-  return true;
+/// What goes into a bundle.
+struct Contents {
+  const TraceFiles& trace;
+  const fs::path& run;
+  const std::vector<fs::path> files;  // of the run, below its folder
+};
+
+bool addAll(const Writer& writer, RunRecord record, const Contents& contents) {
+  const fs::path folder = contents.trace.folder();
+  const auto packedName = [&folder](const fs::path& file) {
+    return kTraceName / file.lexically_relative(folder);
+  };
+  record.trace = packedName(contents.trace.files.front()).generic_string();
+  const std::string text = jsonOf(record);
+  return addHeader(writer, kRecordName, text.size()) && addBytes(writer, text) &&
+         std::ranges::all_of(
+             contents.trace.files,
+             [&](const fs::path& file) { return addFile(writer, packedName(file), file); }) &&
+         std::ranges::all_of(contents.files, [&](const fs::path& file) {
+           return addFile(writer, kRunName / file, contents.run / file);
+         });
 }
 
-// Regular files alone, below the folder.
+// Why it cannot be written; empty: it was.
+std::string writeArchive(const fs::path& file, const RunRecord& record, const Contents& contents) {
+  const Writer writer(archive_write_new());
+  archive_write_set_format_pax_restricted(writer.get());
+  archive_write_add_filter_gzip(writer.get());
+  archive_write_set_filter_option(writer.get(), "gzip", "timestamp", nullptr);
+  if (archive_write_open_filename(writer.get(), file.c_str()) == ARCHIVE_OK &&
+      addAll(writer, record, contents) && archive_write_close(writer.get()) == ARCHIVE_OK) {
+    return {};
+  }
+  return reasonOf(writer.get());
+}
+
+// What a bundle holds: regular files alone, below the folder.
 bool isFit(archive_entry* entry) {
   const char* const name = archive_entry_pathname(entry);
   if (name == nullptr || archive_entry_filetype(entry) != AE_IFREG) return false;
   if (archive_entry_hardlink(entry) != nullptr) return false;
   const fs::path path(name);
-  return !path.empty() && path.is_relative() && std::ranges::find(path, "..") == path.end();
+  if (path.empty() || std::ranges::find(path, "..") != path.end()) return false;
+  return path == kRecordName || *path.begin() == kTraceName || *path.begin() == kRunName;
 }
 
 // False: it cannot be written.
@@ -103,7 +147,7 @@ bool copyData(archive* reader, const fs::path& file, int64_t& left) {
   std::error_code failure;
   fs::create_directories(file.parent_path(), failure);
   std::ofstream stream(file, std::ios::binary);
-  std::array<char, 1 << 16> bytes{};
+  std::array<char, kBlockBytes> bytes{};
   for (;;) {
     const la_ssize_t count = archive_read_data(reader, bytes.data(), bytes.size());
     if (count == 0) return stream.flush().good();
@@ -135,6 +179,28 @@ bool unpack(const Reader& reader, const fs::path& folder, std::string& error) {
   }
 }
 
+// The packed run's record, its trace named below the folder.
+std::optional<RunRecord> unpackInto(const fs::path& folder, const fs::path& bundle,
+                                    std::string& error) {
+  const Reader reader(archive_read_new());
+  archive_read_support_filter_gzip(reader.get());
+  archive_read_support_format_tar(reader.get());
+  if (archive_read_open_filename(reader.get(), bundle.c_str(), kBlockBytes) != ARCHIVE_OK) {
+    error = "cannot be read: " + reasonOf(reader.get());
+    return {};
+  }
+  if (!unpack(reader, folder, error)) return {};
+  auto record = parseRecord(bytesOf(folder / kRecordName));
+  const bool isInside = record && !record->command.empty() && record->trace.starts_with("trace/") &&
+                        record->trace.find("..") == std::string::npos;
+  if (!isInside) {
+    error = std::string("has no valid ") + kRecordName;
+    return {};
+  }
+  record->trace = (folder / record->trace).native();
+  return record;
+}
+
 }  // namespace
 
 std::string jsonOf(const RunRecord& record) {
@@ -158,46 +224,42 @@ std::optional<RunRecord> parseRecord(const std::string& text) {
   }
 }
 
-bool writeBundle(const fs::path& bundle, const RunRecord& record, const fs::path& trace,
+bool writeBundle(const fs::path& bundle, const RunRecord& record, const TraceFiles& trace,
                  const fs::path& run, std::string& error) {
-  const auto files = traceFiles(trace, error);
-  if (!files) return false;
-  const Writer writer(archive_write_new());
-  archive_write_set_format_pax_restricted(writer.get());
-  archive_write_add_filter_gzip(writer.get());
-  archive_write_set_filter_option(writer.get(), "gzip", "timestamp", nullptr);
-  if (archive_write_open_filename(writer.get(), bundle.c_str()) == ARCHIVE_OK &&
-      addAll(writer, record, *files, run, bundle) &&
-      archive_write_close(writer.get()) == ARCHIVE_OK) {
-    return true;
+  if (!trace.error.empty()) {
+    error = bundle.native() + ": the trace cannot be packed: " + trace.error;
+    return false;
   }
-  error = bundle.native() + ": cannot be written: " + reasonOf(writer.get());
+  const Contents contents{trace, run, filesOfRun(run, bundle)};
+  std::string reason;
+  const auto write = [&](const fs::path& target) {
+    reason = writeArchive(target, record, contents);
+    return reason.empty();
+  };
+  if (writeWhole(bundle, write)) return true;
+  error = bundle.native() + ": cannot be written" + (reason.empty() ? "" : ": " + reason);
   return false;
 }
 
 std::optional<UnpackedBundle> unpackBundle(const fs::path& bundle, const fs::path& folder,
                                            std::string& error) {
-  constexpr std::size_t kBlockBytes = std::size_t{1} << 16;
-  const Reader reader(archive_read_new());
-  archive_read_support_filter_gzip(reader.get());
-  archive_read_support_format_tar(reader.get());
-  if (archive_read_open_filename(reader.get(), bundle.c_str(), kBlockBytes) != ARCHIVE_OK) {
-    error = bundle.native() + ": cannot be read: " + reasonOf(reader.get());
+  std::error_code failure;
+  if (!fs::create_directory(folder, failure)) {
+    error = folder.native() + ": is there already, or cannot be made";
     return {};
   }
-  if (!unpack(reader, folder, error)) {
-    error = bundle.native() + ": " + error;
-    return {};
-  }
-  auto record = parseRecord(bytesOf(folder / kRecordName));
-  const bool isInside = record && !record->command.empty() && record->trace.starts_with("trace/") &&
-                        record->trace.find("..") == std::string::npos;
-  if (!isInside) {
-    error = bundle.native() + ": has no valid " + kRecordName;
-    return {};
-  }
-  record->trace = (folder / record->trace).native();
-  return UnpackedBundle{std::move(*record), folder / "run"};
+  auto record = unpackInto(folder, bundle, error);
+  if (record) return UnpackedBundle{std::move(*record), folder / kRunName};
+  error = bundle.native() + ": " + error;
+  fs::remove_all(folder, failure);
+  return {};
+}
+
+std::vector<fs::path> unpackedFiles(const fs::path& folder) {
+  std::error_code failure;
+  const bool isFolder = fs::is_directory(fs::symlink_status(folder, failure));
+  if (!isFolder || !parseRecord(bytesOf(folder / kRecordName))) return {};
+  return {folder / kTraceName, folder / kRunName, folder / kRecordName};
 }
 
 }  // namespace brimol::replay

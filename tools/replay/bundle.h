@@ -7,6 +7,8 @@
 #include <string>
 #include <vector>
 
+#include "trace_files.h"
+
 namespace brimol::replay {
 
 /// What was run, and with what.
@@ -24,19 +26,22 @@ std::string jsonOf(const RunRecord& record);
 /// Nothing for what is no such text.
 std::optional<RunRecord> parseRecord(const std::string& text);
 
-/// Packs the trace with what it includes as trace/, the run's folder as run/, and the record, to a
-/// compressed tar archive. False, with one line in `error`, if it cannot be written whole.
+/// Packs the trace's files as trace/, the run's folder as run/, and the record, to a compressed tar
+/// archive. False, with one line in `error`, if it cannot be written whole: what was there stays.
 bool writeBundle(const std::filesystem::path& bundle, const RunRecord& record,
-                 const std::filesystem::path& trace, const std::filesystem::path& run,
-                 std::string& error);
+                 const TraceFiles& trace, const std::filesystem::path& run, std::string& error);
 
 struct UnpackedBundle {
   RunRecord record;           // its trace named from where this program runs
   std::filesystem::path run;  // the folder of the run that was packed
 };
 
-/// Unpacks it into the folder. What is no bundle, or would be written elsewhere, is refused.
+/// Unpacks it into a new folder. What is no bundle, or would be written elsewhere, is refused, and
+/// leaves no folder.
 std::optional<UnpackedBundle> unpackBundle(const std::filesystem::path& bundle,
                                            const std::filesystem::path& folder, std::string& error);
+
+/// What unpackBundle() wrote into the folder; nothing where it did not write there.
+std::vector<std::filesystem::path> unpackedFiles(const std::filesystem::path& folder);
 
 }  // namespace brimol::replay

@@ -154,12 +154,9 @@ std::filesystem::path placeOf(const std::filesystem::path& file) {
   return failure ? file : place;
 }
 
-// Empty: each file to write is another one, and none that is read or that the application is given.
+// Empty: each file to write is another one, and none that the application is given.
 std::string whatIsOverwritten(const Options& options) {
   std::set<std::filesystem::path> taken;
-  for (const auto& file : {options.trace, options.fromBundle}) {
-    if (!file.empty()) taken.insert(placeOf(file));
-  }
   for (const std::string& word : options.command) taken.insert(placeOf(word));
   for (const auto& file : {options.report, options.junit, options.bundle}) {
     if (!file.empty() && !taken.insert(placeOf(file)).second) {

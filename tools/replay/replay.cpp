@@ -1,5 +1,6 @@
 #include "replay.h"
 
+#include <algorithm>
 #include <array>
 #include <cstdlib>
 #include <fstream>
@@ -7,6 +8,7 @@
 
 #include "bundle.h"
 #include "compare.h"
+#include "files.h"
 #include "junit.h"
 #include "layout_lint.h"
 #include "picture.h"
@@ -15,6 +17,7 @@
 #include "report_data.h"
 #include "run.h"
 #include "run_directory.h"
+#include "trace_files.h"
 #include "version.h"
 
 namespace brimol::replay {
@@ -24,8 +27,10 @@ namespace fs = std::filesystem;
 namespace {
 
 // The platform's settings that a run depends on, and that a repeated run takes from the first.
-constexpr auto kSettings =
-    std::to_array<const char*>({"BRIMOL_DEVICE", "BRIMOL_SCREEN", "BRIMOL_CLOCK_START"});
+constexpr auto kSettings = std::to_array<const char*>(
+    {"BRIMOL_DEVICE", "BRIMOL_SCREEN", "BRIMOL_CLOCK_START", "BRIMOL_CLOCK_STEP"});
+constexpr auto kRootVariable = "BRIMOL_TRACE_ROOT";
+constexpr auto kUnfinished = "unfinished";  // a record's verdict while the run goes on
 
 int complain(const std::string& message) {
   std::cerr << "brimol-replay: " << message << '\n';
@@ -35,10 +40,23 @@ int complain(const std::string& message) {
 /// All that stands before the application starts.
 struct Plan {
   Options options;
-  fs::path folder;  // of the run
+  fs::path folder;     // of the run
+  fs::path traceRoot;  // where included files are; empty: in the trace's own folder
   RunRecord record;
   test::AcceptedFindings accepted;
 };
+
+bool writeFile(const fs::path& file, const std::string& text, std::string& error) {
+  const auto write = [&text](const fs::path& target) {
+    std::ofstream stream(target, std::ios::binary);
+    stream << text;
+    stream.close();
+    return stream.good();
+  };
+  if (writeWhole(file, write)) return true;
+  error = file.native() + ": cannot be written";
+  return false;
+}
 
 // A word of a command as a shell would take it.
 std::string quoted(const std::string& word) {
@@ -56,8 +74,24 @@ std::string commandText(const std::vector<std::string>& command) {
   return text;
 }
 
+fs::path traceRootOfUser() {
+  const char* const root = std::getenv(kRootVariable);
+  return root == nullptr ? "" : root;
+}
+
+// What the run reads: it may not be removed or written over.
+std::vector<fs::path> neededFiles(const Options& options) {
+  std::vector<fs::path> files;
+  if (!options.trace.empty()) files = traceFiles(options.trace, traceRootOfUser()).files;
+  for (const fs::path& file : {options.trace, options.fromBundle, options.accepted}) {
+    if (!file.empty()) files.push_back(file);
+  }
+  if (!options.against.empty()) files.push_back(options.against / kSessionName);
+  return files;
+}
+
 // Empty: what is named can be read and written, as far as can be told beforehand.
-std::string whatIsMissing(const Options& options) {
+std::string whatIsMissing(const Options& options, const std::vector<fs::path>& needed) {
   for (const fs::path& file : {options.trace, options.fromBundle}) {
     if (!file.empty() && !std::ifstream(file)) return file.native() + ": cannot be read";
     if (fs::is_directory(file)) return file.native() + ": is a folder";
@@ -65,14 +99,17 @@ std::string whatIsMissing(const Options& options) {
   if (!options.against.empty() && !fs::exists(options.against / kSessionName)) {
     return options.against.native() + ": holds no run";
   }
-  std::error_code failure;
-  if (fs::equivalent(options.against, options.directory, failure)) {
-    return options.against.native() + ": would be replaced by the run that is compared with it";
-  }
   for (const fs::path& file : {options.report, options.junit, options.bundle}) {
     if (file.empty()) continue;
     if (!fs::is_directory(fs::absolute(file).parent_path()) || fs::is_directory(file)) {
       return file.native() + ": cannot be written there";
+    }
+    const auto isSame = [&file](const fs::path& one) {
+      std::error_code failure;
+      return fs::equivalent(file, one, failure);
+    };
+    if (std::ranges::any_of(needed, isSame)) {
+      return file.native() + ": would be written over, and the run reads it";
     }
   }
   return {};
@@ -85,6 +122,7 @@ bool takeFromBundle(Plan& plan, std::string& error) {
   if (!unpacked) return false;
   options.trace = unpacked->record.trace;
   options.against = unpacked->run;
+  plan.traceRoot = plan.folder / kUnpackedName;
   const std::vector<std::string> packed(unpacked->record.command.begin() + 1,
                                         unpacked->record.command.end());
   if (options.takesArguments) {
@@ -110,13 +148,22 @@ void takeSettings(Plan& plan) {
   if (!plan.options.device.empty()) settings["BRIMOL_DEVICE"] = plan.options.device;
 }
 
-std::optional<Plan> prepare(Options options, std::string& error) {
-  error = whatIsMissing(options);
+// The folder of the run. Its record says from now on whose it is.
+std::optional<fs::path> makeFolder(const Options& options, std::string& error) {
+  const std::vector<fs::path> needed = neededFiles(options);
+  error = whatIsMissing(options, needed);
   if (!error.empty()) return {};
   const fs::path& named = options.trace.empty() ? options.fromBundle : options.trace;
-  const auto folder = prepareRunDirectory(options.directory, named.stem(), error);
+  auto folder = prepareRunDirectory(options.directory, named.stem(), needed, error);
+  const RunRecord record{kVersion, named.native(), options.command, {}, kUnfinished};
+  if (folder && !writeFile(*folder / kRecordFileName, jsonOf(record), error)) return {};
+  return folder;
+}
+
+std::optional<Plan> prepare(Options options, std::string& error) {
+  const auto folder = makeFolder(options, error);
   if (!folder) return {};
-  Plan plan{std::move(options), *folder, {}, {}};
+  Plan plan{std::move(options), *folder, traceRootOfUser(), {}, {}};
   if (!plan.options.accepted.empty()) plan.accepted = test::AcceptedFindings(plan.options.accepted);
   if (!plan.options.fromBundle.empty() && !takeFromBundle(plan, error)) return {};
   takeSettings(plan);
@@ -140,39 +187,14 @@ Launch launchOf(const Plan& plan) {
     launch.environment[name] = isSet ? std::optional(found->second) : std::nullopt;
   }
   launch.environment["BRIMOL_TRACE"] = plan.record.trace;
-  if (!plan.options.fromBundle.empty()) {
-    launch.environment["BRIMOL_TRACE_ROOT"] = plan.folder / kUnpackedName;
-  }
+  if (!plan.traceRoot.empty()) launch.environment[kRootVariable] = plan.traceRoot;
   launch.environment["BRIMOL_RECORD"] = std::nullopt;
+  launch.environment["BRIMOL_MONKEY"] = std::nullopt;
   launch.environment["BRIMOL_REPORT_DIR"] = plan.folder.native();
   if (plan.options.lints) launch.environment["BRIMOL_REPORT_ITEMS"] = "changed";
   launch.environment["BRIMOL_DISPLAY"] = isWatched ? "window" : "headless";
   launch.environment["BRIMOL_CLOCK"] = isWatched ? "paced" : "simulated";
   return launch;
-}
-
-bool writeBytes(const fs::path& file, const std::string& text) {
-  std::ofstream stream(file, std::ios::binary);
-  stream << text;
-  stream.close();
-  return stream.good();
-}
-
-// Whole, or what was there stays. A device does not give way to a file.
-bool writeFile(const fs::path& file, const std::string& text, std::string& error) {
-  std::error_code failure;
-  const fs::path target = fs::weakly_canonical(file, failure);
-  if (fs::is_regular_file(target, failure) || !fs::exists(target, failure)) {
-    const fs::path temporary = fs::path(target).concat(".tmp");
-    const bool isWhole = writeBytes(temporary, text);
-    if (isWhole) fs::rename(temporary, target, failure);
-    if (isWhole && !failure) return true;
-    fs::remove(temporary, failure);
-  } else if (writeBytes(target, text)) {
-    return true;
-  }
-  error = file.native() + ": cannot be written";
-  return false;
 }
 
 /// A run that has ended, and what it is compared with.
@@ -193,7 +215,8 @@ Outcome runAndJudge(const Plan& plan) {
         run(launchOf(plan), [&progress](const Session& session) { progress.show(session); });
   }
   outcome.run = {plan.folder, readSession(plan.folder / kSessionName)};
-  outcome.output = bytesOf(plan.folder / kOutputName);
+  // One byte more than is shown tells that there are more.
+  outcome.output = endOf(plan.folder / kOutputName, kMostOutputBytes + 1);
   if (const fs::path& against = plan.options.against; !against.empty()) {
     outcome.other = PlayedRun{against, readSession(against / kSessionName)};
     outcome.comparison = compare(outcome.run, *outcome.other, kMostPairs);
@@ -233,8 +256,9 @@ bool writeAll(const Plan& plan, const Outcome& outcome, std::string& error) {
         junitXml(options.trace.filename(), outcome.run.session, outcome.judgement, outcome.output);
     if (!writeFile(options.junit, xml, error)) return false;
   }
-  return options.bundle.empty() ||
-         writeBundle(options.bundle, record, options.trace, plan.folder, error);
+  const bool isPacked = !options.bundle.empty() && outcome.judgement.verdict != Verdict::Unusable;
+  return !isPacked || writeBundle(options.bundle, record, traceFiles(options.trace, plan.traceRoot),
+                                  plan.folder, error);
 }
 
 // The end of what the application wrote, where it says more than the judgement.
@@ -255,6 +279,9 @@ void tell(const Plan& plan, const Outcome& outcome) {
   if (!place.file.empty()) out << place.text() << ": ";
   out << verdictName(verdict) << ": " << headline << '\n';
   if (!detail.empty()) out << detail << '\n';
+  if (verdict == Verdict::Unusable && !plan.options.bundle.empty()) {
+    out << "no bundle: there is no run to repeat\n";
+  }
   out << "report: " << plan.options.report.native() << '\n';
 }
 

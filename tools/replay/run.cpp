@@ -24,7 +24,7 @@ constexpr milliseconds kLookEvery{100};
 sigset_t watchedSignals() {
   sigset_t set;
   ::sigemptyset(&set);
-  for (const int signal : {SIGCHLD, SIGINT, SIGTERM, SIGHUP}) ::sigaddset(&set, signal);
+  for (const int signal : {SIGCHLD, SIGINT, SIGQUIT, SIGTERM, SIGHUP}) ::sigaddset(&set, signal);
   return set;
 }
 
@@ -47,12 +47,22 @@ class HeldSignals {
   sigset_t former{};
 };
 
-/// How the process is to start: in a group of its own, without input, its output in a file.
+std::vector<char*> pointersTo(std::vector<std::string>& texts) {
+  std::vector<char*> pointers;
+  pointers.reserve(texts.size() + 1);
+  for (std::string& text : texts) pointers.push_back(text.data());
+  pointers.push_back(nullptr);
+  return pointers;
+}
+
+/// How a process is to start: in a group (0: one that it leads), without input, its output in a
+/// file.
 class SpawnPlan {
  public:
-  SpawnPlan(const std::string& output, const sigset_t& mask) {
+  SpawnPlan(const std::string& output, const sigset_t& mask, pid_t group) {
     ::posix_spawnattr_init(&attributes);
     ::posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETPGROUP | POSIX_SPAWN_SETSIGMASK);
+    ::posix_spawnattr_setpgroup(&attributes, group);
     ::posix_spawnattr_setsigmask(&attributes, &mask);
     ::posix_spawn_file_actions_init(&actions);
     ::posix_spawn_file_actions_addopen(&actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
@@ -68,17 +78,18 @@ class SpawnPlan {
   SpawnPlan(const SpawnPlan&) = delete;
   SpawnPlan& operator=(const SpawnPlan&) = delete;
 
+  void takeInput(int end) { ::posix_spawn_file_actions_adddup2(&actions, end, STDIN_FILENO); }
+  /// 0, or the number of the error.
+  int start(std::vector<std::string> command, std::vector<std::string> environment,
+            pid_t& process) const {
+    return ::posix_spawnp(&process, command.front().c_str(), &actions, &attributes,
+                          pointersTo(command).data(), pointersTo(environment).data());
+  }
+
+ private:
   posix_spawnattr_t attributes{};
   posix_spawn_file_actions_t actions{};
 };
-
-std::vector<char*> pointersTo(std::vector<std::string>& texts) {
-  std::vector<char*> pointers;
-  pointers.reserve(texts.size() + 1);
-  for (std::string& text : texts) pointers.push_back(text.data());
-  pointers.push_back(nullptr);
-  return pointers;
-}
 
 // This program's, with the given ones in the place of those of the same name.
 std::vector<std::string> environmentWith(
@@ -94,13 +105,46 @@ std::vector<std::string> environmentWith(
   return all;
 }
 
+/// A process group that ends with this program, however that comes: its leader waits for the end
+/// of a pipe into which nobody writes, and then kills the group.
+class Group {
+ public:
+  explicit Group(const sigset_t& mask) {
+    std::array<int, 2> ends = {};
+    if (::pipe2(ends.data(), O_CLOEXEC) != 0) {
+      error = errno;
+      return;
+    }
+    SpawnPlan plan("/dev/null", mask, 0);
+    plan.takeInput(ends[0]);
+    error = plan.start({"/bin/sh", "-c", "read line; kill -KILL 0"}, environmentWith({}), leader);
+    ::close(ends[0]);
+    lifeline = ends[1];
+  }
+  ~Group() {
+    if (error == 0) {
+      kill();
+      while (::waitpid(leader, nullptr, 0) < 0 && errno == EINTR) continue;
+    }
+    if (lifeline >= 0) ::close(lifeline);
+  }
+  Group(const Group&) = delete;
+  Group& operator=(const Group&) = delete;
+
+  // The leader is not yet waited for, so that its number still stands for this group.
+  void kill() const { ::kill(-leader, SIGKILL); }
+
+  pid_t leader = 0;
+  int error = 0;  // why there is no group
+
+ private:
+  int lifeline = -1;  // the pipe's end that closes with this program
+};
+
 // 0, or the number of the error.
-int start(const Launch& launch, const sigset_t& mask, pid_t& process) {
-  const SpawnPlan plan(launch.output.native(), mask);
-  std::vector<std::string> command = launch.command;
-  std::vector<std::string> environment = environmentWith(launch.environment);
-  return ::posix_spawnp(&process, command.front().c_str(), &plan.actions, &plan.attributes,
-                        pointersTo(command).data(), pointersTo(environment).data());
+int start(const Launch& launch, const HeldSignals& signals, const Group& group, pid_t& process) {
+  const SpawnPlan plan(launch.output.native(), signals.former, group.leader);
+  return plan.start(launch.command, environmentWith(launch.environment), process);
 }
 
 /// The session's file while it grows.
@@ -159,13 +203,14 @@ RunEnd run(const Launch& launch, const std::function<void(const Session&)>& look
   const auto began = steady_clock::now();
   RunEnd end;
   pid_t process = 0;
-  if (const int error = start(launch, signals.former, process); error != 0) {
+  const Group group(signals.former);
+  const int error = group.error != 0 ? group.error : start(launch, signals, group, process);
+  if (error != 0) {
     end.why = "cannot start " + launch.command.front() + ": " + std::strerror(error);
     return end;
   }
   end.kind = watch(launch, signals, process, look);
-  // The process is not yet waited for, so that its number still stands for this group.
-  ::kill(-process, SIGKILL);
+  group.kill();
   int status = 0;
   while (::waitpid(process, &status, 0) < 0 && errno == EINTR) continue;
   end.realTime = std::chrono::duration_cast<milliseconds>(steady_clock::now() - began);

@@ -24,8 +24,9 @@ struct Launch {
 };
 
 /// Runs it in a process group of its own until it ends, hangs, or this program is asked to end
-/// (SIGINT, SIGTERM, SIGHUP). Whatever happens, nothing of the group is left running. `look` is
-/// called with what the session has come to, about ten times a second.
+/// (SIGINT, SIGQUIT, SIGTERM, SIGHUP). Whatever happens, nothing of the group is left running, not
+/// even where this program is killed. `look` is called with what the session has come to, about ten
+/// times a second.
 RunEnd run(const Launch& launch, const std::function<void(const Session&)>& look);
 
 }  // namespace brimol::replay

@@ -2,22 +2,23 @@
 #pragma once
 
 #include <filesystem>
-#include <optional>
 #include <string>
-#include <string_view>
 #include <vector>
 
 namespace brimol::replay {
 
-/// The name in a line `include FILE`; nothing for any other line.
-std::optional<std::string> includedBy(std::string_view line);
-
 struct TraceFiles {
-  std::filesystem::path root;                // the deepest folder that all of them are in
-  std::vector<std::filesystem::path> files;  // below root; the trace itself first, each once
+  // The trace first, then what it includes, each once: absolute, and without `..`.
+  std::vector<std::filesystem::path> files = {};
+  std::string error = {};  // one line; empty: these are all of them
+
+  /// The deepest folder that all of them are in.
+  std::filesystem::path folder() const;
 };
 
-/// The trace and what it includes. Nothing, with one line in `error`, if one cannot be read.
-std::optional<TraceFiles> traceFiles(const std::filesystem::path& trace, std::string& error);
+/// Reads the trace as the platform does: only what the platform would read is among the files. What
+/// is included is in `root` or below it, and an empty root is the trace's own folder. A trace that
+/// is a device or a pipe is not read, since it can be read only once.
+TraceFiles traceFiles(const std::filesystem::path& trace, const std::filesystem::path& root);
 
 }  // namespace brimol::replay
