@@ -55,7 +55,7 @@ void play(const brimol::pc::Trace& trace) {
   constexpr brimol::pc::Size kScreen = {480, 800};
   constexpr int kMostActs = 500;
   std::size_t written = 0;
-  const auto count = [&written](const std::string& text) { written += text.size(); };
+  const auto count = [&written](std::string_view text) { written += text.size(); };
   TraceRunner runner(
       trace, {.screen = trace.screen.value_or(kScreen),
               .post = [&](const Event& record) { written += record.type; },
@@ -84,9 +84,10 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, std::size_t count) {
   const Files files({reinterpret_cast<const char*>(bytes), count});
   const auto parsed =
       brimol::pc::parseTrace("t", [&](const std::string& path) { return files.read(path); });
-  if (parsed.error.empty()) play(parsed.trace);
-  // What is wrong is said with its place.
-  else if (parsed.error.find(':') == std::string::npos)
+  if (parsed.error.empty()) {
+    play(parsed.trace);
+  } else if (parsed.error.find(':') == std::string::npos) {  // it lacks its place
     std::abort();
+  }
   return 0;
 }
