@@ -71,7 +71,7 @@ void step(FuzzStage& stage, Arguments& from) {
     case 3: stage.dispatchRecord(); break;
     case 4: stage.dispatchTouch(); break;
     case 5: stage.wait(); break;
-    case 6: stage.round(); break;
+    case 6: FuzzStage::round(); break;
     default: callItems(from); break;
   }
 }

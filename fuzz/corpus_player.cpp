@@ -10,6 +10,7 @@
 #include <vector>
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size);
+extern "C" [[gnu::weak]] int LLVMFuzzerInitialize(int* count, char*** words);
 
 namespace {
 
@@ -42,6 +43,7 @@ int main(int count, char** words) {
     std::fprintf(stderr, "which files or folders of them?\n");
     return 2;
   }
+  if (LLVMFuzzerInitialize != nullptr) LLVMFuzzerInitialize(&count, &words);
   bool areRead = true;
   for (const char* place : std::span(words, static_cast<std::size_t>(count)).subspan(1)) {
     areRead = playAll(place) && areRead;

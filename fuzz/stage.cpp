@@ -106,14 +106,19 @@ void FuzzStage::dispatchTouch() {
   const auto part = [this](int side) {
     return static_cast<uint16_t>(int64_t{side} * from.byte() / kSteps);
   };
+  const auto motion = [this] {
+    constexpr int kBack = 128;  // from here on to the left, or up
+    const int step = from.byte();
+    return static_cast<int16_t>(step < kBack ? step : step - 2 * kBack);
+  };
   const uint8_t what = from.byte();
   Event event = {};
   event.pointer.type = static_cast<uint8_t>(kTypes.at(what % kTypes.size()));
   event.pointer.finger = static_cast<uint8_t>(what / kTypes.size() % 3);
   event.pointer.x = part(MW::Window::width);
   event.pointer.y = part(MW::Window::height);
-  event.pointer.xrel = static_cast<int8_t>(from.byte());
-  event.pointer.yrel = static_cast<int8_t>(from.byte());
+  event.pointer.xrel = motion();
+  event.pointer.yrel = motion();
   dispatch(event);
 }
 

@@ -33,7 +33,7 @@ class FuzzStage {
   void operate(std::size_t place);
 
   /// Sends an event through the queue and the dispatcher.
-  void dispatch(const Event& event);
+  static void dispatch(const Event& event);
   /// A random one, or a finger at a place on the screen.
   void dispatchRecord() { dispatch(from.take<Event>()); }
   void dispatchTouch();
@@ -41,7 +41,7 @@ class FuzzStage {
   void wait();
   /// A round of the application's loop: timers and a frame. Stops the fuzzer where a text is drawn
   /// that does not fit into its record.
-  void round();
+  static void round();
 
  private:
   struct Occupant {

@@ -38,9 +38,9 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, std::size_t count) {
   for (std::size_t left = from.below(16); left > 0; --left) {
     stage.operate(0);
     from.forget();
-    stage.round();
+    FuzzStage::round();
   }
   giveLong(*stage.at(0), from.remaining());
-  stage.round();
+  FuzzStage::round();
   return 0;
 }

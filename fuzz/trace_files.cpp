@@ -84,9 +84,10 @@ extern "C" int LLVMFuzzerTestOneInput(const uint8_t* bytes, std::size_t count) {
   const Files files({reinterpret_cast<const char*>(bytes), count});
   const auto parsed =
       brimol::pc::parseTrace("t", [&](const std::string& path) { return files.read(path); });
-  if (parsed.error.empty()) play(parsed.trace);
-  // What is wrong is said with its place.
-  else if (parsed.error.find(':') == std::string::npos)
+  if (parsed.error.empty()) {
+    play(parsed.trace);
+  } else if (parsed.error.find(':') == std::string::npos) {  // it lacks its place
     std::abort();
+  }
   return 0;
 }

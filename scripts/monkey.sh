@@ -10,15 +10,15 @@ Usage: scripts/monkey.sh [--preset NAME] [--events N] [--days N] SEED...
 Each seed plays in a process of its own, in simulated time, on a screen of 480x800. The session's memory, threads and
 open files are printed after each 250,000 events and each simulated day. A seed fails if the application crashes,
 leaks (with a sanitizer's preset), does not close, shows the same for 5,000 events, or gives a verdict a wrong time.
-From the first of those lines after half a million events to the last, memory may not grow by more than 1 %, and no
-thread and no open file may be left. Fewer events than a million are too few to tell, and are not judged by this.
+From the first of those lines after a million events to the last, memory may not grow by more than 1 %, and no thread
+and no open file may be left. Fewer events than 1,500,000 are too few to tell, and are not judged by this.
 
 The trace of a seed that fails stays in build/monkey/SEED.trace. Played, it brings back a crash, a hang, and that the
 application does not close: scripts/shrink_trace.py makes it short, the latter two with --hangs and --exit 1. The rest
 is judged only while the monkey plays; the same seed and options do the same again.
 
   --preset NAME   the build, `release` when not said
-  --events N      so many events each, 1000000 when not said
+  --events N      so many events each, 2000000 when not said
   --days N        with rests in between, so that they take N days; the clock starts over in the middle
   --help          this text
 END
@@ -30,7 +30,7 @@ fail_usage() {
 }
 
 readonly day=86400000 # ms
-preset=release events=1000000 days=0 seeds=()
+preset=release events=2000000 days=0 seeds=()
 while (($# > 0)); do
   case $1 in
     --help) usage; exit ;;
@@ -69,10 +69,10 @@ program=$PWD/build/$preset/apps/factory_test/factory_test
 mkdir -p build/monkey
 cd build/monkey
 
-# Compares the first line that tells of memory (KiB), threads and open files with the last one. Before half a million
+# Compares the first line that tells of memory (KiB), threads and open files with the last one. Before a million
 # events the painter's bounded store of texts still fills; a leak needs events to show.
 judge() {
-  awk -v few=$((events < 1000000)) '/ KiB resident/ && $4 >= 500000 {
+  awk -v few=$((events < 1500000)) '/ KiB resident/ && $4 >= 1000000 {
          memory = $(NF - 7); threads = $(NF - 4); files = $(NF - 2); told = $4
          if (!lines++) { memory1 = memory; threads1 = threads; files1 = files; told1 = told }
        }

@@ -14,6 +14,7 @@ MEMORY = 4 << 30  # bytes that a test may take
 FEWEST_SECONDS = 10
 SLOWER = 10  # how many times longer than without a mutant a test may take
 COMPILE_SECONDS = 600
+NO_END = ': no end'  # of a test that was stopped
 
 
 class Failure(Exception):
@@ -80,9 +81,17 @@ class Build:
         if self.mark.exists():
             for path in self.kept.rglob('*.o'):
                 (self.build / path.relative_to(self.kept)).unlink(missing_ok=True)
+            self.drop_others()
             self.mark.unlink()
         for path in list(self.build.rglob('*')):
             if path.is_file() and 'CMakeFiles' not in path.parts and (path.suffix == '.a' or os.access(path, os.X_OK)):
+                path.unlink()
+
+    def drop_others(self):
+        """The tests' objects that were made since a header was changed: it gets its time back, and they would stay."""
+        begin = self.mark.stat().st_mtime_ns
+        for path in list(self.build.rglob('*.o')):
+            if path.stat().st_mtime_ns >= begin:
                 path.unlink()
 
     def demand(self, command, environment):
@@ -118,7 +127,7 @@ class Build:
                 output = program.communicate(timeout=seconds)[0].decode(errors='replace')
             except subprocess.TimeoutExpired:
                 os.killpg(program.pid, signal.SIGKILL)
-                return f'{name}: no end'
+                return name + NO_END
         if program.returncode == 0:
             return None
         failed = re.search(r'\[  FAILED  \] ([^\s,]+)', output)
@@ -148,6 +157,7 @@ class Build:
             os.utime(path, ns=(times.st_atime_ns, times.st_mtime_ns))
             for name in self.clean:
                 shutil.copy2(self.kept / name, self.build / name)
+            self.drop_others()
             self.mark.unlink()
 
     def ninja(self, targets):

@@ -1,9 +1,10 @@
 #!/usr/bin/python3
 # Debian's Python, since python3-clang is installed for that one.
 """Measures how many small faults the unit tests find: each mutant is the library with one operator, constant,
-condition, result or call of src/ changed; lines of the log are left alone. A seed chooses them. A mutant is killed if
-a unit test fails, crashes or does not end. One that does not compile, or that compiles to the same as the original or
-as a mutant before, does not count: the next one takes its place.
+condition, result or call of src/ or include/MW/detail/ changed; lines of the log are left alone. A seed chooses them.
+A mutant is killed if a unit test fails, crashes or does not end; the report says how many do not. One that does not
+compile, or that compiles to the same as the original or as a mutant before, does not count: the next one takes its
+place.
 
 All is built in build/mutants. The results stand in build/mutants/seed_N.jsonl; a run that was interrupted goes on
 from there, until the sources change.
@@ -21,10 +22,11 @@ import threading
 from concurrent.futures import ThreadPoolExecutor
 
 import mutation_points
-from mutant_build import Build, Failure
+from mutant_build import NO_END, Build, Failure
 from mutation_points import Point, find_points
 
 COUNTED = ('killed', 'survived')
+CHANGED = ('src', 'include/MW/detail')
 
 
 class Results:
@@ -77,7 +79,7 @@ class Session:
         self.folder = project / 'build' / 'mutants'
         self.builds = [Build(project, self.folder / f'job_{job + 1}', without) for job in range(jobs)]
         self.builds[0].configure()
-        self.digest = digest_of(project / 'src')
+        self.digest = digest_of(project)
         self.points = self.find()
         self.sources = {point.file: (project / point.file).read_bytes() for point in self.points}
         self.objects = {}  # what mutants were compiled to, and the number of the first
@@ -92,7 +94,7 @@ class Session:
             if kept['sources'] == self.digest:
                 return [Point(*values[:4], values[4].encode()) for values in kept['points']]
         first = self.builds[0]
-        points = find_points(first.folder, first.commands, first.sources)
+        points = find_points(first.folder, first.commands, [first.folder / name for name in CHANGED])
         if not points:
             raise Failure(f'{first.sources}: there is nothing to change')
         values = [(p.file, p.begin, p.end, p.kind, p.text.decode()) for p in points]
@@ -144,18 +146,20 @@ class Session:
         print(f'#{number} {place} {point.kind}: {status}{f" by {due_to}" if due_to else ""}', flush=True)
 
 
-def digest_of(folder):
+def digest_of(project):
     """Of the sources and of what looks for points in them."""
     whole = hashlib.sha256(pathlib.Path(mutation_points.__file__).read_bytes())
-    for path in sorted(folder.rglob('*')):
+    for path in sorted(path for name in CHANGED for path in (project / name).rglob('*')):
         if path.is_file():
-            whole.update(str(path.relative_to(folder)).encode() + b'\0' + path.read_bytes())
+            whole.update(str(path.relative_to(project)).encode() + b'\0' + path.read_bytes())
     return whole.hexdigest()
 
 
 def report(session, results, numbers):
     killed = [number for number in numbers if results.of[number]['status'] == 'killed']
-    print(f'\nKilled {len(killed)} of {len(numbers)} mutants: {100 * len(killed) / max(1, len(numbers)):.1f} %')
+    endless = [number for number in killed if results.of[number]['by'].endswith(NO_END)]
+    print(f'\nKilled {len(killed)} of {len(numbers)} mutants: {100 * len(killed) / max(1, len(numbers)):.1f} %, '
+          f'{len(endless)} of them by the time limit')
     for number in sorted(set(numbers) - set(killed)):
         print(f'survived: {session.describe(number)}')
 

@@ -174,18 +174,18 @@ def unwrap(cursor):
     return cursor
 
 
-def find_points(project, commands, folder):
-    """All points of the sources below `folder`, in order. `commands`: how the sources are compiled."""
+def find_points(project, commands, folders):
+    """All points of what stands below `folders` and is compiled there, in order. `commands`: how that is done."""
     index = clang.cindex.Index.create()
     files = {}
     for entry in sorted(json.loads(commands.read_text()), key=lambda entry: entry['file']):
-        if not pathlib.Path(entry['file']).is_relative_to(folder):
+        if not is_below(pathlib.Path(entry['file']), folders):
             continue
         unit = index.parse(entry['file'], ['-DNDEBUG', *options_of(entry['command'])])
         errors = [str(found) for found in unit.diagnostics if found.severity >= clang.cindex.Diagnostic.Error]
         if errors:
             raise RuntimeError(errors[0])
-        visit_unit(unit, project, folder, files)
+        visit_unit(unit, project, folders, files)
     return sorted(point for file in files.values() for point in file.points)
 
 
@@ -197,11 +197,15 @@ def options_of(command):
             if word.startswith(('-I', '-D', '-std=')) or '-isystem' in (last, word)]
 
 
-def visit_unit(unit, project, folder, files):
+def is_below(path, folders):
+    return any(path.is_relative_to(folder) for folder in folders)
+
+
+def visit_unit(unit, project, folders, files):
     known = set(files)
     for cursor in unit.cursor.get_children():
         path = cursor.location.file and pathlib.Path(cursor.location.file.name)
-        if not path or path in known or not path.is_relative_to(folder):
+        if not path or path in known or not is_below(path, folders):
             continue
         if path not in files:
             files[path] = FilePoints(str(path.relative_to(project)), path.read_bytes())

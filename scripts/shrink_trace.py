@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Makes a trace that crashes or hangs a program as short as it goes: shrink_trace.py TRACE SHORT -- PROGRAM [ARGUMENT...]
+"""Makes a trace under which a program fails as short as it goes: shrink_trace.py TRACE SHORT -- PROGRAM [ARGUMENT...]
 
 The program is run under ever shorter traces (BRIMOL_TRACE, without a window). A run counts as the same failure
 if it ends by the same signal, or, before the names, with --exit CODE, with that exit code, or, with --hangs, if it has

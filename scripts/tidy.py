@@ -26,7 +26,7 @@ from batches import make_batches
 LEFT_OUT = ('--checks=-bugprone-suspicious-include', '--extra-arg=-Wno-shadow')
 
 # Projects of their own, which tests build.
-STAND_ALONE = ('tests/install/outer/', 'tests/mutants/tiny/')
+STAND_ALONE = ('tests/install/outer/', 'tests/install/c_program/', 'tests/mutants/tiny/')
 
 
 def read_units(folder, files):
@@ -48,9 +48,10 @@ def check_all_known(units, files):
 
 
 class Group:
-    """Targets whose files can be looked at together."""
+    """Targets whose files, of one language, can be looked at together."""
 
-    def __init__(self, options):
+    def __init__(self, language, options):
+        self.language = language  # the files' suffix
         self.others, self.folders, self.macros = self.split(options)
         self.headers = headers_of(self.folders)
         self.paths = []
@@ -71,8 +72,10 @@ class Group:
                 others.append(word)
         return others, folders, macros
 
-    def takes(self, options):
+    def takes(self, language, options):
         """Whether these options fit, which the group has then."""
+        if language != self.language:
+            return False
         _, folders, macros = self.split(options)
         headers = headers_of(folders)
         if any(self.macros.get(name, word) != word for name, word in macros.items()):
@@ -109,9 +112,10 @@ def batches_of(units):
         paths_by_options.setdefault(options, []).append(path)
     groups = []
     for options, paths in sorted(paths_by_options.items(), key=lambda item: -len(item[1])):
-        group = next((each for each in groups if each.takes(options)), None)
+        language = pathlib.Path(paths[0]).suffix
+        group = next((each for each in groups if each.takes(language, options)), None)
         if group is None:
-            group = Group(options)
+            group = Group(language, options)
             groups.append(group)
         group.paths += paths
     return [{'options': group.options(), 'files': files} for group in groups for files in make_batches(group.paths)]
@@ -122,8 +126,7 @@ def write_batches(folder, batches):
     folder.mkdir(exist_ok=True)
     commands = []
     for number, batch in enumerate(batches):
-        is_c = batch['files'][0].endswith('.c')
-        source = folder / f'batch_{number}.{"c" if is_c else "cpp"}'
+        source = folder / f'batch_{number}{pathlib.Path(batch["files"][0]).suffix}'
         source.write_text(''.join(f'#include "{path}"\n' for path in batch['files']))
         words = [*batch['options'], '-c', str(source)]
         commands.append({'directory': str(folder.parent), 'file': str(source), 'arguments': words})

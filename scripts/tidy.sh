@@ -11,7 +11,7 @@ if [[ ${1:-} == --changed ]]; then
   main=$(git merge-base HEAD origin/main 2>/dev/null || git merge-base HEAD main 2>/dev/null || echo HEAD)
   mapfile -t changed < <(git diff --name-only --diff-filter=d "$main"; git ls-files --others --exclude-standard)
   list() {
-    local pattern paths=() file
+    local paths=() file
     for file in "${changed[@]}"; do
       [[ $file == *.h ]] && paths+=("$file" ":(glob)**/$(basename "${file%.h}").cpp") || paths+=("$file")
     done
@@ -21,7 +21,7 @@ if [[ ${1:-} == --changed ]]; then
   }
 fi
 mapfile -t sources < <(list '*.h' '*.cpp' '*.c')
-mapfile -t units < <(list '*.cpp')
+mapfile -t units < <(list '*.cpp' '*.c')
 
 echo "== Checking the format of ${#sources[@]} files"
 ((${#sources[@]} == 0)) || clang-format --dry-run --Werror "${sources[@]}"

@@ -33,7 +33,8 @@ std::string Arguments::remaining() {
 }
 
 std::string Arguments::bytes() {
-  const std::size_t count = std::min<std::size_t>(byte(), rest.size());
+  const std::size_t wanted = byte();  // taken before what is left is asked for
+  const std::size_t count = std::min(wanted, rest.size());
   std::string taken(rest.begin(), rest.begin() + static_cast<std::ptrdiff_t>(count));
   rest = rest.subspan(count);
   return taken;

@@ -8,6 +8,7 @@
 #include <cmath>
 #include <cstdio>
 #include <utility>
+#include <vector>
 
 #include "language/language.h"
 #include "layout.h"
@@ -67,8 +68,9 @@ bool MeasurePage::isWithinMm(double pixels, double most) {
 }
 
 void MeasurePage::updateLook() {
-  const uint32_t now = GetTicks();
-  for (const Input& input : watch->take()) {
+  const std::vector<Input> inputs = watch->take();
+  const uint32_t now = GetTicks();  // after the inputs' times
+  for (const Input& input : inputs) {
     if (input.kind == Input::Kind::KeyPress && input.key == kKeyBack) finishLook();
     if (isOfAnOldTouch(input) && !followsOldTouches()) continue;
     followStill(input);

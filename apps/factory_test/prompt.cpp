@@ -50,7 +50,8 @@ Prompt::Prompt(const Question& question) : panel(std::make_unique<Panel>(questio
   buttons.place<1>(no, captionIn(no, question.no, kButtonInk.text));
   veil.emplace(SKIA_Rect{yes.x, yes.y, no.x + no.w - yes.x, yes.h, 0}, MW::kTopLayer,
                GetTicks() + PressGuard::kDeafMs);
-  key.emplace().keyPressCallback = [](MW::kbd_event* event) {
+  moveToTop(key.emplace());
+  key->keyPressCallback = [](MW::kbd_event* event) {
     Current<Prompt>::get().followKey(event->code);
   };
   MW::isDisplayUpdate(1);

@@ -77,7 +77,7 @@ class Prompt {
   std::unique_ptr<Panel> panel;
   Buttons buttons;
   std::optional<Veil> veil;
-  std::optional<OnTop<MW::Key>> key;
+  std::optional<MW::Key> key;
 };
 
 }  // namespace factory_test

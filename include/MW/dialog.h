@@ -87,7 +87,8 @@ class MW_API Dialog : public PromptDialog {
   using Widget::setRect;
   /// The Layout of a kind.
   static int isType(int dialogKind);
-  /// Lays it out on the present screen as `dialogKind`; its texts stay. Any thread.
+  /// Lays it out on the present screen as `dialogKind`, with that kind's letters. Its texts stay,
+  /// and its kind: what is drawn of it, on red or not. Any thread.
   void setRect(int dialogKind);
   /// Replaces the title. At most 127 bytes are taken; null is the empty text. Any thread.
   void setTitle(const char* newTitle);

@@ -50,8 +50,8 @@ class MW_API Screen : public Widget {
  protected:
   int screenW = 0;  // pixels
   int screenH = 0;  // pixels
-  // `clicks` and `rect` (the square) are used on the dispatch thread only.
-  DoubleTap clicks;
+  // `rect`, the square, is guarded by stateLock.
+  DoubleTap clicks;  // dispatch thread
 };
 
 /// Fills the screen with one colour, to look for faults of the display.
@@ -81,8 +81,8 @@ class MW_API FullScreen : public Widget {
 
  protected:
   int colorIndex;                 // as constructed
-  int screenW = 0;                // pixels
-  int screenH = 0;                // pixels
+  int screenW = 0;                // pixels; guarded by stateLock
+  int screenH = 0;                // pixels; guarded by stateLock
   SKIA_Rect fillRect = {};        // guarded by stateLock
   std::atomic<int> lcdState = 1;  // 1: the panel is on
 };

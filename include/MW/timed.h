@@ -43,7 +43,8 @@ class MW_API Toastbox : public Widget {
  protected:
   int lines;  // 1 or 2
   // The rest is guarded by stateLock.
-  unsigned int hideAt = 0;  // GetTicks() milliseconds, 0: no time set
+  unsigned int hideAt = 0;   // GetTicks() milliseconds, 0: no time set
+  unsigned int shownMs = 0;  // from onHideTimer() to hideAt
   SKIA_Text toastText = {};
   SKIA_Text toastMsg = {};
   SKIA_Rect upperRect = {};
@@ -80,8 +81,9 @@ class MW_API Progressbar : public Widget {
   SKIA_Rect textRect = {};
   SKIA_Rect starRect = {};
   SKIA_Text starText = {};
-  int running = 0;         // 1 while it is shown
-  unsigned int endAt = 0;  // GetTicks() milliseconds
+  int running = 0;           // 1 while it is shown
+  unsigned int endAt = 0;    // GetTicks() milliseconds
+  unsigned int shownMs = 0;  // from onProgressbar() to endAt
   StarRow stars;
 };
 

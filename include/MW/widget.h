@@ -155,10 +155,11 @@ class MW_API Widget {
   int getOwnerFinger() const { return ownerFinger; }
 
   /// Starts blinking in `color` (0xAARRGGBB) and returns it, or with `on` 0 stops and returns 0.
-  /// Call it on the thread that draws.
+  /// Any thread, without `stateLock`, which it takes.
   unsigned int setBlink(int on, unsigned int color);
   /// The colour to draw at `now` (GetTicks() milliseconds): black in the dark phase and while
-  /// blinking is off. A phase lasts a little over 500 ms; the first one is dark.
+  /// blinking is off. A phase lasts a little over 500 ms; the first one is dark. Call it under
+  /// `stateLock`. At 0 no phase ends.
   unsigned int updateBlink(unsigned int now);
   /// Which of two choices keys have taken.
   enum KeySide { kNoSide = 0, kLeftSide = 1, kRightSide = 2 };

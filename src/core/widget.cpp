@@ -74,6 +74,7 @@ void Widget::setActive(int on) {
 }
 
 unsigned int Widget::setBlink(int on, unsigned int color) {
+  const std::lock_guard guard(stateLock);
   blink = on != 0 ? 1 : 0;
   if (blink == 0) return 0;
   blinkRuns = false;

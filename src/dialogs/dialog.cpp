@@ -51,6 +51,7 @@ void Dialog::fillIn() {
 int Dialog::show(unsigned int ticks) {
   const DialogLayout& layout = dialogLayout(kind);
   const std::lock_guard guard(stateLock);
+  frame.backdrop.color = layout.backdrop;
   frame.body.color = updateBlink(ticks);
   drawFrame(frame);
   skia_add_label_c(messageRect, message);
@@ -89,7 +90,6 @@ void Dialog::setRect(int dialogKind) {
   const std::lock_guard guard(stateLock);
   layOutFrame(frame, screen, grid);
   styleTitle(frame.title, layout.align);
-  frame.backdrop.color = layout.backdrop;
   messageRect = messageArea(grid);
   if (isSmall) messageRect.h = smallText;
   message.color = kColorWhite;

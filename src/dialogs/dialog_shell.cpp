@@ -114,6 +114,7 @@ bool DialogShell::onRecvEvent(event_data* event, unsigned int arg) {
   if (event == nullptr) return false;
   const bool mayAnswer = event->type == kEventRelease || !isPointerEvent(*event);
   if (!mayAnswer && hold.isOthers(event->mouse)) return false;
+  if (event->type == kEventUser) return onPlugKey(event->key), true;
   return FramedDialog::onRecvEvent(event, arg);
 }
 

@@ -310,11 +310,12 @@ int MainList::move_key_down(int) {
 int MainList::move_key_up(int) {
   const std::lock_guard guard(stateLock);
   const int previous = nextSelectable(current, -1);
-  if (previous == kNoItem) return kNotMoved;
-  current = previous;
-  const int64_t above = listRect.y - columnOf(previous).nextTop();
+  if (previous != kNoItem) current = previous;
+  if (current == kNoItem) return kNotMoved;
+  // Also where it is the first one, which may have been scrolled out of sight.
+  const int64_t above = listRect.y - columnOf(current).nextTop();
   scroll = toPixels(scroll + std::max<int64_t>(above, 0));
-  return previous;
+  return previous == kNoItem ? kNotMoved : previous;
 }
 
 // The first selectable item beyond `from` in the direction of `step`, or kNoItem.

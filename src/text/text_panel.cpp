@@ -23,7 +23,7 @@ void TextPanel::takeLooks(const SKIA_Rect* area, const SKIA_Text* looks) {
 int TextPanel::show() { return show(0); }
 
 // The time is never taken back, so that every later pass asks, too. Once reached it goes along with
-// the clock, or half a turn of that later it would lie ahead again.
+// the clock, or a turn of that later it would lie ahead again.
 void TextPanel::updateTimer(unsigned int ticks) {
   {
     const std::lock_guard guard(stateLock);
@@ -57,7 +57,7 @@ void TextPanel::onShowTimer(int ms) {
   setActive(1);
   {
     const std::lock_guard guard(stateLock);
-    showTimer.start(now, static_cast<unsigned int>(ms));
+    showTimer.start(now, ms);
   }
   askForRedraw();
 }

@@ -155,7 +155,7 @@ void Button3::init(int position, const SKIA_Text* first, const SKIA_Text* second
     caption2 = copyText(second);
     delayedShow = DelayedShow();
   }
-  Button3::setRect(position, nullptr);
+  setRect(position, &rect);
   pressCallback = clickCallback = longPressCallback = doubleClickCallback = nullptr;
   clicks.reset();
   Window::registerWidget(this);

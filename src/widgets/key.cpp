@@ -29,7 +29,7 @@ Key::Key() {
   setActive(1);
 }
 
-Key::~Key() { leaveLayers(); }
+Key::~Key() { leaveWindow(); }
 
 int Key::show() { return show(0); }
 

@@ -52,7 +52,7 @@ void PushButton::onShowTimer(int ms) {
   const unsigned int now = GetTicks();
   {
     const std::lock_guard guard(stateLock);
-    delayedShow.start(now, static_cast<unsigned int>(ms));
+    delayedShow.start(now, ms);
   }
   setActive(1);
   askForRedraw();

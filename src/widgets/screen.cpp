@@ -7,6 +7,7 @@
 #include "core/class_log.h"
 #include "core/geometry.h"
 #include "core/life_guard.h"
+#include "core/present_screen.h"
 
 namespace MW {
 
@@ -33,7 +34,7 @@ Screen::Screen() {
   Window::registerWidget(this);
 }
 
-Screen::~Screen() { leaveLayers(); }
+Screen::~Screen() { leaveWindow(); }
 
 int Screen::show() { return 1; }
 int Screen::show(unsigned int) { return 1; }
@@ -63,7 +64,7 @@ void Screen::onPress(event_data* event) {
   if (event == nullptr) return;
   const mouse_event& mouse = event->mouse;
   kLog.print(LogLevel::Debug, "pressed!!");
-  rect.color = kColorHighlight;
+  write(rect.color, kColorHighlight);
   hold.press(mouse);
   SKIA_Rect center = {};
   center.x = mouse.x;
@@ -79,9 +80,11 @@ void Screen::onRelease(event_data* event) {
   hold.letGo();
   const LifeGuard self(this);
   clickCallback(&event->mouse);
-  if (!self.isAlive() || !doubleClickCallback || rect.w == 0 || rect.h == 0) return;
+  if (!self.isAlive() || !doubleClickCallback) return;
+  const SKIA_Rect square = read(rect);
+  if (square.w == 0 || square.h == 0) return;
   if (!isUnder(rect, event)) {
-    setRect(kNoSquare, &rect);
+    setRect(kNoSquare, &square);
   } else if (clicks.isRunning()) {
     onTouchClickCount();
   }
@@ -93,6 +96,7 @@ void Screen::onPressLong(event_data* event) {
 
 void Screen::setRect(int mode, const SKIA_Rect* center) {
   if (center == nullptr) return;
+  const std::lock_guard guard(stateLock);  // `center` may be the square itself
   const auto isWithin = [](int64_t at, int64_t length) {
     return kSquareSide <= at && at <= length - kSquareSide;
   };
@@ -119,7 +123,7 @@ FullScreen::FullScreen(int color) : colorIndex(color) {
   Window::registerWidget(this);
 }
 
-FullScreen::~FullScreen() { leaveLayers(); }
+FullScreen::~FullScreen() { leaveWindow(); }
 
 int FullScreen::show() { return show(0); }
 
@@ -137,8 +141,11 @@ int FullScreen::hide() {
 void FullScreen::lcdOn(int on) { lcdState = on; }
 
 void FullScreen::setRect(int color) {
-  Window::getwindowsize(&screenW, &screenH);
-  write(fillRect, overScreen({screenW, screenH}, fillOf(color)));
+  const ScreenSize screen = presentScreen();
+  const std::lock_guard guard(stateLock);
+  screenW = screen.w;
+  screenH = screen.h;
+  fillRect = overScreen(screen, fillOf(color));
 }
 
 }  // namespace MW

@@ -64,7 +64,7 @@ Slide::Slide(Look switchLook, int startState, const SKIA_Rect* area, const SKIA_
   Window::registerWidget(this);
 }
 
-Slide::~Slide() { leaveLayers(); }
+Slide::~Slide() { leaveWindow(); }
 
 int Slide::show() { return show(0); }
 
@@ -193,6 +193,6 @@ SlideV::SlideV(int startState, const SKIA_Rect* area, const SKIA_Text* first,
                const SKIA_Text* second)
     : Slide(Look::Plain, startState, area, first, second) {}
 
-SlideV::~SlideV() { leaveLayers(); }
+SlideV::~SlideV() { leaveWindow(); }
 
 }  // namespace MW

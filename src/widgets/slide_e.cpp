@@ -35,7 +35,7 @@ SlideE::SlideE(int startState, const SKIA_Rect* area, const SKIA_Text* caption, 
 SlideE::SlideE(int startState, const SKIA_Rect* area, const SKIA_Text* caption, std::nullptr_t)
     : SlideE(startState, area, caption, "") {}
 
-SlideE::~SlideE() { leaveLayers(); }
+SlideE::~SlideE() { leaveWindow(); }
 
 void SlideE::SlideE_init(int startState, const SKIA_Rect* area, const SKIA_Text* caption,
                          const char*) {

@@ -80,7 +80,7 @@ SlideMove::SlideMove(const SKIA_Rect* area, int percent, int a, int b, int initi
   Window::registerWidget(this);
 }
 
-SlideMove::~SlideMove() { leaveLayers(); }
+SlideMove::~SlideMove() { leaveWindow(); }
 
 int SlideMove::show() { return show(0); }
 

@@ -35,7 +35,7 @@ Toastbox::~Toastbox() { leaveWindow(); }
 void Toastbox::init(const SKIA_Rect* area, const SKIA_Text* line, const SKIA_Text* message) {
   setActive(0);
   setType(kBaseLayer);
-  Toastbox::setRect(lines, area);
+  setRect(lines, area);
   {
     const std::lock_guard guard(stateLock);
     hideAt = 0;
@@ -48,7 +48,7 @@ void Toastbox::init(const SKIA_Rect* area, const SKIA_Text* line, const SKIA_Tex
 
 int Toastbox::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
-  if (hideAt == 0 || isLater(ticks, hideAt)) {
+  if (hideAt == 0 || isOver(ticks, hideAt, shownMs)) {
     hideAt = 0;
     setActive(0);
     return 1;
@@ -64,8 +64,11 @@ int Toastbox::show(unsigned int ticks) {
 }
 
 void Toastbox::updateTimer(unsigned int ticks) {
-  const unsigned int end = read(hideAt);
-  if (end != 0 && isLater(ticks, end)) isDisplayUpdate_c(1);
+  const bool ends = [&] {
+    const std::lock_guard guard(stateLock);
+    return hideAt != 0 && isOver(ticks, hideAt, shownMs);
+  }();
+  if (ends) isDisplayUpdate_c(1);
 }
 
 void Toastbox::setText(const char* newText) {
@@ -85,6 +88,7 @@ void Toastbox::onHideTimer(int ms) {
     const std::lock_guard guard(stateLock);
     // An end at 0, which stands for none, comes a millisecond later.
     hideAt = std::max(GetTicks() + static_cast<unsigned int>(ms), 1U);
+    shownMs = lengthOf(ms);
     setActive(1);
   }
   askForRedraw();
@@ -118,7 +122,7 @@ Progressbar::~Progressbar() { leaveWindow(); }
 int Progressbar::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
   if (running == 0) return 1;
-  if (isLater(ticks, endAt)) {
+  if (isOver(ticks, endAt, shownMs)) {
     setActive(0);
     endAt = 0;
     running = 0;
@@ -136,7 +140,7 @@ int Progressbar::show(unsigned int ticks) {
 void Progressbar::updateTimer(unsigned int ticks) {
   const bool changes = [&] {
     const std::lock_guard guard(stateLock);
-    return running != 0 && (isLater(ticks, endAt) || stars.isDue(ticks));
+    return running != 0 && (isOver(ticks, endAt, shownMs) || stars.isDue(ticks));
   }();
   if (changes) isDisplayUpdate_c(1);
 }
@@ -158,6 +162,7 @@ void Progressbar::onProgressbar(int ms) {
   const unsigned int end = GetTicks() + static_cast<unsigned int>(ms);
   running = ms != 0 ? 1 : 0;
   endAt = running != 0 ? end : 0;
+  shownMs = lengthOf(ms);
   stars.restart(end);
   setActive(running);
 }

@@ -13,7 +13,7 @@ TEST_F(DialogShellTest, OtherFingersNeitherPressNorMoveButMayLift) {
   const Steps steps = {
       finger(1),           press(154, 1774), finger(0),     press(),      drag(1, 0),
       release(1285, 1993), lookAtHold(),     release(0, 0), keyDown(323), plug(17)};
-  EXPECT_EQ(played(shell, steps), "press+ - - button1 click+ <held 2> click+ down323+ -");
+  EXPECT_EQ(played(shell, steps), "press+ - - button1 click+ <held 2> click+ down323+ +");
 }
 
 struct Open : DialogShell {

@@ -105,6 +105,10 @@ TEST_F(DialogTest, IsLaidOutAnewWithItsTexts) {
   EXPECT_EQ(shown(dialog).at(6).text.text, "No");
   EXPECT_EQ(shown(dialog).at(6).rect, (SKIA_Rect{154, 1290, 1132, 69, 0}));
   EXPECT_STREQ(dialog.message.text, "No you want to exit?") << "the record keeps the old tail";
+  const auto backdrop = [&] { return shown(dialog).front().rect.color; };
+  const unsigned int plain = backdrop();
+  dialog.setRect(Dialog::kDoNotTouch);
+  EXPECT_EQ(backdrop(), plain) << "it is no alarm";
 }
 
 }  // namespace

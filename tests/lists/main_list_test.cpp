@@ -126,6 +126,10 @@ TEST_F(MainListTest, KeysScrollTheirItemIntoView) {
   while (menu.move_key_up(0) > 1) continue;
   EXPECT_EQ(menu.at(341), 1) << "exactly at the top";
   EXPECT_EQ(shown(menu).front().text.text, "2") << "where none is drawn";
+  while (menu.move_key_up(0) >= 0) continue;
+  menu.onHover({0, 0, 0, 0, 0, -500});
+  EXPECT_EQ(menu.move_key_up(0), -100) << "it is the first";
+  EXPECT_EQ(menu.at(341), 0) << "and back in sight";
 }
 
 TEST_F(MainListTest, IsFullAtSixtyFourItemsAndRefusesLongTexts) {

@@ -13,8 +13,11 @@ const PlaysOn kToast = {makes<MW::Toastbox>(&kArea, &kCaption)};
 const PlaysOn kTwoLines = {makes<MW::Toastbox>(&kArea, &kCaption, &kCaption)};
 const PlaysOn kBar = {makes<MW::Progressbar>(0, &kArea, &kCaption)};
 
+constexpr unsigned int kMonthMs = 31U * 86'400'000;
+
 Step showFor(int ms) { return call(&Widget::onHideTimer, ms); }
 Step runFor(int ms) { return call(&Widget::onProgressbar, ms); }
+Step setActive(int on) { return call(&Widget::setActive, on); }
 Step setMsg(const char* words) { return call(&Widget::setMsg, words); }
 
 // What a drawing pass writes last, with "!" if the timer pass before it asked for one; "gone" once
@@ -53,6 +56,12 @@ const PlayTests kPlays = {
            {at(~255U), showFor(100), seen(), at(9), seen()}, "<Wi-Fi> <!gone>"),
     kToast("AToastStartsWithTheClock", {at(0), showFor(5), seen(), at(5), seen(), at(6), seen()},
            "<Wi-Fi> <Wi-Fi> <!gone>"),
+    kToast("AToastThatWasPutAwayForAMonthIsOver",
+           {at(1000), showFor(500), setActive(0), at(1000 + kMonthMs), setActive(1), seen()},
+           "<!gone>"),
+    kBar("ABarThatWasPutAwayForAMonthIsOver",
+         {at(1000), runFor(500), setActive(0), at(1000 + kMonthMs), setActive(1), seen()},
+         "<!gone>"),
     kBar("ABarEndsOverTheWrap", {at(~15U), runFor(50), seen(), later(50), seen(), later(1), seen()},
          "<!*> <*> <!gone>"),
     kTwoLines("AToastOfTwoLinesHasAMessage", {setMsg("below"), showFor(1), seen()}, "<below>"),

@@ -64,7 +64,7 @@ class ColourTest : public LookTest {
     touch->clickCallback = [](MW::mouse_event*) { Current<ColourTest>::get().next(); };
     touch->longPressCallback = [](MW::mouse_event*) { Current<ColourTest>::get().finishLook(); };
     touch->setActive(1);
-    key.emplace();
+    moveToTop(key.emplace());
     key->keyPressCallback = [](MW::kbd_event* event) {
       Current<ColourTest>::get().followKey(event->code);
     };
@@ -113,7 +113,7 @@ class ColourTest : public LookTest {
   int seenLast = 0;                      // whether the last one was seen, too
   std::optional<MW::FullScreen> colour;
   std::optional<OnTop<MW::Screen>> touch;
-  std::optional<OnTop<MW::Key>> key;
+  std::optional<MW::Key> key;
 };
 
 }  // namespace

@@ -70,8 +70,10 @@ class DescriptorTest : public PageTest {
     MW::WidgetList::show();
   }
 
-  void update(uint32_t now) override {
-    if (!find(kRcuiFullScreen).isActive() || now - whiteSince < kWhiteMs) return;
+  void update(uint32_t) override {
+    if (!find(kRcuiFullScreen).isActive()) return;
+    const uint32_t since = whiteSince;  // another thread's: the time is asked afterwards
+    if (GetTicks() - since < kWhiteMs) return;
     find(kRcuiFullScreen).hide();
     MW::isDisplayUpdate(1);
   }

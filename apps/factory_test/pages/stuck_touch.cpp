@@ -30,7 +30,8 @@ class StuckTouchPage : public MeasurePage {
 
  protected:
   void follow(const Input& input) override {
-    const bool isLate = began && input.ticks - *began >= kLiftMs;
+    // An input's time may be a little before the first update's.
+    const bool isLate = began && static_cast<int32_t>(input.ticks - *began) >= kLiftMs;
     if (input.kind == Input::Kind::Press) {
       touches += 1;
     } else if (isOfAnOldTouch(input) && isLate) {
@@ -64,7 +65,7 @@ class StuckTouchPage : public MeasurePage {
   }
 
  private:
-  static constexpr uint32_t kLiftMs = 2000;
+  static constexpr int32_t kLiftMs = 2000;
 
   std::optional<uint32_t> began;  // GetTicks() milliseconds
   uint32_t watched = 0;           // seconds

@@ -8,15 +8,19 @@
 namespace MW {
 
 /// Until the first drawing pass at or after the due time the widget is not drawn and takes no
-/// events. Times are GetTicks() milliseconds, compared by isLater(). The holder's lock guards it.
+/// events. Times are GetTicks() milliseconds, compared by isOver(). The holder's lock guards it.
 class DelayedShow {
  public:
-  constexpr void start(uint32_t now, uint32_t delayMs) {
-    due = now + delayMs;
+  constexpr void start(uint32_t now, int delayMs) {
+    due = now + static_cast<uint32_t>(delayMs);
+    length = lengthOf(delayMs);
     pending = true;
   }
   constexpr bool isPending() const { return pending; }
-  constexpr bool isDue(uint32_t now) const { return pending && !isLater(due, now); }
+  constexpr bool isDue(uint32_t now) const {
+    return pending && (now == due || isOver(now, due, length));
+  }
+
   /// A drawing pass: whether the widget is drawn in it.
   constexpr bool draws(uint32_t now) {
     if (isDue(now)) pending = false;
@@ -25,6 +29,7 @@ class DelayedShow {
 
  private:
   uint32_t due = 0;
+  uint32_t length = 0;
   bool pending = false;
 };
 

@@ -1,6 +1,7 @@
 #include "host/open_platform.h"
 
 #include <mutex>
+#include <system_error>
 #include <utility>
 
 #include "clock/inside_wait.h"
@@ -16,16 +17,47 @@ namespace {
 // Held while the platform opens or closes, so that one does not meet the other half-way.
 constinit std::mutex turnMutex;
 constinit std::mutex openedMutex;  // guards opened; held for no more than a copy
-constinit std::shared_ptr<Platform> opened;
+// Never deleted: an application may leave its threads drawing while the process ends.
+std::shared_ptr<Platform>& opened = *new std::shared_ptr<Platform>;
 
 void setOpened(std::shared_ptr<Platform> platform) {
   const std::lock_guard<std::mutex> lock(openedMutex);
   opened = std::move(platform);
 }
 
+// Closes what the application left open.
+struct ProcessEnd {
+  ProcessEnd() = default;
+  ProcessEnd(const ProcessEnd&) = delete;
+  ProcessEnd& operator=(const ProcessEnd&) = delete;
+  ~ProcessEnd() {
+    const std::shared_ptr<Platform> left = openedPlatform();
+    setOpened(nullptr);
+    if (left) left->close();
+  }
+};
+const ProcessEnd processEnd;
+
+std::string threadProblem(const std::system_error& failure) {
+  return "a thread cannot be started: " + failure.code().message();
+}
+
+// Null, with the reason in `error`, and neither is open.
+std::shared_ptr<Platform> openDisplayAndInput(const Settings& settings, std::string& error) {
+  InputService& input = inputService();
+  input.open();
+  try {
+    if (auto platform = Platform::open(settings, input, error)) return platform;
+  } catch (const std::system_error& failure) {
+    error = threadProblem(failure);
+  }
+  input.close();
+  return nullptr;
+}
+
 }  // namespace
 
-std::string openPlatform() {
+std::string openPlatform() try {
   if (auto* const clock = turnClock()) clock->takePart();
   const InsideWait wait(turnClock());
   const std::lock_guard<std::mutex> turn(turnMutex);
@@ -39,16 +71,14 @@ std::string openPlatform() {
     wanted.settings.density = played->dotsPerInch();
   }
   if (!wanted.error.empty()) return wanted.error;
-  InputService& input = inputService();
-  input.open();
   std::string error;
-  if (auto platform = Platform::open(wanted.settings, input, error)) {
-    if (played != nullptr) played->begin(*platform);
-    setOpened(std::move(platform));
-  } else {
-    input.close();
-  }
-  return error;
+  const std::shared_ptr<Platform> platform = openDisplayAndInput(wanted.settings, error);
+  if (!platform) return error;
+  if (played != nullptr) played->begin(*platform);
+  setOpened(platform);
+  return {};
+} catch (const std::system_error& failure) {
+  return threadProblem(failure);  // the clock's
 }
 
 void closePlatform() {

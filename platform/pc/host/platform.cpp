@@ -3,7 +3,9 @@
 #include <cstdio>
 #include <cstdlib>
 #include <ctime>
+#include <exception>
 #include <filesystem>
+#include <system_error>
 #include <utility>
 
 #include "clock/process_clock.h"
@@ -139,7 +141,13 @@ void Platform::run(std::promise<std::string> opened) {
   isPlatformThread = true;
   if (auto* const clock = turnClock()) clock->stayOutside();
   InputTranslator input(settings.screen, service);
-  const OpenedDisplay outcome = openChosen(settings, input, service);
+  OpenedDisplay outcome;
+  try {
+    outcome = openChosen(settings, input, service);
+  } catch (const std::system_error&) {
+    opened.set_exception(std::current_exception());
+    return;
+  }
   if (!outcome.display) {
     opened.set_value(outcome.error);
     return;

@@ -34,6 +34,7 @@ class Platform {
 
   /// Opens the display that the settings choose; input records go to `service`, which is open and
   /// outlives the platform. Null, with the reason in one line in `error`, where there is none.
+  /// Throws std::system_error where one of its threads cannot be started.
   static std::shared_ptr<Platform> open(const Settings& settings, InputService& service,
                                         std::string& error);
   ~Platform() { close(); }

@@ -1,4 +1,5 @@
 #pragma once
 
+bool isHuge(int number);
 bool isNegative(int number);
 int countBits(unsigned bits);

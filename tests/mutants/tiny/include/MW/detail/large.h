@@ -1,0 +1,3 @@
+#pragma once
+
+inline bool isLarge(int number) { return number > 100; }
