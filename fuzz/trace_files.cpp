@@ -55,7 +55,7 @@ void play(const brimol::pc::Trace& trace) {
   constexpr brimol::pc::Size kScreen = {480, 800};
   constexpr int kMostActs = 500;
   std::size_t written = 0;
-  const auto count = [&written](const std::string& text) { written += text.size(); };
+  const auto count = [&written](std::string_view text) { written += text.size(); };
   TraceRunner runner(
       trace, {.screen = trace.screen.value_or(kScreen),
               .post = [&](const Event& record) { written += record.type; },

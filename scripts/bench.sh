@@ -1,6 +1,6 @@
 #!/usr/bin/env bash
-# Measures what the toolkit and the platform cost and writes the tables of docs/performance.md, in less
-# than five minutes on a machine that does nothing else.
+# Measures what the toolkit and the platform cost and writes the tables of docs/performance.md. Once built, it takes a
+# minute and a half on a machine that does nothing else.
 # scripts/bench.sh --against COMMIT builds that commit beside, under the same benchmarks, runs both by
 # turns, and prints how painting, start, memory and latency compare: below 1 this tree is better.
 set -euo pipefail
@@ -105,7 +105,7 @@ write_library_tables() {
     ["a search, found in every line", $of["searching/in_every_line"].cpu_time, "ms", "50 ms"],
     ["drawing a view into 1,000,000 lines, against one into 100", $of["showingLongText"].ratio, "", "about 1"] |
     @tsv' <<<"$found" |
-    table texts '| | measured | aim |' '| %s | %.3g %s | %s |'
+    table texts '| | measured | aim |' '| %s | %.4g %s | %s |'
 }
 
 write_latency_tables() {

@@ -1,12 +1,33 @@
 #!/usr/bin/env bash
-# Unpacks what a build for another architecture needs into a folder: scripts/foreign_root.sh ARCHITECTURE
-#
-# The packages are Debian's own of that architecture (i386, arm64, armhf), for build/roots/ARCHITECTURE.
-# The machine's packages and its list of architectures stay as they are. A complete folder is kept.
+# Unpacks what a build for another architecture needs into a folder. `scripts/foreign_root.sh --help` says which.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
-architecture=${1:?the architecture: i386, arm64 or armhf}
+usage() {
+  cat <<'END'
+Usage: scripts/foreign_root.sh i386|arm64|armhf
+
+Unpacks Debian's own packages of that architecture into build/roots/ARCHITECTURE, for a build's preset of that name.
+The machine's packages and its list of architectures stay as they are. A complete folder is kept.
+
+  --help   this text
+END
+}
+
+fail_usage() {
+  echo "foreign_root.sh: $1 (try --help)" >&2
+  exit 2
+}
+
+architecture=${1:-}
+case $architecture in
+  --help) usage; exit ;;
+  i386 | arm64 | armhf) ;;
+  '') fail_usage "which architecture?" ;;
+  *) fail_usage "unknown architecture or option '$architecture'" ;;
+esac
+(($# == 1)) || fail_usage "one architecture at a time"
+
 packages=(libc6-dev libstdc++-12-dev android-libutils-dev android-liblog-dev libgtest-dev libgmock-dev)
 root=$PWD/build/roots/$architecture
 complete=$root/packages.txt

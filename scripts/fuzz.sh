@@ -1,21 +1,47 @@
 #!/usr/bin/env bash
-# Fuzzes: scripts/fuzz.sh [TARGET [SECONDS]]; without a target each in turn, without a time for a
-# minute each. What was learnt is kept in build/fuzz/learnt/TARGET, what was found beside it as
-# TARGET-crash-... or the like: rerun the target's program with that file alone.
-#
-#   scripts/fuzz.sh --keep TARGET   makes of what was learnt the small corpus that is committed
+# Fuzzes. `scripts/fuzz.sh --help` says how.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
 readonly most_files=24 most_bytes=400
+mapfile -t known < <(ls fuzz/corpus)
+
+usage() {
+  cat <<END
+Usage: scripts/fuzz.sh [TARGET [SECONDS]]
+       scripts/fuzz.sh --keep [TARGET]
+
+Without a target each in turn, without a time for a minute each. What was learnt is kept in build/fuzz/learnt/TARGET,
+what was found beside it as TARGET-crash-... or the like: rerun the target's program with that file alone.
+
+  --keep   makes of what was learnt the small corpus that is committed
+  --help   this text
+
+Targets: ${known[*]}
+END
+}
+
+fail_usage() {
+  echo "fuzz.sh: $1 (try --help)" >&2
+  exit 2
+}
+
 keep=no
-if [[ ${1:-} == --keep ]]; then
-  keep=yes
-  shift
+case ${1:-} in
+  --help) usage; exit ;;
+  --keep)
+    keep=yes
+    shift
+    ;;
+esac
+target=${1:-} seconds=${2:-60} targets=("${known[@]}")
+if [[ -n $target ]]; then
+  [[ " ${known[*]} " == *" $target "* ]] || fail_usage "unknown target or option '$target'"
+  targets=("$target")
 fi
-target=${1:-} seconds=${2:-60}
-targets=("$target")
-[[ -n $target ]] || mapfile -t targets < <(ls fuzz/corpus)
+[[ $seconds =~ ^[1-9][0-9]{0,8}$ ]] || fail_usage "'$seconds' is no number of seconds"
+(($# <= 2)) || fail_usage "a target and a time at most"
+[[ $keep == no || $# -le 1 ]] || fail_usage "--keep takes no time"
 
 if command -v ccache >/dev/null; then
   export CMAKE_C_COMPILER_LAUNCHER=ccache CMAKE_CXX_COMPILER_LAUNCHER=ccache

@@ -4,6 +4,8 @@
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
+[[ $# == 0 || ($# == 1 && $1 == --changed) ]] || { echo "tidy.sh: nothing, or --changed" >&2; exit 2; }
+
 list() {
   git ls-files --cached --others --exclude-standard "$@"
 }

@@ -6,6 +6,8 @@
 #include <algorithm>
 #include <string>
 
+#include "scene/utf8.h"
+
 using brimol::test::platform;
 
 int brimol_host_open() { return 1; }
@@ -13,8 +15,8 @@ const char* brimol_host_error() { return "the picture cannot be written"; }
 const char* brimol_host_help() { return ""; }
 
 void brimol_host_screen_size(int* width, int* height) {
-  *width = platform().width;
-  *height = platform().height;
+  if (width != nullptr) *width = platform().width;
+  if (height != nullptr) *height = platform().height;
 }
 
 float brimol_host_density() { return platform().xdpi; }
@@ -37,8 +39,11 @@ int64_t brimol_host_utc_ms() { return platform().utcMs + (GetTicks() - brimol::t
 uint32_t brimol_host_random() { return platform().random++; }
 
 int brimol_host_figure(const char* name, const char*, char* value, int bytes) {
-  const auto found = platform().figures.find(name);
+  const auto found = platform().figures.find(name == nullptr ? "" : name);
   const std::string text = found == platform().figures.end() ? "" : found->second;
-  if (bytes > 0) value[text.copy(value, static_cast<std::size_t>(bytes - 1))] = '\0';
+  if (value != nullptr && bytes > 0) {
+    const std::size_t most = static_cast<std::size_t>(bytes) - 1;
+    value[text.copy(value, brimol::pc::wholeBytes(text, most))] = '\0';
+  }
   return static_cast<int>(text.size());
 }

@@ -145,8 +145,8 @@ void Delay(unsigned int ms) {
 }
 
 void getDpi(float* xdpi, float* ydpi) {
-  *xdpi = platform().xdpi;
-  *ydpi = platform().ydpi;
+  if (xdpi != nullptr) *xdpi = platform().xdpi;
+  if (ydpi != nullptr) *ydpi = platform().ydpi;
 }
 
 // NOLINTNEXTLINE(readability-identifier-naming): the parameters are named as in the contract

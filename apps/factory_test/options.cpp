@@ -37,7 +37,7 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char*) { options.action = Options::Action::Version; }},
     {"--headless", nullptr, "draw to memory instead of a window",
      [](Options& options, const char*) { options.headless = true; }},
-    {"--device", "NAME", "play on that phone's screen, see below",
+    {"--device", "NAME", "use that phone's screen; the names stand below",
      [](Options& options, const char* value) { options.device = value; }},
     {"--language", "CODE", "show texts in en, de, ko or ar, instead of the environment's language",
      [](Options& options, const char* value) { options.language = value; }},
@@ -48,7 +48,7 @@ constexpr auto kOptions = std::to_array<OptionRow>({
      [](Options& options, const char* value) { options.junit = value; }},
     {"--database", "FILE", "keep all runs in FILE, and go on with the unit's aborted one",
      [](Options& options, const char* value) { options.database = value; }},
-    {"--new-run", nullptr, "begin a new run even so, in the file of --results, too",
+    {"--new-run", nullptr, "begin a new run instead; the file of --results loses what it held",
      [](Options& options, const char*) { options.newRun = true; }},
     {"--line", "postgresql://...", "send the database's runs there, too",
      [](Options& options, const char* value) { options.line = value; }},
@@ -187,7 +187,9 @@ std::string wrongMonkey(const Options& options) {
 
 std::string wrongLanguage(const std::string& code) {
   std::string error = "unknown language '" + code + "', known are:";
-  for (const std::string_view each : languages()) error.append(" ").append(each);
+  for (const std::string_view each : languages()) {
+    if (each != kMadeUpLanguage) error.append(" ").append(each);
+  }
   return error;
 }
 

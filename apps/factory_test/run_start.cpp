@@ -40,8 +40,9 @@ bool isKept(const Options& options) {
 // it did: never among those of people.
 std::string wrongMonkeyRecords(const Options& options) {
   if (!options.monkey.empty()) {
-    return isKept(options) ? "--monkey judges nothing: neither --database, --results nor --junit"
-                           : "";
+    return isKept(options)
+               ? "--monkey judges nothing, so it takes none of --database, --results and --junit"
+               : "";
   }
   const char* const asked = std::getenv("BRIMOL_MONKEY");
   if (asked == nullptr || *asked == '\0') return "";
@@ -101,7 +102,7 @@ std::string wrongRecords(const Options& options) {
   if (!options.serial.empty() && !isSerial(options.serial, why)) return "--serial: " + why;
   if (std::string wrong = wrongMonkeyRecords(options); !wrong.empty()) return wrong;
   if (!options.shot.empty() && !(options.database.empty() && options.junit.empty())) {
-    return "--shot keeps nothing: neither --database nor --junit";
+    return "--shot keeps nothing, so it takes neither --database nor --junit";
   }
   if (options.newRun && options.database.empty() && options.results.empty()) {
     return "--new-run needs --database or --results";

@@ -3,26 +3,44 @@
 #include <android/log.h>
 #include <brimol/host.h>
 
+#include <algorithm>
+#include <array>
 #include <cstdio>
 #include <cstdlib>
 #include <string_view>
 
 #include "browser.h"
 #include "document.h"
+#include "version.h"
 
 namespace {
 
 constexpr int kUsageError = 2;
 
-constexpr const char* kUsage =
-    "Usage: brimol_gallery [OPTION]\n"
-    "Every widget and every dialog of the toolkit, to look at and to touch.\n\n"
-    "Options:\n"
-    "  --help      print this and end\n"
-    "  --document  print the gallery as Markdown, and end\n\n"
-    "Touch, or the keys up, down, select and back, choose from the menus; left and right go from\n"
-    "one example to the next, and select shows its code.\n\n"
-    "On a PC:\n";
+void printUsage() {
+  std::printf(
+      "Usage: brimol_gallery [OPTION]\n"
+      "Every widget and every dialog of the toolkit, to look at and to touch.\n\n"
+      "Options:\n"
+      "  --help      print this and end; also -h\n"
+      "  --version   print the version and end\n"
+      "  --document  print the gallery as Markdown, and end\n\n"
+      "Touch, or the keys up, down, select and back, choose from the menus; left and right go\n"
+      "from one example to the next, and select shows its code.\n\n"
+      "On a PC:\n%s",
+      brimol_host_help());
+}
+
+struct OptionRow {
+  std::string_view name;
+  void (*print)();
+};
+constexpr auto kOptions = std::to_array<OptionRow>({
+    {"--help", printUsage},
+    {"-h", printUsage},
+    {"--version", [] { std::printf("brimol_gallery %s\n", gallery::kVersion); }},
+    {"--document", [] { std::fputs(gallery::document().c_str(), stdout); }},
+});
 
 // Without the toolkit's log.
 int run() {
@@ -37,18 +55,17 @@ int run() {
 }  // namespace
 
 int main(int count, char** arguments) {
-  const std::string_view option = count > 1 ? arguments[1] : "";
-  if (count > 2 || (count == 2 && option != "--help" && option != "--document")) {
-    std::fputs("brimol_gallery: unknown option, see --help\n", stderr);
+  if (count <= 1) return run();
+  const std::string_view option = arguments[1];
+  const auto* const row = std::ranges::find(kOptions, option, &OptionRow::name);
+  if (row == kOptions.end()) {
+    std::fprintf(stderr, "brimol_gallery: unknown option '%s', see --help\n", arguments[1]);
     return kUsageError;
   }
-  if (option == "--help") {
-    std::printf("%s%s", kUsage, brimol_host_help());
-    return EXIT_SUCCESS;
+  if (count > 2) {
+    std::fputs("brimol_gallery: one option at most, see --help\n", stderr);
+    return kUsageError;
   }
-  if (option == "--document") {
-    std::fputs(gallery::document().c_str(), stdout);
-    return EXIT_SUCCESS;
-  }
-  return run();
+  row->print();
+  return EXIT_SUCCESS;
 }

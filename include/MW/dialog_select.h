@@ -12,9 +12,10 @@ namespace MW {
 ///
 /// The application owns the dialog. A dialog enters the top layer, inactive, when it is constructed
 /// and leaves it when it is deleted; setActive(1) brings it up, and it never hides itself. While it
-/// is active, the widgets underneath get no events. The application's thread draws it.
-/// onRecvEvent(), the one entry for events, runs on the dispatch thread and calls the handlers
-/// declared below and the callbacks; a callback may delete the dialog. A null event is not taken.
+/// is active, the widgets underneath get no events. The application's thread draws it; show()
+/// without ticks draws nothing. onRecvEvent(), the one entry for events, runs on the dispatch
+/// thread and calls the handlers declared below and the callbacks; a callback may delete the
+/// dialog. A null event is not taken.
 ///
 /// Call isDisplayUpdate(1) after an answer, after a touch has slid off its button, and after a
 /// setter (any thread): these ask for no redraw, so the screen would stay as it is. No release is

@@ -14,11 +14,11 @@ namespace MW {
 ///
 /// The application owns the dialog. A dialog enters the top layer, inactive, when it is constructed
 /// and leaves it when it is deleted; setActive(1) brings it up. While it is active, the widgets
-/// underneath get no events. The application's thread draws it. onRecvEvent(), the one entry for
-/// events, runs on the dispatch thread and calls the handlers declared below and the callbacks; a
-/// callback may delete the dialog. A null event is not taken. The texts may be set by any thread
-/// and are copied; that raises no redraw flag (isDisplayUpdate(1) does). A null text is empty, and
-/// so is one of more than 127 bytes.
+/// underneath get no events. The application's thread draws it; show() without ticks draws nothing.
+/// onRecvEvent(), the one entry for events, runs on the dispatch thread and calls the handlers
+/// declared below and the callbacks; a callback may delete the dialog. A null event is not taken.
+/// The texts may be set by any thread and are copied; that raises no redraw flag
+/// (isDisplayUpdate(1) does). A null text is empty, and so is one of more than 127 bytes.
 class MW_API DialogSlide : public Widget {
  public:
   /// What it asks.

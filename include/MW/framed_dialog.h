@@ -11,9 +11,9 @@ namespace MW {
 ///
 /// The application owns the dialog. A dialog enters the top layer, inactive, when it is constructed
 /// and leaves it when it is deleted; setActive(1) brings it up. While it is active, the widgets
-/// underneath get no events. The application's thread draws it. onRecvEvent(), the one entry for
-/// events, runs on the dispatch thread and calls the handlers declared below and the callbacks; a
-/// callback may delete the dialog. A null event is not taken.
+/// underneath get no events. The application's thread draws it; show() without ticks draws nothing.
+/// onRecvEvent(), the one entry for events, runs on the dispatch thread and calls the handlers
+/// declared below and the callbacks; a callback may delete the dialog. A null event is not taken.
 ///
 /// A button turns kColorHighlight when a finger presses it, and turns back when a finger moves
 /// outside it or lifts. It answers every finger that lifts on it, wherever that finger came from.

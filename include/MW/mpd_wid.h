@@ -92,10 +92,9 @@ class MW_API MpdWid : public RowList {
   ///   name is "no name", and the value the line.
   ///
   /// `lines` is read up to its NUL or through the byte with the index `length`, whichever comes
-  /// first. Only what a
-  /// "\n" ends is a line; one that is the text's first byte ends none. Of more than 64 lines the
-  /// first 64 are shown. Null, or a length of 0 or less: an empty list. Drawn texts are cut to 127
-  /// bytes. Without memory the rows stay, and a line is logged.
+  /// first. Only what a "\n" ends is a line; one that is the text's first byte ends none. Of more
+  /// than 64 lines the first 64 are shown. Null, or a length of 0 or less: an empty list. Drawn
+  /// texts are cut to 127 bytes. Without memory the rows stay, and a line is logged.
   ///
   /// The scroll stays: call initIndex() afterwards, or a shorter list may stand above its area,
   /// where nothing of it shows.

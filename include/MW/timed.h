@@ -30,7 +30,8 @@ class MW_API Toastbox : public Widget {
   void setText(const char* newText) override;
   /// Sets the second line. Does nothing on a box of one line.
   void setMsg(const char* message) override;
-  /// Shows it from now for `ms` milliseconds; a time that still runs is replaced.
+  /// Shows it from now for `ms` milliseconds; a time that still runs is replaced. A negative one is
+  /// over already. Raises the redraw flag.
   void onHideTimer(int ms) override;
   /// `lineCount` 2 divides the box into two halves; any other leaves them as they are. Null: no
   /// change.
@@ -71,7 +72,7 @@ class MW_API Progressbar : public Widget {
   void updateTimer(unsigned int ticks) override;
   /// The first argument is not read. Null: no change.
   void setRect(int unused, const SKIA_Rect* newRect) override;
-  /// Shows it from now for `ms` milliseconds; 0 takes it away.
+  /// Shows it from now for `ms` milliseconds; 0 takes it away. A negative time is over already.
   void onProgressbar(int ms) override;
 
  protected:

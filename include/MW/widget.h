@@ -47,7 +47,8 @@ class MW_API Widget {
 
   virtual ~Widget();
   /// Draws the widget outside a drawing pass: for the application, on the thread that draws. The
-  /// result is the class's to define.
+  /// result is the class's to define. The classes of FramedDialog, DialogSelect, DialogSlide,
+  /// Toastbox and Progressbar leave it to the base and draw nothing: call show(ticks).
   virtual int show();
   /// Draws it as part of the drawing pass at `ticks` (GetTicks() milliseconds). Window::show calls
   /// it, on the application's thread.
@@ -86,14 +87,16 @@ class MW_API Widget {
   virtual void setBgColor(unsigned int color);
   virtual void setBdColor(unsigned int color);
   virtual void setLnColor(unsigned int color);
-  /// Makes the widget active now and visible after `ms` milliseconds.
+  /// Makes the widget active now and visible after `ms` milliseconds; of a negative number they are
+  /// over already. Raises the redraw flag.
   virtual void onShowTimer(int ms);
   /// Copies a primitive to the display-item table (WidgetList), on that table's thread. The item's
   /// index, or a negative code.
   virtual int add_MWWList();
   /// Tells the widget whether the display's panel is on: any value but 0.
   virtual void lcdOn(int on);
-  /// Hides the widget after `ms` milliseconds.
+  /// Shows a toast for `ms` milliseconds; of a negative number they are over already, so that the
+  /// next drawing pass hides it. Raises the redraw flag.
   virtual void onHideTimer(int ms);
 
   // Parts of onRecvEvent(), which has tested what they rely on: classes call them on themselves, on
@@ -120,8 +123,9 @@ class MW_API Widget {
 
   // For the application again.
 
-  /// How far a progress bar is.
-  virtual void onProgressbar(int value);
+  /// Shows a progress bar for `ms` milliseconds; 0 takes it away. Of a negative number they are
+  /// over already, so that the next drawing pass hides it.
+  virtual void onProgressbar(int ms);
   /// Ends a highlight.
   virtual void restoreColor();
   /// Whether a slide follows the finger.

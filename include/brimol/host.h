@@ -25,7 +25,8 @@ int brimol_host_open(void);
  * valid until the next call that fails. */
 const char* brimol_host_error(void);
 
-/* Stores the size of the open screen in pixels; what it would be where none is open. */
+/* Stores the size of the open screen in pixels; what it would be where none is open. A null pointer
+ * is skipped. */
 void brimol_host_screen_size(int* width, int* height);
 
 /* The dots per inch of the open screen, across and down; what they would be where none is open. */
@@ -56,9 +57,11 @@ int64_t brimol_host_utc_ms(void);
 /* A random number. */
 uint32_t brimol_host_random(void);
 
-/* Stores what the figure of that name is, such as a battery's charge, as a text that is cut to the
- * room of `bytes` with its NUL: `real_value` as the application has read it, or what the trace says
- * instead, an empty text where it says nothing. Returns the text's whole length. */
+/* Stores what the figure of that name is, such as a battery's charge: `real_value` as the
+ * application has read it, or what the trace says instead, an empty text where it says nothing. The
+ * text is cut at a whole UTF-8 character, so that it has room in `bytes` with its NUL. Returns the
+ * length of the whole text in bytes. A null `name` or `real_value` is the empty text; a null
+ * `value`, or `bytes` of less than 1, stores nothing. */
 int brimol_host_figure(const char* name, const char* real_value, char* value, int bytes);
 
 #pragma GCC visibility pop

@@ -11,8 +11,7 @@
 #include <string>
 #include <vector>
 
-/// The records have no operators of their own: they are C.
-// The records are nothing but words, without gaps.
+// The records of C have no operators of their own. They are nothing but words, without gaps.
 inline bool operator==(const SKIA_Rect& left, const SKIA_Rect& right) {
   using Words = std::array<int32_t, 5>;
   return std::bit_cast<Words>(left) == std::bit_cast<Words>(right);

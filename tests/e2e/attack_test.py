@@ -18,6 +18,7 @@ PROGRAM = sys.argv.pop(1)
 JUDGES_MEMORY = sys.argv[1:] != ["sanitizer"]
 MOST_CONNECTIONS = 64
 MOST_VIEWERS = 16
+FEW = 8  # connections that are just about to end, or to begin
 PAUSE = 0.25  # seconds after a wrong password
 
 
@@ -25,16 +26,24 @@ class Application:
     def __init__(self):
         settings = {**os.environ, "BRIMOL_DISPLAY": "browser", "BRIMOL_LISTEN": "127.0.0.1:0"}
         self.process = subprocess.Popen([PROGRAM], stderr=subprocess.PIPE, text=True, env=settings)
+        self.folder = pathlib.Path(f"/proc/{self.process.pid}")
         said = self.process.stderr.readline() + self.process.stderr.readline()
         self.web, self.vnc, self.password = re.search(
             r"http://127.0.0.1:(\d+)/.*\n.*127.0.0.1::(\d+), password (\S+)", said).groups()
 
     def figures(self):
         """Threads, descriptors, and memory in MiB."""
-        folder = pathlib.Path(f"/proc/{self.process.pid}")
-        status = (folder / "status").read_text()
-        memory = int(re.search(r"VmRSS:\s+(\d+)", status).group(1)) >> 10
-        return len(list((folder / "task").iterdir())), len(list((folder / "fd").iterdir())), memory
+        return len(list((self.folder / "task").iterdir())), self.descriptors(), self.memory("VmRSS")
+
+    def descriptors(self):
+        return len(list((self.folder / "fd").iterdir()))
+
+    def memory(self, name):
+        return int(re.search(name + r":\s+(\d+)", (self.folder / "status").read_text()).group(1)) >> 10
+
+    def forget_peak(self):
+        """VmHWM, the most memory that it had, counts from here on."""
+        (self.folder / "clear_refs").write_text("5")
 
     def end(self):
         self.process.kill()
@@ -69,8 +78,24 @@ def has_ended(connection):
     return False
 
 
-def waits_for_end(connection):
-    return read(connection, 1 << 26) is not None
+class Websocket:
+    """A connection, once it is upgraded, as a viewer's."""
+
+    def __init__(self, connection):
+        self.connection, self.came = connection, b""
+
+    def sendall(self, message):
+        self.connection.sendall(bytes([0x82, 0x80 | len(message)]) + bytes(4) + message)  # masked with zeros
+
+    def recv(self, count):
+        while not self.came:
+            kind, length = read(self.connection, 2)
+            if length > 125:
+                length = int.from_bytes(read(self.connection, 2 if length == 126 else 8), "big")
+            message = read(self.connection, length)
+            self.came = message if kind & 15 <= 2 else b""
+        taken, self.came = self.came[:count], self.came[count:]
+        return taken
 
 
 def cipher(password, challenge):
@@ -80,14 +105,20 @@ def cipher(password, challenge):
     return subprocess.run(command, input=challenge, stdout=subprocess.PIPE, check=True).stdout
 
 
+def is_let_in(connection, password):
+    connection.sendall(b"RFB 003.008\n\2")
+    challenge = read(connection, 12 + 2 + 16)[14:]
+    if len(challenge) != 16:
+        return False
+    connection.sendall(cipher(password, challenge) + b"\1")
+    return read(connection, 4) == bytes(4) and len(read(connection, 24)) == 24
+
+
 def viewer(application, password=None):
     """A viewer that was let in, or None."""
-    connection = connect(application.vnc, b"RFB 003.008\n\2")
-    challenge = read(connection, 12 + 2 + 16)[14:]
-    if len(challenge) == 16:
-        connection.sendall(cipher(password or application.password, challenge) + b"\1")
-        if read(connection, 4) == bytes(4) and len(read(connection, 24)) == 24:
-            return connection
+    connection = connect(application.vnc)
+    if is_let_in(connection, password or application.password):
+        return connection
     connection.close()
     return None
 
@@ -141,6 +172,16 @@ class AttackTest(unittest.TestCase):
         self.opened.append(connect(*arguments))
         return self.opened[-1]
 
+    def assert_ends(self, connection):
+        """Not by the time limit, which is for those who have not proved the password."""
+        try:
+            while connection.recv(1 << 16):
+                pass
+        except ConnectionError:
+            pass
+        except TimeoutError:
+            self.fail("the connection stays open")
+
     def test_who_asks_again_and_again_or_byte_by_byte_or_nothing_has_to_go(self):
         slow = [self.open(port) for port in (self.application.web, self.application.vnc)]
         asking, dripping = self.open(self.application.web), self.open(self.application.web)
@@ -161,6 +202,9 @@ class AttackTest(unittest.TestCase):
     def test_many_without_the_password_leave_room_for_one_with_it(self):
         for _ in range(3 * MOST_CONNECTIONS):
             self.open(self.application.web, b"GET / HTTP/1.1\r\n")
+        self.opened[-1].sendall(b"Host: localhost\r\n\r\n")
+        self.assertIn(b"200", read(self.opened[-1], 15))  # so the listener has come to all of them
+        self.assertLess(self.application.descriptors(), self.before[1] + MOST_CONNECTIONS + FEW)
         self.comes_in().close()
         # Those that the listener has not come to yet count as open, too.
         end = time.monotonic() + 60
@@ -192,7 +236,10 @@ class AttackTest(unittest.TestCase):
             f"GET / HTTP/1.1\r\nHost: {own}\r\nOrigin: http://{origin or own}\r\nUpgrade: websocket\r\n"
             "Connection: Upgrade\r\nSec-WebSocket-Version: 13\r\n"
             "Sec-WebSocket-Key: AAAAAAAAAAAAAAAAAAAAAA==\r\n\r\n").encode())
-        return connection, read(connection, 12)
+        said = read(connection, 12)
+        while b"101" in said and not said.endswith(b"\r\n\r\n"):
+            said += read(connection, 1)
+        return connection, said
 
     def test_websockets_of_other_origins_and_broken_ones(self):
         self.assertNotIn(b"101", self.upgraded("evil.example")[1])
@@ -202,23 +249,35 @@ class AttackTest(unittest.TestCase):
                         bytes(range(256)) * 16):
             connection, said = self.upgraded(None)
             self.assertIn(b"101", said)
+            self.assertTrue(is_let_in(Websocket(connection), self.application.password))
             connection.sendall(message)
-            self.assertTrue(waits_for_end(connection))
+            self.assert_ends(connection)
+
+    def test_a_version_that_only_looks_like_a_number_does_not_come_to_the_server(self):
+        """It would wait for the rest of the password, in the thread that serves all viewers."""
+        for version in b"RFB 003.00A\n", b"RFB 003. 08\n", b"RFB 003.0x8\n", b"RFB 003.-01\n":
+            said = read(self.open(self.application.vnc, version + b"\2"), 99)
+            self.assertIn(said, (b"", b"RFB 003.008\n"), "the server's answer")
 
     def test_huge_and_broken_messages_end_the_connection(self):
         huge = self.open(self.application.web)
         try:
-            huge.sendall(b"GET / HTTP/1.1\r\nHost: localhost\r\n" + 40000 * b"A: aaaaaaaaaaaaaaaaaaaaa\r\n")
+            huge.sendall(b"GET / HTTP/1.1\r\nHost: localhost\r\n" + 40000 * b"A: aaaaaaaaaaaaaaaaaaaaa\r\n" + b"\r\n")
         except ConnectionError:
             pass
-        self.assertTrue(waits_for_end(huge))
+        self.assertNotIn(b"200", read(huge, 99))
         for message in b"\2\0\xff\xff", b"\x80", b"\xc7":  # too many encodings, and unknown kinds
             self.opened.append(self.comes_in())
             self.opened[-1].sendall(message)
-            self.assertTrue(waits_for_end(self.opened[-1]))
+            self.assert_ends(self.opened[-1])
         clipboard = self.comes_in()
-        clipboard.sendall(b"\6\0\0\0\x7f\xff\xff\xff" + (32 << 20) * b"a")
-        clipboard.close()
+        self.opened.append(clipboard)
+        self.application.forget_peak()
+        before = self.application.memory("VmHWM")
+        clipboard.sendall(b"\6\0\0\0" + struct.pack(">I", 32 << 20) + (32 << 20) * b"a")
+        self.assertTrue(self.is_served(clipboard))
+        if JUDGES_MEMORY:
+            self.assertLess(self.application.memory("VmHWM"), before + 8, "MiB of memory, of a text of 32")
 
     def test_z_it_is_as_it_was(self):
         for _ in range(60):

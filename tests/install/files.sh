@@ -10,6 +10,8 @@ for path in "$SOURCE" "$BUILD" "$WORK"; do
   ! grep -rlF -e "$path" . || fail "The files above name a folder of the build, $path."
 done
 
+python3 "$SOURCE/tests/links_test.py" share/doc/brimol3_widget || fail "Installed pages lead nowhere."
+
 bill=share/doc/brimol3_widget/brimol3_widget.spdx
 sed -n 's/^FileName: \.\///p' "$bill" | sort >"$WORK/billed"
 find . -type f ! -name '*.spdx' -printf '%P\n' | sort | diff -u "$WORK/billed" - ||

@@ -1,6 +1,17 @@
 # Manual pages and completion name every option that a program's help prints; the desktop file is valid.
 . "$SOURCE/tests/install/common.sh"
 
+# offered WORD...: what the completion of the first word's program offers for the last one, a line each.
+offered() (
+  . "$staged/share/bash-completion/completions/$1"
+  complete -p "$1" >/dev/null
+  cd "$SOURCE"
+  COMP_WORDS=("$@")
+  COMP_CWORD=$(($# - 1))
+  _brimol_options "$staged/bin/$1"
+  printf '  %s\n' "${COMPREPLY[@]}" | sort -u
+)
+
 for program in "$staged"/bin/*; do
   name=$(basename "$program")
   options=$("$program" --help | grep -oE '^  --[a-z-]+' | sort -u)
@@ -11,16 +22,25 @@ for program in "$staged"/bin/*; do
     grep -qE -- "$option( |\$|\")" <<<"$page" || fail "$name(1) does not name $option."
   done
 
-  offered=$(
-    . "$staged/share/bash-completion/completions/$name"
-    complete -p "$name" >/dev/null
-    COMP_WORDS=("$program" --)
-    COMP_CWORD=1
-    _brimol_options "$program"
-    printf '  %s\n' "${COMPREPLY[@]}" | sort -u
-  )
-  diff <(echo "$options") <(echo "$offered") || fail "The completion of $name offers other options."
+  diff <(echo "$options") <(offered "$name" --) || fail "The completion of $name offers other options."
 done
+
+# The last word of a command line, and what it may become.
+while IFS='>' read -r line wanted; do
+  read -ra words <<<"$line"
+  found=$(offered "${words[@]}" | xargs)
+  [[ $found == "${wanted# }" ]] || fail "The completion of '${line% }' offers '$found'."
+done <<'END'
+brimol-replay --lint READ > README.md
+brimol-replay --dir packag > packaging
+brimol-replay --device READ >
+brimol-replay menu.trace -- packag > packaging
+factory_test ex > export
+factory_test export --j > --json --junit
+factory_test report --j >
+factory_test report --serial READ >
+factory_test --database READ > README.md
+END
 
 desktop-file-validate "$staged/share/applications/factory_test.desktop"
 

@@ -81,6 +81,31 @@ TEST_F(SessionReplay, WritesNoPictureThroughALink) {
   EXPECT_EQ(play(writeTrace("shot link/x.png\n"), {{"BRIMOL_REPORT_DIR", report}}), 1);
   EXPECT_NE(readAll(folder / "stderr").find("is outside of the folder"), std::string::npos);
   EXPECT_FALSE(fs::exists(folder / "x.png"));
+
+  std::ofstream(folder / "kept") << "kept";
+  for (const char* const name : {"failed.png", "failed.items.txt"}) {
+    fs::remove(fs::path(report) / name);
+    fs::create_symlink(folder / "kept", fs::path(report) / name);
+  }
+  EXPECT_EQ(
+      play(writeTrace("expect text \"Nowhere\" within 10\n"), {{"BRIMOL_REPORT_DIR", report}}), 1);
+  EXPECT_EQ(readAll(folder / "kept"), "kept");
+  EXPECT_NE(readAll(fs::path(report) / "failed.items.txt"), "kept");
+}
+
+TEST_F(SessionReplay, RecordsNothingWhereNoScreenOpens) {
+  std::ofstream(folder / "kept") << "kept";
+  for (const char* const name : {"kept", "new"}) {
+    const Variables variables = {{"BRIMOL_RECORD", name},
+                                 {"BRIMOL_DISPLAY", "browser"},
+                                 {"BRIMOL_LISTEN", "192.0.2.1:0"}};  // no machine's address
+    EXPECT_EQ(Program(folder, variables, {}).waitForEnd(), 1);
+    EXPECT_NE(readAll(folder / "stderr").find("cannot listen"), std::string::npos);
+  }
+  EXPECT_EQ(readAll(folder / "kept"), "kept");
+  for (const char* const name : {"kept.part", "new", "new.part"}) {
+    EXPECT_FALSE(fs::exists(folder / name)) << name;
+  }
 }
 
 TEST_F(SessionReplay, PaintsTheSamePictures) {
@@ -190,9 +215,11 @@ TEST_F(SessionReplay, EndsWithTheReasonOfAFailure) {
   EXPECT_NE(errors.find("Factory test"), std::string::npos) << errors;
   EXPECT_NE(readAll(fs::path(report) / "failed.items.txt"), "");
   EXPECT_TRUE(fs::exists(fs::path(report) / "failed.png"));
+  EXPECT_NE(errors.find("Kept as " + report + "/failed.png\n"), std::string::npos) << errors;
   EXPECT_NE(session(report).find("\"exit\":1,\"reason\":\"failed\""), std::string::npos);
 
-  EXPECT_EQ(play(writeTrace("dance\n")), 2);
+  EXPECT_EQ(play(writeTrace("dance\n"), {{"BRIMOL_REPORT_DIR", report}}), 2);
+  EXPECT_NE(session(report).find("written.trace\",\"line\":2"), std::string::npos);
   EXPECT_EQ(readAll(folder / "stderr"), writeTrace("") + ":2: unknown step 'dance'\n");
   EXPECT_EQ(play(folder / "gone.trace"), 2);
   EXPECT_EQ(play(writeTrace("screen 10x10\n"), {{"BRIMOL_SCREEN", "20x20"}}), 2);

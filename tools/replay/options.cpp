@@ -227,7 +227,8 @@ std::string usage() {
       "Usage: brimol-replay [OPTION]... TRACE -- APP [ARGUMENT]...\n"
       "       brimol-replay [OPTION]... --from-bundle FILE -- APP [ARGUMENT]...\n"
       "Runs an application under a trace, without a window, and writes a report of the session.\n"
-      "An application that was packed with arguments wants its own, or --packed-arguments.\n\n"
+      "Where a bundle holds arguments of the application, give yours behind APP, or "
+      "--packed-arguments.\n\n"
       "Options:\n";
   for (const OptionRow& row : kOptions) {
     std::string name(row.name);

@@ -9,8 +9,10 @@
 
 namespace factory_test {
 
-/// Their codes: "en", "de", "ko", "ar", and "xx", a made-up language of long words with accents, by
-/// which one sees what a translation would break.
+/// Long words with accents, by which one sees what a translation would break. It is not installed.
+inline constexpr std::string_view kMadeUpLanguage = "xx";
+
+/// Their codes: "en", "de", "ko", "ar" and the made-up one.
 std::span<const std::string_view> languages();
 
 /// Chooses one of languages(). Empty: that of the environment (LC_ALL, LC_MESSAGES, LANG), or

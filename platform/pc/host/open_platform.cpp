@@ -73,10 +73,13 @@ std::string openPlatform() try {
   if (!wanted.error.empty()) return wanted.error;
   std::string error;
   const std::shared_ptr<Platform> platform = openDisplayAndInput(wanted.settings, error);
-  if (!platform) return error;
-  if (played != nullptr) played->begin(*platform);
-  setOpened(platform);
-  return {};
+  if (platform) {
+    if (played != nullptr) played->begin(*platform);
+    setOpened(platform);
+  } else if (played != nullptr) {
+    played->giveUp();
+  }
+  return error;
 } catch (const std::system_error& failure) {
   return threadProblem(failure);  // the clock's
 }

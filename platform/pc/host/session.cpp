@@ -67,9 +67,11 @@ Session* session() {
 Session::Session(SessionSettings wanted) : settings(std::move(wanted)), problem(settings.error) {
   if (isPlaying()) parsed = parseTrace(settings.trace, settings.traceRoot);
   takeScreen();
-  if (!parsed.error.empty() || !problem.empty()) return;
-  if (settings.clock != ClockChoice::Real) startClock();
+  if (!problem.empty()) return;
+  const bool isBadTrace = !parsed.error.empty();
+  if (settings.clock != ClockChoice::Real && !isBadTrace) startClock();
   if (!settings.reportFolder.empty()) startReport();
+  if (isBadTrace) return;
   if (isRecording()) startRecording();
   if (settings.monkey) startMonkey();
   if (!isPlaying()) return;
@@ -87,9 +89,10 @@ void Session::takeScreen() {
   const std::optional<Size>& size = parsed.trace.screen;
   if (!size) return;
   if (!wanted.settings.isSizeGiven) screenSize = *size;
-  if (*size != screenSize && parsed.error.empty()) {
-    parsed.error = settings.trace + ": it is for a screen of " + std::to_string(size->w) + 'x' +
-                   std::to_string(size->h) + ", and the environment asks for another";
+  if (*size != screenSize) {
+    parsed.refuse(parsed.trace.screenLine, "it is for a screen of " + std::to_string(size->w) +
+                                               'x' + std::to_string(size->h) +
+                                               ", and the environment asks for another");
   }
 }
 
@@ -98,8 +101,8 @@ void Session::takeDensity(const Settings& wanted) {
   const std::optional<float>& recorded = parsed.trace.density;
   if (!recorded) return;
   if (!wanted.isDensityGiven) density = *recorded;
-  if (*recorded != density && parsed.error.empty()) {
-    parsed.error = settings.trace + ": BRIMOL_DEVICE asks for another density";
+  if (*recorded != density) {
+    parsed.refuse(parsed.trace.densityLine, "BRIMOL_DEVICE asks for another density");
   }
 }
 
@@ -112,7 +115,7 @@ void Session::startReport() {
 void Session::startClock() {
   const uint32_t start = parsed.trace.clockStart.value_or(settings.clockStart.value_or(0));
   turns.emplace(start, settings.clock == ClockChoice::Paced ? Speed::Real : Speed::Free);
-  turns->setStep(settings.clockStep.value_or(1));
+  turns->setStep(parsed.trace.clockStep.value_or(settings.clockStep.value_or(1)));
   turns->setAgent({[this](uint64_t soonest) { return due(soonest); },
                    [this](uint64_t moment) { act(moment); }});
   turns->setBlockedWatcher(
@@ -123,17 +126,13 @@ void Session::startClock() {
 }
 
 void Session::startRecording() {
-  std::string error;
-  recorder.emplace(settings.recording, error);
-  if (!error.empty()) {
-    problem = "BRIMOL_RECORD=" + error;
-    return;
-  }
+  recorder.emplace(settings.recording);
   if (settings.monkey) {  // its world is that of a script
     recorder->startScript(turns->ticksAtStart());
   } else {
     recordWorld();
   }
+  if (settings.clockStep) recorder->clockStep(*settings.clockStep);
   recorder->screen(screenSize);
   if (density != kDefaultDensity) recorder->density(density);
 }
@@ -154,7 +153,15 @@ std::string Session::prepare() {
   if (problem.empty() && !parsed.trace.cutAt.empty()) {
     std::cerr << parsed.trace.cutAt << ": the recording has no end; it is played up to here\n";
   }
-  return problem;
+  if (!problem.empty() || !recorder) return problem;
+  const std::lock_guard lock(mutex);
+  const std::string error = recorder->open();
+  return error.empty() ? error : "BRIMOL_RECORD=" + error;
+}
+
+void Session::giveUp() {
+  const std::lock_guard lock(mutex);
+  if (recorder && !isOver) recorder->close();
 }
 
 void Session::begin(Platform& platform) {
@@ -163,6 +170,7 @@ void Session::begin(Platform& platform) {
   const std::lock_guard lock(mutex);
   if (isOver || open != nullptr) return;
   open = &platform;
+  if (recorder) recorder->begin();
   if (!isHeard && report) {
     report->error(now(), "the log is not heard: link brimol_pc before the log's library", nullptr);
   }
@@ -236,7 +244,7 @@ void Session::takeArrivals(uint64_t moment) {
   }
   for (const auto& [record, isClose] : taken) {
     if (isClose) {
-      recorder->close(moment);
+      recorder->userCloses(moment);
       if (report) report->close(moment, nullptr);
       askToClose();
     } else {

@@ -40,6 +40,8 @@ class Session {
   /// The screen is about to open. One line that says why it cannot; a trace that cannot be played
   /// ends the process.
   std::string prepare();
+  /// It did not open.
+  void giveUp();
   /// It has opened.
   void begin(Platform& platform);
   /// It is about to close.

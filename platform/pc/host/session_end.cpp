@@ -1,13 +1,17 @@
 // How a session ends before the application does.
+#include <cerrno>
 #include <cstdio>
 #include <cstdlib>
 #include <fstream>
 #include <iostream>
+#include <system_error>
 
 #include "host/open_platform.h"
 #include "host/png_file.h"
 #include "host/session.h"
+#include "host/whole_file.h"
 #include "scene/item_text.h"
+#include "scene/quoted_text.h"
 
 namespace brimol::pc {
 
@@ -29,12 +33,27 @@ std::string textsOf(const Frame& frame, Size screen) {
   return list.empty() ? "  (none)\n" : list;
 }
 
+std::string writeItems(const std::vector<std::string>& items, const std::string& path) {
+  return writeWhole(path, [&items](const std::string& unfinished) -> std::string {
+    errno = 0;
+    std::ofstream out(unfinished);
+    for (const std::string& each : items) out << each << '\n';
+    out.close();
+    return out ? "" : std::generic_category().message(errno);
+  });
+}
+
+// For the user: where a file is, or why there is none.
+std::string outcomeOf(const std::string& path, const std::string& error) {
+  return (error.empty() ? "Kept as " + printable(path) : error) + '\n';
+}
+
 }  // namespace
 
 void Session::endWithBadTrace() {
   std::cerr << parsed.error << '\n';
   if (report) {
-    report->error(0, parsed.error, nullptr);
+    report->error(0, parsed.error, &parsed.wrong);
     report->end(0, kBadTrace, "error");
   }
   endProcess(kBadTrace);
@@ -56,9 +75,9 @@ void Session::endMonkey(const std::string& why) {
 void Session::endWithFailure(const TraceFailure& failure) {
   isOver = true;
   const TraceLine& line = failure.line;
-  const std::string message = line.number == 0 ? settings.trace + ": " + failure.why
-                                               : line.file + ':' + std::to_string(line.number) +
-                                                     ": " + line.text + ": " + failure.why;
+  const std::string place =
+      line.file == nullptr ? settings.trace : line.place() + ": " + std::string(line.text);
+  const std::string message = printable(place) + ": " + failure.why;
   std::cerr << message << "\nTexts on the screen, at " << now() << " ms:\n"
             << textsOf(runner->frame(), screenSize) << keepFailure();
   if (report) {
@@ -72,14 +91,12 @@ void Session::endWithFailure(const TraceFailure& failure) {
 std::string Session::keepFailure() {
   const std::string stem =
       report ? (report->directory() / "failed").native() : settings.trace + ".failed";
-  std::ofstream items(stem + ".items.txt");
-  for (const std::string& each : textOfFrame(runner->frame())) items << each << '\n';
-  items.close();
-  if (const CairoSurface picture =
-          open == nullptr ? nullptr : open->copyPicture(std::chrono::seconds(10))) {
-    (void)writePng(picture.get(), stem + ".png");
-  }
-  return "Kept as " + stem + ".png and " + stem + ".items.txt\n";
+  const CairoSurface picture =
+      open == nullptr ? nullptr : open->copyPicture(std::chrono::seconds(10));
+  const std::string png = stem + ".png";
+  const std::string items = stem + ".items.txt";
+  return outcomeOf(png, picture ? writePng(picture.get(), png) : "there is no picture") +
+         outcomeOf(items, writeItems(textOfFrame(runner->frame()), items));
 }
 
 void Session::tellBlocked(const std::string& name, pid_t thread) {

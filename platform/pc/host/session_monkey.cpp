@@ -54,7 +54,7 @@ void Session::followMonkey(uint64_t moment) {
   }
   if (!monkey->isOver()) return;
   tellOfMonkey();
-  if (recorder) recorder->close(moment);
+  if (recorder) recorder->userCloses(moment);
   askToClose();
   closedBy = moment + kCloseMs;
 }

@@ -16,6 +16,7 @@
 #include "input/trace_steps.h"
 #include "scene/item.h"
 #include "scene/item_text.h"
+#include "scene/quoted_text.h"
 #include "scene/shown_texts.h"
 
 namespace brimol::pc {
@@ -39,8 +40,8 @@ std::filesystem::path fileIn(const std::filesystem::path& folder) {
 ordered_json lineOf(const char* kind, uint64_t time) { return {{"kind", kind}, {"time", time}}; }
 
 void addPlace(ordered_json& line, const TraceLine* place) {
-  if (place == nullptr || place->number == 0) return;
-  line["file"] = place->file;
+  if (place == nullptr || place->file == nullptr) return;
+  line["file"] = place->file->path;
   line["line"] = place->number;
 }
 
@@ -104,7 +105,9 @@ ordered_json wordsOf(const SKIA_Item& item) {
 
 SessionReport::SessionReport(std::filesystem::path where, std::string& error)
     : folder(std::move(where)), file(fileIn(folder), error) {
-  if (!error.empty()) error = "BRIMOL_REPORT_DIR=" + folder.native() + ": cannot be written";
+  if (!error.empty()) {
+    error = "BRIMOL_REPORT_DIR=" + printable(folder.native()) + ": cannot be written";
+  }
 }
 
 void SessionReport::start(const SessionSettings& settings, const SessionScreen& screen,

@@ -42,7 +42,7 @@ std::string readClock(const VariableLookup& lookup, SessionSettings& settings) {
   if (value.empty()) return {};
   const auto* const row = std::ranges::find(kClocks, value, &ClockRow::word);
   if (row == kClocks.end()) {
-    return std::string(kClockVariable) + "=" + value + ": wanted real, simulated or paced";
+    return wrongValue(kClockVariable, value, "real, simulated or paced");
   }
   settings.clock = row->clock;
   const bool isSession = !settings.trace.empty() || !settings.recording.empty() || settings.monkey;
@@ -69,8 +69,9 @@ std::string readMilliseconds(const VariableLookup& lookup, const MillisecondsRow
   const char* const end = value.data() + value.size();
   const auto [stop, failure] = std::from_chars(value.data(), end, read);
   if (failure != std::errc() || stop != end || read < row.least || read > row.most) {
-    return std::string(row.variable) + "=" + value + ": wanted milliseconds, " +
-           std::to_string(row.least) + " to " + std::to_string(row.most);
+    return wrongValue(
+        row.variable, value,
+        "milliseconds, " + std::to_string(row.least) + " to " + std::to_string(row.most));
   }
   settings.*row.value = read;
   return {};
@@ -90,22 +91,21 @@ std::string readMonkey(const VariableLookup& lookup, SessionSettings& settings) 
     if (*stop != ':') break;
     next = stop + 1;
   }
-  return std::string(kMonkeyVariable) + "=" + value +
-         ": wanted SEED, SEED:EVENTS or SEED:EVENTS:REST";
+  return wrongValue(kMonkeyVariable, value, "SEED, SEED:EVENTS or SEED:EVENTS:REST");
 }
 
 std::string readPictures(const VariableLookup& lookup, SessionSettings& settings) {
   const std::string value = valueOf(lookup, kPicturesVariable);
   settings.keepsPictures = value != "none";
   if (value.empty() || value == "none" || value == "changed") return {};
-  return std::string(kPicturesVariable) + "=" + value + ": wanted changed or none";
+  return wrongValue(kPicturesVariable, value, "changed or none");
 }
 
 std::string readItems(const VariableLookup& lookup, SessionSettings& settings) {
   const std::string value = valueOf(lookup, kItemsVariable);
   settings.listsItems = value == "changed";
   if (value.empty() || value == "none" || value == "changed") return {};
-  return std::string(kItemsVariable) + "=" + value + ": wanted changed or none";
+  return wrongValue(kItemsVariable, value, "changed or none");
 }
 
 }  // namespace

@@ -8,6 +8,7 @@
 #include <string_view>
 
 #include "host/devices.h"
+#include "scene/quoted_text.h"
 
 namespace brimol::pc {
 
@@ -23,18 +24,6 @@ constexpr std::size_t kShownBytes = 60;  // of a wrong value
 std::string_view valueOf(const VariableLookup& lookup, const char* name) {
   const char* const value = lookup(name);
   return value == nullptr ? std::string_view() : std::string_view(value);
-}
-
-bool isControl(char c) {
-  constexpr char kDelete = '\x7f';
-  return (c >= '\0' && c < ' ') || c == kDelete;
-}
-
-std::string wrongValue(const char* name, std::string_view value, const std::string& wanted) {
-  std::string shown(value.substr(0, kShownBytes));
-  std::ranges::replace_if(shown, isControl, '?');
-  if (value.size() > kShownBytes) shown += "...";
-  return std::string(name) + "=" + shown + ": wanted " + wanted;
 }
 
 std::optional<int> readSide(std::string_view digits) {
@@ -108,6 +97,12 @@ std::string readScreen(const VariableLookup& lookup, Settings& settings) {
 }
 
 }  // namespace
+
+std::string wrongValue(const char* name, std::string_view value, const std::string& wanted) {
+  std::string shown = printable(std::string(value.substr(0, kShownBytes)));
+  if (value.size() > kShownBytes) shown += "...";
+  return std::string(name) + "=" + shown + ": wanted " + wanted;
+}
 
 SettingsResult readSettings(const VariableLookup& lookup) {
   SettingsResult result;

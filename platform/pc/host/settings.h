@@ -22,6 +22,7 @@
 #include <functional>
 #include <optional>
 #include <string>
+#include <string_view>
 
 #include "display/display.h"
 #include "remote/listener.h"
@@ -51,6 +52,9 @@ struct SettingsResult {
 
 /// Gives the value of a variable, or null where it is not set.
 using VariableLookup = std::function<const char*(const char* name)>;
+
+/// "NAME=VALUE: wanted ...", in one line whatever the value.
+std::string wrongValue(const char* name, std::string_view value, const std::string& wanted);
 
 /// Reads BRIMOL_DISPLAY, BRIMOL_LISTEN, BRIMOL_DEVICE and BRIMOL_SCREEN. DISPLAY or WAYLAND_DISPLAY
 /// tell of a desktop. Opens nothing.

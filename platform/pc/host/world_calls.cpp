@@ -1,12 +1,11 @@
 // What an application asks the host of the world.
 #include <brimol/host.h>
 
-#include <algorithm>
 #include <chrono>
-#include <cstring>
 #include <random>
 
 #include "host/session.h"
+#include "scene/utf8.h"
 
 using brimol::pc::Session;
 using brimol::pc::session;
@@ -35,9 +34,8 @@ int brimol_host_figure(const char* name, const char* real_value, char* value, in
     text = played->figure(name == nullptr ? "" : name, text).value_or(text);
   }
   if (value != nullptr && bytes > 0) {
-    const std::size_t copied = std::min(text.size(), static_cast<std::size_t>(bytes) - 1);
-    std::memcpy(value, text.data(), copied);
-    value[copied] = '\0';
+    const std::size_t most = static_cast<std::size_t>(bytes) - 1;
+    value[text.copy(value, brimol::pc::wholeBytes(text, most))] = '\0';
   }
   return static_cast<int>(text.size());
 }

@@ -4,8 +4,11 @@
 #include <brimol/input.h>
 
 #include <cstdint>
+#include <deque>
+#include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <variant>
 #include <vector>
 
@@ -14,10 +17,19 @@
 
 namespace brimol::pc {
 
+/// The trace, or what it includes.
+struct TraceFile {
+  std::string path;
+  std::string text;
+};
+
+/// Lives as long as its trace, which holds the files.
 struct TraceLine {
-  std::string file;
-  int number = 0;    // from 1
-  std::string text;  // as it is written, without blanks at its ends
+  const TraceFile* file = nullptr;  // null: there is no such line
+  int number = 0;                   // from 1
+  std::string_view text = {};       // as it is written, without blanks at its ends
+  /// "FILE:LINE".
+  std::string place() const { return file->path + ':' + std::to_string(number); }
 };
 
 /// Pixels, or hundredths of per cent of the screen's side.
@@ -101,7 +113,7 @@ struct TraceStep {
 
 struct ItemChange {
   std::size_t number;
-  std::string item;
+  std::string_view item;  // as TraceLine's text
   friend bool operator==(const ItemChange&, const ItemChange&) = default;
 };
 
@@ -117,15 +129,19 @@ struct RecordedFrame {
 };
 
 struct Trace {
+  std::vector<std::shared_ptr<const TraceFile>> files;  // the trace itself first
   bool isRecording = false;
   bool leavesRunning = false;
   uint64_t lingerMs = 0;  // from the last step's end to the wish to close
   std::string cutAt;      // a recording without an end: where it stops, for the user
   std::optional<Size> screen;
+  TraceLine screenLine;
   std::optional<float> density;  // dots per inch
+  TraceLine densityLine;
   std::optional<uint32_t> clockStart;
-  std::vector<TraceStep> steps;
-  std::vector<RecordedFrame> frames;
+  std::optional<uint32_t> clockStep;
+  std::deque<TraceStep> steps;
+  std::deque<RecordedFrame> frames;
 };
 
 /// The items of a recorded frame; empty texts where they are not known.

@@ -6,6 +6,7 @@
 #include "input/trace_runner.h"
 #include "scene/quoted_text.h"
 #include "scene/shown_texts.h"
+#include "scene/utf8.h"
 
 namespace brimol::pc {
 
@@ -50,8 +51,7 @@ std::vector<ShownText> fitting(const std::vector<ShownText>& texts, const TextPa
 
 // The bytes of the character that begins there.
 std::size_t lengthOfCharacter(std::string_view text) {
-  const auto isContinued = [](char byte) { return (static_cast<uint8_t>(byte) & 0xC0U) == 0x80U; };
-  const auto* const end = std::find_if_not(text.begin() + 1, text.end(), isContinued);
+  const auto* const end = std::find_if_not(text.begin() + 1, text.end(), isInsideCharacter);
   return static_cast<std::size_t>(end - text.begin());
 }
 

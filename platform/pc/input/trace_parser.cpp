@@ -5,6 +5,8 @@
 #include <filesystem>
 #include <fstream>
 #include <limits>
+#include <new>
+#include <numeric>
 #include <string_view>
 #include <system_error>
 #include <utility>
@@ -13,6 +15,7 @@
 #include "input/trace_steps.h"
 #include "input/trace_words.h"
 #include "scene/item_text.h"
+#include "scene/quoted_text.h"
 
 namespace brimol::pc {
 
@@ -22,10 +25,19 @@ constexpr std::string_view kMark = "brimol-trace";          // what the first li
 constexpr std::size_t kMostBytes = std::size_t{256} << 20;  // of all files of a trace
 constexpr std::size_t kMostIncludes = 16;                   // one in the other
 constexpr int kMostFiles = 10'000;
+constexpr std::size_t kMostSteps = 4'000'000;    // and frames; of 200 bytes each
+constexpr std::size_t kMostChanges = 8'000'000;  // lines of items
+constexpr uint32_t kMostClockStep = 1000;
 constexpr uint64_t kMostTime = uint64_t{1} << 40;
 constexpr uint64_t kMostItems = 65536;
 constexpr std::size_t kHashDigits = 16;
 constexpr uint64_t kMostSide = 16384;
+
+// Each frame's items are hashed, though its line may say but a few words. What is hashed in all is
+// bounded by what the lines say. A frame of 1,000 items in which one blinks stays below.
+constexpr uint64_t kFreeWork = uint64_t{256} << 20;  // bytes
+constexpr uint64_t kWorkForByte = 1024;
+constexpr uint64_t kWorkForItem = 8;
 
 std::string_view trimmed(std::string_view line) {
   constexpr std::string_view kBlanks = " \t\r";
@@ -65,86 +77,93 @@ float readDensity(std::string_view word) {
 /// Reads files into one trace.
 class TraceParser {
  public:
-  TraceParser(Trace& target, const TraceFiles& source) : trace(target), files(source) {}
+  TraceParser(ParsedTrace& target, const TraceFiles& source)
+      : parsed(target), trace(target.trace), files(source) {}
 
-  /// The error, or an empty text.
-  std::string read(const std::string& path);
+  void read(const std::string& path);
 
  private:
   // A file that is being read. What is left of it are the bytes from `place` on.
   struct OpenFile {
-    std::string path;
-    std::string text;
+    const TraceFile* file;
     std::size_t place = 0;
     int lines = 0;
   };
 
+  const TraceFile* keep(TraceFile file);
   bool begin(const std::string& path);
   bool takeLine(TraceLine& line);
-  std::string readOne(const TraceLine& line);
-  std::string finish();
+  void readOne(const TraceLine& line);
+  void finish();
   void readLine(const TraceLine& line);
   void readHeader(const TraceLine& line);
   void readItem(const TraceLine& line);
   void readFrame(const TraceLine& line, TraceWords& words, uint64_t time);
   bool readSetting(const TraceLine& line, TraceWords& words);
+  void readClock(TraceWords& words);
+  void mustComeFirst() const;
   void readTimed(const TraceLine& line, TraceWords& words);
   void include(const TraceLine& line, const std::string& file);
   void endFrame();
+  void boundWork();
 
+  ParsedTrace& parsed;
   Trace& trace;
   const TraceFiles& files;
   std::vector<OpenFile> open;  // each is included by the one before
   int filesRead = 0;
   std::vector<std::string> items;  // of the newest frame
+  std::size_t changes = 0;
+  uint64_t bytesRead = 0;
+  uint64_t work = 0;      // bytes that were hashed
+  bool hasBegun = false;  // with a step that is not of the world
   bool hasEnd = false;
-  std::string lastLine;
+  TraceLine lastLine;
 };
 
-std::string TraceParser::read(const std::string& path) {
-  if (!begin(path)) return path + ":1: cannot be read";
-  while (!open.empty()) {
+void TraceParser::read(const std::string& path) {
+  if (!begin(path)) return parsed.refuse({keep({path, {}}), 1}, "cannot be read");
+  while (!open.empty() && parsed.error.empty()) {
     TraceLine line;
-    if (!takeLine(line)) {
-      open.pop_back();
-    } else if (std::string error = readOne(line); !error.empty()) {
-      return error;
-    }
+    takeLine(line) ? readOne(line) : open.pop_back();
   }
-  return finish();
+  if (parsed.error.empty()) finish();
+}
+
+const TraceFile* TraceParser::keep(TraceFile file) {
+  return trace.files.emplace_back(std::make_shared<const TraceFile>(std::move(file))).get();
 }
 
 bool TraceParser::begin(const std::string& path) {
   std::optional<std::string> text = files(path);
-  if (text) open.push_back({path, std::move(*text)});
+  if (text) open.push_back({keep({path, std::move(*text)})});
   ++filesRead;
   return text.has_value();
 }
 
 // The next line of the innermost file; an empty file has one. False at its end.
 bool TraceParser::takeLine(TraceLine& line) {
-  OpenFile& file = open.back();
-  if (file.place >= file.text.size() && file.lines > 0) return false;
-  const std::size_t end = file.text.find('\n', file.place);
-  const bool isCut = end == std::string::npos;
+  auto& [file, place, lines] = open.back();
+  const std::string_view text = file->text;
+  if (place >= text.size() && lines > 0) return false;
+  const std::size_t end = text.find('\n', place);
+  const bool isCut = end == std::string_view::npos;
   // The crash came while the line was written.
-  if (isCut && trace.isRecording && file.lines > 0) return false;
-  const std::string_view written =
-      std::string_view(file.text).substr(file.place, isCut ? end : end - file.place);
-  line = {file.path, ++file.lines, std::string(trimmed(written))};
-  file.place = isCut ? file.text.size() : end + 1;
+  if (isCut && trace.isRecording && lines > 0) return false;
+  const std::string_view written = text.substr(place, isCut ? end : end - place);
+  line = {file, ++lines, trimmed(written)};
+  bytesRead += written.size();
+  place = isCut ? text.size() : end + 1;
   return true;
 }
 
-std::string TraceParser::readOne(const TraceLine& line) {
-  const std::string place = line.file + ":" + std::to_string(line.number);
+void TraceParser::readOne(const TraceLine& line) {
   try {
     line.number == 1 ? readHeader(line) : readLine(line);
+    lastLine = line;
   } catch (const BadLine& bad) {
-    return place + ": " + bad.why;
+    parsed.refuse(line, bad.why);
   }
-  lastLine = place;
-  return {};
 }
 
 void TraceParser::readHeader(const TraceLine& line) {
@@ -169,19 +188,22 @@ void TraceParser::readLine(const TraceLine& line) {
 
 // `| NUMBER ITEM`, of the frame above.
 void TraceParser::readItem(const TraceLine& line) {
-  std::string_view rest = trimmed(std::string_view(line.text).substr(1));
+  const std::string_view rest = trimmed(line.text.substr(1));
   if (trace.frames.empty()) throw BadLine{"an item without a frame above"};
   TraceWords number(rest.substr(0, rest.find(' ')));
   const uint64_t place = number.number("an item's number", kMostItems);
   if (place >= items.size()) throw BadLine{"the frame above has not so many items"};
-  items[place] = trimmed(rest.substr(std::min(rest.find(' '), rest.size())));
-  trace.frames.back().changes.push_back({place, items[place]});
+  if (++changes > kMostChanges) throw BadLine{"too many lines of items"};
+  const std::string_view item = trimmed(rest.substr(std::min(rest.find(' '), rest.size())));
+  items[place] = item;
+  trace.frames.back().changes.push_back({place, item});
 }
 
 // Settled with the first line behind its items. A damaged recording shows here.
 void TraceParser::endFrame() {
   if (trace.frames.empty()) return;
   RecordedFrame& frame = trace.frames.back();
+  boundWork();
   const bool isWhole = hashOf(items) == frame.hash;
   if (!isWhole && trace.isRecording) {
     throw BadLine{"the frame at line " + std::to_string(frame.line.number) +
@@ -189,6 +211,14 @@ void TraceParser::endFrame() {
   }
   frame.isForgotten = !isWhole && frame.changes.empty();
   if (frame.isForgotten) std::ranges::fill(items, std::string());
+}
+
+void TraceParser::boundWork() {
+  work = std::accumulate(
+      items.begin(), items.end(), work,
+      [](uint64_t sum, const std::string& item) { return sum + item.size() + kWorkForItem; });
+  if (work <= kFreeWork + kWorkForByte * bytesRead) return;
+  throw BadLine{"the frames up to here have too many items for what their lines say"};
 }
 
 void TraceParser::readFrame(const TraceLine& line, TraceWords& words, uint64_t time) {
@@ -203,27 +233,35 @@ void TraceParser::readFrame(const TraceLine& line, TraceWords& words, uint64_t t
   trace.frames.push_back(std::move(frame));
 }
 
+void TraceParser::mustComeFirst() const {
+  if (hasBegun) throw BadLine{"this must stand before the first step"};
+}
+
+void TraceParser::readClock(TraceWords& words) {
+  mustComeFirst();
+  if (words.takes("step")) {
+    trace.clockStep =
+        static_cast<uint32_t>(words.number("a number of milliseconds", kMostClockStep));
+    if (trace.clockStep == 0U) throw BadLine{"a clock that stands still"};
+    return;
+  }
+  words.expect("start");
+  trace.clockStart = static_cast<uint32_t>(
+      words.number("a number of milliseconds", std::numeric_limits<uint32_t>::max()));
+}
+
 // What is about the trace, and no step.
 bool TraceParser::readSetting(const TraceLine& line, TraceWords& words) {
-  const auto mustComeFirst = [this] {
-    const auto isOfWorld = [](const TraceStep& step) {
-      return std::holds_alternative<WorldChange>(step.action);
-    };
-    if (!std::ranges::all_of(trace.steps, isOfWorld)) {
-      throw BadLine{"this must stand before the first step"};
-    }
-  };
   if (words.takes("screen")) {
     mustComeFirst();
     trace.screen = readScreen(words);
+    trace.screenLine = line;
   } else if (words.takes("density")) {
     mustComeFirst();
     trace.density = readDensity(words.word("dots per inch"));
+    trace.densityLine = line;
   } else if (words.takes("clock")) {
-    mustComeFirst();
-    words.expect("start");
-    trace.clockStart = static_cast<uint32_t>(
-        words.number("a number of milliseconds", std::numeric_limits<uint32_t>::max()));
+    readClock(words);
   } else if (words.takes("include")) {
     const std::string file = words.isTextNext() ? words.text("a file") : words.word("a file");
     words.expectEnd();
@@ -241,9 +279,9 @@ bool TraceParser::readSetting(const TraceLine& line, TraceWords& words) {
 }
 
 void TraceParser::include(const TraceLine& line, const std::string& file) {
-  const std::string path = (std::filesystem::path(line.file).parent_path() / file).native();
-  if (std::ranges::count(open, path, &OpenFile::path) != 0)
-    throw BadLine{"'" + file + "' includes itself"};
+  const std::string path = (std::filesystem::path(line.file->path).parent_path() / file).native();
+  const auto isPath = [&path](const OpenFile& each) { return each.file->path == path; };
+  if (std::ranges::any_of(open, isPath)) throw BadLine{"'" + file + "' includes itself"};
   if (open.size() >= kMostIncludes || filesRead >= kMostFiles) {
     throw BadLine{"too many files are included"};
   }
@@ -251,6 +289,9 @@ void TraceParser::include(const TraceLine& line, const std::string& file) {
 }
 
 void TraceParser::readTimed(const TraceLine& line, TraceWords& words) {
+  if (trace.steps.size() + trace.frames.size() >= kMostSteps) {
+    throw BadLine{"more than " + std::to_string(kMostSteps) + " steps and frames"};
+  }
   TraceStep step = {line, TraceStep::Timing::AsSoonAsPossible, 0, {}};
   if (words.peek().starts_with('+')) {
     TraceWords digits(words.word("a time").substr(1));
@@ -270,23 +311,23 @@ void TraceParser::readTimed(const TraceLine& line, TraceWords& words) {
   if (hasEnd) throw BadLine{"a step behind the end"};
   step.action = readStep(words);
   hasEnd = std::holds_alternative<SessionEnd>(step.action);
+  hasBegun = hasBegun || !std::holds_alternative<WorldChange>(step.action);
   trace.steps.push_back(std::move(step));
 }
 
-std::string TraceParser::finish() {
+void TraceParser::finish() {
   try {
     endFrame();
   } catch (const BadLine& bad) {
     // The crash came between the last frame and its items.
-    if (hasEnd) return lastLine + ": " + bad.why;
+    if (hasEnd || !trace.isRecording) return parsed.refuse(lastLine, bad.why);
     trace.frames.pop_back();
   }
   if (trace.isRecording && !hasEnd) {
     constexpr uint64_t kAftermathMs = 5000;  // the crash came after the last line
-    trace.cutAt = lastLine;
+    trace.cutAt = printable(lastLine.place());
     trace.lingerMs = kAftermathMs;
   }
-  return {};
 }
 
 // At most `left` bytes, which become fewer. Of a file that is no trace only the beginning, which
@@ -322,10 +363,20 @@ std::vector<std::string> itemsOf(const Trace& trace, std::size_t frame) {
   return items;
 }
 
+void ParsedTrace::refuse(const TraceLine& line, const std::string& why) {
+  if (!error.empty()) return;
+  wrong = line;
+  error = printable(line.place() + ": " + why);
+}
+
 ParsedTrace parseTrace(const std::string& path, const TraceFiles& files) {
   ParsedTrace parsed;
-  TraceParser parser(parsed.trace, files);
-  parsed.error = parser.read(path);
+  try {
+    TraceParser(parsed, files).read(path);
+  } catch (const std::bad_alloc&) {
+    parsed = {};
+    parsed.error = printable(path + ": there is not enough memory for it");
+  }
   return parsed;
 }
 

@@ -14,10 +14,15 @@ using TraceFiles = std::function<std::optional<std::string>(const std::string& p
 
 struct ParsedTrace {
   Trace trace;
-  std::string error;  // "FILE:LINE: what is wrong"; empty: nothing is
+  std::string error;  // "FILE:LINE: what is wrong", in one line; empty: nothing is
+  TraceLine wrong;    // that line, if the error names one
+
+  /// Keeps the first error.
+  void refuse(const TraceLine& line, const std::string& why);
 };
 
-/// Reads `path` and what it includes. Throws nothing, whatever the files hold.
+/// Reads `path` and what it includes. Throws nothing, whatever the files hold: too many steps, or
+/// more items than are compared in a bearable time, are errors, and so is a lack of memory.
 ParsedTrace parseTrace(const std::string& path, const TraceFiles& files);
 
 /// The same from the file system: 256 MiB at most. What is included is a regular file in the folder

@@ -2,6 +2,7 @@
 
 #include <array>
 #include <charconv>
+#include <utility>
 
 #include "input/trace_steps.h"
 #include "scene/item_text.h"
@@ -45,38 +46,60 @@ std::string textOfRecord(const Event& record) {
   return {};
 }
 
+std::string TraceRecorder::open() {
+  std::string error;
+  if (!out) out.emplace(path, error);
+  if (!error.empty()) out.reset();
+  return error;
+}
+
+void TraceRecorder::begin() {
+  hasBegun = true;
+  for (const std::string& lines : std::exchange(early, {})) out->write(lines);
+}
+
+void TraceRecorder::write(const std::string& lines) {
+  if (hasBegun) {
+    out->write(lines);
+  } else {
+    early.push_back(lines);
+  }
+}
+
 void TraceRecorder::startScript(uint32_t clockStart) {
-  file.write("brimol-trace 1");
-  file.write("clock start " + std::to_string(clockStart));
-  file.write("linger 5000");  // a crash comes after the last line
+  write("brimol-trace 1");
+  write("clock start " + std::to_string(clockStart));
+  write("linger 5000");  // a crash comes after the last line
 }
 
 void TraceRecorder::start(uint32_t clockStart, uint64_t utcMs, uint64_t seed) {
-  file.write("brimol-trace 1 recording");
-  file.write("clock start " + std::to_string(clockStart));
-  file.write("world time " + utcText(utcMs));
-  file.write("world random " + std::to_string(seed));
+  write("brimol-trace 1 recording");
+  write("clock start " + std::to_string(clockStart));
+  write("world time " + utcText(utcMs));
+  write("world random " + std::to_string(seed));
 }
 
+void TraceRecorder::clockStep(uint32_t ms) { write("clock step " + std::to_string(ms)); }
+
 void TraceRecorder::screen(Size size) {
-  file.write("screen " + std::to_string(size.w) + 'x' + std::to_string(size.h));
+  write("screen " + std::to_string(size.w) + 'x' + std::to_string(size.h));
 }
 
 void TraceRecorder::density(float dotsPerInch) {
   std::array<char, 32> digits = {};
   const auto end = std::to_chars(digits.data(), digits.data() + digits.size(), dotsPerInch).ptr;
-  file.write("density " + std::string(digits.data(), end));
+  write("density " + std::string(digits.data(), end));
 }
 
 void TraceRecorder::input(uint64_t time, const Event& record) {
   const std::string words = textOfRecord(record);
-  if (!words.empty()) file.write(std::to_string(time) + ' ' + words);
+  if (!words.empty()) write(std::to_string(time) + ' ' + words);
 }
 
-void TraceRecorder::close(uint64_t time) { file.write(std::to_string(time) + " close"); }
+void TraceRecorder::userCloses(uint64_t time) { write(std::to_string(time) + " close"); }
 
 void TraceRecorder::figure(uint64_t time, const std::string& name, const std::string& value) {
-  file.write(std::to_string(time) + " world figure " + inQuotes(name) + ' ' + inQuotes(value));
+  write(std::to_string(time) + " world figure " + inQuotes(name) + ' ' + inQuotes(value));
 }
 
 void TraceRecorder::frame(uint64_t time, const std::vector<std::string>& items) {
@@ -87,9 +110,9 @@ void TraceRecorder::frame(uint64_t time, const std::vector<std::string>& items) 
     lines += "\n| " + std::to_string(i) + ' ' + items[i];
   }
   lastItems = items;
-  file.write(lines);
+  write(lines);
 }
 
-void TraceRecorder::end(uint64_t time) { file.write(std::to_string(time) + " end"); }
+void TraceRecorder::end(uint64_t time) { write(std::to_string(time) + " end"); }
 
 }  // namespace brimol::pc

@@ -1,14 +1,13 @@
 #include "remote/message_gate.h"
 
 #include <algorithm>
+#include <array>
 
 namespace brimol::pc {
 namespace {
 
 // The protocol's handshake.
-constexpr std::string_view kVersionStart = "RFB 003.";
 constexpr std::size_t kVersionBytes = 12;
-constexpr std::string_view kSecuritySince = "007";  // before, the server alone chooses
 constexpr char kPasswordSecurity = 2;
 constexpr std::size_t kPasswordBytes = 16;
 
@@ -23,6 +22,18 @@ constexpr std::size_t kMaxEncodings = 256;
 constexpr std::size_t kClipboardHead = 8;
 
 constexpr std::size_t kBroken = 0;
+
+struct Version {
+  std::string_view greeting;
+  bool choosesSecurity;  // in older versions the server alone does
+};
+// What viewers answer to 3.8. The server takes whatever looks like a number in their place, and
+// might read another one there than the gate.
+constexpr auto kVersions = std::to_array<Version>({{"RFB 003.003\n", false},
+                                                   {"RFB 003.005\n", false},
+                                                   {"RFB 003.007\n", true},
+                                                   {"RFB 003.008\n", true},
+                                                   {"RFB 003.889\n", true}});
 
 std::size_t number(std::string_view message, std::size_t at, std::size_t bytes) {
   std::size_t value = 0;
@@ -94,12 +105,12 @@ std::size_t MessageGate::wantedBytes(std::string_view message) const {
 
 bool MessageGate::pass(std::string_view message, std::string& whole) {
   switch (stage) {
-    case Stage::Version:
-      if (!message.starts_with(kVersionStart) || message.back() != '\n') return false;
-      stage = message.substr(kVersionStart.size(), kSecuritySince.size()) < kSecuritySince
-                  ? Stage::Password
-                  : Stage::Security;
+    case Stage::Version: {
+      const auto* const version = std::ranges::find(kVersions, message, &Version::greeting);
+      if (version == kVersions.end()) return false;
+      stage = version->choosesSecurity ? Stage::Security : Stage::Password;
       break;
+    }
     case Stage::Security:
       if (message.front() != kPasswordSecurity) return false;
       stage = Stage::Password;

@@ -75,4 +75,9 @@ std::optional<std::string> unescaped(std::string_view inside) {
   return text;
 }
 
+std::string printable(std::string text) {
+  std::ranges::replace_if(text, isControl, '?');
+  return text;
+}
+
 }  // namespace brimol::pc

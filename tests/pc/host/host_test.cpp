@@ -7,6 +7,7 @@
 #include <gmock/gmock.h>
 #include <unistd.h>
 
+#include <array>
 #include <atomic>
 #include <cstdlib>
 #include <filesystem>
@@ -99,6 +100,18 @@ TEST_F(HostTest, OpensShowsAndClosesAgainAndAgain) {
     unsetenv("BRIMOL_DEVICE");
     EXPECT_EQ(skia_live_widget_c(), 0);
   }
+}
+
+TEST_F(HostTest, CutsAFigureAtAWholeCharacter) {
+  constexpr int kRoom = 4;
+  std::array<char, kRoom> told = {'x'};
+  EXPECT_EQ(brimol_host_figure("load", "ab", told.data(), 0), 2);
+  EXPECT_EQ(told.front(), 'x') << "no room";
+  EXPECT_EQ(brimol_host_figure("load", "ab", nullptr, kRoom), 2);
+  EXPECT_EQ(brimol_host_figure("load", "a\u20acb", told.data(), kRoom), 5);
+  EXPECT_STREQ(told.data(), "a");
+  EXPECT_EQ(brimol_host_figure(nullptr, nullptr, told.data(), kRoom), 0);
+  EXPECT_STREQ(told.data(), "");
 }
 
 TEST_F(HostTest, SaysWhyItDoesNotOpenOrWriteAScreenshot) {

@@ -39,6 +39,8 @@ TEST(SessionSettings, SayWhatIsWrong) {
             "BRIMOL_REPORT_PICTURES=all: wanted changed or none");
   EXPECT_EQ(errorWith({{"BRIMOL_REPORT_ITEMS", "1"}}),
             "BRIMOL_REPORT_ITEMS=1: wanted changed or none");
+  EXPECT_EQ(errorWith({{"BRIMOL_MONKEY", "1\n2"}}),
+            "BRIMOL_MONKEY=1?2: wanted SEED, SEED:EVENTS or SEED:EVENTS:REST");
   EXPECT_NE(errorWith({{"BRIMOL_TRACE", "a"}, {"BRIMOL_CLOCK", "real"}}), "");
   EXPECT_NE(errorWith({{"BRIMOL_TRACE", "a"}, {"BRIMOL_RECORD", "b"}}), "");
 }

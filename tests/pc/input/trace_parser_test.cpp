@@ -1,5 +1,6 @@
 #include "input/trace_parser.h"
 
+#include <fcntl.h>
 #include <gtest/gtest.h>
 #include <sys/resource.h>
 #include <unistd.h>
@@ -98,12 +99,14 @@ INSTANTIATE_TEST_SUITE_P(
         WrongLine{"| 0 box", "an item without a frame"},
         WrongLine{"screen 720", "a side in pixels"}, WrongLine{"screen 0x5", "without pixels"},
         WrongLine{"density 0", "no number of dots"}, WrongLine{"density 1x", "no number of dots"},
+        WrongLine{"clock step 0", "stands still"}, WrongLine{"clock step 1001", "0 to 1000"},
+        WrongLine{"wait\x1B[2J", "'wait?[2J'"},
         WrongLine{"include gone.trace", "'t/gone.trace' cannot be read"},
         WrongLine{"include main.trace", "includes itself"}));
 
 TEST(TraceParserTest, ReadsStepsWithTheirTimesAndOperands) {
   const ParsedTrace parsed = parseLines(
-      "screen 720x1280\ndensity 312.5\nclock start 4294960000\n"
+      "screen 720x1280\ndensity 312.5\nclock start 4294960000\nclock step 10\n"
       "1500 tap \"a*\\*\" for 700 finger 9 # a comment\n"
       "+20 move by -5 10% over 30\n"
       "key down\nkey down up\nkey volume-up for 5\n"
@@ -112,6 +115,7 @@ TEST(TraceParserTest, ReadsStepsWithTheirTimesAndOperands) {
   ASSERT_EQ(parsed.error, "");
   const auto& steps = parsed.trace.steps;
   ASSERT_EQ(steps.size(), 8U);
+  EXPECT_EQ(parsed.trace.clockStep, 10U);
   EXPECT_EQ(parsed.trace.screen, (Size{720, 1280}));
   EXPECT_EQ(parsed.trace.density, 312.5F);
   EXPECT_EQ(parsed.trace.clockStart, 4294960000U);
@@ -135,6 +139,16 @@ TEST(TraceParserTest, ReadsStepsWithTheirTimesAndOperands) {
   EXPECT_EQ(look.within, 7U);
   EXPECT_EQ(std::get<Look>(steps[6].action).within, 10'000U);
   EXPECT_EQ(std::get<Look>(steps[7].action).colour, 0xFF0080U);
+  EXPECT_EQ(parseLines("world random 1\nscreen 9x9\nwait 1\nscreen 9x9\n").error,
+            "t/main.trace:5: this must stand before the first step");
+}
+
+// Each line has items to compare that it does not say.
+TEST(TraceParserTest, RefusesFramesThatTakeTooLong) {
+  std::string lines;
+  for (int i = 0; i < 5'000; ++i) lines += "0 frame 0123456789abcdef 65536\n";
+  EXPECT_NE(parseLines(lines).error.find("too many items"), std::string::npos);
+  EXPECT_EQ(parseLines(lines.substr(0, lines.size() / 50)).error, "");
 }
 
 TEST(TraceParserTest, IncludesFilesAndNamesTheirLines) {
@@ -143,7 +157,7 @@ TEST(TraceParserTest, IncludesFilesAndNamesTheirLines) {
   const ParsedTrace whole = parse(files);
   ASSERT_EQ(whole.error, "");
   ASSERT_EQ(whole.trace.steps.size(), 2U);
-  EXPECT_EQ(whole.trace.steps[0].line.file, "t/sub/part.trace");
+  EXPECT_EQ(whole.trace.steps[0].line.file->path, "t/sub/part.trace");
   EXPECT_EQ(whole.trace.steps[1].line.number, 3);
   files["t/sub/part.trace"] += "dance\n";
   EXPECT_EQ(parse(files).error, "t/sub/part.trace:3: unknown step 'dance'");
@@ -218,6 +232,28 @@ TEST_F(FilesOfATrace, KeepWhatTheyHeldWhereTheDiskIsFull) {
   EXPECT_EQ(included("main.trace"), "new\n");
 }
 
+TEST_F(FilesOfATrace, AreNoStandardStreamsAndNoOtherPrograms) {
+  const int errors = ::dup(STDERR_FILENO);
+  ::close(STDERR_FILENO);
+  std::string error;
+  {
+    const LineFile file(folder / "recording", error);
+    const bool isTaken = ::fcntl(STDERR_FILENO, F_GETFD) != -1;
+    ::dup2(errors, STDERR_FILENO);
+    EXPECT_FALSE(isTaken);
+    for (const auto& each : std::filesystem::directory_iterator("/proc/self/fd")) {
+      std::error_code isGone;
+      const auto open = std::filesystem::read_symlink(each, isGone);
+      if (open.filename() != "recording.part") continue;
+      EXPECT_EQ(::fcntl(std::stoi(each.path().filename()), F_GETFD), FD_CLOEXEC);
+      error = "found";
+    }
+  }
+  ::close(errors);
+  EXPECT_EQ(error, "found");
+  EXPECT_FALSE(std::filesystem::exists(folder / "recording.part"));
+}
+
 TEST(TraceParserTest, ReadsTimesOfDay) {
   for (const char* text : {"2026-11-22T10:00:00.007Z", "1970-01-01T00:00:00.000Z"}) {
     EXPECT_EQ(utcText(readUtc(text)), text);
@@ -235,11 +271,12 @@ SKIA_Item itemAt(int x, const char* text) {
 /// A recording of three frames and some input, as a session leaves it.
 std::string recording() {
   const std::string path = testing::TempDir() + "recording." + std::to_string(::getpid());
-  std::string error;
-  TraceRecorder recorder(path, error);
-  EXPECT_EQ(error, "");
+  TraceRecorder recorder(path);
+  EXPECT_EQ(recorder.open(), "");
   recorder.start(77, readUtc("2026-11-22T10:00:00Z"), 12345678901234567890U);
   recorder.screen({720, 1280});
+  EXPECT_FALSE(std::filesystem::exists(path)) << "no screen is open";
+  recorder.begin();
   recorder.frame(0, textOfFrame({itemAt(1, "one"), itemAt(2, "two \"quoted\"\n")}));
   recorder.input(5, pointerRecord(BRIMOL_POINTER_DOWN, 1, {10, 20}));
   Event motion = pointerRecord(BRIMOL_POINTER_MOTION, 1, {8, 20});
@@ -249,7 +286,7 @@ std::string recording() {
   recorder.frame(7, textOfFrame({itemAt(1, "one"), itemAt(3, "three"), itemAt(4, "")}));
   recorder.input(8, keyRecord(BRIMOL_KEY_UP, 158));
   recorder.frame(9, {});
-  recorder.close(10);
+  recorder.userCloses(10);
   recorder.end(11);
   std::ifstream in(path, std::ios::binary);
   std::string text{std::istreambuf_iterator<char>(in), {}};

@@ -44,7 +44,9 @@ class Played {
     return *this;
   }
   std::string failure() const {
-    return runner.failure() ? runner.failure()->line.text + ": " + runner.failure()->why : "";
+    return runner.failure()
+               ? std::string(runner.failure()->line.text) + ": " + runner.failure()->why
+               : "";
   }
 
   uint64_t now = 0;

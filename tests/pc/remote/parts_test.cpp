@@ -41,6 +41,7 @@ const auto kStreams = std::to_array<Stream>(
      {"an old viewer", kOld + kKey, kOld + kKey},
      {"half a message", kHandshake + kKey.substr(0, 7), kHandshake},
      {"a browser", "GET / HTTP/1.1\r\n", "", false},
+     {"a version that is half a number", "RFB 003.00A\n\2", "", false},
      {"no password wanted", "RFB 003.008\n\1", "RFB 003.008\n", false},
      {"an unknown message", kHandshake + "\7" + kKey, kHandshake, false},
      {"too many encodings", kHandshake + "\2\0\xFF\xFF"s, kHandshake, false}});
