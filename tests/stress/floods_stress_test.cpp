@@ -81,7 +81,7 @@ std::ptrdiff_t threads() { return entriesOf("/proc/self/task"); }
 std::ptrdiff_t openFiles() { return entriesOf("/proc/self/fd"); }
 
 TEST_F(WidgetTest, AThousandStartsAndEndsLeaveNothing) {
-  constexpr unsigned int kStarts = 1000;
+  constexpr std::size_t kStarts = 1000;
   platform().records = false;
   const auto startAndEnd = [] {
     EXPECT_EQ(Window::init(), 1);
@@ -96,7 +96,7 @@ TEST_F(WidgetTest, AThousandStartsAndEndsLeaveNothing) {
   for (int i = 0; i < 250; ++i) startAndEnd();
   const std::size_t before = allocatedBytes();
   const std::ptrdiff_t filesBefore = openFiles();
-  for (unsigned int i = 0; i < kStarts; ++i) startAndEnd();
+  for (std::size_t i = 0; i < kStarts; ++i) startAndEnd();
   EXPECT_LT(openFiles(), filesBefore + 10) << "a sanitizer opens one or two for itself";
   // The last ones have done their work; the system may still take them down.
   while (threads() > threadsBefore) std::this_thread::yield();

@@ -23,6 +23,7 @@ static_assert(counts({{1000, 1100}, {1200, 1300}, {1400, 1500}}) == 123);
 // The last tick of a tap, and of the time between two releases.
 static_assert(counts({{1000, 1499}, {1600, 1998}}) == 12);
 static_assert(counts({{1000, 1500}, {1600, 1700}}) == 1);
+static_assert(counts({{1000, 1500}, {1500, 1510}}) == 1, "it begins anew at once");
 static_assert(counts({{1000, 1100}, {1200, 1600}, {1700, 1800}}) == 101);
 
 // A press forgets a tap that is older than the time, and no younger one.
@@ -31,6 +32,7 @@ static_assert(counts({{1000, 1100}, {1600, 1601}}) == 10);
 
 // Tick 0 stands for none.
 static_assert(counts({{0, 0}, {900, 1000}, {1100, 1200}}) == 12);
+static_assert(counts({{1, 1}, {600, 650}}) == 11, "1 is a time");
 
 constexpr uint32_t kDay = 24 * 60 * 60 * 1000;
 

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cerrno>
 #include <fstream>
 #include <memory>
 #include <nlohmann/json.hpp>
@@ -67,7 +68,11 @@ bool addFile(const Writer& writer, const fs::path& name, const fs::path& file) {
   std::error_code failure;
   uintmax_t left = fs::file_size(file, failure);
   std::ifstream stream(file, std::ios::binary);
-  if (failure || !stream || !addHeader(writer, name, left)) return false;
+  if (failure || !stream) {
+    archive_set_error(writer.get(), EIO, "%s cannot be read", file.c_str());
+    return false;
+  }
+  if (!addHeader(writer, name, left)) return false;
   std::array<char, kBlockBytes> bytes{};
   while (left > 0) {
     stream.read(bytes.data(), static_cast<std::streamsize>(std::min(left, kBlockBytes)));
@@ -80,7 +85,7 @@ bool addFile(const Writer& writer, const fs::path& name, const fs::path& file) {
 
 // The files of a run, by their names from its folder. What was unpacked is none of it, nor is an
 // earlier bundle that the new one replaces.
-std::vector<fs::path> filesOfRun(const fs::path& folder, const fs::path& bundle) {
+std::vector<fs::path> filesToPack(const fs::path& folder, const fs::path& bundle) {
   std::vector<fs::path> files;
   std::error_code failure;
   std::error_code ignored;
@@ -119,17 +124,28 @@ bool addAll(const Writer& writer, RunRecord record, const Contents& contents) {
          });
 }
 
-// Why it cannot be written; empty: it was.
-std::string writeArchive(const fs::path& file, const RunRecord& record, const Contents& contents) {
+// The library leaks its compressor where a write fails, so that the stream alone knows of it.
+la_ssize_t writeSome(archive*, void* stream, const void* bytes, std::size_t count) {
+  static_cast<std::ofstream*>(stream)->write(static_cast<const char*>(bytes),
+                                             static_cast<std::streamsize>(count));
+  return static_cast<la_ssize_t>(count);
+}
+
+// False, with `reason` where the file is not to blame, if it cannot be written.
+bool writeArchive(const fs::path& file, const RunRecord& record, const Contents& contents,
+                  std::string& reason) {
+  std::ofstream stream(file, std::ios::binary);
   const Writer writer(archive_write_new());
   archive_write_set_format_pax_restricted(writer.get());
   archive_write_add_filter_gzip(writer.get());
   archive_write_set_filter_option(writer.get(), "gzip", "timestamp", nullptr);
-  if (archive_write_open_filename(writer.get(), file.c_str()) == ARCHIVE_OK &&
-      addAll(writer, record, contents) && archive_write_close(writer.get()) == ARCHIVE_OK) {
-    return {};
-  }
-  return reasonOf(writer.get());
+  archive_write_set_bytes_in_last_block(writer.get(), 1);  // nothing behind the compressed bytes
+  const bool isWhole =
+      archive_write_open(writer.get(), &stream, nullptr, writeSome, nullptr) == ARCHIVE_OK &&
+      addAll(writer, record, contents) && archive_write_close(writer.get()) == ARCHIVE_OK;
+  if (!isWhole) reason = ": " + reasonOf(writer.get());
+  stream.close();
+  return isWhole && stream.good();
 }
 
 // What a bundle holds: regular files alone, below the folder.
@@ -230,14 +246,13 @@ bool writeBundle(const fs::path& bundle, const RunRecord& record, const TraceFil
     error = bundle.native() + ": the trace cannot be packed: " + trace.error;
     return false;
   }
-  const Contents contents{trace, run, filesOfRun(run, bundle)};
+  const Contents contents{trace, run, filesToPack(run, bundle)};
   std::string reason;
   const auto write = [&](const fs::path& target) {
-    reason = writeArchive(target, record, contents);
-    return reason.empty();
+    return writeArchive(target, record, contents, reason);
   };
   if (writeWhole(bundle, write)) return true;
-  error = bundle.native() + ": cannot be written" + (reason.empty() ? "" : ": " + reason);
+  error = bundle.native() + ": cannot be written" + reason;
   return false;
 }
 

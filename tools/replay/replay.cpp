@@ -268,7 +268,9 @@ std::string lastLines(const std::string& output) {
   for (int line = 0; line <= kLines && from != std::string::npos && from > 0; ++line) {
     from = output.rfind('\n', from - 1);
   }
-  return from == std::string::npos || from == 0 ? output : output.substr(from + 1);
+  std::string lines = from == std::string::npos || from == 0 ? output : output.substr(from + 1);
+  if (!lines.empty() && lines.back() != '\n') lines += '\n';
+  return lines;
 }
 
 void tell(const Plan& plan, const Outcome& outcome) {

@@ -14,7 +14,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr uintmax_t kMostBytes = uintmax_t{256} << 20;  // the platform refuses more
+constexpr uintmax_t kMostTraceBytes = uintmax_t{256} << 20;  // the platform refuses more
 
 fs::path commonFolder(const fs::path& one, const fs::path& other) {
   fs::path common;
@@ -41,7 +41,7 @@ TraceFiles traceFiles(const fs::path& trace, const fs::path& root) {
     const fs::path file = fs::path(name).lexically_normal();
     std::error_code failure;
     const bool isFit = fs::is_regular_file(file, failure) &&
-                       fs::file_size(file, failure) <= kMostBytes &&
+                       fs::file_size(file, failure) <= kMostTraceBytes &&
                        (file == first || isInside(allowed, file));
     if (!isFit) return {};
     if (std::ranges::find(found.files, file) == found.files.end()) found.files.push_back(file);
