@@ -72,9 +72,9 @@ class MonkeyTest(unittest.TestCase):
 
     def test_a_program_that_ignores_everything_is_told_of_though_it_blinks(self):
         for what in [], ["blink"]:
-            ended = self.run_program(PLANTED, *what, BRIMOL_MONKEY="8:20000", BRIMOL_SCREEN="30x30")
+            ended = self.run_program(PLANTED, *what, BRIMOL_MONKEY="8:25000", BRIMOL_SCREEN="30x30")
             self.assertEqual(ended.returncode, 1, ended.stderr)
-            self.assertIn("nothing new was shown for 5000 events", ended.stderr)
+            self.assertIn("nothing new was shown for 20000 events", ended.stderr)
 
     def test_wrong_wishes_are_refused(self):
         for wish in "x", "1:", "1:2:3:4", "-1":

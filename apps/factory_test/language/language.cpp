@@ -15,7 +15,8 @@ namespace factory_test {
 namespace {
 
 constexpr const char* kDomain = "factory_test";
-constexpr auto kLanguages = std::to_array<std::string_view>({"en", "de", "ko", "ar", kMadeUpLanguage});
+constexpr auto kLanguages =
+    std::to_array<std::string_view>({"en", "de", "ko", "ar", kMadeUpLanguage});
 
 bool isKnown(std::string_view code) { return std::ranges::count(kLanguages, code) > 0; }
 
