@@ -10,7 +10,7 @@ Usage: scripts/monkey.sh [--preset NAME] [--events N] [--days N] SEED...
 Each seed plays in a process of its own, in simulated time, on a screen of 480x800. The session's memory, threads and
 open files are printed after each 250,000 events and each simulated day. A seed fails if the application crashes,
 leaks (with a sanitizer's preset), does not close, shows the same for 20,000 events, or gives a verdict a wrong time.
-From the first of those lines after a million events to the last, memory may not grow by more than 2 %, and no thread
+From the first of those lines after a million events to the last, memory may not grow by more than 1 %, and no thread
 and no open file may be left. Fewer events than 1,500,000 are too few to tell, and are not judged by this.
 
 The trace of a seed that fails stays in build/monkey/SEED.trace. Played, it brings back a crash, a hang, and that the
@@ -80,7 +80,7 @@ judge() {
          if (told - told1 < 400000) { print "growth is not judged: too few events were told of"; exit !few }
          growth = 100 * (memory - memory1) / memory1
          printf "growth from %d events to %d: %.2f %%\n", told1, told, growth
-         exit growth > 2 || threads > threads1 || files > files1
+         exit growth > 1 || threads > threads1 || files > files1
        }' "$1"
 }
 

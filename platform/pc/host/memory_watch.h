@@ -6,7 +6,7 @@
 
 namespace brimol::pc {
 
-/// Takes looks at the resident size and says the least of the latest ten: what is only held for a
+/// Takes looks at the resident size and says the least of the latest 25: what is only held for a
 /// while, such as a long text that is shown, does not count. In KiB; 0 where the system does not
 /// tell.
 class MemoryWatch {
@@ -15,7 +15,7 @@ class MemoryWatch {
   long least() const;
 
  private:
-  std::array<long, 10> looks = {};
+  std::array<long, 25> looks = {};
   std::size_t count = 0;
 };
 
