@@ -51,15 +51,20 @@ cmake --build --preset fuzz
 export LSAN_OPTIONS="suppressions=$PWD/cmake/lsan.supp:print_suppressions=0"
 export UBSAN_OPTIONS=print_stacktrace=1
 
-# Of the files that together reach all that small files reach the smallest.
+# Of the files that together reach all that small files reach some, from the smallest to the largest; what has a name
+# of its own was put there by hand and stays.
 keep_corpus() {
   local merged=build/fuzz/merged/$1
   rm -rf "$merged"
   mkdir -p "$merged"
   "build/fuzz/fuzz/fuzz_$1" -merge=1 -use_value_profile=0 -max_len=$most_bytes "$merged" \
     "build/fuzz/learnt/$1" "fuzz/corpus/$1" 2>/dev/null
-  find "$merged" -type f -printf '%s %p\n' | sort -n | head -n $most_files | cut -d' ' -f2- |
-    while read -r file; do cp "$file" "fuzz/corpus/$1/"; done
+  find "fuzz/corpus/$1" -type f -regextype egrep -regex '.*/[0-9a-f]{40}' -delete
+  local files
+  mapfile -t files < <(find "$merged" -type f -printf '%s %p\n' | sort -n | cut -d' ' -f2-)
+  local i all=${#files[@]}
+  local some=$((all < most_files ? all : most_files))
+  for ((i = 0; i < some; ++i)); do cp "${files[i * all / some]}" "fuzz/corpus/$1/"; done
 }
 
 for name in "${targets[@]}"; do
