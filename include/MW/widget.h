@@ -163,7 +163,7 @@ class MW_API Widget {
   unsigned int setBlink(int on, unsigned int color);
   /// The colour to draw at `now` (GetTicks() milliseconds): black in the dark phase and while
   /// blinking is off. A phase lasts a little over 500 ms; the first one is dark. Call it under
-  /// `stateLock`. At 0 no phase ends.
+  /// `stateLock`. At 0 no phase ends, unless that is the time.
   unsigned int updateBlink(unsigned int now);
   /// Which of two choices keys have taken.
   enum KeySide { kNoSide = 0, kLeftSide = 1, kRightSide = 2 };

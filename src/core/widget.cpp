@@ -5,6 +5,7 @@
 #include "core/layer_walk.h"
 #include "core/layers.h"
 #include "core/life_guard.h"
+#include "core/pass_time.h"
 
 namespace MW {
 
@@ -88,7 +89,7 @@ unsigned int Widget::updateBlink(unsigned int now) {
   if (!blinkRuns) blinkNext = now + kBlinkMs;
   blinkRuns = true;
   // Counted from the tick that notices the end of a phase, not from the one that was planned.
-  if (isOver(now, blinkNext, kBlinkMs)) {
+  if (!isNoTime(now) && isOver(now, blinkNext, kBlinkMs)) {
     blinkNext = now + kBlinkMs;
     ++blinkCount;
   }

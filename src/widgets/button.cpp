@@ -1,6 +1,8 @@
 #include <MW/button.h>
 #include <MW/window.h>
 
+#include "core/pass_time.h"
+
 namespace MW {
 
 Button::Button(const SKIA_Rect* area, const SKIA_Text* caption)
@@ -12,7 +14,7 @@ Button::~Button() { leaveLayers(); }
 
 int Button::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
-  if (delayedShow.draws(ticks)) skia_add_buttonbox_c(rect, text);
+  if (drawsAt(delayedShow, ticks)) skia_add_buttonbox_c(rect, text);
   return 1;
 }
 

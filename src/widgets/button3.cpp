@@ -7,6 +7,7 @@
 
 #include "core/bounded_text.h"
 #include "core/geometry.h"
+#include "core/pass_time.h"
 #include "core/present_screen.h"
 
 namespace MW {
@@ -104,7 +105,7 @@ Button3::~Button3() { leaveLayers(); }
 
 int Button3::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
-  if (!delayedShow.draws(ticks)) return 1;
+  if (!drawsAt(delayedShow, ticks)) return 1;
   skia_add_buttonbox_c(rect, text);
   if (captionCount > 0) skia_add_label_c(labelRect1, caption1);
   if (captionCount > 1) skia_add_label_c(labelRect2, caption2);

@@ -2,6 +2,7 @@
 
 #include "core/class_log.h"
 #include "core/life_guard.h"
+#include "core/pass_time.h"
 
 namespace MW {
 
@@ -18,7 +19,7 @@ int StyledButton::show(unsigned int ticks) {
 }
 
 bool StyledButton::drawFace(unsigned int ticks) {
-  if (!delayedShow.draws(ticks)) return false;
+  if (!drawsAt(delayedShow, ticks)) return false;
   if (buttonType == kButtonBox) {
     skia_add_buttonbox_c(rect, text);
   } else {

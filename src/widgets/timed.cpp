@@ -9,6 +9,7 @@
 #include "core/bounded_text.h"
 #include "core/class_log.h"
 #include "core/geometry.h"
+#include "core/pass_time.h"
 #include "core/redraw.h"
 
 namespace MW {
@@ -48,7 +49,7 @@ void Toastbox::init(const SKIA_Rect* area, const SKIA_Text* line, const SKIA_Tex
 
 int Toastbox::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
-  if (hideAt == 0 || isOver(ticks, hideAt, shownMs)) {
+  if (hideAt == 0 || (!isNoTime(ticks) && isOver(ticks, hideAt, shownMs))) {
     hideAt = 0;
     setActive(0);
     return 1;
@@ -122,7 +123,7 @@ Progressbar::~Progressbar() { leaveWindow(); }
 int Progressbar::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
   if (running == 0) return 1;
-  if (isOver(ticks, endAt, shownMs)) {
+  if (!isNoTime(ticks) && isOver(ticks, endAt, shownMs)) {
     setActive(0);
     endAt = 0;
     running = 0;

@@ -33,6 +33,13 @@ Step seen() {
     return asked + (widget.isActive() ? "nothing" : "gone");
   });
 }
+// Outside of a pass.
+Step seenWithoutTime() {
+  return look([](Widget& widget) {
+    widget.show(0);
+    return platform().takeDrawings().empty() ? "nothing" : "drawn";
+  });
+}
 Steps stepsOfStars(int count) {
   Steps steps;
   steps.push_back(runFor(5000));
@@ -59,6 +66,10 @@ const PlayTests kPlays = {
     kToast("AToastThatWasPutAwayForAMonthIsOver",
            {at(1000), showFor(500), setActive(0), at(1000 + kMonthMs), setActive(1), seen()},
            "<!gone>"),
+    kToast("WithoutATimeAToastDoesNotEnd",
+           {at(100'000), showFor(500), seenWithoutTime(), later(500), seen(), at(~0U), showFor(0),
+            at(0), seenWithoutTime()},
+           "<drawn> <Wi-Fi> <nothing>"),
     kBar("ABarThatWasPutAwayForAMonthIsOver",
          {at(1000), runFor(500), setActive(0), at(1000 + kMonthMs), setActive(1), seen()},
          "<!gone>"),

@@ -13,11 +13,10 @@ constexpr bool isLater(uint32_t time, uint32_t other) {
 
 /// Whether a time of `lengthMs` milliseconds that ends at `end` is over at `now`, wherever the
 /// clock wraps: up to 49.7 days behind its beginning, and not a second before it, where a drawing
-/// pass stands that another thread overtook. At 0 nothing is over, since what is drawn without a
-/// time is drawn at 0; a clock is there for a millisecond.
+/// pass stands that another thread overtook.
 constexpr bool isOver(uint32_t now, uint32_t end, uint32_t lengthMs) {
   constexpr uint32_t kOvertakenMs = 1000;
-  return now != 0 && end - now > lengthMs + kOvertakenMs;
+  return end - now > lengthMs + kOvertakenMs;
 }
 
 /// The length for isOver() of a time that an application gave: one below 0 is over already.
