@@ -119,6 +119,7 @@ def viewer(application, password=None):
     connection = connect(application.vnc)
     if is_let_in(connection, password or application.password):
         return connection
+    read(connection, 999)  # to its end, with which the pause begins
     connection.close()
     return None
 
