@@ -61,7 +61,7 @@ of_fuzzers() {
     "build/coverage/fuzz/fuzz_$name" "fuzz/corpus/$name" "build/fuzz/learnt/$name" >/dev/null
   done
   echo "== ${names[*]}: of $*"
-  report "${filters[@]}" --output /dev/null
+  report "${filters[@]}" --output build/coverage/fuzzers.txt
 }
 
 of_all_fuzzers() {
