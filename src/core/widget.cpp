@@ -89,7 +89,7 @@ unsigned int Widget::updateBlink(unsigned int now) {
   if (!blinkRuns) blinkNext = now + kBlinkMs;
   blinkRuns = true;
   // Counted from the tick that notices the end of a phase, not from the one that was planned.
-  if (!isNoTime(now) && isOver(now, blinkNext, kBlinkMs)) {
+  if (hasEnded(now, blinkNext, kBlinkMs)) {
     blinkNext = now + kBlinkMs;
     ++blinkCount;
   }

@@ -49,7 +49,7 @@ void Toastbox::init(const SKIA_Rect* area, const SKIA_Text* line, const SKIA_Tex
 
 int Toastbox::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
-  if (hideAt == 0 || (!isNoTime(ticks) && isOver(ticks, hideAt, shownMs))) {
+  if (hideAt == 0 || hasEnded(ticks, hideAt, shownMs)) {
     hideAt = 0;
     setActive(0);
     return 1;
@@ -123,7 +123,7 @@ Progressbar::~Progressbar() { leaveWindow(); }
 int Progressbar::show(unsigned int ticks) {
   const std::lock_guard guard(stateLock);
   if (running == 0) return 1;
-  if (!isNoTime(ticks) && isOver(ticks, endAt, shownMs)) {
+  if (hasEnded(ticks, endAt, shownMs)) {
     setActive(0);
     endAt = 0;
     running = 0;
