@@ -2,6 +2,7 @@
 #pragma once
 
 #include "clock/turn_clock.h"
+#include "clock/turn_signal.h"
 
 namespace brimol::pc {
 
@@ -22,8 +23,7 @@ struct TurnClock::Participant {
   std::optional<std::chrono::milliseconds> cpuBefore;  // away, and seen running: when first seen
   std::chrono::steady_clock::time_point pollsSince;    // away, and polls: the same
 
-  // Has the turn, and is to hear of it. A word of its own, so that who hears needs no lock.
-  std::atomic<int> granted = 0;
+  TurnSignal granted;                  // has the turn, and is to hear of it
   std::atomic<bool> isAtWork = false;  // has the turn, and knows it
 };
 

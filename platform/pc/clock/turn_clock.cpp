@@ -179,8 +179,7 @@ uint64_t TurnClock::endOfPause(uint32_t ms) const {
 }
 
 void TurnClock::hearOfTurn(Participant& me) {
-  me.granted.wait(0);
-  me.granted = 0;
+  me.granted.wait();
   me.isAtWork = true;
 }
 
@@ -198,8 +197,7 @@ void TurnClock::passOn(Lock& lock) {
   next->state = Participant::State::Running;
   holder = next;
   ++turns;
-  next->granted = 1;
-  next->granted.notify_one();
+  next->granted.give();
 }
 
 // Null: nobody can run, or real time has not come so far; the keeper looks again.
@@ -225,9 +223,14 @@ TurnClock::Participant* TurnClock::earliest() {
   return found;
 }
 
+// Where the machine lags, real time has come further than the next turn's: what came from outside
+// is due before that one. It would wait for as long as the machine lags otherwise.
 std::optional<uint64_t> TurnClock::agentDue() {
   if (!agent.due) return std::nullopt;
-  return agent.due(pace.isStarted() ? std::max(time + 1, pace.reached()) : time + 1);
+  if (!pace.isStarted()) return agent.due(time + 1);
+  const Participant* const next = earliest();
+  const uint64_t come = next == nullptr ? pace.reached() : std::min(pace.reached(), next->wake);
+  return agent.due(std::max(time + 1, come));
 }
 
 // None: every thread is away, and time stands still.

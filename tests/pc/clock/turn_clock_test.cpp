@@ -189,6 +189,20 @@ TEST(TurnClock, KeepsToRealTimeWhereItIsToAndHearsOfInput) {
   user.join();
 }
 
+TEST(TurnClock, HearsOfInputBeforeTheNextTurnWhereItLags) {
+  const auto start = std::chrono::steady_clock::now();
+  TurnClock clock(0, Speed::Real);
+  bool waits = true;
+  clock.setAgent({[&](uint64_t soonest) { return waits ? std::optional(soonest) : std::nullopt; },
+                  [&](uint64_t) { waits = false; }});
+  clock.takePart();
+  while (std::chrono::steady_clock::now() - start < 20ms) {
+  }
+  clock.delay(1);
+  EXPECT_FALSE(waits);
+  EXPECT_EQ(clock.now(), 1);
+}
+
 TEST(TurnClock, TakesALoopWithoutPausesForAWait) {
   TurnClock clock(0, Speed::Free);
   while (clock.ticks() < 3) {
