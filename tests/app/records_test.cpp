@@ -302,6 +302,12 @@ TEST_F(Records, SayWhereTheyCannotBeWritten) {
   EXPECT_FALSE(ResultBook::open({.database = folder / "none" / "x.db"}, {}, error));
   EXPECT_THAT(error,
               testing::EndsWith("/none/x.db: cannot be opened: it or its folder is missing"));
+  fs::create_symlink(folder / "victim", file.native() + ".lock");
+  EXPECT_FALSE(open(startOf("A1")));
+  EXPECT_THAT(error, testing::EndsWith(".lock: is a symbolic link"));
+  EXPECT_FALSE(fs::exists(folder / "victim"));
+  fs::remove(file.native() + ".lock");
+  fs::remove(file);
   const int end = inChild([this] {
     fs::permissions(folder, fs::perms::owner_read | fs::perms::owner_exec);
     if (::setuid(65'534) != 0 && ::getuid() == 0) ::_exit(2);

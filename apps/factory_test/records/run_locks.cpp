@@ -28,9 +28,11 @@ struct flock byteOf(std::int64_t run, short kind) {
 
 RunLocks::RunLocks(const std::filesystem::path& database) {
   const std::filesystem::path file = placeOfFile(database).concat(".lock");
-  descriptor = ::open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, kMode);
+  descriptor = ::open(file.c_str(), O_RDWR | O_CREAT | O_CLOEXEC | O_NOFOLLOW, kMode);
   if (descriptor >= 0) return;
-  throw StoreError(file.native() + ": cannot be written: " + systemWords(errno));
+  const std::string reason =
+      errno == ELOOP ? "is a symbolic link" : "cannot be written: " + systemWords(errno);
+  throw StoreError(file.native() + ": " + reason);
 }
 
 RunLocks::~RunLocks() { ::close(descriptor); }
