@@ -19,17 +19,18 @@ constexpr std::size_t kReadBytes = 4096;
 
 constexpr const char* kNowhere = "/dev/null";
 
-/// Where a process reads and writes, and the group that it leads.
+/// Where a process reads and writes, and its group.
 class SpawnPlan {
  public:
-  SpawnPlan() {
+  /// `group`: 0 is one of its own, which it leads.
+  explicit SpawnPlan(pid_t group) {
     posix_spawn_file_actions_init(&actions);
     for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
       posix_spawn_file_actions_addopen(&actions, stream, kNowhere, O_RDWR, 0);
     }
     posix_spawnattr_init(&attributes);
     posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETPGROUP);
-    posix_spawnattr_setpgroup(&attributes, 0);
+    posix_spawnattr_setpgroup(&attributes, group);
   }
   ~SpawnPlan() {
     posix_spawnattr_destroy(&attributes);
@@ -40,12 +41,11 @@ class SpawnPlan {
 
   void connect(int stream, int end) { posix_spawn_file_actions_adddup2(&actions, end, stream); }
 
-  /// Starts a line of the shell, with one argument. An error's number, or 0.
-  int start(std::string line, std::string argument, pid_t& process) const {
+  /// Starts a line of the shell. An error's number, or 0.
+  int start(std::string line, pid_t& process) const {
     std::string name = "sh";
     std::string option = "-c";
-    const std::array<char*, 5> arguments = {name.data(), option.data(), line.data(),
-                                            argument.data(), nullptr};
+    const std::array<char*, 4> arguments = {name.data(), option.data(), line.data(), nullptr};
     return posix_spawn(&process, "/bin/sh", &actions, &attributes, arguments.data(), environ);
   }
 
@@ -62,52 +62,51 @@ std::string wordsOf(int status) {
 }  // namespace
 
 Command::Command(const std::string& line) {
-  std::array<int, 2> ends = {};
-  if (pipe2(ends.data(), O_CLOEXEC) != 0) {
-    ended = std::strerror(errno);
-    return;
-  }
-  output = ends[0];
-  fcntl(output, F_SETFL, O_NONBLOCK);
-  SpawnPlan plan;
-  plan.connect(STDOUT_FILENO, ends[1]);
-  plan.connect(STDERR_FILENO, ends[1]);
-  const int failed = plan.start(line, "sh", process);
-  close(ends[1]);
-  if (failed == 0) {
-    watch();
-    return;
-  }
-  process = 0;
+  int failed = watch();
+  if (failed == 0) failed = start(line);
+  if (failed == 0) return;
+  end();
   ended = std::strerror(failed);
 }
 
 // A process of its own waits for the end of a pipe into which nobody writes. It comes when the
-// application ends, which a signal or a lost display may do without a word.
-void Command::watch() {
+// application ends, which a signal or a lost display may do without a word. The watcher is there
+// before the command is, and leads its group, whose number is nobody else's until it is waited for.
+int Command::watch() {
   std::array<int, 2> ends = {};
-  if (pipe2(ends.data(), O_CLOEXEC) != 0) return;
+  if (pipe2(ends.data(), O_CLOEXEC) != 0) return errno;
   lifeline = ends[1];
-  SpawnPlan plan;
+  SpawnPlan plan(0);
   plan.connect(STDIN_FILENO, ends[0]);
-  if (plan.start("read line; kill -KILL -$0", std::to_string(process), watcher) != 0) watcher = 0;
+  const int failed = plan.start("trap '' HUP INT TERM; read line; kill -KILL 0", watcher);
+  if (failed != 0) watcher = 0;
   close(ends[0]);
+  return failed;
 }
 
-void Command::endWatch() {
-  if (watcher > 0) {
-    kill(watcher, SIGKILL);  // before the pipe ends: the group's number may be another's by now
-    waitpid(std::exchange(watcher, 0), nullptr, 0);
-  }
+int Command::start(const std::string& line) {
+  std::array<int, 2> ends = {};
+  if (pipe2(ends.data(), O_CLOEXEC) != 0) return errno;
+  output = ends[0];
+  fcntl(output, F_SETFL, O_NONBLOCK);
+  SpawnPlan plan(watcher);
+  plan.connect(STDOUT_FILENO, ends[1]);
+  plan.connect(STDERR_FILENO, ends[1]);
+  const int failed = plan.start(line, process);
+  if (failed != 0) process = 0;
+  close(ends[1]);
+  return failed;
+}
+
+void Command::end() {
+  if (watcher > 0) kill(-watcher, SIGKILL);
+  if (process > 0) waitpid(std::exchange(process, 0), nullptr, 0);
+  if (watcher > 0) waitpid(std::exchange(watcher, 0), nullptr, 0);
   if (lifeline >= 0) close(std::exchange(lifeline, -1));
 }
 
 Command::~Command() {
-  if (process > 0) {
-    kill(-process, SIGKILL);
-    waitpid(process, nullptr, 0);
-  }
-  endWatch();
+  end();
   if (output >= 0) close(output);
 }
 
@@ -123,9 +122,8 @@ std::string Command::read() {
 std::optional<std::string> Command::outcome() {
   int status = 0;
   if (process > 0 && waitpid(process, &status, WNOHANG) == process) {
-    kill(-process, SIGKILL);
     process = 0;
-    endWatch();
+    end();
     ended = wordsOf(status);
   }
   if (ended.empty() || output >= 0) return {};

@@ -25,11 +25,13 @@ class Command {
   std::optional<std::string> outcome();
 
  private:
-  void watch();
-  void endWatch();
+  // An error's number, or 0.
+  int watch();
+  int start(const std::string& line);
+  void end();
 
-  pid_t process = 0;  // the leader of a group of its own; 0: none runs
-  pid_t watcher = 0;  // kills that group when the application ends; 0: none
+  pid_t watcher = 0;  // leads their group, and kills it when the application ends; 0: none
+  pid_t process = 0;  // the shell; 0: none runs
   int lifeline = -1;  // the end of a pipe that the watcher reads from
   int output = -1;    // the end of a pipe that is read from; -1: closed
   std::string ended;  // empty: it has not
