@@ -20,10 +20,7 @@ class ClickSlop {
   /// Motion by so many pixels. The click is given up when the sum of either direction exceeds
   /// `slop`.
   constexpr void move(int dx, int dy, int slop) {
-    if (pressed == kNone) {
-      press(kNone);
-      return;
-    }
+    if (pressed == kNone) return;
     sumX += dx;
     sumY += dy;
     if (isBeyond(sumX, slop) || isBeyond(sumY, slop)) pressed = kNone;
