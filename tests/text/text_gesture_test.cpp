@@ -26,5 +26,6 @@ static_assert(told({{1000, 1100}, {1200, 1300}, {1400, 1500}}) == 121, "a third 
 static_assert(told({{1000, 1100}, {1200, 1600}, {1700, 1800}, {1900, 2000}}) == 1112, "late");
 static_assert(told({{1000, 1100}, {1200, 1300, TextTouch::None}, {1400, 1500}}) == 102, "outside");
 static_assert(!MW::TextGesture().isTapDue(TextTouch::Release), "not awaited");
+static_assert(MW::TextGesture().tapNumber() == 0, "none yet");
 
 }  // namespace

@@ -25,7 +25,7 @@ class TextGesture {
     counted = taps.tap(now);
     return counted == DoubleTap::kDouble ? TextTouch::DoubleTap : TextTouch::None;
   }
-  /// The number of the last tap in its series, from 1; 0 where it came too late.
+  /// The number of the last tap in its series, from 1; 0 where it came too late, or none did yet.
   constexpr int tapNumber() const { return counted; }
   constexpr void reset() { *this = TextGesture(); }
 
