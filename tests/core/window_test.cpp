@@ -35,7 +35,6 @@ TEST_F(WindowTest, UnregisteringTakesTheFirstOfEqualIds) {
 
 // Places that were cleared cost every walk time, and memory.
 TEST_F(WindowTest, WidgetsThatLeftTakeNoRoom) {
-  constexpr std::size_t kAllocatorKeeps = 1 << 14;  // less than half a place for each widget
   platform().records = false;
   std::vector<std::unique_ptr<ProbeWidget>> all(4000);
   const std::size_t before = allocatedBytes();
@@ -45,7 +44,7 @@ TEST_F(WindowTest, WidgetsThatLeftTakeNoRoom) {
       if (byNumber) Window::unregisterWidget(each.get());
     }
     for (auto& each : all) each.reset();
-    EXPECT_LT(allocatedBytes(), before + kAllocatorKeeps) << byNumber;
+    EXPECT_LT(allocatedBytes(), before + (std::size_t{1} << 13)) << byNumber;
   }
 }
 

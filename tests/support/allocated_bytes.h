@@ -14,6 +14,7 @@ namespace brimol::test {
 
 inline bool hasSanitizer() { return __sanitizer_get_current_allocated_bytes != nullptr; }
 
+/// Exact only without the allocator's caches of each thread, as CTest runs the unit tests.
 inline std::size_t allocatedBytes() {
   return hasSanitizer() ? __sanitizer_get_current_allocated_bytes() : mallinfo2().uordblks;
 }
