@@ -32,8 +32,8 @@ class MW_API Window {
   ///
   /// It may also be called in a handler or callback. There it waits for no thread that runs
   /// handlers, since that thread might be waiting for this very handler. On the dispatch thread
-  /// everything ends but that thread, which ends after its callback. An init() in the same callback
-  /// starts a new dispatch thread, whose handlers begin after the callback; a later destroy() waits
+  /// everything ends but that thread, which ends after its callback; a line of the log says so. An
+  /// init() in the same callback starts a new dispatch thread, whose handlers begin after the callback; a later destroy() waits
   /// for both.
   ///
   /// In a handler of a drawing or timer pass, or of a dispatch thread that init() has replaced, it

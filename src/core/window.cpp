@@ -25,6 +25,7 @@ constexpr int kDefaultWidth = 1440;
 constexpr int kDefaultHeight = 2560;
 constexpr double kMmPerInch = 25.4;
 constexpr double kRoundUp = 0.5;
+constexpr const char* kEndsAfterHandler = "destroy: a handler's thread ends after the handler";
 constexpr const char* kEndLeft = "destroy: a handler asks for it: the rest is left to another call";
 
 constinit std::mutex updateLock;
@@ -61,6 +62,7 @@ void end() {
     kLog.print(LogLevel::Error, kEndLeft);
     return;
   }
+  if (event_dispatcher != nullptr) kLog.print(LogLevel::Warning, kEndsAfterHandler);
   endService();
   kLog.print(LogLevel::Error, "event_dispatcher End");
 }

@@ -97,7 +97,7 @@ TEST_F(WidgetTest, AThousandStartsAndEndsLeaveNothing) {
   const std::size_t before = allocatedBytes();
   const std::ptrdiff_t filesBefore = openFiles();
   for (std::size_t i = 0; i < kStarts; ++i) startAndEnd();
-  EXPECT_LT(openFiles(), filesBefore + 10) << "a sanitizer opens one or two for itself";
+  EXPECT_LE(openFiles(), filesBefore + (hasSanitizer() ? 9 : 0)) << "it opens some for itself";
   // The last ones have done their work; the system may still take them down.
   while (threads() > threadsBefore) std::this_thread::yield();
   EXPECT_LT(allocatedBytes(), before + most);
