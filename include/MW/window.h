@@ -22,10 +22,10 @@ class MW_API Window {
   /// memory or the dispatch thread could not be created; input may run already and does so until
   /// destroy(). Without memory or a thread for input it logs an error line and returns 1, and no
   /// input comes; that the platform could not open its screen or input, the platform tells itself,
-  /// and 1 is returned as well. A second call before destroy() changes nothing but the log, which tells of it,
-  /// and returns 1. Any thread: a call waits while another thread is inside init() or destroy(); in
-  /// a handler it returns 0 instead, after an error line. If a handler calls destroy() meanwhile,
-  /// the window is ended again before init() returns.
+  /// and 1 is returned as well. A second call before destroy() changes nothing but the log, which
+  /// tells of it, and returns 1. Any thread: a call waits while another thread is inside init() or
+  /// destroy(); in a handler it returns 0 instead, after an error line. If a handler calls
+  /// destroy() meanwhile, the window is ended again before init() returns.
   static int init();
   /// Stops the dispatch thread and then input, and waits for both. Returns 1. The widgets stay as
   /// they are. Where nothing runs, only the log tells of the call. Any thread: a call waits while
@@ -34,8 +34,8 @@ class MW_API Window {
   /// It may also be called in a handler or callback. There it waits for no thread that runs
   /// handlers, since that thread might be waiting for this very handler. On the dispatch thread
   /// everything ends but that thread, which ends after its callback; a line of the log says so. An
-  /// init() in the same callback starts a new dispatch thread, whose handlers begin after the callback; a later destroy() waits
-  /// for both.
+  /// init() in the same callback starts a new dispatch thread, whose handlers begin after the
+  /// callback; a later destroy() waits for both.
   ///
   /// In a handler of a drawing or timer pass, or of a dispatch thread that init() has replaced, it
   /// only tells the dispatch thread to end and logs an error line; a later init() or destroy(),

@@ -24,9 +24,9 @@ struct ParsedTrace {
 /// Steps and frames, of 200 bytes each.
 constexpr std::size_t kMostSteps = 4'000'000;
 
-/// Reads `path` and what it includes. Throws nothing, whatever the files hold: more than `mostSteps`
-/// steps and frames, or more items than are compared in a bearable time, are errors, and so is a
-/// lack of memory.
+/// Reads `path` and what it includes. Throws nothing, whatever the files hold: more than
+/// `mostSteps` steps and frames, or more items than are compared in a bearable time, are errors,
+/// and so is a lack of memory.
 ParsedTrace parseTrace(const std::string& path, const TraceFiles& files,
                        std::size_t mostSteps = kMostSteps);
 
