@@ -73,11 +73,20 @@ INSTANTIATE_TEST_SUITE_P(
     [](const auto& given) { return given.param.name; });
 
 TEST_F(Program, EndsAHungApplicationWithAllThatItStarted) {
-  EXPECT_EQ(replay("--dir d --timeout 15 menu.trace -- APP hang"), 3);
+  // Also where it leads a group of its own.
+  EXPECT_EQ(replay("--dir d --timeout 15 menu.trace -- setsid APP hang"), 3);
   EXPECT_THAT(said, HasSubstr("menu.trace:3: hung"));
   EXPECT_TRUE(comesToItsEnd("d/output.txt"));
   EXPECT_EQ(replay("--dir d menu.trace -- APP leave-child"), 0);
   EXPECT_TRUE(comesToItsEnd("d/output.txt")) << "the application left a process behind";
+}
+
+TEST_F(Program, BearsWhatItIsStartedWith) {
+  for (const auto& [before, application, code] :
+       {std::tuple("trap '' CHLD;", "APP exit 7", 1), std::tuple("exec <&-;", "APP pass", 0),
+        std::tuple("trap '' HUP;", "sh -c 'kill -HUP $PPID; exec APP pass'", 0)}) {
+    EXPECT_EQ(replay(std::string("--dir d menu.trace -- ") + application, before), code) << before;
+  }
 }
 
 class Signals : public Program, public testing::WithParamInterface<int> {};
