@@ -418,18 +418,5 @@ TEST_F(Records, SayWhatASilentLineDoesNotTake) {
   EXPECT_THAT(states(), ElementsAre("aborted", "aborted"));
 }
 
-TEST_F(Records, StayWithoutALineWhereTheSystemHasNoMoreFor) {
-  ASSERT_TRUE(open(startOf("A1"))->record(kKeys, error));
-  rlimit former = {};
-  ::getrlimit(RLIMIT_NOFILE, &former);
-  const rlimit none = {0, former.rlim_max};
-  ::setrlimit(RLIMIT_NOFILE, &none);
-  Line line(file, "postgresql://127.0.0.1:1/line");
-  ::setrlimit(RLIMIT_NOFILE, &former);
-  EXPECT_THAT(line.status().error, testing::HasSubstr("no background work: Too many open files"));
-  line.end();
-  EXPECT_EQ(line.status().waiting, 1);
-}
-
 }  // namespace
 }  // namespace factory_test
