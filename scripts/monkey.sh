@@ -11,7 +11,8 @@ Each seed plays in a process of its own, in simulated time, on a screen of 480x8
 open files are printed after each 250,000 events and each simulated day. A seed fails if the application crashes,
 leaks (with a sanitizer's preset), does not close, shows the same for 20,000 events, or gives a verdict a wrong time.
 From the first of those lines after a million events to the last, memory may not grow by more than 1 %, and no thread
-and no open file may be left. Fewer events than 1,500,000 are too few to tell, and are not judged by this.
+and no open file may be left: with --days from the first day on. Fewer events than 1,500,000 are too few to tell how
+memory grows, and are not judged by it.
 
 The trace of a seed that fails stays in build/monkey/SEED.trace. Played, it brings back a crash, a hang, and that the
 application does not close: scripts/shrink_trace.py makes it short, the latter two with --hangs and --exit 1. The rest
@@ -72,15 +73,22 @@ cd build/monkey
 # Compares the first line that tells of memory (KiB), threads and open files with the last one. Before a million
 # events the painter's bounded store of texts still fills, and a little for a million more; a leak needs events to show.
 judge() {
-  awk -v few=$((events < 1500000)) '/ KiB resident/ && $4 >= 1000000 {
-         memory = $(NF - 7); threads = $(NF - 4); files = $(NF - 2); told = $4
-         if (!lines++) { memory1 = memory; threads1 = threads; files1 = files; told1 = told }
+  awk -v few=$((events < 1500000)) -v day=$((days > 0 ? day : 0)) '
+       / KiB resident/ && (day ? $7 >= day : $4 >= 1000000) {
+         threads = $(NF - 4); files = $(NF - 2)
+         if (!looks++) { threads1 = threads; files1 = files }
+       }
+       / KiB resident/ && $4 >= 1000000 {
+         memory = $(NF - 7); told = $4
+         if (!lines++) { memory1 = memory; told1 = told }
        }
        END {
-         if (told - told1 < 400000) { print "growth is not judged: too few events were told of"; exit !few }
+         isLeft = threads > threads1 || files > files1
+         if (isLeft) printf "threads: %d, then %d; open files: %d, then %d\n", threads1, threads, files1, files
+         if (told - told1 < 400000) { print "growth is not judged: too few events were told of"; exit isLeft || !few }
          growth = 100 * (memory - memory1) / memory1
          printf "growth from %d events to %d: %.2f %%\n", told1, told, growth
-         exit growth > 1 || threads > threads1 || files > files1
+         exit growth > 1 || isLeft
        }' "$1"
 }
 

@@ -7,7 +7,7 @@ usage() {
   cat <<'END'
 Usage: scripts/test.sh [--quick | --all | SUITE...] [--repeat N]
 
-Without an argument: phone, tidy, asan, tsan, fuzz, i386 and release.
+Without an argument: phone, tidy, asan, tsan, fuzz, race, i386 and release.
 
   --quick     the unit tests in release, and tidy for what changed since main
   --all       every suite
@@ -102,7 +102,7 @@ while (($# > 0)); do
   esac
   shift
 done
-((${#suites[@]} > 0)) || suites=(phone tidy asan tsan fuzz i386 release)
+((${#suites[@]} > 0)) || suites=(phone tidy asan tsan fuzz race i386 release)
 
 scripts/install_packages.sh
 for suite in "${suites[@]}"; do

@@ -22,8 +22,9 @@ class MW_API EventService {
   EventService(const EventService&) = delete;
   EventService& operator=(const EventService&) = delete;
 
-  /// What the constructor and the destructor call. Both return 1; startEvent() returns 0, after an
-  /// error line, when the thread could not be created.
+  /// What the constructor and the destructor call, and nobody else needs to: by the thread that is
+  /// inside Window::init or destroy, one call of each. Both return 1; startEvent() returns 0, after
+  /// an error line, when the thread could not be created.
   static int startEvent();
   static int stopEvent();
   /// 1 from the constructor on until the destructor begins, else 0. Any thread.
@@ -32,7 +33,8 @@ class MW_API EventService {
   /// Converts the platform's record and queues it. Without memory the event is lost and a line is
   /// logged. Any thread.
   static void sendEvent(const Event* event);
-  /// Fills `data` from the platform's record. A type that is not known gives kEventUnknown.
+  /// Fills `data` from the platform's record. A type that is not known, or no record, gives
+  /// kEventUnknown; without `data` nothing happens. Any thread.
   static void parseEvent(const Event* event, event_data* data);
   /// Queues a block from malloc, which recvEvent() frees. A block still queued when the service
   /// ends is freed by nobody. Without memory to queue it, or without a service, it is freed at once

@@ -21,7 +21,8 @@ class MW_API Window {
   /// Starts input and the dispatch thread. Returns 1, or 0 after an error line when there is no
   /// memory or the dispatch thread could not be created; input may run already and does so until
   /// destroy(). Without memory or a thread for input it logs an error line and returns 1, and no
-  /// input comes. A second call before destroy() changes nothing but the log, which tells of it,
+  /// input comes; that the platform could not open its screen or input, the platform tells itself,
+  /// and 1 is returned as well. A second call before destroy() changes nothing but the log, which tells of it,
   /// and returns 1. Any thread: a call waits while another thread is inside init() or destroy(); in
   /// a handler it returns 0 instead, after an error line. If a handler calls destroy() meanwhile,
   /// the window is ended again before init() returns.
@@ -70,7 +71,8 @@ class MW_API Window {
   /// first. A null pointer is skipped. Returns 1. Any thread.
   static int getwindowsize(int* outWidth, int* outHeight);
   /// Millimetres to pixels by the horizontal density; cut to the range of an int. Stores the
-  /// density in dots per inch as it was before it is rounded. A null pointer is skipped.
+  /// density in dots per inch as it was before it is rounded. A null pointer is skipped. A density
+  /// of 0, or that is no number, gives 0 pixels. Any thread.
   static int getMura(float* outXdpi, float* outYdpi, float mm);
 
   /// Logs an event of codes 0 to 5 and returns 1; 0 for any other.

@@ -98,6 +98,16 @@ wait until text "Line out of reach: 1 verdict waits" within 86400000
         self.assertIn("no catalogue of the language 'de': texts are English", says)
         self.assertNotIn("played.trace", says)
 
+    def test_a_report_without_room_for_its_pictures_says_so_once(self):
+        trace = self.folder / "played.trace"
+        trace.write_text("brimol-trace 1\ntap \"Shell\"\nwait 300\nclose\n")
+        full = ["sh", "-c", "ulimit -f 16; exec \"$0\" --headless", FACTORY_TEST]  # no file grows beyond 8 KiB
+        says = subprocess.run(full, stderr=subprocess.PIPE, text=True, env=os.environ | {
+            "BRIMOL_TRACE": str(trace), "BRIMOL_SCREEN": "480x800", "BRIMOL_REPORT_DIR": str(self.folder)}).stderr
+        self.assertEqual(1, says.count("frame-"), says)
+        self.assertIn(f"cannot write {self.folder}/frame-000001.png: File too large", says)
+        self.assertEqual([], [*self.folder.glob("*.png*")])
+
     def test_one_unit_after_another(self):
         """The second one fails; the exit code tells of it, though the third one passes."""
         plan = self.folder / "plan.json"

@@ -48,6 +48,7 @@ std::string phases(std::initializer_list<unsigned int> ticks) {
 
 TEST_F(WidgetTest, Blinks) {
   EXPECT_EQ(phases({1000, 1500, 1501}), "ddl.");
+  EXPECT_EQ(phases({0, 500, 501}), "ddl.") << "from the clock's start";
   EXPECT_EQ(phases({1000, 1900, 2400, 2401}), "dlld.") << "counted from the late tick";
   EXPECT_EQ(phases({0xFFFFFF00, 0xFFFFFF01, 0xF4, 0xF5}), "dddl.") << "over the wrap";
   EXPECT_EQ(phases({0xFFFFFE0C, 0, 1}), "ddl.") << "up to the wrap";

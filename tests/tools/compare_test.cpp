@@ -87,6 +87,9 @@ TEST_F(ComparePictures, FindsThePixelsThatDiffer) {
   EXPECT_EQ(compared(one, runOf(folder, "b", "same.png")).kind, Kind::Differs);
   EXPECT_EQ(compared(one, runOf(folder, "a", "damaged.png")).kind, Kind::Same);
   EXPECT_EQ(compared(one, runOf(folder, "a", "missing.png")).kind, Kind::Same);
+  const PlayedRun below = runOf(folder / "below", "a", "../other.png");
+  std::filesystem::create_directories(below.folder);
+  EXPECT_EQ(compared(one, below).kind, Kind::Same) << "it stands outside of its run";
 }
 
 TEST_F(ComparePictures, CountWhatOneOfThemLacks) {

@@ -69,6 +69,10 @@ const PlayTests kPlays = {
             {at(~15U), call(&Widget::onShowTimer, 250), later(249), lookAtDrawings(), later(1),
              untimed(), lookAtDrawings(), untimed()},
             "<0> <0> <1> <1>"),
+    kButton("IsSeenAfterADelayThatStartsWithTheClock",
+            {at(0), call(&Widget::onShowTimer, 250), lookAtDrawings(), at(249), lookAtDrawings(),
+             at(250), lookAtDrawings()},
+            "<0> <0> <1>"),
 };
 
 TEST_F(WidgetTest, AButtonsCaptionChangesItsLooks) {

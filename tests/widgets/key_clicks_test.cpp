@@ -27,7 +27,8 @@ static_assert(counts({{65535, 1000}, {65535, 1001}}) == 12);
 
 constexpr uint32_t kDay = 24 * 60 * 60 * 1000;
 
-// Where the clock starts over.
+// Where the clock starts, and where it starts over.
+static_assert(counts({{5, 0}, {5, 0}, {5, 999}, {5, 1999}}) == 1231);
 static_assert(counts({{5, 0U - 1001}, {5, 0U - 1000}, {5, 0U - 1000}}) == 121, "just before");
 static_assert(counts({{5, ~15U}, {5, ~7U}, {5, 10}, {5, 11}}) == 1123, "over the wrap");
 static_assert(counts({{5, 0U - 1000}, {5, 0}}) == 11, "over the wrap, too late");

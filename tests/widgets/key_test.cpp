@@ -27,6 +27,8 @@ const PlayTests kPlays = {
         "TellsAPlugThatNoPassMetBeforeTheWrap",
         {at(~0x100U), plug(17), at(0x100), draw(), at(~99U), plug(2), at(0), draw(), at(1), draw()},
         "+ plug2 + plug2"),
+    kKey("TellsAPlugOfTheClocksStart", {at(0), plug(2), at(100), draw(), at(101), draw()},
+         "+ plug2"),
     kNoPlug("HoldsNoPlugWithoutACallback",
             {plug(2),
              call([](MW::Widget& key) { key.plugCallback = [](MW::kbd_event*) { note("plug"); }; }),

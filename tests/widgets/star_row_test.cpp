@@ -18,6 +18,7 @@ constexpr uint32_t counts(uint32_t start, std::initializer_list<uint32_t> ticks)
   return digits;
 }
 static_assert(counts(1000, {1100, 1101, 1201, 1202}) == 112);
+static_assert(counts(0, {100, 101, 201, 202}) == 112);
 static_assert(counts(2000, {1000, 1100, 1101}) == 112);  // a start in the future
 static_assert(counts(~49U, {50, 51, 151, 152}) == 112);  // over the wrap
 

@@ -75,6 +75,8 @@ const PlayTests kPlays = {
          "<!gone>"),
     kBar("ABarEndsOverTheWrap", {at(~15U), runFor(50), seen(), later(50), seen(), later(1), seen()},
          "<!*> <*> <!gone>"),
+    kBar("ABarStartsWithTheClock", {at(0), runFor(50), seen(), at(50), seen(), at(51), seen()},
+         "<!*> <*> <!gone>"),
     kTwoLines("AToastOfTwoLinesHasAMessage", {setMsg("below"), showFor(1), seen()}, "<below>"),
     kToast("AToastOfOneLineHasNone", {setMsg("below"), showFor(1), seen()}, "<Wi-Fi>"),
     kBar("ABarShowsNothingBeforeItRuns", {seen()}, "<nothing>"),

@@ -5,6 +5,7 @@
 #include <array>
 #include <cstdio>
 #include <fstream>
+#include <iostream>
 #include <nlohmann/json.hpp>
 #include <sstream>
 #include <string_view>
@@ -177,11 +178,17 @@ void SessionReport::frame(const SessionFrame& shown, Size screen, cairo_surface_
     line["drawn"] = ordered_json::array();
     for (const SKIA_Item& item : shown.frame) line["drawn"].push_back(wordsOf(item));
   }
-  const std::string name = pictureName(shown.number);
-  const bool isWritten = picture != nullptr && writePng(picture, folder / name).empty();
-  line["picture"] = isWritten ? ordered_json(name) : ordered_json();
+  line["picture"] = picture == nullptr ? ordered_json() : nameOfWritten(*picture, shown.number);
   line["paint_us"] = paintUs;
   put(file, line);
+}
+
+ordered_json SessionReport::nameOfWritten(cairo_surface_t& picture, int number) {
+  const std::string name = pictureName(number);
+  const std::string problem = writePng(&picture, folder / name);
+  if (problem.empty()) return name;
+  if (!std::exchange(lacksPictures, true)) std::cerr << "brimol: " << problem << '\n';
+  return {};
 }
 
 void SessionReport::log(uint64_t time, int priority, const char* tag, const char* message) {

@@ -5,6 +5,7 @@
 
 #include <cstdint>
 #include <filesystem>
+#include <nlohmann/json_fwd.hpp>
 #include <string>
 #include <vector>
 
@@ -41,7 +42,8 @@ class SessionReport {
   void step(uint64_t time, const TraceLine& place);
   void event(uint64_t time, const Event& record, const TraceLine* place);
   void close(uint64_t time, const TraceLine* place);
-  /// `picture` is written beside the file; null: none.
+  /// `picture` is written beside the file; null: none. The first that cannot be written is told of
+  /// in a line on standard error, and the session goes on.
   void frame(const SessionFrame& shown, Size screen, cairo_surface_t* picture, int64_t paintUs);
   void log(uint64_t time, int priority, const char* tag, const char* message);
   void expectation(uint64_t time, const TraceLine& place, const std::string& why);
@@ -54,9 +56,13 @@ class SessionReport {
   const std::filesystem::path& directory() const { return folder; }
 
  private:
+  // Null where it could not be written.
+  nlohmann::ordered_json nameOfWritten(cairo_surface_t& picture, int number);
+
   std::filesystem::path folder;
   LineFile file;
   bool listsItems = false;
+  bool lacksPictures = false;
 };
 
 }  // namespace brimol::pc

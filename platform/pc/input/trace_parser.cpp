@@ -25,7 +25,6 @@ constexpr std::string_view kMark = "brimol-trace";          // what the first li
 constexpr std::size_t kMostBytes = std::size_t{256} << 20;  // of all files of a trace
 constexpr std::size_t kMostIncludes = 16;                   // one in the other
 constexpr int kMostFiles = 10'000;
-constexpr std::size_t kMostSteps = 4'000'000;    // and frames; of 200 bytes each
 constexpr std::size_t kMostChanges = 8'000'000;  // lines of items
 constexpr uint32_t kMostClockStep = 1000;
 constexpr uint64_t kMostTime = uint64_t{1} << 40;
@@ -51,7 +50,8 @@ bool isDigit(char letter) { return letter >= '0' && letter <= '9'; }
 // "720x1280".
 Size readScreen(TraceWords& words) {
   std::string size = words.word("a size as 720x1280");
-  std::ranges::replace(size, 'x', ' ');
+  const std::size_t by = size.find('x');
+  if (by != std::string::npos) size[by] = ' ';
   TraceWords sides(size);
   const auto side = [&] {
     const uint64_t pixels = sides.number("a side in pixels", kMostSide);
@@ -77,8 +77,8 @@ float readDensity(std::string_view word) {
 /// Reads files into one trace.
 class TraceParser {
  public:
-  TraceParser(ParsedTrace& target, const TraceFiles& source)
-      : parsed(target), trace(target.trace), files(source) {}
+  TraceParser(ParsedTrace& target, const TraceFiles& source, std::size_t most)
+      : parsed(target), trace(target.trace), files(source), mostSteps(most) {}
 
   void read(const std::string& path);
 
@@ -110,6 +110,7 @@ class TraceParser {
   ParsedTrace& parsed;
   Trace& trace;
   const TraceFiles& files;
+  const std::size_t mostSteps;
   std::vector<OpenFile> open;  // each is included by the one before
   int filesRead = 0;
   std::vector<std::string> items;  // of the newest frame
@@ -289,8 +290,8 @@ void TraceParser::include(const TraceLine& line, const std::string& file) {
 }
 
 void TraceParser::readTimed(const TraceLine& line, TraceWords& words) {
-  if (trace.steps.size() + trace.frames.size() >= kMostSteps) {
-    throw BadLine{"more than " + std::to_string(kMostSteps) + " steps and frames"};
+  if (trace.steps.size() + trace.frames.size() >= mostSteps) {
+    throw BadLine{"more than " + std::to_string(mostSteps) + " steps and frames"};
   }
   TraceStep step = {line, TraceStep::Timing::AsSoonAsPossible, 0, {}};
   if (words.peek().starts_with('+')) {
@@ -369,10 +370,10 @@ void ParsedTrace::refuse(const TraceLine& line, const std::string& why) {
   error = printable(line.place() + ": " + why);
 }
 
-ParsedTrace parseTrace(const std::string& path, const TraceFiles& files) {
+ParsedTrace parseTrace(const std::string& path, const TraceFiles& files, std::size_t mostSteps) {
   ParsedTrace parsed;
   try {
-    TraceParser(parsed, files).read(path);
+    TraceParser(parsed, files, mostSteps).read(path);
   } catch (const std::bad_alloc&) {
     parsed = {};
     parsed.error = printable(path + ": there is not enough memory for it");

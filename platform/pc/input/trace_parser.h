@@ -21,9 +21,14 @@ struct ParsedTrace {
   void refuse(const TraceLine& line, const std::string& why);
 };
 
-/// Reads `path` and what it includes. Throws nothing, whatever the files hold: too many steps, or
-/// more items than are compared in a bearable time, are errors, and so is a lack of memory.
-ParsedTrace parseTrace(const std::string& path, const TraceFiles& files);
+/// Steps and frames, of 200 bytes each.
+constexpr std::size_t kMostSteps = 4'000'000;
+
+/// Reads `path` and what it includes. Throws nothing, whatever the files hold: more than `mostSteps`
+/// steps and frames, or more items than are compared in a bearable time, are errors, and so is a
+/// lack of memory.
+ParsedTrace parseTrace(const std::string& path, const TraceFiles& files,
+                       std::size_t mostSteps = kMostSteps);
 
 /// The same from the file system: 256 MiB at most. What is included is a regular file in the folder
 /// `root` or below it, wherever links lead; an empty root is the folder of `path`.

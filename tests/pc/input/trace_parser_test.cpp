@@ -3,6 +3,7 @@
 #include <fcntl.h>
 #include <gtest/gtest.h>
 #include <sys/resource.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <algorithm>
@@ -98,9 +99,9 @@ INSTANTIATE_TEST_SUITE_P(
         WrongLine{"5 frame 0123 1", "a hash of 16 digits"},
         WrongLine{"| 0 box", "an item without a frame"},
         WrongLine{"screen 720", "a side in pixels"}, WrongLine{"screen 0x5", "without pixels"},
-        WrongLine{"density 0", "no number of dots"}, WrongLine{"density 1x", "no number of dots"},
-        WrongLine{"clock step 0", "stands still"}, WrongLine{"clock step 1001", "0 to 1000"},
-        WrongLine{"wait\x1B[2J", "'wait?[2J'"},
+        WrongLine{"screen x9xx9x", "a side in pixels"}, WrongLine{"density 0", "no number of dots"},
+        WrongLine{"density 1x", "no number of dots"}, WrongLine{"clock step 0", "stands still"},
+        WrongLine{"clock step 1001", "0 to 1000"}, WrongLine{"wait\x1B[2J", "'wait?[2J'"},
         WrongLine{"include gone.trace", "'t/gone.trace' cannot be read"},
         WrongLine{"include main.trace", "includes itself"}));
 
@@ -149,6 +150,18 @@ TEST(TraceParserTest, RefusesFramesThatTakeTooLong) {
   for (int i = 0; i < 5'000; ++i) lines += "0 frame 0123456789abcdef 65536\n";
   EXPECT_NE(parseLines(lines).error.find("too many items"), std::string::npos);
   EXPECT_EQ(parseLines(lines.substr(0, lines.size() / 50)).error, "");
+}
+
+TEST(TraceParserTest, RefusesWhatTakesTooMuchMemory) {
+  const auto parse = [](const char* lines, std::size_t mostSteps) {
+    return parseTrace(
+        "main", [&](auto&) { return std::string("brimol-trace 1\n") + lines; }, mostSteps);
+  };
+  const char* const three = "wait 1\n2 frame 0123456789abcdef 0\nwait 1\n";
+  EXPECT_EQ(parse(three, 3).error, "");
+  EXPECT_EQ(parse(three, 2).error, "main:4: more than 2 steps and frames");
+  const ParsedTrace none = parseTrace("main", [](auto&) -> std::string { throw std::bad_alloc(); });
+  EXPECT_EQ(none.error, "main: there is not enough memory for it");
 }
 
 TEST(TraceParserTest, IncludesFilesAndNamesTheirLines) {
@@ -202,7 +215,9 @@ TEST_F(FilesOfATrace, StandInItsFolder) {
   }
 }
 
-TEST_F(FilesOfATrace, AreNoHugeOnes) {
+TEST_F(FilesOfATrace, AreNoPipesAndNoHugeOnes) {
+  ASSERT_EQ(::mkfifo((folder / "t/pipe").c_str(), 0600), 0);
+  EXPECT_NE(errorOf("include pipe").find("cannot be read"), std::string::npos) << "nobody writes";
   for (const char* const beginning : {"PNG\n", "brimol-trace 1\n"}) {
     write("t/huge", beginning);
     std::filesystem::resize_file(folder / "t/huge", std::uintmax_t{1} << 40);
