@@ -98,7 +98,8 @@ TEST_P(Signals, EndTheApplicationToo) {
     ::kill(std::stoi(bytesOf(folder / "pid.txt")), GetParam());
   });
   const std::string command = "cd " + folder.native() + " && echo $$ >pid.txt && exec " +
-                              kReplayProgram + " --dir d menu.trace -- " + kFakeApplication +
+                              "env --default-signal=QUIT " + kReplayProgram +
+                              " --dir d menu.trace -- " + kFakeApplication +
                               " hang >said.txt 2>&1 <&-";  // also without an input
   const int status = std::system(command.c_str());
   killer.join();
