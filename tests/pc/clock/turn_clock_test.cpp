@@ -1,10 +1,13 @@
 #include "clock/turn_clock.h"
 
 #include <gtest/gtest.h>
+#include <pthread.h>
+#include <sys/resource.h>
 #include <unistd.h>
 #include <utils/Thread.h>
 
 #include <array>
+#include <future>
 #include <mutex>
 #include <string>
 
@@ -21,6 +24,37 @@ TEST(ThreadLook, ReadsTheKernelsText) {
   EXPECT_EQ(stateOf("-1 0x7ffe 0x401000"), ThreadState::Running);
   EXPECT_EQ(stateOf("202 0x7ffe 0x80 0x0"), ThreadState::OnThread);
   EXPECT_EQ(stateOf("0 0x3 0x7ffe 0x10"), ThreadState::Outside);
+}
+
+/// While it lives, the process can open nothing.
+class NoDescriptors {
+ public:
+  NoDescriptors() {
+    EXPECT_EQ(::getrlimit(RLIMIT_NOFILE, &before), 0);
+    const rlimit none = {0, before.rlim_max};
+    EXPECT_EQ(::setrlimit(RLIMIT_NOFILE, &none), 0);
+  }
+  ~NoDescriptors() { EXPECT_EQ(::setrlimit(RLIMIT_NOFILE, &before), 0); }
+
+ private:
+  rlimit before = {};
+};
+
+TEST(ThreadLook, TellsAThreadThatLivesWhateverItsNameAndWithoutDescriptors) {
+  std::promise<pid_t> begun;
+  std::promise<void> end;
+  std::thread thread([&] {
+    pthread_setname_np(pthread_self(), "a\nb) Z");
+    begun.set_value(::gettid());
+    end.get_future().wait();
+  });
+  const pid_t number = begun.get_future().get();
+  while (lookAt(number) != ThreadState::OnThread) std::this_thread::yield();
+  const NoDescriptors none;
+  EXPECT_EQ(lookAt(number), ThreadState::Outside);
+  end.set_value();
+  thread.join();
+  while (lookAt(number) != ThreadState::Gone) std::this_thread::yield();
 }
 
 /// What threads do and when, in the order in which they did it.
