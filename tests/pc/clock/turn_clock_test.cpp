@@ -88,6 +88,23 @@ void tick(TurnClock& clock, Journal& journal, const char* who, uint32_t ms, int 
   }
 }
 
+/// A pipe: who waits for it blocks outside of the process.
+class Gate {
+ public:
+  Gate() { EXPECT_EQ(::pipe(ends.data()), 0); }
+  ~Gate() {
+    for (const int each : ends) ::close(each);
+  }
+  void wait() {
+    char byte = 0;
+    EXPECT_EQ(::read(ends[0], &byte, 1), 1);
+  }
+  void open() { EXPECT_EQ(::write(ends[1], "x", 1), 1); }
+
+ private:
+  std::array<int, 2> ends = {};
+};
+
 TEST(TurnClock, GivesTurnsByTimeAndThenByTheOrderOfComing) {
   for (int round = 0; round < 50; ++round) {
     TurnClock clock(0xFFFFFFFF, Speed::Free);
@@ -182,23 +199,103 @@ TEST(TurnClock, GoesOnWithoutAThreadThatBlocksOutsideAndNamesIt) {
   TurnClock clock(0, Speed::Free);
   std::string named;
   clock.setBlockedWatcher([&](const std::string& name, pid_t) { named = name; });
-  std::array<int, 2> ends = {};
-  ASSERT_EQ(::pipe(ends.data()), 0);
+  Gate gate;
   clock.takePart();
   std::atomic<bool> isBack = false;
   std::thread blocked = taking(clock, [&] {
-    char byte = 0;
-    EXPECT_EQ(::read(ends[0], &byte, 1), 1);
+    gate.wait();
     clock.takePart();
     isBack = true;
   });
   clock.delay(50);
   EXPECT_EQ(named, "worker");
-  EXPECT_EQ(::write(ends[1], "x", 1), 1);
+  gate.open();
   const auto before = clock.now();
   while (!isBack) clock.delay(1);
   EXPECT_LE(clock.now() - before, 100) << "it is soon back among the others";
   blocked.join();
+}
+
+TEST(TurnClock, IsFreeAgainOnceAThreadThatBlockedOutsideHasEnded) {
+  TurnClock clock(0, Speed::Free);
+  Gate gate;
+  clock.takePart();
+  std::thread blocked = taking(clock, [&] { gate.wait(); });
+  clock.delay(50);
+  gate.open();
+  blocked.join();
+  const auto start = std::chrono::steady_clock::now();
+  clock.delay(60'000);
+  EXPECT_LT(std::chrono::steady_clock::now() - start, 30s);
+}
+
+TEST(TurnClock, LeavesTheTurnToAThreadThatComesBackWhileItIsNamed) {
+  TurnClock clock(0, Speed::Free);
+  Gate gate;
+  std::promise<void> back;
+  clock.setBlockedWatcher([&](const std::string&, pid_t) {
+    gate.open();
+    back.get_future().wait();
+  });
+  clock.takePart();
+  std::thread blocked = taking(clock, [&] {
+    gate.wait();
+    clock.delay(1);
+    back.set_value();
+    std::this_thread::sleep_for(100ms);
+    EXPECT_EQ(clock.now(), 1);
+  });
+  clock.delay(50);
+  blocked.join();
+}
+
+struct LateAsker {
+  ~LateAsker() {
+    if (clock != nullptr) *answer = clock->ticks();
+  }
+  TurnClock* clock = nullptr;
+  uint32_t* answer = nullptr;
+};
+thread_local LateAsker lateAsker;
+
+TEST(TurnClock, AnswersAThreadThatHasLeftAndIsNotGoneYet) {
+  TurnClock clock(0, Speed::Free);
+  uint32_t end = 0;
+  uint32_t answer = 1;
+  clock.takePart();
+  std::thread worker([&] {
+    lateAsker.answer = &answer;
+    lateAsker.clock = &clock;
+    clock.delay(2);
+    end = clock.ticks();
+  });
+  clock.delay(50);
+  worker.join();
+  EXPECT_EQ(answer, end);
+}
+
+TEST(TurnClock, GoesOnWithoutAnAnnouncedThreadThatHasTheTurn) {
+  TurnClock clock(0, Speed::Free);
+  std::atomic<bool> blocks = false;
+  std::promise<void> looked;
+  std::promise<void> passed;
+  clock.setAgent({[&](uint64_t) {
+                    if (blocks.exchange(false)) looked.set_value();
+                    return std::optional<uint64_t>();
+                  },
+                  [](uint64_t) {}});
+  TurnClock::Participant& place = clock.announce("never starts");
+  std::thread other([&] {
+    looked.get_future().wait();
+    clock.lookAtAgent();  // waits for the lock, and so for the turn to be passed on
+    passed.set_value();
+  });
+  blocks = true;
+  passed.get_future().wait();
+  clock.withdraw(place);
+  clock.delay(1);
+  EXPECT_EQ(clock.now(), 1);
+  other.join();
 }
 
 TEST(TurnClock, KeepsToRealTimeWhereItIsToAndHearsOfInput) {
