@@ -58,7 +58,7 @@ void run(const Variables& variables) { finish(start(variables)); }
 double runFor(std::chrono::seconds time, const Variables& variables) {
   const pid_t process = start(variables);
   std::this_thread::sleep_for(time);
-  ::kill(process, SIGINT);
+  ::kill(process, SIGTERM);
   return finish(process);
 }
 

@@ -18,6 +18,7 @@
 #include "factory_test.h"
 #include "language/language.h"
 #include "pages/table.h"
+#include "process/inherited.h"
 #include "results/whole_file.h"
 #include "run_start.h"
 #include "task.h"
@@ -31,8 +32,9 @@ constexpr unsigned int kLoopMs = 5;
 volatile std::sig_atomic_t interrupted = 0;
 
 void endOnSignals() {
-  for (const int number : {SIGINT, SIGTERM, SIGHUP})
-    std::signal(number, [](int) { interrupted = 1; });
+  for (const int number : {SIGINT, SIGTERM, SIGHUP}) {
+    if (!brimol::process::isIgnored(number)) std::signal(number, [](int) { interrupted = 1; });
+  }
 }
 
 ExitCode fail(const std::string& why) {

@@ -2,6 +2,7 @@
 
 #include <fcntl.h>
 #include <spawn.h>
+#include <sys/ioctl.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -54,7 +55,22 @@ class SpawnPlan {
   posix_spawnattr_t attributes = {};
 };
 
-std::string wordsOf(int status) {
+// It is not yet waited for, so that its number is nobody else's.
+bool hasEnded(pid_t process) {
+  siginfo_t info = {};
+  const int options = WEXITED | WNOHANG | WNOWAIT;
+  return waitid(P_PID, static_cast<id_t>(process), &info, options) != 0 || info.si_pid != 0;
+}
+
+// Ends a process that may have left its group, and says how it ended. Another user's can go on:
+// that one is not waited for.
+std::string finish(pid_t process) {
+  kill(-process, SIGKILL);
+  const int options = kill(process, SIGKILL) == 0 ? 0 : WNOHANG;
+  int status = 0;
+  pid_t waited = waitpid(process, &status, options);
+  while (waited < 0 && errno == EINTR) waited = waitpid(process, &status, options);
+  if (waited <= 0) return "exit code unknown";
   if (WIFSIGNALED(status)) return "signal " + std::to_string(WTERMSIG(status));
   return "exit code " + std::to_string(WEXITSTATUS(status));
 }
@@ -100,7 +116,7 @@ int Command::start(const std::string& line) {
 
 void Command::end() {
   if (watcher > 0) kill(-watcher, SIGKILL);
-  if (process > 0) waitpid(std::exchange(process, 0), nullptr, 0);
+  if (process > 0) ended = finish(std::exchange(process, 0));
   if (watcher > 0) waitpid(std::exchange(watcher, 0), nullptr, 0);
   if (lifeline >= 0) close(std::exchange(lifeline, -1));
 }
@@ -113,18 +129,18 @@ Command::~Command() {
 std::string Command::read() {
   std::string bytes(kReadBytes, '\0');
   const ssize_t count = output < 0 ? 0 : ::read(output, bytes.data(), bytes.size());
-  // No end of the pipe is left in which the command, or what it started, could write.
-  if (count == 0 && output >= 0) close(std::exchange(output, -1));
   bytes.resize(count < 0 ? 0 : static_cast<std::size_t>(count));
+  if (!ended.empty()) unread -= static_cast<int>(bytes.size());
+  // Nobody is left who could write, or only what has left the group: that may never end.
+  const bool isRead = count == 0 || (!ended.empty() && unread <= 0);
+  if (isRead && output >= 0) close(std::exchange(output, -1));
   return bytes;
 }
 
 std::optional<std::string> Command::outcome() {
-  int status = 0;
-  if (process > 0 && waitpid(process, &status, WNOHANG) == process) {
-    process = 0;
+  if (process > 0 && hasEnded(process)) {
     end();
-    ended = wordsOf(status);
+    ioctl(output, FIONREAD, &unread);
   }
   if (ended.empty() || output >= 0) return {};
   return ended;

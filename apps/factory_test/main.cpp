@@ -11,6 +11,7 @@
 #include "complain.h"
 #include "options.h"
 #include "plan/plan_json.h"
+#include "process/inherited.h"
 #include "records/commands.h"
 #include "task.h"
 #include "version.h"
@@ -36,6 +37,7 @@ int printPlan(const factory_test::Options& options) {
 }  // namespace
 
 int main(int count, char** arguments) {
+  brimol::process::settleInherited();
   // What goes beyond a limit for files fails as on a full disk, instead of ending the program.
   std::signal(SIGXFSZ, SIG_IGN);
   std::string error;

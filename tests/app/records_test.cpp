@@ -171,6 +171,27 @@ TEST_F(Records, KnowARunThatADeadProgramLeft) {
   EXPECT_TRUE(living->record(kKeys, error));
 }
 
+TEST_F(Records, DoNotBeginARunThatAnotherProgramHolds) {
+  ASSERT_TRUE(open(startOf("A1")));
+  const int descriptor = ::open((file.native() + ".lock").c_str(), O_RDWR | O_CLOEXEC);
+  struct flock second = {F_WRLCK, SEEK_SET, 2, 1, 0};
+  ASSERT_EQ(::fcntl(descriptor, F_OFD_SETLK, &second), 0);
+  EXPECT_FALSE(open(startOf("A2")));
+  EXPECT_EQ(error, file.native() + ".lock: another program holds run 2");
+  ::close(descriptor);
+  EXPECT_THAT(states(), ElementsAre("aborted"));
+}
+
+TEST_F(Records, GoToAFileWhateverItsName) {
+  const fs::path before = fs::current_path();
+  fs::current_path(folder);
+  for (const fs::path name : {":memory:", "file:x?mode=memory"}) {
+    EXPECT_TRUE(ResultBook::open({.database = name}, startOf("A1"), error)->record(kKeys, error));
+    EXPECT_EQ(ResultBook::open({.database = name}, startOf("A1"), error)->results().size(), 1U);
+  }
+  fs::current_path(before);
+}
+
 TEST_F(Records, TakeSeveralProgramsAtOnce) {
   constexpr int kPrograms = 8;
   constexpr int kVerdicts = 5;

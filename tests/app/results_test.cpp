@@ -275,6 +275,9 @@ TEST_F(Results, SurviveAFullDiskBehindALink) {
   EXPECT_TRUE(book->isSaved(kColours.test));
   EXPECT_TRUE(book->saveAgain(error)) << error;
   EXPECT_TRUE(book->isSaved(kKeys.test));
+  ::setrlimit(RLIMIT_FSIZE, &little);
+  for (int times = 0; times < 2; ++times) EXPECT_FALSE(book->finish(error)) << "is left to save";
+  ::setrlimit(RLIMIT_FSIZE, &former);
   book.reset();
   EXPECT_EQ(ResultBook::open(folder / "far", error)->results(), (std::vector{kColours, kKeys}));
 }

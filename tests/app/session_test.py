@@ -4,6 +4,7 @@ import json
 import os
 import pathlib
 import shutil
+import signal
 import sqlite3
 import subprocess
 import sys
@@ -30,11 +31,11 @@ class SessionTest(unittest.TestCase):
         self.folder = pathlib.Path(self.enterContext(tempfile.TemporaryDirectory()))
         self.database = self.folder / "station.db"
 
-    def start(self, trace, *options, program=FACTORY_TEST):
+    def start(self, trace, *options, program=FACTORY_TEST, before=None):
         file = self.folder / "played.trace"
         file.write_text("brimol-trace 1\n" + trace)
         return subprocess.Popen([program, "--headless", "--database", self.database, *options],
-                                stderr=subprocess.PIPE, text=True, cwd=self.folder,
+                                stderr=subprocess.PIPE, text=True, cwd=self.folder, preexec_fn=before,
                                 env=os.environ | {"BRIMOL_TRACE": str(file), "BRIMOL_SCREEN": "480x800",
                                                   "BRIMOL_REPORT_DIR": str(self.folder),
                                                   "BRIMOL_REPORT_PICTURES": "none"})
@@ -126,6 +127,18 @@ wait until text "Line out of reach: 1 verdict waits" within 86400000
         self.assertEqual((0, ""), (played.wait(), played.communicate()[1]))
         self.assertEqual("ran\n", (self.folder / "ran").read_text())
         self.assertEqual([], [name for name in ("unit", "operator") if (self.folder / name).exists()])
+
+    def test_it_bears_what_it_is_started_with(self):
+        """Ignored signals, and no stderr: what the program says of the line at its end goes into no file."""
+        def before():
+            signal.signal(signal.SIGCHLD, signal.SIG_IGN)
+            signal.signal(signal.SIGHUP, signal.SIG_IGN)
+            os.close(2)
+        played = self.start(PASS + "expect text \"Shell: PASS\"\n", "--serial", "a1", "--results", "kept",
+                            "--line", "postgresql://nobody@127.0.0.1:1/none", "--test", "shell", "--shell",
+                            "kill -HUP $PPID", before=before)
+        self.assertEqual((0, ""), (played.wait(), played.communicate()[1]))
+        self.assertFalse((self.folder / "kept.lock").exists())
 
     def test_a_locked_database_holds_up_no_screen(self):
         played = self.start(PASS + """expect text "Shell: PASS, saving..."

@@ -57,7 +57,7 @@ class Program {
     if (process <= 0 || waitpid(std::exchange(process, 0), &status, 0) < 0) return -1;
     return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
   }
-  void interrupt() const { kill(process, SIGINT); }
+  void interrupt() const { kill(process, SIGTERM); }
 
  private:
   pid_t process = 0;

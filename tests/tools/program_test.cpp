@@ -26,8 +26,8 @@ class Program : public InFolder {
     if (const auto place = words.find("APP"); place != std::string::npos) {
       words.replace(place, 3, kFakeApplication);
     }
-    const std::string command = "cd " + folder.native() + " && " + before + " exec " +
-                                kReplayProgram + " " + words + " >said.txt 2>&1";
+    const std::string command = "cd " + folder.native() + " && " + before + " " + kReplayProgram +
+                                " " + words + " >said.txt 2>&1";
     const int status = std::system(command.c_str());
     said = bytesOf(folder / "said.txt");
     return WIFEXITED(status) ? WEXITSTATUS(status) : -1;
@@ -73,11 +73,20 @@ INSTANTIATE_TEST_SUITE_P(
     [](const auto& given) { return given.param.name; });
 
 TEST_F(Program, EndsAHungApplicationWithAllThatItStarted) {
-  EXPECT_EQ(replay("--dir d --timeout 15 menu.trace -- APP hang"), 3);
+  // Also where it leads a group of its own.
+  EXPECT_EQ(replay("--dir d --timeout 15 menu.trace -- setsid APP hang"), 3);
   EXPECT_THAT(said, HasSubstr("menu.trace:3: hung"));
   EXPECT_TRUE(comesToItsEnd("d/output.txt"));
   EXPECT_EQ(replay("--dir d menu.trace -- APP leave-child"), 0);
   EXPECT_TRUE(comesToItsEnd("d/output.txt")) << "the application left a process behind";
+}
+
+TEST_F(Program, BearsIgnoredSignals) {
+  for (const auto& [before, application, code] :
+       {std::tuple("env --ignore-signal=CHLD", "APP exit 7", 1),
+        std::tuple("env --ignore-signal=HUP", "sh -c 'kill -HUP $PPID; exec APP pass'", 0)}) {
+    EXPECT_EQ(replay(std::string("--dir d menu.trace -- ") + application, before), code) << before;
+  }
 }
 
 class Signals : public Program, public testing::WithParamInterface<int> {};
@@ -89,8 +98,9 @@ TEST_P(Signals, EndTheApplicationToo) {
     ::kill(std::stoi(bytesOf(folder / "pid.txt")), GetParam());
   });
   const std::string command = "cd " + folder.native() + " && echo $$ >pid.txt && exec " +
-                              kReplayProgram + " --dir d menu.trace -- " + kFakeApplication +
-                              " hang >said.txt 2>&1";
+                              "env --default-signal=QUIT " + kReplayProgram +
+                              " --dir d menu.trace -- " + kFakeApplication +
+                              " hang >said.txt 2>&1 <&-";  // also without an input
   const int status = std::system(command.c_str());
   killer.join();
   EXPECT_TRUE(comesToItsEnd("d/output.txt"));

@@ -2,6 +2,7 @@
 #include <iostream>
 
 #include "options.h"
+#include "process/inherited.h"
 #include "replay.h"
 #include "verdict.h"
 #include "version.h"
@@ -9,6 +10,7 @@
 using brimol::replay::Options;
 
 int main(int count, char** arguments) {
+  brimol::process::settleInherited();
   try {
     std::string error;
     const auto options = brimol::replay::parseOptions({arguments + 1, arguments + count}, error);

@@ -10,7 +10,10 @@
 #include <csignal>
 #include <cstring>
 #include <fstream>
+#include <system_error>
 #include <utility>
+
+#include "process/inherited.h"
 
 namespace brimol::replay {
 
@@ -24,7 +27,10 @@ constexpr milliseconds kLookEvery{100};
 sigset_t watchedSignals() {
   sigset_t set;
   ::sigemptyset(&set);
-  for (const int signal : {SIGCHLD, SIGINT, SIGQUIT, SIGTERM, SIGHUP}) ::sigaddset(&set, signal);
+  ::sigaddset(&set, SIGCHLD);
+  for (const int signal : {SIGINT, SIGQUIT, SIGTERM, SIGHUP}) {
+    if (!process::isIgnored(signal)) ::sigaddset(&set, signal);  // else it would come all the same
+  }
   return set;
 }
 
@@ -179,6 +185,18 @@ bool hasEnded(pid_t process) {
   return ::waitid(P_PID, static_cast<id_t>(process), &info, options) != 0 || info.si_pid != 0;
 }
 
+// Ends it, which may have left the group, and says what it ended with. It is not yet waited for, so
+// that its number is nobody else's. Another user's can go on: that one is not waited for.
+int finish(pid_t process) {
+  ::kill(-process, SIGKILL);
+  const int options = ::kill(process, SIGKILL) == 0 ? 0 : WNOHANG;
+  int status = 0;
+  while (::waitpid(process, &status, options) < 0) {
+    if (errno != EINTR) throw std::system_error(errno, std::generic_category(), "how it ended");
+  }
+  return status;
+}
+
 // Until it ended, hung or this program was asked to end; says which.
 RunEnd::Kind watch(const Launch& launch, const HeldSignals& signals, pid_t process,
                    const std::function<void(const Session&)>& look) {
@@ -211,8 +229,7 @@ RunEnd run(const Launch& launch, const std::function<void(const Session&)>& look
   }
   end.kind = watch(launch, signals, process, look);
   group.kill();
-  int status = 0;
-  while (::waitpid(process, &status, 0) < 0 && errno == EINTR) continue;
+  const int status = finish(process);
   end.realTime = std::chrono::duration_cast<milliseconds>(steady_clock::now() - began);
   if (end.kind != RunEnd::Kind::Exited) return end;
   end.code = WIFEXITED(status) ? WEXITSTATUS(status) : WTERMSIG(status);

@@ -24,9 +24,11 @@ struct Launch {
 };
 
 /// Runs it in a process group of its own until it ends, hangs, or this program is asked to end
-/// (SIGINT, SIGQUIT, SIGTERM, SIGHUP). Whatever happens, nothing of the group is left running, not
-/// even where this program is killed. `look` is called with what the session has come to, about ten
-/// times a second.
+/// (SIGINT, SIGQUIT, SIGTERM, SIGHUP, as far as they are not ignored). Whatever happens, nothing of
+/// the group is left running, not even where this program is killed. What leaves the group (setsid,
+/// timeout) stays; only the application itself, with the group that it then leads, is ended all the
+/// same unless this program is killed. `look` is called with what the session has come to, about
+/// ten times a second.
 RunEnd run(const Launch& launch, const std::function<void(const Session&)>& look);
 
 }  // namespace brimol::replay

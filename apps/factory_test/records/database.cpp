@@ -71,8 +71,7 @@ bool Database::startRun(const RunStart& start, Resume resume, std::vector<TestRe
     }
   };
   if (succeeds(begin, error)) return true;
-  locks.release(number);
-  number = 0;
+  leaveRun();
   return false;
 }
 
@@ -127,7 +126,7 @@ void Database::addRun(const RunStart& start) {
       {run, orNull(start.unit), start.planHash, start.station, orNull(start.operatorName),
        start.software, utcText(start.started)});
   number = store.number("select last_insert_rowid()");
-  locks.take(number);  // before the commit: others would take the run for a dead program's
+  locks.takeNew(number);  // before the commit: others would take the run for a dead program's
 }
 
 bool Database::keep(std::span<const TestResult> results, std::string& error) {
@@ -167,9 +166,14 @@ bool Database::finishRun(std::string& error) {
 bool Database::endRun(std::string& error) {
   if (number == 0) return true;
   if (!succeeds([this] { closeRun(RunState::Aborted); }, error)) return false;
+  leaveRun();
+  return true;
+}
+
+void Database::leaveRun() {
   locks.release(number);
   number = 0;
-  return true;
+  run.clear();
 }
 
 // A run that has ended already stays as it is.

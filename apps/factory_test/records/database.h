@@ -52,6 +52,7 @@ class Database {
   void addRun(const RunStart& start);
   void add(const TestResult& result);
   void closeRun(RunState state);
+  void leaveRun();
 
   Sqlite store;
   RunLocks locks;

@@ -6,13 +6,16 @@
 
 #include <algorithm>
 #include <array>
+#include <cerrno>
 #include <condition_variable>
 #include <mutex>
 #include <random>
+#include <system_error>
 #include <thread>
 #include <utility>
 
 #include "records/line_transfer.h"
+#include "results/system_words.h"
 
 namespace factory_test {
 
@@ -30,6 +33,7 @@ class Bell {
   Bell(const Bell&) = delete;
   Bell& operator=(const Bell&) = delete;
 
+  bool isThere() const { return descriptor >= 0; }
   void ring() const { ::eventfd_write(descriptor, 1); }
   void clear() const {
     eventfd_t count = 0;
@@ -96,6 +100,7 @@ struct Line::Shared {
       sendAll(transfer, pause);
       if (!wait(milliseconds(0), nullptr)) return;
       set([&] { served = serving, status.waiting = 0, status.error.clear(); });
+      pause = pace.first;
     } while (wait(kForever, &news));
   }
 
@@ -123,7 +128,20 @@ struct Line::Shared {
 
 Line::Line(std::filesystem::path station, std::string url, LinePace pace)
     : shared(std::make_shared<Shared>(std::move(station), std::move(url), pace)) {
-  std::thread(work, shared).detach();
+  const int failure = start();
+  if (failure == 0) return;
+  shared->fail("the line's database: no background work: " + systemWords(failure));
+  shared->hasEnded = true;
+}
+
+int Line::start() const {
+  if (!shared->stop.isThere() || !shared->news.isThere()) return errno;
+  try {
+    std::thread(work, shared).detach();
+  } catch (const std::system_error& failure) {
+    return failure.code().value();
+  }
+  return 0;
 }
 
 void Line::work(const std::shared_ptr<Shared>& shared) {

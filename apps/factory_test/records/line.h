@@ -43,6 +43,8 @@ class Line {
 
  private:
   struct Shared;
+  // An error's number, or 0.
+  int start() const;
   static void work(const std::shared_ptr<Shared>& shared);
 
   static constexpr std::chrono::milliseconds kGrace{1000};

@@ -147,7 +147,9 @@ Sqlite::Sqlite(const std::filesystem::path& path, Mode mode) : file(path) {
   const ReadWay way = writes ? ReadWay() : wayToRead(path);
   const int flags = (writes ? kNew : SQLITE_OPEN_READONLY | SQLITE_OPEN_URI) | SQLITE_OPEN_NOMUTEX;
   sqlite3* opened = nullptr;
-  const std::string name = writes ? path.native() : uriOf(path, way.settings);
+  // SQLite has names for databases that are no files, such as ":memory:"; a path is none of them.
+  const fs::path plain = path.is_absolute() ? path : "." / path;
+  const std::string name = writes ? plain.native() : uriOf(path, way.settings);
   const int code = sqlite3_open_v2(name.c_str(), &opened, flags, nullptr);
   handle.reset(opened);  // also of one that failed
   // SQLite then says that there is no such file.

@@ -187,7 +187,7 @@ bool ResultBook::saveAgain(std::string& error) {
 
 bool ResultBook::finish(std::string& error) {
   isFinishing = database != nullptr;
-  isEndUnsaved = state != RunState::Finished;
+  isEndUnsaved = isEndUnsaved || state != RunState::Finished;
   state = RunState::Finished;
   return saveAgain(error);
 }
