@@ -50,11 +50,14 @@ TEST(ThreadLook, TellsAThreadThatLivesWhateverItsNameAndWithoutDescriptors) {
   });
   const pid_t number = begun.get_future().get();
   while (lookAt(number) != ThreadState::OnThread) std::this_thread::yield();
-  const NoDescriptors none;
-  EXPECT_EQ(lookAt(number), ThreadState::Outside);
+  const auto lookWithoutDescriptors = [number] {
+    const NoDescriptors none;
+    return lookAt(number);
+  };
+  EXPECT_EQ(lookWithoutDescriptors(), ThreadState::Outside);
   end.set_value();
   thread.join();
-  while (lookAt(number) != ThreadState::Gone) std::this_thread::yield();
+  while (lookWithoutDescriptors() != ThreadState::Gone) std::this_thread::yield();
 }
 
 /// What threads do and when, in the order in which they did it.
