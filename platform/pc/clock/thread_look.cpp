@@ -4,7 +4,9 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <cerrno>
 #include <charconv>
+#include <csignal>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
@@ -26,10 +28,12 @@ fs::path folderOf(pid_t thread) { return fs::path(kThreads) / std::to_string(thr
 std::vector<std::string> statWords(pid_t thread) {
   std::ifstream file(folderOf(thread) / "stat");
   std::string text;
-  if (!std::getline(file, text)) return {};
+  if (!std::getline(file, text, '\0')) return {};  // a name may hold a line's end
   std::istringstream rest(text.substr(std::min(text.rfind(')') + 1, text.size())));
   return {std::istream_iterator<std::string>(rest), {}};
 }
+
+bool isGone(pid_t thread) { return ::tgkill(::getpid(), thread, 0) != 0 && errno == ESRCH; }
 
 }  // namespace
 
@@ -43,7 +47,8 @@ ThreadState stateOf(std::string_view syscallText) {
 
 ThreadState lookAt(pid_t thread) {
   const std::vector<std::string> words = statWords(thread);
-  if (words.empty() || words.front() == "Z" || words.front() == "X") return ThreadState::Gone;
+  if (words.empty()) return isGone(thread) ? ThreadState::Gone : ThreadState::Outside;
+  if (words.front() == "Z" || words.front() == "X") return ThreadState::Gone;
   if (words.front() != "S") return ThreadState::Running;
   std::ifstream file(folderOf(thread) / "syscall");
   std::string text;

@@ -13,7 +13,8 @@ namespace brimol::pc {
 enum class ThreadState {
   Running,   ///< or ready to, or waiting for a disk or for memory, which end by themselves
   OnThread,  ///< waits for what another thread of the process does: a lock, a condition, an end
-  Outside,   ///< waits for anything else: a pipe, a child process, a pause
+  Outside,   ///< waits for anything else: a pipe, a child process, a pause; or cannot be looked at,
+             ///< as where the process has no descriptor left
   Gone,
 };
 

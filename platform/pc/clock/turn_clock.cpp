@@ -25,16 +25,26 @@ std::string nameOfThread() {
   return pthread_getname_np(pthread_self(), name.data(), name.size()) == 0 ? name.data() : "";
 }
 
-// Where the calling thread sits. The main thread keeps the turn when it ends: the process does too.
+// Where the calling thread sits. Nothing destroys it: what the thread destroys last may take part.
 struct Seat {
-  ~Seat() {
-    if (clock != nullptr && ::gettid() != ::getpid()) clock->leave();
-  }
   TurnClock* clock = nullptr;
   uint64_t id = 0;
   TurnClock::Participant* place = nullptr;
+  bool endsWithThread = false;
 };
-thread_local Seat seat;
+constinit thread_local Seat seat;
+
+// The main thread keeps the turn when it ends: the process does too.
+struct Leaver {
+  ~Leaver() {
+    if (seat.clock != nullptr && ::gettid() != ::getpid()) seat.clock->leave();
+  }
+};
+
+void leaveAtEndOfThread() {
+  if (std::exchange(seat.endsWithThread, true)) return;
+  thread_local const Leaver leaver;
+}
 
 }  // namespace
 
@@ -72,12 +82,21 @@ TurnClock::Participant& TurnClock::add(const std::string& name) {
   return added;
 }
 
+// A place that the thread left goes now, and not with the thread's end, which may wait for a turn.
 void TurnClock::sitDown(Participant& me) {
+  leaveAtEndOfThread();
+  drop([thread = ::gettid()](const Participant& each) {
+    return each.state == Participant::State::Left && each.thread == thread;
+  });
   seat.clock = this;
   seat.id = id;
   seat.place = &me;
   me.thread = ::gettid();
   if (speed == Speed::Free) cpus.join();
+}
+
+void TurnClock::drop(const std::function<bool(const Participant&)>& isToGo) {
+  if (participants.remove_if(isToGo) > 0) loosenPace();
 }
 
 TurnClock::Participant& TurnClock::self() {
@@ -138,7 +157,10 @@ TurnClock::Participant& TurnClock::announce(const char* name) {
 
 void TurnClock::withdraw(Participant& announced) {
   const std::lock_guard lock(mutex);
-  participants.remove_if([&](const Participant& each) { return &each == &announced; });
+  drop([&](const Participant& each) { return &each == &announced; });
+  if (holder != &announced) return;
+  holder = nullptr;
+  keeperWakes.notify_one();
 }
 
 void TurnClock::begin(Participant& announced) {

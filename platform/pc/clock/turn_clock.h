@@ -102,6 +102,7 @@ class TurnClock {
   Participant& self();
   Participant& add(const std::string& name);
   void sitDown(Participant& me);
+  void drop(const std::function<bool(const Participant&)>& isToGo);
   void pause(Participant& me, uint32_t ms);
   uint64_t endOfPause(uint32_t ms) const;
   static void hearOfTurn(Participant& me);
@@ -123,6 +124,7 @@ class TurnClock {
   void sendAway(Lock& lock, Participant& blocked);
   void callOutside(Lock& lock, Participant& blocked);
   void takeBack(Participant& me);
+  void loosenPace();
 
   const uint64_t id;  // tells clocks apart, even if one takes the place of another
   const uint32_t firstTick;

@@ -81,7 +81,7 @@ bool TurnClock::isStillToPoll(Participant& away) {
 
 void TurnClock::dropGone() {
   using State = Participant::State;
-  participants.remove_if([](const Participant& each) {
+  drop([](const Participant& each) {
     const bool mayBeGone = each.state == State::Left || each.state == State::Away;
     return mayBeGone && lookAt(each.thread) == ThreadState::Gone;
   });
@@ -155,16 +155,23 @@ void TurnClock::callOutside(Lock& lock, Participant& blocked) {
   if (!pace.isStarted()) pace.start(time);
   const std::string name = blocked.name;
   const pid_t thread = blocked.thread;
+  const uint64_t turn = turns;
   lock.unlock();
   if (tellBlocked) tellBlocked(name, thread);
   lock.lock();
-  if (holder == &blocked) sendAway(lock, blocked);
+  if (holder != nullptr && turns == turn) sendAway(lock, *holder);
 }
 
 void TurnClock::takeBack(Participant& me) {
   me.isOutside = false;
-  const bool isLast = std::ranges::none_of(participants, &Participant::isOutside);
-  if (isLast && speed == Speed::Free) pace.stop();
+  loosenPace();
+}
+
+void TurnClock::loosenPace() {
+  if (!pace.isStarted() || speed == Speed::Real) return;
+  if (std::ranges::any_of(participants, &Participant::isOutside)) return;
+  pace.stop();
+  keeperWakes.notify_one();  // it may sleep until real time has come so far
 }
 
 }  // namespace brimol::pc

@@ -1,10 +1,13 @@
 #include "clock/turn_clock.h"
 
 #include <gtest/gtest.h>
+#include <pthread.h>
+#include <sys/resource.h>
 #include <unistd.h>
 #include <utils/Thread.h>
 
 #include <array>
+#include <future>
 #include <mutex>
 #include <string>
 
@@ -21,6 +24,40 @@ TEST(ThreadLook, ReadsTheKernelsText) {
   EXPECT_EQ(stateOf("-1 0x7ffe 0x401000"), ThreadState::Running);
   EXPECT_EQ(stateOf("202 0x7ffe 0x80 0x0"), ThreadState::OnThread);
   EXPECT_EQ(stateOf("0 0x3 0x7ffe 0x10"), ThreadState::Outside);
+}
+
+/// While it lives, the process can open nothing.
+class NoDescriptors {
+ public:
+  NoDescriptors() {
+    EXPECT_EQ(::getrlimit(RLIMIT_NOFILE, &before), 0);
+    const rlimit none = {0, before.rlim_max};
+    EXPECT_EQ(::setrlimit(RLIMIT_NOFILE, &none), 0);
+  }
+  ~NoDescriptors() { EXPECT_EQ(::setrlimit(RLIMIT_NOFILE, &before), 0); }
+
+ private:
+  rlimit before = {};
+};
+
+TEST(ThreadLook, TellsAThreadThatLivesWhateverItsNameAndWithoutDescriptors) {
+  std::promise<pid_t> begun;
+  std::promise<void> end;
+  std::thread thread([&] {
+    pthread_setname_np(pthread_self(), "a\nb) Z");
+    begun.set_value(::gettid());
+    end.get_future().wait();
+  });
+  const pid_t number = begun.get_future().get();
+  while (lookAt(number) != ThreadState::OnThread) std::this_thread::yield();
+  const auto lookWithoutDescriptors = [number] {
+    const NoDescriptors none;
+    return lookAt(number);
+  };
+  EXPECT_EQ(lookWithoutDescriptors(), ThreadState::Outside);
+  end.set_value();
+  thread.join();
+  while (lookWithoutDescriptors() != ThreadState::Gone) std::this_thread::yield();
 }
 
 /// What threads do and when, in the order in which they did it.
@@ -53,6 +90,23 @@ void tick(TurnClock& clock, Journal& journal, const char* who, uint32_t ms, int 
     clock.delay(ms);
   }
 }
+
+/// A pipe: who waits for it blocks outside of the process.
+class Gate {
+ public:
+  Gate() { EXPECT_EQ(::pipe(ends.data()), 0); }
+  ~Gate() {
+    for (const int each : ends) ::close(each);
+  }
+  void wait() {
+    char byte = 0;
+    EXPECT_EQ(::read(ends[0], &byte, 1), 1);
+  }
+  void open() { EXPECT_EQ(::write(ends[1], "x", 1), 1); }
+
+ private:
+  std::array<int, 2> ends = {};
+};
 
 TEST(TurnClock, GivesTurnsByTimeAndThenByTheOrderOfComing) {
   for (int round = 0; round < 50; ++round) {
@@ -148,23 +202,103 @@ TEST(TurnClock, GoesOnWithoutAThreadThatBlocksOutsideAndNamesIt) {
   TurnClock clock(0, Speed::Free);
   std::string named;
   clock.setBlockedWatcher([&](const std::string& name, pid_t) { named = name; });
-  std::array<int, 2> ends = {};
-  ASSERT_EQ(::pipe(ends.data()), 0);
+  Gate gate;
   clock.takePart();
   std::atomic<bool> isBack = false;
   std::thread blocked = taking(clock, [&] {
-    char byte = 0;
-    EXPECT_EQ(::read(ends[0], &byte, 1), 1);
+    gate.wait();
     clock.takePart();
     isBack = true;
   });
   clock.delay(50);
   EXPECT_EQ(named, "worker");
-  EXPECT_EQ(::write(ends[1], "x", 1), 1);
+  gate.open();
   const auto before = clock.now();
   while (!isBack) clock.delay(1);
   EXPECT_LE(clock.now() - before, 100) << "it is soon back among the others";
   blocked.join();
+}
+
+TEST(TurnClock, IsFreeAgainOnceAThreadThatBlockedOutsideHasEnded) {
+  TurnClock clock(0, Speed::Free);
+  Gate gate;
+  clock.takePart();
+  std::thread blocked = taking(clock, [&] { gate.wait(); });
+  clock.delay(50);
+  gate.open();
+  blocked.join();
+  const auto start = std::chrono::steady_clock::now();
+  clock.delay(60'000);
+  EXPECT_LT(std::chrono::steady_clock::now() - start, 30s);
+}
+
+TEST(TurnClock, LeavesTheTurnToAThreadThatComesBackWhileItIsNamed) {
+  TurnClock clock(0, Speed::Free);
+  Gate gate;
+  std::promise<void> back;
+  clock.setBlockedWatcher([&](const std::string&, pid_t) {
+    gate.open();
+    back.get_future().wait();
+  });
+  clock.takePart();
+  std::thread blocked = taking(clock, [&] {
+    gate.wait();
+    clock.delay(1);
+    back.set_value();
+    std::this_thread::sleep_for(100ms);
+    EXPECT_EQ(clock.now(), 1);
+  });
+  clock.delay(50);
+  blocked.join();
+}
+
+struct LateAsker {
+  ~LateAsker() {
+    if (clock != nullptr) *answer = clock->ticks();
+  }
+  TurnClock* clock = nullptr;
+  uint32_t* answer = nullptr;
+};
+thread_local LateAsker lateAsker;
+
+TEST(TurnClock, AnswersAThreadThatHasLeftAndIsNotGoneYet) {
+  TurnClock clock(0, Speed::Free);
+  uint32_t end = 0;
+  uint32_t answer = 1;
+  clock.takePart();
+  std::thread worker([&] {
+    lateAsker.answer = &answer;
+    lateAsker.clock = &clock;
+    clock.delay(2);
+    end = clock.ticks();
+  });
+  clock.delay(50);
+  worker.join();
+  EXPECT_EQ(answer, end);
+}
+
+TEST(TurnClock, GoesOnWithoutAnAnnouncedThreadThatHasTheTurn) {
+  TurnClock clock(0, Speed::Free);
+  std::atomic<bool> blocks = false;
+  std::promise<void> looked;
+  std::promise<void> passed;
+  clock.setAgent({[&](uint64_t) {
+                    if (blocks.exchange(false)) looked.set_value();
+                    return std::optional<uint64_t>();
+                  },
+                  [](uint64_t) {}});
+  TurnClock::Participant& place = clock.announce("never starts");
+  std::thread other([&] {
+    looked.get_future().wait();
+    clock.lookAtAgent();  // waits for the lock, and so for the turn to be passed on
+    passed.set_value();
+  });
+  blocks = true;
+  passed.get_future().wait();
+  clock.withdraw(place);
+  clock.delay(1);
+  EXPECT_EQ(clock.now(), 1);
+  other.join();
 }
 
 TEST(TurnClock, KeepsToRealTimeWhereItIsToAndHearsOfInput) {
