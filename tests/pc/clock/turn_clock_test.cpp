@@ -245,7 +245,7 @@ TEST(TurnClock, LeavesTheTurnToAThreadThatComesBackWhileItIsNamed) {
     gate.wait();
     clock.delay(1);
     back.set_value();
-    std::this_thread::sleep_for(100ms);
+    std::this_thread::sleep_for(100ms);  // blocks outside anew, for less than what sends it away
     EXPECT_EQ(clock.now(), 1);
   });
   clock.delay(50);
