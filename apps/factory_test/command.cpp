@@ -12,6 +12,8 @@
 #include <cstring>
 #include <utility>
 
+#include "process/child.h"
+
 namespace factory_test {
 
 namespace {
@@ -55,24 +57,10 @@ class SpawnPlan {
   posix_spawnattr_t attributes = {};
 };
 
-// It is not yet waited for, so that its number is nobody else's.
-bool hasEnded(pid_t process) {
-  siginfo_t info = {};
-  const int options = WEXITED | WNOHANG | WNOWAIT;
-  return waitid(P_PID, static_cast<id_t>(process), &info, options) != 0 || info.si_pid != 0;
-}
-
-// Ends a process that may have left its group, and says how it ended. Another user's can go on:
-// that one is not waited for.
-std::string finish(pid_t process) {
-  kill(-process, SIGKILL);
-  const int options = kill(process, SIGKILL) == 0 ? 0 : WNOHANG;
-  int status = 0;
-  pid_t waited = waitpid(process, &status, options);
-  while (waited < 0 && errno == EINTR) waited = waitpid(process, &status, options);
-  if (waited <= 0) return "exit code unknown";
-  if (WIFSIGNALED(status)) return "signal " + std::to_string(WTERMSIG(status));
-  return "exit code " + std::to_string(WEXITSTATUS(status));
+std::string wordsOf(std::optional<int> status) {
+  if (!status) return "exit code unknown";
+  if (WIFSIGNALED(*status)) return "signal " + std::to_string(WTERMSIG(*status));
+  return "exit code " + std::to_string(WEXITSTATUS(*status));
 }
 
 }  // namespace
@@ -116,7 +104,7 @@ int Command::start(const std::string& line) {
 
 void Command::end() {
   if (watcher > 0) kill(-watcher, SIGKILL);
-  if (process > 0) ended = finish(std::exchange(process, 0));
+  if (process > 0) ended = wordsOf(brimol::process::finish(std::exchange(process, 0)));
   if (watcher > 0) waitpid(std::exchange(watcher, 0), nullptr, 0);
   if (lifeline >= 0) close(std::exchange(lifeline, -1));
 }
@@ -138,7 +126,7 @@ std::string Command::read() {
 }
 
 std::optional<std::string> Command::outcome() {
-  if (process > 0 && hasEnded(process)) {
+  if (process > 0 && brimol::process::hasEnded(process)) {
     end();
     ioctl(output, FIONREAD, &unread);
   }

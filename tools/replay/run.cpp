@@ -10,9 +10,11 @@
 #include <csignal>
 #include <cstring>
 #include <fstream>
+#include <optional>
 #include <system_error>
 #include <utility>
 
+#include "process/child.h"
 #include "process/inherited.h"
 
 namespace brimol::replay {
@@ -179,26 +181,8 @@ class Tail {
   SessionReader reader;
 };
 
-bool hasEnded(pid_t process) {
-  siginfo_t info{};
-  const int options = WEXITED | WNOHANG | WNOWAIT;
-  return ::waitid(P_PID, static_cast<id_t>(process), &info, options) != 0 || info.si_pid != 0;
-}
-
-// Ends it, which may have left the group, and says what it ended with. It is not yet waited for, so
-// that its number is nobody else's. Another user's can go on: that one is not waited for.
-int finish(pid_t process) {
-  ::kill(-process, SIGKILL);
-  const int options = ::kill(process, SIGKILL) == 0 ? 0 : WNOHANG;
-  int status = 0;
-  while (::waitpid(process, &status, options) < 0) {
-    if (errno != EINTR) throw std::system_error(errno, std::generic_category(), "how it ended");
-  }
-  return status;
-}
-
 // Until it ended, hung or this program was asked to end; says which.
-RunEnd::Kind watch(const Launch& launch, const HeldSignals& signals, pid_t process,
+RunEnd::Kind watch(const Launch& launch, const HeldSignals& signals, pid_t application,
                    const std::function<void(const Session&)>& look) {
   Tail tail(launch.session);
   auto lastNews = steady_clock::now();
@@ -207,7 +191,7 @@ RunEnd::Kind watch(const Launch& launch, const HeldSignals& signals, pid_t proce
     if (signal != 0 && signal != SIGCHLD) return RunEnd::Kind::Interrupted;
     if (tail.read()) lastNews = steady_clock::now();
     look(tail.session());
-    if (hasEnded(process)) return RunEnd::Kind::Exited;
+    if (process::hasEnded(application)) return RunEnd::Kind::Exited;
     if (launch.timeout.count() > 0 && steady_clock::now() - lastNews > launch.timeout) {
       return RunEnd::Kind::Hung;
     }
@@ -220,20 +204,23 @@ RunEnd run(const Launch& launch, const std::function<void(const Session&)>& look
   const HeldSignals signals;
   const auto began = steady_clock::now();
   RunEnd end;
-  pid_t process = 0;
+  pid_t application = 0;
   const Group group(signals.former);
-  const int error = group.error != 0 ? group.error : start(launch, signals, group, process);
+  const int error = group.error != 0 ? group.error : start(launch, signals, group, application);
   if (error != 0) {
     end.why = "cannot start " + launch.command.front() + ": " + std::strerror(error);
     return end;
   }
-  end.kind = watch(launch, signals, process, look);
+  end.kind = watch(launch, signals, application, look);
   group.kill();
-  const int status = finish(process);
+  const std::optional<int> status = process::finish(application);  // it may have left the group
   end.realTime = std::chrono::duration_cast<milliseconds>(steady_clock::now() - began);
   if (end.kind != RunEnd::Kind::Exited) return end;
-  end.code = WIFEXITED(status) ? WEXITSTATUS(status) : WTERMSIG(status);
-  if (WIFSIGNALED(status)) end.kind = RunEnd::Kind::Signalled;
+  if (!status) {
+    throw std::system_error(std::make_error_code(std::errc::no_child_process), "how it ended");
+  }
+  end.code = WIFEXITED(*status) ? WEXITSTATUS(*status) : WTERMSIG(*status);
+  if (WIFSIGNALED(*status)) end.kind = RunEnd::Kind::Signalled;
   return end;
 }
 
